@@ -1,0 +1,198 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "document/page_document.h"
+
+#include "platform/numbers.h"
+#include "platform/run_time_error.h"
+
+#include <functional>
+#include <initializer_list>
+
+namespace pelloric {
+
+namespace {
+
+std::size_t mixed(std::initializer_list<std::size_t> parts)
+{
+    std::size_t hash = 0;
+    for (const std::size_t part : parts)
+        hash = (hash ^ part) * 0x9E3779B97F4A7C15ULL + (hash >> 29U);
+    return hash;
+}
+
+std::size_t bits(std::int32_t value) { return static_cast<std::uint32_t>(value); }
+
+} // namespace
+
+std::int16_t marginOfCentimetres(std::int16_t centimetres)
+{
+    return narrowToInt16(std::int64_t { centimetres } * TwipsPerCm);
+}
+
+PageDocument::PageDocument()
+    : pages_(1)
+    , pictures_(1)
+    , store_(std::make_shared<TextStore>())
+{
+}
+
+void PageDocument::newPage()
+{
+    Totalpages = narrowToInt16(std::int64_t { Totalpages } + 1);
+    const Page* full = pages_.empty() ? nullptr : &pages_.back();
+    const std::size_t lines = full != nullptr ? full->lines.size() : 0;
+    const std::size_t texts = full != nullptr ? full->texts.size() : 0;
+    if (full != nullptr) {
+        pages_.back().lines.shrink_to_fit();
+        pages_.back().texts.shrink_to_fit();
+    }
+    const auto count = static_cast<std::size_t>(std::max<std::int16_t>(Totalpages, 0));
+    pages_.resize(count);
+    pictures_.resize(count);
+    currentPage = static_cast<std::int16_t>(Totalpages - 1);
+    if (count == 0)
+        return;
+    pages_.back() = {};
+    pages_.back().lines.reserve(lines); // the pages of a report are alike
+    pages_.back().texts.reserve(texts);
+    pictures_.back().reset();
+}
+
+void PageDocument::clear()
+{
+    pages_.clear();
+    pages_.resize(1);
+    pages_.shrink_to_fit();
+    currentPage = 0;
+    Totalpages = 1;
+    pens_.clear();
+    styles_.clear();
+    penNumbers_.clear();
+    styleNumbers_.clear();
+    earlierStores_.clear();
+    store_ = std::make_shared<TextStore>();
+}
+
+std::span<const LineRecord> PageDocument::lines(int page) const { return pageAt(page).lines; }
+
+std::span<const TextRecord> PageDocument::texts(int page) const { return pageAt(page).texts; }
+
+Lineobj PageDocument::line(int page, std::size_t index) const
+{
+    const auto records = lines(page);
+    if (index >= records.size())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    const LineRecord& record = records[index];
+    const LinePen& lines = pen(record.pen);
+    return { record.pt1, record.pt2, lines.LineStyle, lines.LineColor, lines.LineWidth,
+        lines.FillStyle, lines.FillColor };
+}
+
+Textobj PageDocument::text(int page, std::size_t index) const
+{
+    const auto records = texts(page);
+    if (index >= records.size())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    const TextRecord& record = records[index];
+    const TextStyle& look = style(record.style);
+    return { record.pt, Text(record.text()), look.font, look.color };
+}
+
+const MapLocation* PageDocument::picture(int page) const
+{
+    if (page < 0 || static_cast<std::size_t>(page) >= pictures_.size())
+        return nullptr;
+    const auto& picture = pictures_[static_cast<std::size_t>(page)];
+    return picture ? &*picture : nullptr;
+}
+
+void PageDocument::placePicture(int page, const MapLocation& picture)
+{
+    pageAt(page);
+    if (pictures_.size() < pages_.size())
+        pictures_.resize(pages_.size());
+    pictures_[static_cast<std::size_t>(page)] = picture;
+}
+
+void PageDocument::removePicture(int page)
+{
+    pageAt(page);
+    if (static_cast<std::size_t>(page) < pictures_.size())
+        pictures_[static_cast<std::size_t>(page)].reset();
+}
+
+std::uint32_t PageDocument::penNumber(const LinePen& pen)
+{
+    const auto [place, isNew]
+        = penNumbers_.try_emplace(pen, static_cast<std::uint32_t>(pens_.size()));
+    if (isNew)
+        pens_.push_back(pen);
+    return place->second;
+}
+
+std::uint32_t PageDocument::styleNumber(const TextStyle& style)
+{
+    TextStyle kept = style;
+    kept.font.strikethrough = false;
+    kept.font.underline = false;
+    const auto [place, isNew]
+        = styleNumbers_.try_emplace(kept, static_cast<std::uint32_t>(styles_.size()));
+    if (isNew)
+        styles_.push_back(std::move(kept));
+    return place->second;
+}
+
+void PageDocument::shareStore(std::shared_ptr<TextStore> store)
+{
+    earlierStores_.push_back(std::exchange(store_, std::move(store)));
+}
+
+std::size_t PageDocument::memoryBytes() const
+{
+    std::size_t bytes = pages_.capacity() * sizeof(Page) + store_->capacityBytes();
+    for (const auto& store : earlierStores_)
+        bytes += store->capacityBytes();
+    for (const Page& page : pages_) {
+        bytes += page.lines.capacity() * sizeof(LineRecord);
+        bytes += page.texts.capacity() * sizeof(TextRecord);
+    }
+    return bytes;
+}
+
+std::size_t PageDocument::PenHash::operator()(const LinePen& pen) const
+{
+    return mixed({ bits(pen.LineStyle), bits(pen.LineColor), bits(pen.LineWidth),
+        bits(pen.FillStyle), bits(pen.FillColor) });
+}
+
+std::size_t PageDocument::StyleHash::operator()(const TextStyle& style) const
+{
+    const Font& font = style.font;
+    return mixed({ std::hash<Text>()(font.name), std::hash<float>()(font.size), font.bold ? 1U : 0U,
+        font.italic ? 1U : 0U, bits(style.color) });
+}
+
+PageDocument::Page& PageDocument::current()
+{
+    if (!hasPage(currentPage))
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    return pages_[static_cast<std::size_t>(currentPage)];
+}
+
+const PageDocument::Page& PageDocument::pageAt(int page) const
+{
+    if (!hasPage(page))
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    return pages_[static_cast<std::size_t>(page)];
+}
+
+TextView withPageCount(TextView text, std::int16_t pages, Text& buffer)
+{
+    if (!contains(text, PageCountToken))
+        return text;
+    buffer = replaceAll(text, PageCountToken, decimal(pages));
+    return buffer;
+}
+
+} // namespace pelloric

@@ -1,0 +1,151 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "document/records.h"
+#include "document/text_store.h"
+
+#include <memory>
+#include <optional>
+#include <span>
+#include <unordered_map>
+#include <vector>
+
+namespace pelloric {
+
+/// Paper and margins.
+struct PageSetup {
+    std::int16_t intTop = 2 * TwipsPerCm; ///< twips
+    std::int16_t intButtom = 2 * TwipsPerCm; ///< twips
+    std::int16_t intLeft = 2 * TwipsPerCm; ///< twips
+    std::int16_t intRight = 2 * TwipsPerCm; ///< twips
+    Twips myHeight = 16840; ///< A4 portrait
+    Twips myWidth = 21 * TwipsPerCm;
+
+    bool operator==(const PageSetup&) const = default;
+};
+
+/// A margin given in whole centimetres, as twips.
+/// @throws RunTimeError Overflow: above 57 or below -57
+std::int16_t marginOfCentimetres(std::int16_t centimetres);
+
+/// A line as a page keeps it; the pen is the document's, by number.
+struct LineRecord {
+    Tpoint pt1;
+    Tpoint pt2;
+    std::uint32_t pen = 0;
+};
+
+/// A text as a page keeps it: a view into a text store; the style is the document's, by number.
+struct TextRecord {
+    Tpoint pt;
+    const char16_t* units = nullptr;
+    std::uint32_t length = 0;
+    std::uint32_t style = 0;
+
+    TextView text() const { return TextView(units, length); }
+};
+
+/// The laid-out pages: for each a list of lines, a list of texts and at most one picture.
+///
+/// A page is never a picture of itself; screen, printer and files replay its records, every line
+/// and then every text, in the order recorded. Pages count from 0 here.
+class PageDocument {
+public:
+    PageDocument();
+
+    /// The number of pages as hosts see and may write it; real pages are `pageCount()`.
+    std::int16_t Totalpages = 1;
+
+    /// The page that is recorded on; may point past the real pages when a host said so.
+    std::int16_t currentPage = 0;
+
+    /// The number of pages that exist.
+    int pageCount() const { return static_cast<int>(pages_.size()); }
+
+    /// Adds an empty page behind `Totalpages` and makes it the current one.
+    /// @throws RunTimeError Overflow: there would be more than 32767; nothing has changed
+    void newPage();
+
+    /// Back to one empty page; the picture of a page stays until pages are added.
+    void clear();
+
+    /// Whether there is such a page.
+    bool hasPage(int page) const { return page >= 0 && page < pageCount(); }
+
+    /// @throws RunTimeError SubscriptOutOfRange: no such page
+    std::span<const LineRecord> lines(int page) const;
+    /// @throws RunTimeError SubscriptOutOfRange: no such page
+    std::span<const TextRecord> texts(int page) const;
+
+    /// The pen of a `LineRecord`.
+    const LinePen& pen(std::uint32_t number) const { return pens_[number]; }
+    /// The style of a `TextRecord`.
+    const TextStyle& style(std::uint32_t number) const { return styles_[number]; }
+
+    /// A line as it is published. @throws RunTimeError SubscriptOutOfRange
+    Lineobj line(int page, std::size_t index) const;
+    /// A text as it is published. @throws RunTimeError SubscriptOutOfRange
+    Textobj text(int page, std::size_t index) const;
+
+    /// The picture that the page carries, or null.
+    const MapLocation* picture(int page) const;
+    /// Gives a page its picture. @throws RunTimeError SubscriptOutOfRange
+    void placePicture(int page, const MapLocation& picture);
+    /// Takes the page's picture away. @throws RunTimeError SubscriptOutOfRange
+    void removePicture(int page);
+
+    /// The number of a pen in this document.
+    std::uint32_t penNumber(const LinePen& pen);
+    /// The number of a style in this document; strike-through and underline are dropped.
+    std::uint32_t styleNumber(const TextStyle& style);
+
+    /// Appends to the current page. @throws RunTimeError SubscriptOutOfRange
+    void append(const LineRecord& line) { current().lines.push_back(line); }
+    /// Appends to the current page; the text stays where it is.
+    /// @throws RunTimeError SubscriptOutOfRange
+    void append(const TextRecord& text) { current().texts.push_back(text); }
+
+    /// Where new texts are kept.
+    TextStore& store() { return *store_; }
+    /// Takes over a store that a row set shares; texts recorded before stay valid.
+    void shareStore(std::shared_ptr<TextStore> store);
+
+    /// Bytes that pages, records and text stores hold.
+    std::size_t memoryBytes() const;
+
+private:
+    struct Page {
+        std::vector<LineRecord> lines;
+        std::vector<TextRecord> texts;
+    };
+
+    struct PenHash {
+        std::size_t operator()(const LinePen& pen) const;
+    };
+
+    struct StyleHash {
+        std::size_t operator()(const TextStyle& style) const;
+    };
+
+    Page& current();
+    const Page& pageAt(int page) const;
+
+    std::vector<Page> pages_;
+    std::vector<std::optional<MapLocation>> pictures_;
+    std::vector<LinePen> pens_;
+    std::vector<TextStyle> styles_;
+    std::unordered_map<LinePen, std::uint32_t, PenHash> penNumbers_;
+    std::unordered_map<TextStyle, std::uint32_t, StyleHash> styleNumbers_;
+    std::shared_ptr<TextStore> store_;
+    std::vector<std::shared_ptr<TextStore>> earlierStores_;
+};
+
+/// A text as it is put out: every `PageCountToken` replaced by the number of pages.
+///
+/// @param buffer  holds the result when something was replaced
+/// @return        the text itself where it holds no token, else a view into the buffer
+TextView withPageCount(TextView text, std::int16_t pages, Text& buffer);
+
+} // namespace pelloric

@@ -1,0 +1,38 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstdint>
+
+namespace pelloric {
+
+class Clock;
+class MessageLoop;
+class MessageService;
+class Printer;
+class PrinterSystem;
+class SystemFolders;
+class TextCodec;
+class TextMetrics;
+
+/// What all controls of a program share.
+struct LibraryState {
+    std::int32_t MarvenStartRow = 1; ///< the first row of a flex grid that is printed
+};
+
+/// The services that the core works on; the references outlive whatever is given the record.
+struct Platform {
+    TextMetrics& metrics;
+    TextCodec& codec;
+    MessageService& messages;
+    MessageLoop& loop;
+    Clock& clock;
+    SystemFolders& folders;
+    Printer& printer;
+    PrinterSystem& printers;
+    LibraryState& library;
+    char16_t decimalSeparator = u'.'; ///< of the user's locale
+};
+
+} // namespace pelloric

@@ -1,0 +1,49 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <stdexcept>
+
+namespace pelloric {
+
+/// Every number that a `RunTimeError` carries.
+enum class ErrorNumber {
+    InvalidCall = 5,
+    Overflow = 6,
+    SubscriptOutOfRange = 9,
+    DivisionByZero = 11,
+    TypeMismatch = 13,
+    FileNotFound = 53,
+    WriteFailed = 57,
+    ObjectMissing = 91,
+    NoSuchMember = 438,
+    Cancelled = 32755,
+};
+
+/// The plain English text of an error number, without a full stop.
+TextView errorText(ErrorNumber number);
+
+/// What the core throws; nothing else leaves it on purpose.
+class RunTimeError : public std::runtime_error {
+public:
+    /// An error with the plain text of its number.
+    explicit RunTimeError(ErrorNumber number);
+
+    /// @param detail  what went wrong, for a person: names the member, the file or the value
+    RunTimeError(ErrorNumber number, TextView detail);
+
+    /// The number, from the one list.
+    ErrorNumber number() const { return number_; }
+
+    /// What a message box shows: the number's text, then ": " and the detail when there is one.
+    const Text& text() const { return text_; }
+
+private:
+    ErrorNumber number_;
+    Text text_;
+};
+
+} // namespace pelloric

@@ -1,0 +1,65 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <filesystem>
+#include <optional>
+
+namespace pelloric {
+
+/// Icons of message boxes.
+enum class MessageIcon { None, Information, Critical };
+
+/// One message box with an OK button.
+struct Message {
+    Text text;
+    std::optional<Text> title; ///< nothing: the application's display name
+    MessageIcon icon = MessageIcon::None;
+
+    bool operator==(const Message&) const = default;
+};
+
+/// Shows message boxes; a headless program puts another one in.
+class MessageService {
+public:
+    virtual ~MessageService() = default;
+
+    /// Returns when the user has closed the box.
+    virtual void show(const Message& message) = 0;
+};
+
+/// The message loop of the user-interface thread.
+class MessageLoop {
+public:
+    virtual ~MessageLoop() = default;
+
+    /// Lets the messages that are pending run once.
+    /// @throws RunTimeError Cancelled: the user asked to end the operation that is under way
+    virtual void runOnce() = 0;
+};
+
+/// Date and time, as texts in the user's form.
+class Clock {
+public:
+    virtual ~Clock() = default;
+
+    /// Today as YYYY-MM-DD.
+    virtual Text date() const = 0;
+
+    /// The time with seconds, as the locale writes it.
+    virtual Text time() const = 0;
+};
+
+/// Folders of the system.
+class SystemFolders {
+public:
+    virtual ~SystemFolders() = default;
+
+    /// The folder of the settings file, without a separator at its end.
+    virtual std::filesystem::path systemDirectory() const = 0;
+};
+
+} // namespace pelloric
