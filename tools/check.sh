@@ -1,0 +1,108 @@
+#!/usr/bin/env bash
+# SPDX-FileCopyrightText: The Pelloric authors
+# SPDX-License-Identifier: MIT
+
+# Checks of the sources and of sanitizer builds: all, or those named as arguments.
+#
+#   tools/check.sh [format] [layers] [spelling] [licences] [tidy] [asan] [fuzz]
+#
+# CHECK_FUZZ_SECONDS (60) is how long each fuzzer runs; with 0 they are only built.
+
+set -euo pipefail
+cd "$(dirname "${BASH_SOURCE[0]}")/.."
+. tools/packages.sh
+
+AllChecks=(format layers spelling licences tidy asan fuzz)
+
+cxxFiles() {
+    git ls-files -z -- '*.cpp' '*.h'
+}
+
+checkFormat() {
+    needTools clang-format-14
+    cxxFiles | xargs -0 -r clang-format-14 --dry-run -Werror
+}
+
+checkLayers() {
+    tools/check_layers.sh
+}
+
+checkSpelling() {
+    needTools codespell
+    git ls-files -z | xargs -0 -r codespell
+}
+
+checkLicences() {
+    needTools reuse
+    reuse lint > build/reuse.log 2>&1 || {
+        cat build/reuse.log >&2
+        return 1
+    }
+    tail -n 1 build/reuse.log
+}
+
+# Reads the compile commands of the preset dev, whose build also makes the files that Qt's tools write.
+checkTidy() {
+    needTools clang-tidy-14
+    configureAndBuild dev > build/tidy-build.log 2>&1 || {
+        cat build/tidy-build.log >&2
+        return 1
+    }
+    git ls-files -z -- 'src/*.cpp' 'apps/*.cpp' |
+        xargs -0 -r -n 1 -P "$(nproc)" clang-tidy-14 -p build/dev --quiet 2> build/tidy.log || {
+        grep -v 'warnings\? \(generated\|treated\)' build/tidy.log >&2
+        return 1
+    }
+}
+
+checkAsan() {
+    needTools ctest
+    configureAndBuild asan
+    ctest --preset asan
+}
+
+checkFuzz() {
+    needTools clang++-14
+    configureAndBuild fuzz
+    local seconds=${CHECK_FUZZ_SECONDS:-60} program name
+    [ "$seconds" -gt 0 ] || return 0
+    for program in build/fuzz/fuzz/fuzz_*; do
+        [ -f "$program" ] && [ -x "$program" ] || continue
+        name=${program##*/fuzz_}
+        local corpus=("build/fuzz/corpus/$name")
+        mkdir -p "${corpus[0]}"
+        [ ! -d "fuzz/corpus/$name" ] || corpus+=("fuzz/corpus/$name")
+        QT_QPA_PLATFORM=offscreen "$program" -max_total_time="$seconds" -timeout=10 \
+            -rss_limit_mb=2048 -artifact_prefix="build/fuzz/$name-" -print_final_stats=1 \
+            "${corpus[@]}"
+    done
+}
+
+for check in "$@"; do
+    [[ " ${AllChecks[*]} " = *" $check "* ]] || fail "no check '$check'; there are: ${AllChecks[*]}"
+done
+[ $# -gt 0 ] || set -- "${AllChecks[@]}"
+needPackages build test check
+needTools git
+mkdir -p build
+
+failed=()
+for check in "$@"; do
+    printf '== %s\n' "$check"
+    start=$SECONDS
+    # In a subshell outside any condition, so that its first failing command ends it.
+    set +e
+    (
+        set -e
+        "check${check^}"
+    )
+    result=$?
+    set -e
+    if [ "$result" -eq 0 ]; then
+        printf '== %s: good (%d s)\n' "$check" $((SECONDS - start))
+    else
+        printf '== %s: FAILED (%d s)\n' "$check" $((SECONDS - start))
+        failed+=("$check")
+    fi
+done
+[ ${#failed[@]} -eq 0 ] || fail "failed: ${failed[*]}"

@@ -1,0 +1,113 @@
+# SPDX-FileCopyrightText: The Pelloric authors
+# SPDX-License-Identifier: MIT
+# shellcheck shell=bash
+
+# The Debian packages the project needs, by what they are for, and what installs those that are
+# missing. Read by other scripts; does nothing by itself.
+
+# Compiles the libraries, the program and the tests. The fonts are what pages are drawn with.
+PackagesBuild=(
+    ccache
+    cmake
+    fonts-arphic-uming
+    fonts-dejavu-core
+    g++
+    libcsv-dev
+    libgmock-dev
+    libgtest-dev
+    libqt6sql6-sqlite
+    ninja-build
+    nlohmann-json3-dev
+    qt6-base-dev
+    qt6-declarative-dev
+    qt6-svg-dev
+    qt6-tools-dev
+)
+
+# What tests start or read: a window server and its helpers, a print scheduler, readers of PDF.
+PackagesTest=(
+    cups-client
+    cups-daemon
+    imagemagick
+    openbox
+    poppler-utils
+    python3
+    sqlite3
+    x11-apps
+    x11-utils
+    xauth
+    xdotool
+    xvfb
+)
+
+# Measures.
+PackagesBench=(
+    libbenchmark-dev
+)
+
+# Judges the sources: format, mistakes, spelling, licences, and the compiler of the fuzzers.
+PackagesCheck=(
+    clang-14
+    clang-format-14
+    clang-tidy-14
+    codespell
+    git
+    libclang-rt-14-dev
+    llvm-14
+    reuse
+)
+
+# fail TEXT: ends the script with one line on standard error.
+fail() {
+    printf '%s: %s\n' "${0##*/}" "$1" >&2
+    exit 1
+}
+
+# needTools NAME...: ends the script unless each program is there, naming those that are not.
+needTools() {
+    local tool missing=()
+    for tool in "$@"; do
+        command -v "$tool" > /dev/null 2>&1 || missing+=("$tool")
+    done
+    [ ${#missing[@]} -eq 0 ] || fail "not found: ${missing[*]}"
+}
+
+# asRoot COMMAND...: runs it as root, through sudo where this is another user.
+asRoot() {
+    if [ "$(id -u)" -eq 0 ]; then
+        "$@"
+    elif command -v sudo > /dev/null 2>&1; then
+        sudo -- "$@"
+    else
+        fail "packages are missing and there is no sudo; as root run: $*"
+    fi
+}
+
+# needPackages GROUP...: installs what is missing of the groups build, test, bench and check.
+needPackages() {
+    local group list package missing=()
+    for group in "$@"; do
+        list="Packages${group^}[@]"
+        for package in "${!list}"; do
+            [ "$(dpkg-query -W -f='${db:Status-Status}' "$package" 2> /dev/null)" = installed ] ||
+                missing+=("$package")
+        done
+    done
+    [ ${#missing[@]} -gt 0 ] || return 0
+    command -v apt-get > /dev/null 2>&1 ||
+        fail "no apt-get here; install these Debian packages or their like: ${missing[*]}"
+    printf 'Installing: %s\n' "${missing[*]}"
+    asRoot apt-get update -q || fail "apt-get update failed; is the network there?"
+    asRoot env DEBIAN_FRONTEND=noninteractive apt-get install -q -y --no-install-recommends \
+        "${missing[@]}" || fail "apt-get could not install: ${missing[*]}"
+}
+
+# configureAndBuild PRESET [TARGET...]: configures the preset and builds it, or only the targets.
+configureAndBuild() {
+    local preset=$1
+    shift
+    needTools cmake ninja
+    cmake --preset "$preset" || fail "configuring the preset $preset failed"
+    cmake --build --preset "$preset" --parallel "$(nproc)" ${1:+--target "$@"} ||
+        fail "building the preset $preset failed"
+}
