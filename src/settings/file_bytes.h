@@ -1,0 +1,29 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <filesystem>
+
+namespace pelloric {
+
+/// A path as a person reads it; what is no character becomes U+FFFD.
+Text pathText(const std::filesystem::path& path);
+
+/// All bytes of a file.
+/// @throws RunTimeError FileNotFound, with the path: it is missing or cannot be read
+std::string readFileBytes(const std::filesystem::path& path);
+
+/// Creates a file; a failure leaves none behind.
+/// @return  whether all bytes were written
+bool createFile(const std::filesystem::path& path, std::string_view bytes);
+
+/// Rewrites an existing file in place; after a failure it holds `oldBytes` again where the disk
+/// allows it.
+/// @return  whether all bytes were written
+bool rewriteFile(
+    const std::filesystem::path& path, std::string_view bytes, std::string_view oldBytes);
+
+} // namespace pelloric
