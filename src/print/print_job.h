@@ -1,0 +1,51 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <cstdint>
+#include <functional>
+
+namespace pelloric {
+
+class PageDocument;
+class Printer;
+struct Font;
+
+/// What is to be printed, and how.
+struct PrintJob {
+    bool allPages = true; ///< false: the pages of the list
+    Text pageList; ///< one-based page numbers separated by ","
+    std::int16_t copies = 1; ///< whole copies one after the other; none below 1
+    std::int16_t paperSize = 9; ///< paper-size code of the report
+    std::int16_t orientation = 1; ///< 1 portrait, 2 landscape
+    Text documentName; ///< in the printer's queue; the page number is added
+
+    /// Called after each page with the number of pages sent so far; may be empty.
+    std::function<void(std::int64_t)> pageSent;
+};
+
+/// Sends one page to the printer, its records where they stand, and hands the document over.
+///
+/// @param page         zero-based index
+/// @param defaultFont  font of the printer before the first record
+/// @throws RunTimeError SubscriptOutOfRange: no such page, nothing has been sent; or the printer's
+void printPage(
+    const PageDocument& document, int page, const Font& defaultFont, Printer& printer);
+
+/// The number of pages that a job sends, all its copies together.
+std::int64_t pagesToSend(const PageDocument& document, const PrintJob& job);
+
+/// Prints: every page is a document of its own, copies follow each other.
+///
+/// The printer's paper size and orientation are put back in every case. A page number that names
+/// no page makes no document.
+/// @param defaultFont  as in `printPage`
+/// @return             the number of pages sent
+/// @throws RunTimeError the printer's own, and what `pageSent` throws; the job ends there
+std::int64_t doPrint(const PageDocument& document, const PrintJob& job, const Font& defaultFont,
+    Printer& printer);
+
+} // namespace pelloric
