@@ -1,0 +1,47 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <filesystem>
+#include <functional>
+#include <iosfwd>
+
+namespace pelloric {
+
+class PageDocument;
+class TextCodec;
+struct PageSetup;
+
+/// How texts and numbers become bytes of a document file.
+struct OstlEncoding {
+    const TextCodec& codec;
+    char16_t decimalSeparator = u'.'; ///< of font sizes
+};
+
+/// Told before a page is written: its index, and the index of the last page of the file.
+using OstlProgress = std::function<void(int page, int last)>;
+
+/// Writes a document as lines of text that end in CR LF, the first and the last a lone quote.
+///
+/// Pages 0 to `Totalpages` - 1 are written, 130 being the last index that a file holds. Every
+/// `PageCountToken` becomes `Totalpages`. Texts stand as they are: a line break or a quote in one
+/// breaks the file's structure.
+/// @param progress  may be empty
+/// @throws RunTimeError SubscriptOutOfRange: `Totalpages` counts pages that do not exist; nothing
+///         has been written
+void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
+    const OstlProgress& progress, std::ostream& stream);
+
+/// Saves a document to a file, replacing any file there.
+///
+/// The file is written under another name beside its place and put there when it is whole, so a
+/// save that fails, or that `progress` ends with an error, changes nothing. A file in a folder
+/// that takes no new one is rewritten in place.
+/// @throws RunTimeError WriteFailed, with the path; SubscriptOutOfRange as above
+void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
+    const OstlProgress& progress, const std::filesystem::path& path);
+
+} // namespace pelloric
