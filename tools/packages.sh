@@ -107,6 +107,8 @@ configureAndBuild() {
     local preset=$1
     shift
     needTools cmake ninja
+    # The presets dev and core compile the same files with the same flags in different folders.
+    export CCACHE_NOHASHDIR=1
     cmake --preset "$preset" || fail "configuring the preset $preset failed"
     cmake --build --preset "$preset" --parallel "$(nproc)" ${1:+--target "$@"} ||
         fail "building the preset $preset failed"
