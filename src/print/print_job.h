@@ -32,8 +32,7 @@ struct PrintJob {
 /// @param page         zero-based index
 /// @param defaultFont  font of the printer before the first record
 /// @throws RunTimeError SubscriptOutOfRange: no such page, nothing has been sent; or the printer's
-void printPage(
-    const PageDocument& document, int page, const Font& defaultFont, Printer& printer);
+void printPage(const PageDocument& document, int page, const Font& defaultFont, Printer& printer);
 
 /// The number of pages that a job sends, all its copies together.
 std::int64_t pagesToSend(const PageDocument& document, const PrintJob& job);
@@ -45,7 +44,7 @@ std::int64_t pagesToSend(const PageDocument& document, const PrintJob& job);
 /// @param defaultFont  as in `printPage`
 /// @return             the number of pages sent
 /// @throws RunTimeError the printer's own, and what `pageSent` throws; the job ends there
-std::int64_t doPrint(const PageDocument& document, const PrintJob& job, const Font& defaultFont,
-    Printer& printer);
+std::int64_t doPrint(
+    const PageDocument& document, const PrintJob& job, const Font& defaultFont, Printer& printer);
 
 } // namespace pelloric

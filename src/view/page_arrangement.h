@@ -78,8 +78,7 @@ float fittingDivisor(
 /// @param first    position of surface 0: page twips
 /// @param surface  index of the surface, from 0
 /// @throws RunTimeError Overflow: outside 32 bits
-Tpoint surfacePosition(
-    Tpoint first, int surface, const PageGrid& grid, const PageFacts& facts);
+Tpoint surfacePosition(Tpoint first, int surface, const PageGrid& grid, const PageFacts& facts);
 
 /// Where surface 0 stands so that the grid is centred, 100 twips from the edge at least.
 ///

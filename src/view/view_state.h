@@ -98,8 +98,7 @@ void showAllPage(ViewState& view, const PageFacts& facts, MessageLoop& loop);
 ///               is the window's affair.
 /// @param loop   runs once, after fitting
 /// @throws RunTimeError as `fittingDivisor` and `layOutAgain`, and what the loop throws
-void showMuliPage(
-    ViewState& view, const PageFacts& facts, std::int16_t pages, MessageLoop& loop);
+void showMuliPage(ViewState& view, const PageFacts& facts, std::int16_t pages, MessageLoop& loop);
 
 /// Stores the page window as it is given; shows nothing by itself.
 void setShowStyle(

@@ -1,0 +1,95 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "print/page_list.h"
+
+#include "platform/numbers.h"
+#include "platform/run_time_error.h"
+
+namespace pelloric {
+
+namespace {
+
+constexpr double LastPage = 32767; ///< that any document can have
+constexpr std::size_t LongestList = std::size_t { 1 } << 24U; ///< code units
+
+TextView firstItem(TextView piece) { return piece.substr(0, piece.find(u',')); }
+
+TextView lastItem(TextView piece)
+{
+    const std::size_t comma = piece.rfind(u',');
+    return comma == TextView::npos ? piece : piece.substr(comma + 1);
+}
+
+double endOf(TextView item) { return roundHalfEven(leadingNumber(item)); }
+
+/// Appends the numbers strictly between two ends, each with a comma in front.
+void appendBetween(double first, double last, Text& list)
+{
+    for (double page = first + 1; page < last && page <= LastPage; ++page) {
+        list.push_back(u',');
+        list += decimal(roundToInt32(page));
+    }
+    if (list.size() > LongestList)
+        throw RunTimeError(ErrorNumber::Overflow, u"page list");
+}
+
+/// Appends a piece behind the piece at its left, and the run between the two.
+void appendJoined(TextView left, TextView piece, Text& list)
+{
+    const TextView leftItem = lastItem(left);
+    const TextView rightItem = firstItem(piece);
+    const double first = endOf(leftItem);
+    const double last = endOf(rightItem);
+    appendBetween(first, last, list);
+    if (first == last && isNumber(leftItem) && isNumber(rightItem)) {
+        list += piece.substr(rightItem.size());
+        return;
+    }
+    list.push_back(u',');
+    list += piece;
+}
+
+} // namespace
+
+Text pageListOf(TextView rangeText)
+{
+    std::size_t dash = rangeText.find(u'-');
+    TextView left = rangeText.substr(0, dash);
+    Text list(left);
+    while (dash != TextView::npos) {
+        rangeText.remove_prefix(dash + 1);
+        dash = rangeText.find(u'-');
+        const TextView piece = rangeText.substr(0, dash);
+        appendJoined(left, piece, list);
+        left = piece;
+    }
+    return list;
+}
+
+PageNumbers::PageNumbers(TextView list)
+    : rest_(list)
+{
+}
+
+std::optional<std::int16_t> PageNumbers::next()
+{
+    while (!atEnd_) {
+        const TextView item = firstItem(rest_);
+        atEnd_ = item.size() == rest_.size();
+        rest_.remove_prefix(atEnd_ ? item.size() : item.size() + 1);
+        if (!isNumber(item))
+            continue;
+        const double number = endOf(item);
+        if (number >= -LastPage - 1 && number <= LastPage)
+            return roundToInt16(number);
+    }
+    return std::nullopt;
+}
+
+std::int16_t copiesOf(TextView text)
+{
+    return text.empty() ? std::int16_t { 1 } : roundToInt16(leadingNumber(text));
+}
+
+} // namespace pelloric

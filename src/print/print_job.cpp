@@ -1,0 +1,136 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "print/print_job.h"
+
+#include "document/page_document.h"
+#include "platform/printer.h"
+#include "print/page_list.h"
+
+#include <vector>
+
+namespace pelloric {
+
+namespace {
+
+void printLine(const LineRecord& line, const LinePen& pen, Printer& printer)
+{
+    printer.setDrawWidth(pen.LineWidth);
+    printer.setDrawStyle(pen.LineStyle);
+    printer.setForeColor(pen.LineColor);
+    if (pen.FillStyle == TransparentFill) {
+        printer.setFillStyle(TransparentFill);
+        printer.line(line.pt1, line.pt2);
+        return;
+    }
+    printer.setFillColor(pen.FillColor);
+    printer.setFillStyle(pen.FillStyle);
+    printer.box(line.pt1, line.pt2, pen.FillColor);
+}
+
+void printText(const TextRecord& text, const TextStyle& style, TextView filled, Printer& printer)
+{
+    printer.setFontTransparent(true);
+    printer.setFontBold(style.font.bold);
+    printer.setFontItalic(style.font.italic);
+    printer.setFontName(style.font.name);
+    printer.setFontSize(style.font.size);
+    printer.setForeColor(style.color);
+    printer.setCurrentX(text.pt.x);
+    printer.setCurrentY(text.pt.y);
+    printer.print(filled);
+}
+
+void applySettings(Printer& printer, std::int16_t paperSize, std::int16_t orientation)
+{
+    printer.applyPaperSize(paperSize);
+    printer.applyOrientation(orientation);
+}
+
+/// The zero-based pages of one copy, in the order in which they are sent.
+std::vector<int> pagesOfCopy(const PageDocument& document, const PrintJob& job)
+{
+    std::vector<int> pages;
+    if (job.allPages) {
+        for (int page = 0; page < document.Totalpages && document.hasPage(page); ++page)
+            pages.push_back(page);
+        return pages;
+    }
+    PageNumbers numbers(job.pageList);
+    while (const auto number = numbers.next()) {
+        if (*number <= document.Totalpages && document.hasPage(*number - 1))
+            pages.push_back(*number - 1);
+    }
+    return pages;
+}
+
+Text documentTitle(TextView name, int page)
+{
+    Text title(name);
+    if (!title.empty())
+        title += u" – ";
+    return title + u"page " + decimal(page + 1);
+}
+
+std::int64_t printCopies(
+    const PageDocument& document, const PrintJob& job, const Font& defaultFont, Printer& printer)
+{
+    const std::vector<int> pages = pagesOfCopy(document, job);
+    std::int64_t sent = 0;
+    printer.endDoc(); // what another program part began is no part of this job
+    for (int copy = 1; copy <= job.copies; ++copy) {
+        for (const int page : pages) {
+            printer.setDocumentTitle(documentTitle(job.documentName, page));
+            printPage(document, page, defaultFont, printer);
+            ++sent;
+            if (job.pageSent)
+                job.pageSent(sent);
+        }
+    }
+    return sent;
+}
+
+} // namespace
+
+void printPage(const PageDocument& document, int page, const Font& defaultFont, Printer& printer)
+{
+    const auto lines = document.lines(page);
+    const auto texts = document.texts(page);
+    printer.setFontName(defaultFont.name);
+    printer.setFontSize(defaultFont.size);
+    for (const LineRecord& line : lines)
+        printLine(line, document.pen(line.pen), printer);
+    printer.setFillStyle(TransparentFill);
+    Text buffer;
+    for (const TextRecord& text : texts) {
+        const TextView filled = withPageCount(text.text(), document.Totalpages, buffer);
+        printText(text, document.style(text.style), filled, printer);
+    }
+    printer.endDoc();
+}
+
+std::int64_t pagesToSend(const PageDocument& document, const PrintJob& job)
+{
+    if (job.copies < 1)
+        return 0;
+    return static_cast<std::int64_t>(pagesOfCopy(document, job).size()) * job.copies;
+}
+
+std::int64_t doPrint(
+    const PageDocument& document, const PrintJob& job, const Font& defaultFont, Printer& printer)
+{
+    const std::int16_t paperSize = printer.paperSize();
+    const std::int16_t orientation = printer.orientation();
+    std::int64_t sent = 0;
+    try {
+        applySettings(printer, job.paperSize, job.orientation);
+        sent = printCopies(document, job, defaultFont, printer);
+    } catch (...) {
+        applySettings(printer, paperSize, orientation);
+        throw;
+    }
+    applySettings(printer, paperSize, orientation);
+    return sent;
+}
+
+} // namespace pelloric
