@@ -6,8 +6,10 @@
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
 
+#include <algorithm>
 #include <functional>
 #include <initializer_list>
+#include <utility>
 
 namespace pelloric {
 
@@ -59,19 +61,11 @@ void PageDocument::newPage()
     pictures_.back().reset();
 }
 
-void PageDocument::clear()
+PageDocument PageDocument::cleared() const
 {
-    pages_.clear();
-    pages_.resize(1);
-    pages_.shrink_to_fit();
-    currentPage = 0;
-    Totalpages = 1;
-    pens_.clear();
-    styles_.clear();
-    penNumbers_.clear();
-    styleNumbers_.clear();
-    earlierStores_.clear();
-    store_ = std::make_shared<TextStore>();
+    PageDocument document;
+    document.pictures_ = pictures_;
+    return document;
 }
 
 std::span<const LineRecord> PageDocument::lines(int page) const { return pageAt(page).lines; }

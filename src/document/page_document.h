@@ -69,7 +69,10 @@ public:
     void newPage();
 
     /// Back to one empty page; the picture of a page stays until pages are added.
-    void clear();
+    void clear() { *this = cleared(); }
+
+    /// What `clear` would leave of this document.
+    PageDocument cleared() const;
 
     /// Whether there is such a page.
     bool hasPage(int page) const { return page >= 0 && page < pageCount(); }

@@ -1,0 +1,191 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "document/page_document.h"
+#include "document/recorder.h"
+#include "report/grid_reader.h"
+#include "report/layout_engine.h"
+#include "report/report_style.h"
+#include "view/view_state.h"
+
+#include <filesystem>
+#include <optional>
+
+namespace pelloric {
+
+class AutomationObject;
+struct Platform;
+
+/// The progress bar of a canvas.
+struct ProgressBar {
+    bool visible = false;
+    std::int64_t maximum = 0;
+    std::int64_t value = 0;
+
+    bool operator==(const ProgressBar&) const = default;
+};
+
+/// Is told what a canvas changed of what people see.
+class CanvasObserver {
+public:
+    virtual ~CanvasObserver() = default;
+
+    /// Surfaces, bars, mode or pages are others now.
+    virtual void viewChanged() = 0;
+
+    /// The progress bar has moved, appeared or gone.
+    virtual void progressChanged() = 0;
+};
+
+/// What `Sorvane` publishes, without a window: every member hands on to the rooms that do the work.
+///
+/// Members throw `RunTimeError`; the control that publishes them turns it into a message box.
+class Canvas : private ProgressListener {
+public:
+    /// @param platform  outlives the canvas
+    explicit Canvas(Platform& platform);
+
+    PageSetup page; ///< paper and margins: `intTop` to `myWidth`
+    bool bGetText = false; ///< for the host; the canvas only gives it its first value
+    PrintObjKind m_PrintObj = PrintObjKind::MSHFlexGrid; ///< which reader a build uses
+    Text strSCliectRect = u"small"; ///< while it is "small" no page is painted
+    Text PageHeader; ///< kept for the host; the layout does not read it
+
+    /// @param observer  borrowed, or null
+    void observe(CanvasObserver* observer) { observer_ = observer; }
+
+    /// The number of pages as it is published; a host may write it.
+    std::int16_t Totalpages() const { return document_.Totalpages; }
+    void setTotalpages(std::int16_t pages);
+
+    /// The current page, from 1.
+    std::int16_t Currentpage() const;
+    /// Makes a page the current one; a number above `Totalpages` shows a message and changes
+    /// nothing, one below 1 is stored and fails at the next use of the page.
+    /// @throws RunTimeError Overflow: -32768
+    void setCurrentpage(std::int16_t page);
+
+    Twips CurrentX() const { return recorder_.currentX(); }
+    Twips CurrentY() const { return recorder_.currentY(); }
+    void setCurrentX(Twips x) { recorder_.setCurrentX(x); }
+    void setCurrentY(Twips y) { recorder_.setCurrentY(y); }
+
+    /// Empties the document.
+    void clear();
+    /// Adds a page and makes it the current one.
+    /// @throws RunTimeError Overflow: there are 32767 pages
+    void newPage();
+
+    /// Loads paper, margins and style from the settings file.
+    /// @throws RunTimeError see `pelloric::loadReportStyle`
+    void loadReportStyle();
+
+    /// Builds the pages from a grid with the settings as they are now, and shows page 1.
+    ///
+    /// A build that ends early leaves the document as it was. While one runs another is refused
+    /// without a word.
+    /// @throws RunTimeError of the settings file, the grid, the layout, or Cancelled
+    void doPreview(AutomationObject& grid);
+
+    /// Builds again from the same grid with style and column widths as the canvas holds them.
+    /// @throws RunTimeError ObjectMissing: nothing was built yet; SubscriptOutOfRange: the grid has
+    ///         another number of printed columns now; or as `doPreview`
+    void ReDrawZoom(AutomationObject& grid);
+
+    /// Makes column widths and body font a tenth smaller; the caller rebuilds the pages.
+    /// @throws RunTimeError ObjectMissing: nothing was built yet
+    void Minimum() { scaleReport(0.9); }
+    /// Makes column widths and body font a tenth larger; the caller rebuilds the pages.
+    /// @throws RunTimeError ObjectMissing: nothing was built yet
+    void Maximum() { scaleReport(1.1); }
+
+    /// Writes the document to a file; what fails is skipped, and what was there stays then.
+    /// @return  whether the file was written
+    bool SaveFile(const std::filesystem::path& path);
+    /// Replaces the document by a file's content and shows page 1; a file of another form shows a
+    /// message and leaves the canvas cleared.
+    /// @throws RunTimeError FileNotFound: it cannot be opened; the canvas is cleared
+    void OpenFile(const std::filesystem::path& path);
+
+    /// Prints all pages or a page list; see `pelloric::doPrint`.
+    void doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrintPageNum);
+    /// Sends one page to the printer. @param number  from 1
+    void printPage(std::int16_t number);
+    /// What the documents are called in the printer's queue.
+    Text documentName;
+
+    /// Gives the page the size of a named paper; an unknown name shows a message.
+    void setPaper(TextView name);
+
+    void showWholePage();
+    void showPage();
+    void showAllPage();
+    void showMuliPage(std::int16_t nPages);
+    void SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage);
+    std::int16_t WindowMinPage() const { return view_.window.MinPage; }
+    std::int16_t WindowMaxPage() const { return view_.window.MaxPage; }
+    std::int16_t WindowPages() const { return view_.window.nPages; }
+    OrderStyle WindowOrderStyle() const { return view_.style; }
+    bool ReSetLeftTop() const { return view_.ReSetLeftTop; }
+    void setReSetLeftTop(bool centre) { view_.ReSetLeftTop = centre; }
+
+    void zoomIn();
+    void zoomOut();
+    /// The divisor, not the scale that was written.
+    float DispScale() const { return view_.divisor; }
+    void setDispScale(float scale);
+    void setVerticalDir(bool portrait);
+    void OnDraw();
+    void setMouse();
+    void Pan();
+
+    void setViewport(Twips width, Twips height);
+    void setHbar(std::int32_t value);
+    void setVbar(std::int32_t value);
+    void mouseMove();
+    void mouseDown(double x, double y);
+    void mouseUp(double x, double y);
+
+    const PageDocument& document() const { return document_; }
+    /// For hosts that place a picture on a page.
+    PageDocument& document() { return document_; }
+    Recorder& recorder() { return recorder_; }
+    const ReportStyle& style() const { return style_; }
+    const ViewState& view() const { return view_; }
+    const ProgressBar& progress() const { return progress_; }
+    /// The progress bar as the last build left it.
+    const ProgressBar& buildProgress() const { return buildProgress_; }
+    /// What the last build read of its grid, or null.
+    const GridTable* table() const { return table_ ? &*table_ : nullptr; }
+    PageFacts facts() const { return pageFactsOf(page, document_); }
+    bool isBuilding() const { return building_; }
+    /// Where the titles of the last page were asked for under a page header: twips.
+    double titleTop() const { return titleTop_; }
+    Platform& platform() { return platform_; }
+
+private:
+    void begin(std::int64_t maximum) override;
+    void advance() override;
+    void end() override;
+
+    void build(AutomationObject& grid, bool takeWidths);
+    void layOut(GridTable& table);
+    void scaleReport(double factor);
+    void notifyView();
+
+    Platform& platform_;
+    PageDocument document_;
+    Recorder recorder_;
+    ReportStyle style_;
+    ViewState view_;
+    std::optional<GridTable> table_;
+    ProgressBar progress_;
+    ProgressBar buildProgress_;
+    CanvasObserver* observer_ = nullptr;
+    double titleTop_ = 0;
+    bool building_ = false;
+};
+
+} // namespace pelloric

@@ -1,0 +1,33 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstdint>
+#include <span>
+#include <vector>
+
+namespace pelloric {
+
+/// A band of printed columns, both ends included; columns count from 1.
+struct ColPos {
+    std::int16_t StartCol = 1;
+    std::int16_t EndCol = 1;
+
+    bool operator==(const ColPos&) const = default;
+};
+
+/// Sum of the widths of columns: twips.
+double tableWidthOf(std::span<const double> widths);
+
+/// Cuts columns that are together too wide for the paper into bands, from left to right.
+///
+/// The room is the paper's width less the left margin taken twice. A table that is exactly as wide
+/// does not fit. A column wider than the paper is a band of its own.
+/// @param widths  twips; one per printed column
+/// @param paper   twips
+/// @param left    left margin: twips
+/// @return        at least one band; they follow each other without gaps
+std::vector<ColPos> cutColumnBands(std::span<const double> widths, double paper, double left);
+
+} // namespace pelloric

@@ -1,0 +1,120 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "document/recorder.h"
+#include "report/column_bands.h"
+#include "report/page_fields.h"
+#include "report/record_texts.h"
+
+#include <memory>
+#include <span>
+#include <vector>
+
+namespace pelloric {
+
+class RowSet;
+struct PageSetup;
+struct Platform;
+struct ReportStyle;
+
+/// Is told how far a long operation is.
+class ProgressListener {
+public:
+    virtual ~ProgressListener() = default;
+
+    /// @param maximum  how many steps will come, at least 1
+    virtual void begin(std::int64_t maximum) = 0;
+    /// One step more is done.
+    virtual void advance() = 0;
+    /// The operation is over.
+    virtual void end() = 0;
+};
+
+/// What a report is laid out from; all of it is borrowed.
+struct ReportSource {
+    const ReportStyle& style;
+    const PageSetup& setup;
+    RowSet& rows; ///< its cursor is left where the layout ended
+    std::span<const double> widths; ///< twips; one per printed column
+    std::span<const ColPos> bands; ///< at least one
+};
+
+/// Lays the records of a row set out into pages, from the current, empty page on.
+///
+/// Every page of rows is printed once per band before the next rows follow. A row is as high as the
+/// tallest cell of its whole record, so it is equally high in every band.
+class LayoutEngine {
+public:
+    LayoutEngine(const ReportSource& source, const Platform& platform, PageDocument& document,
+        Recorder& recorder);
+
+    /// Builds all pages.
+    ///
+    /// @throws RunTimeError Overflow: more than 32767 pages, or a position past 32 bits; Cancelled:
+    ///         by the message loop's pass before the rows; or an error of the row set
+    void build(ProgressListener& progress);
+
+    /// Where the titles of the last page were asked for, when there is a page header: twips.
+    double titleTop() const { return titleTop_; }
+
+private:
+    /// A column of the band that is being printed.
+    struct BandColumn {
+        int field = 0; ///< from 0
+        double left = 0; ///< exact left edge: twips
+        double width = 0; ///< twips
+        Twips edge = 0; ///< rounded left edge
+        bool isPrinted = true; ///< false: too narrow to hold text
+    };
+
+    /// A cell of the row that is being placed.
+    struct RowCell {
+        CellText text;
+        std::size_t firstLine = 0; ///< of `rowLines_`
+        std::size_t lineCount = 0; ///< 0: a single line that fits
+        bool isStored = false; ///< its text lives in the document's store
+    };
+
+    void startBand(std::size_t band);
+    void startPage();
+    void drawColumnTitles();
+    void drawTitleTexts(Twips top);
+    void layoutRow();
+    void measureRow();
+    double measureCell(int field, double width);
+    void printRow(Twips rowTop);
+    void printCell(const BandColumn& column, Twips textTop);
+    void drawVerticalLines(Twips rowTop, Twips rowBottom);
+    void drawRowLine(Twips rowBottom, bool pageIsFull);
+    void breakPage(Twips footerTop);
+    void drawLine(Tpoint from, Tpoint to);
+    bool isBlankedByMerging(int field) const;
+    bool equalsLeft(int field) const;
+    bool equalsBelow(int field) const;
+
+    ReportSource source_;
+    const Platform& platform_;
+    PageDocument& document_;
+    Recorder& recorder_;
+    PageLines pageLines_;
+
+    std::vector<TextView> titles_; ///< in the document's store
+    double titleHeight_ = -1; ///< twips; below 0: not measured yet
+    double titleTop_ = 0;
+
+    std::size_t band_ = 0; ///< from 0
+    std::vector<BandColumn> columns_;
+    Twips tableLeft_ = 0;
+    Twips tableRight_ = 0;
+
+    RecordTexts records_;
+    std::vector<RowCell> cells_; ///< one per field
+    std::vector<CellLine> rowLines_;
+    double rowHeight_ = 0; ///< of the texts: twips
+    std::vector<double> pageRowHeights_; ///< of the rows on the pages of the present rows
+    std::size_t rowsOnPage_ = 0;
+};
+
+} // namespace pelloric

@@ -1,0 +1,65 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "document/text_store.h"
+#include "platform/row_set.h"
+
+#include <memory>
+#include <vector>
+
+namespace pelloric {
+
+/// A row set in memory: 16 bytes a cell, and texts in a store that the document shares.
+class TableRowSet final : public RowSet {
+public:
+    /// @param store  where the texts of the cells are kept
+    explicit TableRowSet(std::shared_ptr<TextStore> store);
+
+    /// Appends a field; only while there are no records.
+    void appendField(TextView name);
+
+    /// Whether a field of exactly that name exists.
+    bool fieldExists(TextView name) const;
+
+    /// Makes room for records that are going to be added.
+    void reserveRecords(std::int64_t records);
+
+    /// Adds a record of null values behind the last one.
+    void addRecord();
+
+    /// Sets a field of the last record; a text is copied into the store.
+    ///
+    /// @param field  0 to `fieldCount() - 1`
+    void setLast(int field, const Value& value);
+
+    int fieldCount() const override { return static_cast<int>(names_.size()); }
+    TextView fieldName(int field) const override;
+    std::int64_t recordCount() const override { return records_; }
+    std::int64_t position() const override { return position_; }
+    void setPosition(std::int64_t position) override;
+    Value value(int field) override;
+    bool keepsTexts() const override { return true; }
+
+    /// Bytes that the cells hold, the texts aside.
+    std::size_t memoryBytes() const { return cells_.capacity() * sizeof(Cell); }
+
+private:
+    struct Cell {
+        union {
+            const char16_t* units = nullptr;
+            double number;
+        };
+        std::uint32_t length = 0;
+        ValueKind kind = ValueKind::Null;
+    };
+
+    std::shared_ptr<TextStore> store_;
+    std::vector<Text> names_;
+    std::vector<Cell> cells_;
+    std::int64_t records_ = 0;
+    std::int64_t position_ = 0;
+};
+
+} // namespace pelloric

@@ -1,0 +1,36 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/print_options.h"
+
+#include "controls/messages.h"
+#include "platform/numbers.h"
+#include "platform/printer.h"
+#include "print/page_list.h"
+
+namespace pelloric {
+
+std::variant<Message, PrintArguments> pressPrint(
+    const PrinterSystem& printers, const PrintEntries& entries)
+{
+    if (printers.printerNames().empty())
+        return messageOf(Notice::NoPrinter);
+    const Text printer = printers.currentPrinter();
+    if (!printers.opens(printer)) {
+        Message message = messageOf(Notice::PrinterNotWorking);
+        message.text.insert(0, printer);
+        return message;
+    }
+    return PrintArguments { entries.allPages, pageListOf(trimmed(entries.range)),
+        copiesOf(entries.copies) };
+}
+
+Text steppedCopies(TextView text, bool up)
+{
+    const double copies = leadingNumber(text);
+    if (up)
+        return formatNumber(copies + 1);
+    return copies > 0 ? formatNumber(copies - 1) : Text(text);
+}
+
+} // namespace pelloric

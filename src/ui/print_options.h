@@ -1,0 +1,42 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/services.h"
+
+#include <cstdint>
+#include <variant>
+
+namespace pelloric {
+
+class PrinterSystem;
+
+/// What the print options dialog hands to the print procedure.
+struct PrintArguments {
+    bool allPages = true;
+    Text pageList; ///< one-based page numbers separated by ","; made even when all are printed
+    std::int16_t copies = 1;
+
+    bool operator==(const PrintArguments&) const = default;
+};
+
+/// What stands in the print options dialog.
+struct PrintEntries {
+    bool allPages = true;
+    Text range; ///< as typed
+    Text copies; ///< as typed; empty means 1
+};
+
+/// The dialog's "Print": either why it cannot print, or what is printed.
+///
+/// @throws RunTimeError Overflow: copies past 16 bits, or a page list longer than any document
+std::variant<Message, PrintArguments> pressPrint(
+    const PrinterSystem& printers, const PrintEntries& entries);
+
+/// The text of the copies box after one of its buttons was pressed.
+///
+/// Up adds one without end; down takes one off only while the number is above 0.
+Text steppedCopies(TextView text, bool up);
+
+} // namespace pelloric
