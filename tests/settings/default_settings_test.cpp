@@ -1,0 +1,113 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "settings/default_settings.h"
+
+#include "fakes/fake_platform.h"
+#include "platform/numbers.h"
+#include "settings/settings_file.h"
+#include "settings/settings_keys.h"
+#include "support/errors.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+
+namespace pelloric {
+
+TEST(DefaultSettings, HoldEveryKeyOnce)
+{
+    for (const TextView key : SettingsKeys) {
+        const auto rows = defaultSettings();
+        EXPECT_EQ(std::count_if(rows.begin(), rows.end(),
+                      [&](const DefaultSetting& row) { return row.key == key; }),
+            1)
+            << toUtf8(key);
+    }
+    EXPECT_EQ(defaultSettings().size(), SettingsKeys.size());
+}
+
+TEST(DefaultSettings, HoldNoKeyBelowALineThatContainsIt)
+{
+    const auto rows = defaultSettings();
+    for (std::size_t line = 0; line < rows.size(); ++line) {
+        for (std::size_t above = 0; above < line; ++above) {
+            EXPECT_FALSE(contains(rows[above].key, rows[line].key)
+                || contains(rows[above].value, rows[line].key))
+                << toUtf8(rows[line].key) << " stands below " << toUtf8(rows[above].key);
+        }
+    }
+}
+
+TEST(DefaultSettings, HaveTheHeaderAndFooterTextsLast)
+{
+    const auto rows = defaultSettings();
+    const TextView last[] = { u"HeaderLeft", u"HeaderCenter", u"HeaderRight", u"FooterLeft",
+        u"FooterCenter", u"FooterRight" };
+    for (std::size_t at = 0; at < std::size(last); ++at)
+        EXPECT_EQ(rows[rows.size() - std::size(last) + at].key, last[at]);
+}
+
+TEST(DefaultSettings, ReadBackWhatTheirTableSays)
+{
+    FakePlatform platform;
+    deployDefaultSettings(platform.services());
+    const SettingsSnapshot file(platform.services());
+    for (const DefaultSetting& setting : defaultSettings())
+        EXPECT_EQ(file.value(setting.key), setting.value) << toUtf8(setting.key);
+    EXPECT_EQ(strictInt16(file.value(u"PagerSizeValue")), 9);
+}
+
+TEST(DefaultSettings, AreTheBytesThatASaveLeaves)
+{
+    FakePlatform platform;
+    EXPECT_TRUE(deployDefaultSettings(platform.services()));
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini"),
+        "\"\r\nShowHeaders= 1\r\nGridHor= 1\r\nGridVer= 1\r\nGridMerge= 0\r\n"
+        "HeaderColor= 14737632\r\nGridLineColor= 0\r\nFontName= 宋体\r\nFontSize= 9\r\n"
+        "FontBold= 0\r\nFontItalic= 0\r\nFontStrikethru= 0\r\nFontUnderline= 0\r\n"
+        "FontColor= 0\r\nHeaderFontName= 宋体\r\nHeaderFontSize= 9\r\nHeaderFontBold= 0\r\n"
+        "HeaderFontItalic= 0\r\nHeaderFontStrikethru= 0\r\nHeaderFontUnderline= 0\r\n"
+        "HeaderFontColor= 0\r\nFooterFontName= 宋体\r\nFooterFontSize= 9\r\n"
+        "FooterFontBold= 0\r\nFooterFontItalic= 0\r\nFooterFontStrikethru= 0\r\n"
+        "FooterFontUnderline= 0\r\nFooterFontColor= 0\r\nPagerSize= A4\r\n"
+        "PagerOrientation= 1\r\nPagerSizeValue= 9\r\nTop= 10\r\nButtom= 10\r\nLeft= 10\r\n"
+        "Right= 10\r\nPagerWidth= 210\r\nPagerHeight= 297\r\nHeaderLeft= \r\n"
+        "HeaderCenter= \r\nHeaderRight= \r\nFooterLeft= \r\n"
+        "FooterCenter= [Page # of Pages #]\r\nFooterRight= \r\n\"\r\n");
+    const std::string before = platform.folder.read("OstlConfig.ini");
+    writeSetting(platform.services(), u"Top", u"10");
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini"), before);
+}
+
+TEST(DeployDefaultSettings, NeverTouchesAFileThatExists)
+{
+    FakePlatform platform;
+    platform.folder.write("OstlConfig.ini", "");
+    EXPECT_FALSE(deployDefaultSettings(platform.services()));
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini"), "");
+}
+
+TEST(DeployDefaultSettings, CreatesTheFolder)
+{
+    FakePlatform platform;
+    platform.folders.directory = platform.folder.file("a") / "b";
+    EXPECT_TRUE(deployDefaultSettings(platform.services()));
+    EXPECT_EQ(readSetting(platform.services(), u"PagerSize"), u"A4");
+}
+
+TEST(DeployDefaultSettings, TellsWhichFileItCannotWrite)
+{
+    FakePlatform platform;
+    platform.folder.write("a", "no folder");
+    platform.folders.directory = platform.folder.file("a");
+    try {
+        deployDefaultSettings(platform.services());
+        FAIL() << "no error";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(error.number(), ErrorNumber::WriteFailed);
+        EXPECT_TRUE(contains(error.text(), u"OstlConfig.ini"));
+    }
+}
+
+} // namespace pelloric
