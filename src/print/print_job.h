@@ -17,14 +17,14 @@ struct Font;
 /// What is to be printed, and how.
 struct PrintJob {
     bool allPages = true; ///< false: the pages of the list
-    Text pageList; ///< one-based page numbers separated by ","
+    Text pageList {}; ///< one-based page numbers separated by ","
     std::int16_t copies = 1; ///< whole copies one after the other; none below 1
     std::int16_t paperSize = 9; ///< paper-size code of the report
     std::int16_t orientation = 1; ///< 1 portrait, 2 landscape
-    Text documentName; ///< in the printer's queue; the page number is added
+    Text documentName {}; ///< in the printer's queue; the page number is added
 
     /// Called after each page with the number of pages sent so far; may be empty.
-    std::function<void(std::int64_t)> pageSent;
+    std::function<void(std::int64_t)> pageSent {};
 };
 
 /// Sends one page to the printer, its records where they stand, and hands the document over.

@@ -33,7 +33,8 @@ struct ReplayOptions {
     bool fillPageCount = true; ///< replace "[Pages]" by the page count; false in a page window
     Text reportFontName = u"宋体"; ///< the surface's font before the first record
     float reportFontSize = 20; ///< points, divided like every size
-    std::optional<PageRect> visible; ///< the only part that is seen; nothing: all of the page
+    std::optional<PageRect> visible
+        = std::nullopt; ///< the only part that is seen; nothing: all of the page
 };
 
 /// Replays the records of a page on a drawing surface: every line, then every text.
