@@ -96,11 +96,11 @@ TEST(ReadSetting, AnswersTheLastLineWhenNoneHoldsTheKey)
 
 TEST(ReadSetting, EndsLinesAtCrLfAtLfAndAtCr)
 {
-    SettingsWorld world("A= 1\nB= 2\rC= 3\r\nD= 4");
+    SettingsWorld world("A= 1\nB= 2\rC= 3\r\nE= 4");
     EXPECT_EQ(world.read(u"A"), u"1");
     EXPECT_EQ(world.read(u"B"), u"2");
     EXPECT_EQ(world.read(u"C"), u"3");
-    EXPECT_EQ(world.read(u"D"), u"4");
+    EXPECT_EQ(world.read(u"E"), u"4");
 }
 
 TEST(ReadSetting, SearchesTheDecodedTextAndNotItsBytes)
