@@ -1,0 +1,272 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "platform/qt/qt_drawing_surface.h"
+
+#include "platform/qt/qt_fonts.h"
+#include "platform/qt/qt_text.h"
+
+#include <QFontMetricsF>
+#include <QPaintEngine>
+#include <QPainter>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <limits>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr double TwipsPerPoint = 20;
+
+/// A made-up bold is the same text again, shifted by this part of an em.
+constexpr double BoldShift = 1.0 / 32;
+
+/// An em this close to whole pixels is taken as whole.
+constexpr double WholePixel = 1e-4;
+
+/// Past this an em tells nothing on any paper; the toolkit's numbers would overflow.
+constexpr double LargestEm = 1e6;
+
+/// By draw style.
+constexpr auto PenStyles = std::to_array({ Qt::SolidLine, Qt::DashLine, Qt::DotLine,
+    Qt::DashDotLine, Qt::DashDotDotLine, Qt::NoPen, Qt::SolidLine });
+
+/// By fill style.
+constexpr auto BrushStyles = std::to_array({ Qt::SolidPattern, Qt::NoBrush, Qt::HorPattern,
+    Qt::VerPattern, Qt::BDiagPattern, Qt::FDiagPattern, Qt::CrossPattern, Qt::DiagCrossPattern });
+
+Qt::PenStyle penStyle(std::int16_t style)
+{
+    const auto at = static_cast<std::size_t>(style);
+    return style >= 0 && at < PenStyles.size() ? PenStyles[at] : Qt::SolidLine;
+}
+
+Qt::BrushStyle brushStyle(std::int16_t style)
+{
+    const auto at = static_cast<std::size_t>(style);
+    return style >= 0 && at < BrushStyles.size() ? BrushStyles[at] : Qt::SolidPattern;
+}
+
+QColor colorOf(Color color)
+{
+    return QColor(color & 0xFF, (color >> 8) & 0xFF, (color >> 16) & 0xFF);
+}
+
+QPointF pointOf(Tpoint point) { return QPointF(point.x, point.y); }
+
+bool keepsTexts(const QPainter& painter)
+{
+    const QPaintEngine* const engine = painter.paintEngine();
+    const auto type = engine ? engine->type() : QPaintEngine::Raster;
+    return type == QPaintEngine::Pdf || type == QPaintEngine::SVG || type == QPaintEngine::Picture;
+}
+
+/// Whether a character may be joined to its neighbours or placed on them.
+bool needsShaping(char16_t unit)
+{
+    return (unit >= 0x0300 && unit < 0x0370) || (unit >= 0x0590 && unit < 0x10A0)
+        || (unit >= 0x1780 && unit < 0x18B0) || (unit >= 0x1900 && unit < 0x1CD0)
+        || (unit >= 0x200B && unit < 0x2010) || (unit >= 0xA800 && unit < 0xAC00)
+        || (unit >= 0xD800 && unit < 0xE000) || (unit >= 0xFB1D && unit < 0xFE30);
+}
+
+} // namespace
+
+QtDrawingSurface::QtDrawingSurface(
+    QPainter& painter, QtFonts& fonts, const SurfaceOptions& options)
+    : painter_(painter)
+    , fonts_(fonts)
+    , options_(options)
+    , isPaper_(keepsTexts(painter))
+{
+    painter_.setRenderHint(QPainter::Antialiasing, false);
+    painter_.setRenderHint(QPainter::TextAntialiasing, true);
+    painter_.setRenderHint(QPainter::SmoothPixmapTransform, true);
+}
+
+void QtDrawingSurface::clear()
+{
+    if (!options_.page.isEmpty())
+        painter_.fillRect(options_.page, Qt::white);
+    current_ = {};
+}
+
+void QtDrawingSurface::setFontName(TextView name)
+{
+    if (fontName_ == name)
+        return;
+    fontName_ = name;
+    isFontStale_ = true;
+}
+
+void QtDrawingSurface::setFontSize(float size)
+{
+    isFontStale_ = isFontStale_ || fontSize_ != size;
+    fontSize_ = size;
+}
+
+void QtDrawingSurface::setFontBold(bool bold)
+{
+    isFontStale_ = isFontStale_ || bold_ != bold;
+    bold_ = bold;
+}
+
+void QtDrawingSurface::setFontItalic(bool italic)
+{
+    isFontStale_ = isFontStale_ || italic_ != italic;
+    italic_ = italic;
+}
+
+void QtDrawingSurface::setFontTransparent(bool transparent) { isFontTransparent_ = transparent; }
+
+void QtDrawingSurface::setForeColor(Color color) { foreColor_ = color; }
+
+void QtDrawingSurface::setDrawWidth(std::int16_t width) { drawWidth_ = width; }
+
+void QtDrawingSurface::setDrawStyle(std::int16_t style) { drawStyle_ = style; }
+
+void QtDrawingSurface::setFillStyle(std::int16_t style) { fillStyle_ = style; }
+
+void QtDrawingSurface::setFillColor(Color color) { fillColor_ = color; }
+
+void QtDrawingSurface::setCurrentX(Twips x) { current_.x = x; }
+
+void QtDrawingSurface::setCurrentY(Twips y) { current_.y = y; }
+
+void QtDrawingSurface::line(Tpoint from, Tpoint to)
+{
+    current_ = to;
+    if (!isVisible(QRectF(pointOf(from), pointOf(to)).normalized()))
+        return;
+    QPen pen = penOf(foreColor_);
+    if (from == to) {
+        pen.setStyle(pen.style() == Qt::NoPen ? Qt::NoPen : Qt::SolidLine);
+        painter_.setPen(pen);
+        painter_.drawPoint(pointOf(from));
+        return;
+    }
+    painter_.setPen(pen);
+    painter_.drawLine(pointOf(from), pointOf(to));
+}
+
+void QtDrawingSurface::box(Tpoint corner, Tpoint opposite, Color outline)
+{
+    const QRectF area = QRectF(pointOf(corner), pointOf(opposite)).normalized();
+    current_ = opposite;
+    if (!isVisible(area))
+        return;
+    QBrush brush(colorOf(fillColor_), brushStyle(fillStyle_));
+    // Hatches keep to device pixels as pens do.
+    const QTransform transform = painter_.transform();
+    if (transform.m11() != 0 && transform.m22() != 0)
+        brush.setTransform(QTransform::fromScale(1 / transform.m11(), 1 / transform.m22()));
+    painter_.setPen(penOf(outline));
+    painter_.setBrush(brush);
+    painter_.drawRect(area);
+    painter_.setBrush(Qt::NoBrush);
+}
+
+void QtDrawingSurface::print(TextView text)
+{
+    takeFont();
+    const double height = face_->lineHeight() / TwipsPerPoint * em_;
+    const double left = current_.x;
+    const QRectF& visible = options_.visible;
+    const bool isOutside = !visible.isEmpty()
+        && (current_.y > visible.bottom() || current_.y + height < visible.top()
+            || left > visible.right());
+    if (!isOutside && !text.empty() && em_ > 0)
+        drawText(text);
+    constexpr double Lowest = std::numeric_limits<Twips>::max();
+    current_ = { 0, static_cast<Twips>(std::min(std::nearbyint(current_.y + height), Lowest)) };
+}
+
+void QtDrawingSurface::picture(TextView filePath, Tpoint topLeft, Tpoint size)
+{
+    if (imagePath_ != filePath) {
+        imagePath_ = filePath;
+        image_ = QImage(toQString(filePath));
+    }
+    const QRectF area(pointOf(topLeft), QSizeF(size.x, size.y));
+    if (!image_.isNull() && isVisible(area))
+        painter_.drawImage(area, image_);
+}
+
+void QtDrawingSurface::takeFont()
+{
+    if (!isFontStale_)
+        return;
+    isFontStale_ = false;
+    face_ = &fonts_.face(fontName_, bold_, italic_);
+    const double em = static_cast<double>(fontSize_) * static_cast<double>(options_.divisor)
+        * TwipsPerPoint;
+    em_ = em > 0 ? std::min(em, LargestEm) : 0;
+    const int pixels = std::max(1, static_cast<int>(std::nearbyint(em_)));
+    fontScale_ = std::abs(em_ - pixels) < WholePixel ? 1 : em_ / pixels;
+    font_ = isPaper_ ? face_->font(pixels) : face_->installedFont(pixels);
+}
+
+void QtDrawingSurface::drawText(TextView text)
+{
+    double width = -1;
+    if (!isFontTransparent_) {
+        width = face_->advanceOf(text) / TwipsPerPoint * em_;
+        const double height = face_->lineHeight() / TwipsPerPoint * em_;
+        painter_.fillRect(QRectF(current_.x, current_.y, width, height), Qt::white);
+    }
+    painter_.setPen(colorOf(foreColor_));
+    painter_.setFont(font_);
+    if (std::any_of(text.begin(), text.end(), needsShaping))
+        width = face_->advanceOf(text) / TwipsPerPoint * em_;
+    else
+        width = -1;
+    drawRun(text, width);
+}
+
+/// Draws with the top-left corner at the current point.
+/// @param width  what a shaped text has to keep within: twips; below 0: it needs no shaping
+void QtDrawingSurface::drawRun(TextView text, double width)
+{
+    const QString string = borrowedString(text);
+    double squeeze = 1;
+    if (width > 0) {
+        const double shaped = QFontMetricsF(font_).horizontalAdvance(string) * fontScale_;
+        squeeze = shaped > width ? width / shaped : 1;
+    }
+    const QPointF baseline(current_.x, current_.y + face_->ascent() / TwipsPerPoint * em_);
+    const bool isScaled = fontScale_ != 1 || squeeze != 1;
+    const QTransform before = isScaled ? painter_.transform() : QTransform();
+    if (isScaled) {
+        painter_.translate(baseline);
+        painter_.scale(fontScale_ * squeeze, fontScale_);
+    }
+    const QPointF at = isScaled ? QPointF() : baseline;
+    painter_.drawText(at, string);
+    if (face_->isBoldMadeUp() && !isPaper_)
+        painter_.drawText(at + QPointF(em_ / fontScale_ * BoldShift, 0), string);
+    if (isScaled)
+        painter_.setTransform(before);
+}
+
+QPen QtDrawingSurface::penOf(Color color) const
+{
+    QPen pen(colorOf(color), std::max<int>(1, drawWidth_), penStyle(drawStyle_));
+    pen.setCosmetic(true);
+    pen.setJoinStyle(Qt::MiterJoin);
+    if (pen.style() != Qt::SolidLine)
+        pen.setCapStyle(Qt::FlatCap);
+    return pen;
+}
+
+bool QtDrawingSurface::isVisible(const QRectF& area) const
+{
+    const QRectF& visible = options_.visible;
+    return visible.isEmpty()
+        || (area.left() <= visible.right() && area.right() >= visible.left()
+            && area.top() <= visible.bottom() && area.bottom() >= visible.top());
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,156 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "platform/qt/qt_fonts.h"
+
+#include "platform/qt/qt_text.h"
+
+#include <QFontDatabase>
+#include <QFontInfo>
+#include <QStringList>
+
+namespace pelloric::qt {
+
+namespace {
+
+/// At this size, a multiple of the units that outlines are drawn in, advances are exact.
+constexpr int ReferencePixels = 2048;
+
+constexpr double TwipsPerPoint = 20;
+
+/// Names kept before the table of names is emptied: a document may hold any number of them.
+constexpr std::size_t MostNames = 4096;
+
+/// Song-style families, the best first.
+QStringList substitutes()
+{
+    return { QStringLiteral("SimSun"), QStringLiteral("NSimSun"),
+        QStringLiteral("AR PL UMing CN"), QStringLiteral("Noto Serif CJK SC"),
+        QStringLiteral("WenQuanYi Zen Hei") };
+}
+
+QStringList familiesOf(const QString& family)
+{
+    QStringList families { family };
+    for (const QString& substitute : substitutes()) {
+        if (substitute != family && QFontDatabase::hasFamily(substitute))
+            families.append(substitute);
+    }
+    return families;
+}
+
+QFont preparedFont(const QString& family, bool bold, bool italic, int pixels)
+{
+    QFont font;
+    font.setFamilies(familiesOf(family));
+    font.setBold(bold);
+    font.setItalic(italic);
+    font.setPixelSize(pixels);
+    font.setKerning(false);
+    font.setHintingPreference(QFont::PreferNoHinting);
+    font.setStyleStrategy(
+        static_cast<QFont::StyleStrategy>(QFont::PreferNoShaping | QFont::PreferAntialias));
+    return font;
+}
+
+bool hasBoldFace(const QString& family)
+{
+    for (const QString& style : QFontDatabase::styles(family)) {
+        if (QFontDatabase::weight(family, style) >= QFont::DemiBold)
+            return true;
+    }
+    return false;
+}
+
+double lineHeightOf(const QFont& reference)
+{
+    const QFontMetricsF metrics(reference);
+    return (metrics.ascent() + metrics.descent()) / ReferencePixels * TwipsPerPoint;
+}
+
+} // namespace
+
+QtFace::QtFace(const QString& family, bool bold, bool italic)
+    : QtFace(family, preparedFont(family, bold, italic, ReferencePixels))
+{
+}
+
+QtFace::QtFace(const QString& family, const QFont& reference)
+    : FaceMetrics(lineHeightOf(reference))
+    , family_(family)
+    , reference_(reference)
+    , metrics_(reference)
+    , ascent_(metrics_.ascent() / ReferencePixels * TwipsPerPoint)
+    , isBoldMadeUp_(reference.bold() && !hasBoldFace(family))
+{
+}
+
+QFont QtFace::font(int pixels) const
+{
+    QFont font(reference_);
+    font.setPixelSize(pixels);
+    return font;
+}
+
+QFont QtFace::installedFont(int pixels) const
+{
+    QFont plain = font(pixels);
+    if (isBoldMadeUp_)
+        plain.setBold(false);
+    return plain;
+}
+
+double QtFace::measureAdvance(char32_t codePoint)
+{
+    const bool isHalfPair = codePoint >= 0xD800 && codePoint < 0xE000;
+    const QString character = isHalfPair ? QString(QChar(QChar::ReplacementCharacter))
+                                         : QString::fromUcs4(&codePoint, 1);
+    return metrics_.horizontalAdvance(character) / ReferencePixels * TwipsPerPoint;
+}
+
+QtFonts::QtFonts() = default;
+
+QtFace& QtFonts::face(TextView name, bool bold, bool italic)
+{
+    const bool isLast
+        = last_ && lastKey_.bold == bold && lastKey_.italic == italic && lastKey_.name == name;
+    if (!isLast) {
+        FaceKey key { Text(name), bold, italic };
+        const auto known = byName_.find(key);
+        last_ = known != byName_.end() ? known->second : &resolvedFace(key);
+        lastKey_ = std::move(key);
+    }
+    return *last_;
+}
+
+QString QtFonts::resolve(const QString& name)
+{
+    if (!name.isEmpty() && QFontDatabase::hasFamily(name))
+        return name;
+    for (const QString& substitute : substitutes()) {
+        if (QFontDatabase::hasFamily(substitute))
+            return substitute;
+    }
+    return QFontInfo(QFont()).family();
+}
+
+void QtFonts::installSubstitutions()
+{
+    for (const QString& name : { QStringLiteral("宋体"), QStringLiteral("0") })
+        QFont::insertSubstitutions(name, substitutes());
+}
+
+QtFace& QtFonts::resolvedFace(const FaceKey& key)
+{
+    if (byName_.size() >= MostNames)
+        byName_.clear();
+    const QString family = resolve(toQString(key.name));
+    const FaceKey familyKey { toText(family), key.bold, key.italic };
+    auto& face = byFamily_[familyKey];
+    if (!face)
+        face = std::make_unique<QtFace>(family, key.bold, key.italic);
+    byName_[key] = face.get();
+    return *face;
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,88 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text_metrics.h"
+
+#include <QFont>
+#include <QFontMetricsF>
+#include <QString>
+
+#include <map>
+
+namespace pelloric::qt {
+
+/// How a face is asked for.
+struct FaceKey {
+    Text name;
+    bool bold = false;
+    bool italic = false;
+
+    auto operator<=>(const FaceKey&) const = default;
+};
+
+/// An installed face: its measures, and the fonts that paint it as it was measured.
+///
+/// Fonts are unhinted, unkerned and unshaped, so that painting keeps to the measured width.
+class QtFace final : public FaceMetrics {
+public:
+    /// @param family  an installed family
+    QtFace(const QString& family, bool bold, bool italic);
+
+    /// From the top of a line to its baseline at size 1: twips.
+    double ascent() const { return ascent_; }
+
+    /// Whether the family has no bold face of its own, so that a bold one is made up.
+    bool isBoldMadeUp() const { return isBoldMadeUp_; }
+
+    /// The font whose em is `pixels` high, 1 or more.
+    QFont font(int pixels) const;
+
+    /// The same, never bolder than the family's own faces.
+    QFont installedFont(int pixels) const;
+
+    const QString& family() const { return family_; }
+
+protected:
+    double measureAdvance(char32_t codePoint) override;
+
+private:
+    QtFace(const QString& family, const QFont& reference);
+
+    QString family_;
+    QFont reference_;
+    QFontMetricsF metrics_;
+    double ascent_;
+    bool isBoldMadeUp_;
+};
+
+/// Resolves faces by name and keeps what was resolved.
+///
+/// A family that is not installed is answered by the first installed one of a short list of
+/// Song-style families; the same list fills in for characters that a family lacks.
+class QtFonts {
+public:
+    QtFonts();
+    QtFonts(const QtFonts&) = delete;
+    QtFonts& operator=(const QtFonts&) = delete;
+
+    /// The face, or its substitute's; lives as long as this object.
+    QtFace& face(TextView name, bool bold, bool italic);
+
+    /// The installed family that stands for a name.
+    static QString resolve(const QString& name);
+
+    /// Lets widgets, too, show "宋体" and the names that stand for it in the substitute family.
+    static void installSubstitutions();
+
+private:
+    QtFace& resolvedFace(const FaceKey& key);
+
+    std::map<FaceKey, QtFace*> byName_;
+    std::map<FaceKey, std::unique_ptr<QtFace>> byFamily_;
+    FaceKey lastKey_;
+    QtFace* last_ = nullptr;
+};
+
+} // namespace pelloric::qt

@@ -1,0 +1,92 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/services.h"
+
+#include <QDateTime>
+
+#include <atomic>
+#include <cstdio>
+#include <vector>
+
+class QLocale;
+
+namespace pelloric::qt {
+
+/// The time of day with seconds as a locale writes it, without a time zone.
+QString timeWithSeconds(QTime time, const QLocale& locale);
+
+/// The system's clock, or a fixed moment.
+class QtClock final : public Clock {
+public:
+    /// Stops the clock at a moment; nothing: the clock runs.
+    void setNow(std::optional<QDateTime> now);
+
+    Text date() const override;
+    /// The time as the default locale writes it.
+    Text time() const override;
+
+private:
+    QDateTime now() const;
+
+    std::optional<QDateTime> now_;
+};
+
+/// The application's event loop; does nothing where there is no application.
+class QtMessageLoop final : public MessageLoop {
+public:
+    /// Ends the operation that is under way at its next turn of the loop; may be called from any
+    /// thread and from a signal handler.
+    void cancel() { isCancelled_ = true; }
+
+    /// Forgets a cancellation that no operation has met.
+    void forgetCancel() { isCancelled_ = false; }
+
+    void runOnce() override;
+
+private:
+    std::atomic<bool> isCancelled_ = false;
+    static_assert(std::atomic<bool>::is_always_lock_free);
+};
+
+/// Shows each message in a box over the active window.
+class BoxMessages final : public MessageService {
+public:
+    void show(const Message& message) override;
+};
+
+/// Writes each message as one line and remembers that there was one; for programs without windows.
+class StreamMessages final : public MessageService {
+public:
+    /// @param stream  borrowed
+    explicit StreamMessages(std::FILE* stream = stderr);
+
+    void show(const Message& message) override;
+
+    /// What the program ends with: 0, or 1 once a message was shown.
+    int exitStatus() const { return shown_.empty() ? 0 : 1; }
+
+    /// Every message, in order.
+    const std::vector<Message>& shown() const { return shown_; }
+
+private:
+    std::FILE* stream_;
+    std::vector<Message> shown_;
+};
+
+/// The system directory on Windows, elsewhere "pelloric" below the user's configuration folder.
+class QtSystemFolders final : public SystemFolders {
+public:
+    /// Replaces the folder, for a site-wide set-up or a test.
+    /// @param folder  empty: the system's own again
+    void setSystemDirectory(std::filesystem::path folder);
+
+    std::filesystem::path systemDirectory() const override;
+
+private:
+    std::filesystem::path folder_;
+};
+
+} // namespace pelloric::qt

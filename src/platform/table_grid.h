@@ -1,0 +1,62 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/automation_object.h"
+#include "platform/units.h"
+
+#include <vector>
+
+namespace pelloric {
+
+/// A column of an in-memory table.
+struct TableColumn {
+    Text title;
+    Twips width = 0; ///< -1: the default width, which a reader replaces on the grid
+};
+
+/// A flex grid over a table of texts in memory: `Cols`, `Rows`, `ColWidth`, `TextMatrix`.
+///
+/// Row 0 holds the titles, the rows that were added follow. The texts of all cells stand one behind
+/// the other in one store, so that a table of a million rows costs little more than its texts.
+class TableGrid final : public AutomationObject {
+public:
+    /// A table without rows.
+    explicit TableGrid(std::vector<TableColumn> columns);
+
+    /// Makes room, so that adding moves nothing.
+    /// @param units  of all cells together, UTF-16 code units
+    void reserve(std::size_t rows, std::size_t units);
+
+    /// Adds a row at the end.
+    ///
+    /// @param cells  left to right; cells that are missing at the end are empty
+    /// @throws RunTimeError SubscriptOutOfRange: more cells than columns; Overflow: a row of 2^32
+    ///         code units or more; the table is as before
+    void addRow(std::span<const TextView> cells);
+
+    int columnCount() const { return static_cast<int>(columns_.size()); }
+    /// The number of rows that were added; the row of titles does not count.
+    std::int64_t rowCount() const { return static_cast<std::int64_t>(rowStarts_.size()); }
+    const TableColumn& column(int column) const;
+
+    /// @param row     0 the first that was added
+    /// @param column  from 0
+    /// @return        borrowed until a row is added
+    /// @throws RunTimeError SubscriptOutOfRange
+    TextView cell(std::int64_t row, int column) const;
+
+    std::optional<MemberId> findMember(TextView name) override;
+    const void* memberTable() const override;
+    Value get(MemberId member, std::span<const Value> arguments) override;
+    void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
+
+private:
+    std::vector<TableColumn> columns_;
+    Text store_;
+    std::vector<std::uint64_t> rowStarts_; ///< where a row's first cell begins in the store
+    std::vector<std::uint32_t> cellEnds_; ///< where a cell ends, counted from its row's start
+};
+
+} // namespace pelloric
