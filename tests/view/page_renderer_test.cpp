@@ -110,7 +110,7 @@ TEST(PageRenderer, LeavesOutOnlyWhatLiesOutsideTheVisiblePart)
     addLine(document, { 4000, 0 }, { 4000, 16000 });
     addLine(document, { 9000, 0 }, { 9000, 16000 });
     addText(document, { 0, 100 }, u"above");
-    addText(document, { 0, 100 }, u"a\nb\nc\nd\ne\nf\ng");
+    addText(document, { 0, 100 }, u"a\n\n\n\n\n\ng");
     addText(document, { 0, 4990 }, u"seen");
     addText(document, { 9000, 5000 }, u"far right");
     addText(document, { 0, 9000 }, u"below");
