@@ -162,9 +162,7 @@ void Canvas::build(AutomationObject& grid, bool takeWidths)
         }
         table_ = std::move(table);
     }
-    document_.currentPage = 0;
-    showNewDocument(view_, facts());
-    notifyView();
+    showFirstPage();
 }
 
 void Canvas::layOut(GridTable& table)
@@ -212,15 +210,21 @@ bool Canvas::SaveFile(const std::filesystem::path& path)
 void Canvas::OpenFile(const std::filesystem::path& path)
 {
     clear();
-    PageSetup opened = page;
-    const OstlResult result = readOstl(platform_.codec, path, document_, opened);
-    recorder_.documentReplaced();
-    if (result == OstlResult::BadHeader) {
-        notifyView();
-        platform_.messages.show(messageOf(Notice::BadDocumentFile));
-        return;
+    try {
+        if (readOstl(platform_.codec, path, document_, page) == OstlResult::BadHeader) {
+            platform_.messages.show(messageOf(Notice::BadDocumentFile));
+            return;
+        }
+    } catch (const RunTimeError& error) {
+        if (error.number() != ErrorNumber::FileNotFound)
+            showFirstPage(); // what was read before stays
+        throw;
     }
-    page = opened;
+    showFirstPage();
+}
+
+void Canvas::showFirstPage()
+{
     document_.currentPage = 0;
     showNewDocument(view_, facts());
     notifyView();

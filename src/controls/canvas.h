@@ -172,6 +172,7 @@ private:
 
     void build(AutomationObject& grid, bool takeWidths);
     void layOut(GridTable& table);
+    void showFirstPage();
     void scaleReport(double factor);
     void notifyView();
 
