@@ -75,7 +75,7 @@ void LayoutEngine::startBand(std::size_t band)
     band_ = band;
     const ColPos& columns = source_.bands[band];
     const auto first = static_cast<std::size_t>(columns.StartCol - 1);
-    const auto count = static_cast<std::size_t>(columns.EndCol - columns.StartCol + 1);
+    const auto count = static_cast<std::size_t>(columns.EndCol) - first;
     const auto widths = source_.widths.subspan(first, count);
     const double room = static_cast<double>(source_.setup.myWidth) - tableWidthOf(widths);
     tableLeft_ = roundToInt32(room / 2);

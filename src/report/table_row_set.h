@@ -48,8 +48,8 @@ public:
 private:
     struct Cell {
         union {
-            const char16_t* units = nullptr;
-            double number;
+            double number = 0;
+            const char16_t* units;
         };
         std::uint32_t length = 0;
         ValueKind kind = ValueKind::Null;

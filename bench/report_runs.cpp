@@ -1,0 +1,292 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+// Measures whole roads of a report, each budget beside what was measured:
+//   pelloric_bench_runs [ROWS]    up to ROWS rows, 1,000,000 unless given
+
+#include "sample_table.h"
+
+#include "controls/canvas.h"
+#include "document/ostl_reader.h"
+#include "document/ostl_writer.h"
+#include "platform/qt/qt_platform.h"
+#include "platform/services.h"
+#include "report/layout_engine.h"
+#include "settings/default_settings.h"
+#include "view/qt/page_export.h"
+
+#include <QApplication>
+#include <QPdfWriter>
+#include <QTemporaryDir>
+#include <QTextCursor>
+#include <QTextDocument>
+#include <QTextTable>
+
+#include <malloc.h>
+
+#include <chrono>
+#include <cstdio>
+#include <cstdlib>
+#include <filesystem>
+#include <memory>
+
+namespace {
+
+using namespace pelloric;
+namespace fs = std::filesystem;
+
+constexpr std::int64_t UsualRoadRows = 10'000; ///< the toolkit's table takes minutes beyond that
+constexpr std::int64_t PdfRows = 100'000; ///< of the PDF export, 2,400 pages
+
+double heapBytes()
+{
+    const struct mallinfo2 heap = mallinfo2();
+    return static_cast<double>(heap.uordblks) + static_cast<double>(heap.hblkhd);
+}
+
+/// Seconds since it was made.
+class StopWatch {
+public:
+    double seconds() const
+    {
+        return std::chrono::duration<double>(std::chrono::steady_clock::now() - start_).count();
+    }
+
+private:
+    std::chrono::steady_clock::time_point start_ = std::chrono::steady_clock::now();
+};
+
+class NoProgress final : public ProgressListener {
+public:
+    void begin(std::int64_t) override { }
+    void advance() override { }
+    void end() override { }
+};
+
+void print(const char* what, std::int64_t rows, double seconds, const char* remark)
+{
+    std::printf("%-34s %9lld rows %9.3f s %12.0f rows/s  %s\n", what, static_cast<long long>(rows),
+        seconds, static_cast<double>(rows) / seconds, remark);
+    std::fflush(stdout);
+}
+
+void judge(const char* budget, double value, double limit, bool atMost)
+{
+    const bool met = atMost ? value <= limit : value >= limit;
+    std::printf("    %-52s %10.2f  (%s %.2f: %s)\n", budget, value, atMost ? "at most" : "at least",
+        limit, met ? "met" : "MISSED");
+    std::fflush(stdout);
+}
+
+struct Counts {
+    double texts = 0;
+    double lines = 0;
+};
+
+Counts countsOf(const PageDocument& document)
+{
+    Counts counts;
+    for (int page = 0; page < document.pageCount(); ++page) {
+        counts.texts += static_cast<double>(document.texts(page).size());
+        counts.lines += static_cast<double>(document.lines(page).size());
+    }
+    return counts;
+}
+
+/// What no layout can do without: copy each text once, add its cached advances, append as many
+/// records to as many pages.
+double floorSeconds(const TableGrid& table, TextMetrics& metrics, const Counts& counts, int pages)
+{
+    PageDocument document;
+    FaceMetrics& face = metrics.face(u"宋体", false, false);
+    const std::int64_t rowsOfPage = table.rowCount() / pages + 1;
+    const auto linesOfCell = static_cast<int>(counts.lines / counts.texts + 0.5);
+    double sum = 0;
+    const StopWatch watch;
+    for (std::int64_t row = 0; row < table.rowCount(); ++row) {
+        if (row > 0 && row % rowsOfPage == 0)
+            document.newPage();
+        for (int column = 0; column < table.columnCount(); ++column) {
+            const TextView text = document.store().add(table.cell(row, column));
+            const double width = face.advanceOf(text);
+            sum += width;
+            const auto x = static_cast<Twips>(width);
+            const auto length = static_cast<std::uint32_t>(text.size());
+            document.append(TextRecord { { x, 0 }, text.data(), length, 0 });
+            for (int line = 0; line < linesOfCell; ++line)
+                document.append(LineRecord { { x, 0 }, { x, 360 }, 0 });
+        }
+    }
+    const double seconds = watch.seconds();
+    return sum > 0 ? seconds : 0;
+}
+
+/// The road most users have: a rich-text table that the toolkit lays out and prints.
+double usualRoadSeconds(const TableGrid& table, const QString& file)
+{
+    const StopWatch watch;
+    QTextDocument document;
+    QTextCursor cursor(&document);
+    QTextTable* rich
+        = cursor.insertTable(static_cast<int>(table.rowCount()) + 1, table.columnCount());
+    for (int column = 0; column < table.columnCount(); ++column)
+        rich->cellAt(0, column).firstCursorPosition().insertText(
+            QString::fromStdU16String(table.column(column).title));
+    for (int row = 0; row < table.rowCount(); ++row) {
+        for (int column = 0; column < table.columnCount(); ++column) {
+            const TextView text = table.cell(row, column);
+            rich->cellAt(row + 1, column)
+                .firstCursorPosition()
+                .insertText(QString::fromUtf16(text.data(), static_cast<qsizetype>(text.size())));
+        }
+    }
+    QPdfWriter writer(file);
+    writer.setPageSize(QPageSize(QPageSize::A4));
+    writer.setResolution(600);
+    document.print(&writer);
+    return watch.seconds();
+}
+
+class Runs {
+public:
+    explicit Runs(std::int64_t mostRows)
+        : mostRows_(mostRows)
+    {
+        platform_.folders().setSystemDirectory(folder_.path().toStdString());
+        record_ = std::make_unique<Platform>(platform_.record());
+        deployDefaultSettings(*record_);
+    }
+
+    void all()
+    {
+        for (std::int64_t rows = 1000; rows <= mostRows_; rows *= 10)
+            report(rows);
+    }
+
+private:
+    void report(std::int64_t rows)
+    {
+        std::printf("\n%lld rows x 8 columns\n", static_cast<long long>(rows));
+        TableGrid table = bench::sampleTable(rows);
+        const double before = heapBytes();
+        auto canvas = std::make_unique<Canvas>(*record_);
+        const StopWatch watch;
+        canvas->doPreview(table);
+        print("preview: read, lay out, show", rows, watch.seconds(), "");
+        memory(*canvas, table, heapBytes() - before);
+        layout(table, *canvas);
+        files(*canvas, rows);
+        pdf(table, *canvas);
+    }
+
+    void memory(const Canvas& canvas, const TableGrid& table, double bytes)
+    {
+        const Counts counts = countsOf(canvas.document());
+        const auto texts = static_cast<double>(bench::textBytes(table));
+        std::printf(
+            "    %.0f pages, %.0f texts, %.0f lines, %.1f MB of cell texts, %.1f MB in all\n",
+            static_cast<double>(canvas.document().pageCount()), counts.texts, counts.lines,
+            texts / 1e6, bytes / 1e6);
+        std::printf("    %.1f bytes a text and line beside the cell texts\n",
+            (bytes - texts) / (counts.texts + counts.lines));
+        judge("memory / (3 x cell texts + 24 a text + 20 a line)",
+            bytes / (3 * texts + 24 * counts.texts + 20 * counts.lines), 1, true);
+    }
+
+    void layout(TableGrid& table, Canvas& canvas)
+    {
+        const Counts counts = countsOf(canvas.document());
+        double floor = 1e9;
+        double laidOut = 1e9;
+        for (int repeat = 0; repeat < 3; ++repeat) {
+            floor = std::min(floor,
+                floorSeconds(table, record_->metrics, counts, canvas.document().pageCount()));
+            laidOut = std::min(laidOut, layoutSeconds(table, canvas));
+        }
+        print("floor: copy, measure, append", table.rowCount(), floor, "");
+        print("layout: row set to document", table.rowCount(), laidOut, "");
+        judge("layout / floor", laidOut / floor, 3, true);
+    }
+
+    double layoutSeconds(TableGrid& table, Canvas& canvas)
+    {
+        auto store = std::make_shared<TextStore>();
+        const GridTable read = readGrid(table,
+            { .kind = PrintObjKind::MSFlexGrid,
+                .paperWidth = canvas.page.myWidth,
+                .leftMargin = canvas.page.intLeft,
+                .keptWidths = {},
+                .store = store });
+        PageDocument document;
+        document.shareStore(store);
+        Recorder recorder(document, record_->metrics);
+        NoProgress progress;
+        const StopWatch watch;
+        LayoutEngine engine(
+            { canvas.style(), canvas.page, *read.rows, read.ColumnWidths, read.ColumnBands },
+            *record_, document, recorder);
+        engine.build(progress);
+        return watch.seconds();
+    }
+
+    void files(const Canvas& canvas, std::int64_t rows)
+    {
+        const fs::path path = fs::path(folder_.path().toStdString()) / "report.ostl";
+        const OstlEncoding encoding { record_->codec, u'.' };
+        const StopWatch writing;
+        writeOstl(canvas.document(), canvas.page, encoding, {}, path);
+        const double written = writing.seconds();
+        const double megabytes = static_cast<double>(fs::file_size(path)) / 1e6;
+        print("document file: write (131 pages)", rows, written, "");
+        double read = 1e9;
+        for (int repeat = 0; repeat < 5; ++repeat) {
+            PageDocument document;
+            PageSetup setup;
+            const StopWatch reading;
+            readOstl(record_->codec, path, document, setup);
+            read = std::min(read, reading.seconds());
+        }
+        print("document file: open", rows, read, "");
+        judge("document file opened, MB/s", megabytes / read, 100, false);
+    }
+
+    void pdf(const TableGrid& table, const Canvas& canvas)
+    {
+        const std::int64_t rows = table.rowCount();
+        if (rows > PdfRows)
+            return;
+        const fs::path path = fs::path(folder_.path().toStdString()) / "report.pdf";
+        const StopWatch watch;
+        qt::exportPdf(canvas.document(), canvas.page, platform_, path, {});
+        const double seconds = watch.seconds();
+        print("PDF export", rows, seconds, "");
+        const double pages = canvas.document().pageCount();
+        const double kilobytes = static_cast<double>(fs::file_size(path)) / 1024;
+        if (rows >= UsualRoadRows)
+            judge("PDF, KB a page", kilobytes / pages, 6.4, true);
+        const double perRow = seconds / static_cast<double>(rows);
+        if (rows <= UsualRoadRows) {
+            usual_ = usualRoadSeconds(table, folder_.filePath("usual.pdf"));
+            print("usual road: rich-text table to PDF", rows, usual_, "");
+            usual_ /= static_cast<double>(rows);
+        }
+        judge("PDF export, times the rows/s of the usual road", usual_ / perRow, 10, false);
+    }
+
+    std::int64_t mostRows_;
+    double usual_ = 0; ///< seconds a row of the usual road, of its largest run
+    QTemporaryDir folder_;
+    qt::QtPlatform platform_;
+    std::unique_ptr<Platform> record_;
+};
+
+} // namespace
+
+int main(int count, char** arguments)
+{
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication application(count, arguments);
+    const std::int64_t rows = count > 1 ? std::atoll(arguments[1]) : 1'000'000;
+    Runs(rows).all();
+    return 0;
+}

@@ -1,0 +1,16 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/table_grid.h"
+
+namespace pelloric::bench {
+
+/// A table of eight columns that fits A4 portrait, with mixed Latin and Chinese texts.
+TableGrid sampleTable(std::int64_t rows);
+
+/// Bytes of the texts of all its cells.
+std::int64_t textBytes(const TableGrid& table);
+
+} // namespace pelloric::bench
