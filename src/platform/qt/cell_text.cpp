@@ -17,8 +17,7 @@ TextView CellText::of(const QAbstractItemView& view, const QModelIndex& index)
     const QVariant shown = index.data(Qt::DisplayRole);
     const auto* delegate
         = qobject_cast<const QStyledItemDelegate*>(view.itemDelegateForIndex(index));
-    const bool isPlain
-        = !delegate || typeid(*delegate) == typeid(QStyledItemDelegate);
+    const bool isPlain = !delegate || typeid(*delegate) == typeid(QStyledItemDelegate);
     const bool isText = shown.typeId() == QMetaType::QString;
     if (!delegate || (isPlain && isText)) {
         text_ = shown.toString();

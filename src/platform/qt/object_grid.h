@@ -33,10 +33,10 @@ private:
     std::map<const QMetaObject*, std::unique_ptr<ObjectClass>> classes_;
 };
 
-/// Any QObject by its published members: properties, invokable methods and slots of exactly that
+/// Any QObject by its published members: properties, callable methods and slots of exactly that
 /// name.
 ///
-/// An indexed member is an invokable that takes its indexes. Writing one calls the invokable of the
+/// An indexed member is a method that takes its indexes. Writing one calls the method of the
 /// same name with the value as last argument, or else "set" and the name. Objects that a member
 /// answers are reached the same way; an item model becomes a row set. A collection can be indexed
 /// itself: an index on a member without indexes goes to `Item` of the object that it answers.

@@ -75,8 +75,7 @@ bool needsShaping(char16_t unit)
 
 } // namespace
 
-QtDrawingSurface::QtDrawingSurface(
-    QPainter& painter, QtFonts& fonts, const SurfaceOptions& options)
+QtDrawingSurface::QtDrawingSurface(QPainter& painter, QtFonts& fonts, const SurfaceOptions& options)
     : painter_(painter)
     , fonts_(fonts)
     , options_(options)
@@ -201,8 +200,8 @@ void QtDrawingSurface::takeFont()
         return;
     isFontStale_ = false;
     face_ = &fonts_.face(fontName_, bold_, italic_);
-    const double em = static_cast<double>(fontSize_) * static_cast<double>(options_.divisor)
-        * TwipsPerPoint;
+    const double em
+        = static_cast<double>(fontSize_) * static_cast<double>(options_.divisor) * TwipsPerPoint;
     em_ = em > 0 ? std::min(em, LargestEm) : 0;
     const int pixels = std::max(1, static_cast<int>(std::nearbyint(em_)));
     fontScale_ = std::abs(em_ - pixels) < WholePixel ? 1 : em_ / pixels;

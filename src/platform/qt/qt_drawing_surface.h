@@ -20,7 +20,8 @@ class QtFonts;
 /// How a surface stands to the page it shows.
 struct SurfaceOptions {
     float divisor = 1.0F; ///< display divisor; font sizes arrive divided by it, > 0
-    QRectF page {}; ///< what `clear` makes white: twips; empty: nothing, the paper is blank by itself
+    QRectF
+        page {}; ///< what `clear` makes white: twips; empty: nothing, the paper is blank by itself
     QRectF visible {}; ///< what lies outside need not be drawn: twips; empty: everything is drawn
 };
 

@@ -24,9 +24,8 @@ constexpr std::size_t MostNames = 4096;
 /// Song-style families, the best first.
 QStringList substitutes()
 {
-    return { QStringLiteral("SimSun"), QStringLiteral("NSimSun"),
-        QStringLiteral("AR PL UMing CN"), QStringLiteral("Noto Serif CJK SC"),
-        QStringLiteral("WenQuanYi Zen Hei") };
+    return { QStringLiteral("SimSun"), QStringLiteral("NSimSun"), QStringLiteral("AR PL UMing CN"),
+        QStringLiteral("Noto Serif CJK SC"), QStringLiteral("WenQuanYi Zen Hei") };
 }
 
 QStringList familiesOf(const QString& family)

@@ -55,8 +55,7 @@ std::filesystem::path systemFolder()
 #else
 std::filesystem::path systemFolder()
 {
-    const QString folder
-        = QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation);
+    const QString folder = QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation);
     return std::filesystem::path(toText(folder)) / "pelloric";
 }
 #endif

@@ -193,8 +193,8 @@ void SqlViewGrid::setColumn(int column)
     QTableView& table = view();
     column_ = column;
     const QModelIndex current = table.currentIndex();
-    const QModelIndex next = table.model()->index(current.isValid() ? current.row() : 0,
-        columns_->map().logical(column), table.rootIndex());
+    const QModelIndex next = table.model()->index(
+        current.isValid() ? current.row() : 0, columns_->map().logical(column), table.rootIndex());
     if (next.isValid())
         table.selectionModel()->setCurrentIndex(next, QItemSelectionModel::NoUpdate);
 }

@@ -43,8 +43,7 @@ Value TableViewGrid::get(MemberId member, std::span<const Value> arguments)
     case Rows:
         return Value::ofNumber(rows_.count() + 1);
     case ColWidth:
-        return Value::ofNumber(
-            sectionWidth(*view().horizontalHeader(), columnOf(arguments, 0)));
+        return Value::ofNumber(sectionWidth(*view().horizontalHeader(), columnOf(arguments, 0)));
     case TextMatrix: {
         const int row = indexArgument(arguments, 0, 0, rows_.count());
         return Value::ofText(cell(row, columnOf(arguments, 1)));

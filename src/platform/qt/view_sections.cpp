@@ -71,8 +71,11 @@ void setSectionWidth(QHeaderView& header, int logical, Twips width)
 {
     if (header.isSectionHidden(logical))
         header.showSection(logical);
-    const double pixels = static_cast<double>(width) * header.logicalDpiX() / TwipsPerInch;
-    header.resizeSection(logical, roundToInt32(pixels));
+    const int pixels
+        = roundToInt32(static_cast<double>(width) * header.logicalDpiX() / TwipsPerInch);
+    if (pixels >= 0 && pixels < header.minimumSectionSize())
+        header.setMinimumSectionSize(pixels);
+    header.resizeSection(logical, pixels);
 }
 
 Twips twipsOfPixels(int pixels, int dpi)

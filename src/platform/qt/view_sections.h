@@ -51,7 +51,7 @@ void fetchAll(QAbstractItemModel& model, const QModelIndex& root);
 /// Pixels as twips, at the header's logical resolution.
 Twips sectionWidth(const QHeaderView& header, int logical);
 
-/// Sets a width in twips; a hidden section is shown.
+/// Sets a width in twips; a hidden section is shown, and the header's least width gives way.
 void setSectionWidth(QHeaderView& header, int logical, Twips width);
 
 /// Pixels as twips, rounded half to even.

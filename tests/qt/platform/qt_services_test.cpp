@@ -1,0 +1,134 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "platform/qt/qt_services.h"
+
+#include "platform/qt/qt_platform.h"
+#include "platform/qt/qt_text.h"
+#include "support/errors.h"
+
+#include <QApplication>
+#include <QLocale>
+#include <QMessageBox>
+#include <QTemporaryDir>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+namespace pelloric::qt {
+
+TEST(QtClock, TellsTheDateOneWayAndTheTimeAsTheLocaleDoes)
+{
+    QtClock clock;
+    clock.setNow(QDateTime(QDate(2004, 10, 3), QTime(7, 5, 9)));
+    EXPECT_EQ(clock.date(), u"2004-10-03");
+    EXPECT_EQ(timeWithSeconds(QTime(7, 5, 9), QLocale::c()), QStringLiteral("07:05:09"));
+    const QLocale german(QLocale::German, QLocale::Germany);
+    EXPECT_EQ(timeWithSeconds(QTime(7, 5, 9), german), QStringLiteral("07:05:09"));
+}
+
+TEST(QtClock, TellsTheYearInPlainDigitsInEveryLocale)
+{
+    const QLocale before;
+    QLocale::setDefault(QLocale(QLocale::Arabic, QLocale::Egypt));
+    QtClock clock;
+    clock.setNow(QDateTime(QDate(2004, 10, 3), QTime(7, 5, 9)));
+    EXPECT_EQ(clock.date(), u"2004-10-03");
+    QLocale::setDefault(before);
+}
+
+TEST(QtMessageLoop, RunsWhatIsPendingOnce)
+{
+    int runs = 0;
+    QTimer::singleShot(0, [&] { ++runs; });
+    QtMessageLoop loop;
+    loop.runOnce();
+    EXPECT_EQ(runs, 1);
+}
+
+TEST(QtMessageLoop, EndsACancelledOperationOnce)
+{
+    QtMessageLoop loop;
+    loop.cancel();
+    EXPECT_EQ(errorOf([&] { loop.runOnce(); }), ErrorNumber::Cancelled);
+    EXPECT_EQ(errorOf([&] { loop.runOnce(); }), std::nullopt);
+    loop.cancel();
+    loop.forgetCancel();
+    EXPECT_EQ(errorOf([&] { loop.runOnce(); }), std::nullopt);
+}
+
+TEST(BoxMessages, ShowsTextTitleAndIcon)
+{
+    QString text;
+    QString title;
+    auto icon = QMessageBox::NoIcon;
+    QTimer::singleShot(0, [&] {
+        auto* const box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+        ASSERT_TRUE(box);
+        text = box->text();
+        title = box->windowTitle();
+        icon = box->icon();
+        box->accept();
+    });
+    BoxMessages().show({ u"<b>无", u"提示", MessageIcon::Critical });
+    EXPECT_EQ(text, QStringLiteral("<b>无"));
+    EXPECT_EQ(title, QStringLiteral("提示"));
+    EXPECT_EQ(icon, QMessageBox::Critical);
+}
+
+TEST(StreamMessages, WritesALineAndSetsTheExitStatus)
+{
+    std::FILE* const file = std::tmpfile();
+    ASSERT_TRUE(file);
+    StreamMessages messages(file);
+    EXPECT_EQ(messages.exitStatus(), 0);
+    messages.show({ u"two\nlines", u"提示", MessageIcon::Critical });
+    EXPECT_EQ(messages.exitStatus(), 1);
+    ASSERT_EQ(messages.shown().size(), 1U);
+    std::rewind(file);
+    char line[64] = {};
+    EXPECT_TRUE(std::fgets(line, sizeof line, file));
+    EXPECT_STREQ(line, "提示: two lines\n");
+    std::fclose(file);
+}
+
+TEST(QtSystemFolders, TheFolderCanBeReplaced)
+{
+    QtSystemFolders folders;
+    EXPECT_EQ(folders.systemDirectory().filename(), "pelloric");
+    folders.setSystemDirectory("/srv/set-up/");
+    EXPECT_EQ(folders.systemDirectory(), "/srv/set-up");
+    folders.setSystemDirectory({});
+    EXPECT_EQ(folders.systemDirectory().filename(), "pelloric");
+}
+
+TEST(QtPlatform, HasNoPrinterUntilOneIsPutIn)
+{
+    QtPlatform platform;
+    const Platform services = platform.record();
+    EXPECT_EQ(services.printers.currentPrinter(), u"");
+    EXPECT_FALSE(services.printers.opens(u"T1"));
+    EXPECT_EQ(errorOf([&] { services.printer.endDoc(); }), std::nullopt);
+    services.printer.print(u"text");
+    EXPECT_EQ(errorOf([&] { services.printer.endDoc(); }), ErrorNumber::InvalidCall);
+}
+
+TEST(QtPlatform, HandsOutWhatWasPutIn)
+{
+    QtPlatform platform;
+    StreamMessages messages;
+    platform.useMessages(messages);
+    EXPECT_EQ(&platform.record().messages, &messages);
+    platform.library().MarvenStartRow = 3;
+    EXPECT_EQ(platform.record().library.MarvenStartRow, 3);
+}
+
+TEST(QtText, ConvertsBothWays)
+{
+    const Text text = u"宋体 \U0001F600";
+    EXPECT_EQ(toText(toQString(text)), text);
+    EXPECT_EQ(viewOf(borrowedString(text)).data(), text.data());
+    EXPECT_EQ(viewOf(borrowed(text)).data(), text.data());
+}
+
+} // namespace pelloric::qt
