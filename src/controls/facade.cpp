@@ -3,9 +3,12 @@
 
 #include "controls/facade.h"
 
+#include "platform/automation_object.h"
 #include "platform/platform.h"
 #include "platform/services.h"
 #include "settings/settings_file.h"
+
+#include <utility>
 
 namespace pelloric {
 
@@ -46,10 +49,10 @@ Facade::Facade(Platform& platform, PreviewOpener& opener)
     platform_.library.MarvenStartRow = 1;
 }
 
-void Facade::doPreview(AutomationObject& grid)
+void Facade::doPreview(std::unique_ptr<AutomationObject> grid)
 {
     platform_.loop.runOnce();
-    opener_.openPreview(grid);
+    opener_.openPreview(std::move(grid));
 }
 
 void Facade::AddHeader(TextView strHeader, std::int32_t Location)

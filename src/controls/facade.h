@@ -6,6 +6,7 @@
 #include "platform/text.h"
 
 #include <cstdint>
+#include <memory>
 
 namespace pelloric {
 
@@ -21,7 +22,8 @@ public:
     virtual ~PreviewOpener() = default;
 
     /// Shows the preview window, which there is once, and has it preview the grid.
-    virtual void openPreview(AutomationObject& grid) = 0;
+    /// @param grid  the window keeps it until the next one, to build the pages anew
+    virtual void openPreview(std::unique_ptr<AutomationObject> grid) = 0;
 };
 
 /// What `Kestrane` publishes, without a window.
@@ -36,7 +38,7 @@ public:
     Facade(Platform& platform, PreviewOpener& opener);
 
     /// Lets the message loop run once, then previews the grid in the preview window.
-    void doPreview(AutomationObject& grid);
+    void doPreview(std::unique_ptr<AutomationObject> grid);
 
     /// Stores a page-header text.
     /// @param strHeader  may hold fields; line breaks become blanks, for a setting is one line

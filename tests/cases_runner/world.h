@@ -139,7 +139,7 @@ public:
 
 class NoWindow final : public PreviewOpener {
 public:
-    void openPreview(AutomationObject&) override { }
+    void openPreview(std::unique_ptr<AutomationObject>) override { }
 };
 
 /// The world of one case: services, a canvas, a facade, the host's grid and a system directory.
