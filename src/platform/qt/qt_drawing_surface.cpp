@@ -210,19 +210,19 @@ void QtDrawingSurface::takeFont()
 
 void QtDrawingSurface::drawText(TextView text)
 {
-    double width = -1;
+    const bool isShaped = std::any_of(text.begin(), text.end(), needsShaping);
+    const bool isMeasured = isShaped || !isFontTransparent_;
+    const double width = isMeasured ? face_->advanceOf(text) / TwipsPerPoint * em_ : 0;
     if (!isFontTransparent_) {
-        width = face_->advanceOf(text) / TwipsPerPoint * em_;
         const double height = face_->lineHeight() / TwipsPerPoint * em_;
         painter_.fillRect(QRectF(current_.x, current_.y, width, height), Qt::white);
     }
+    QFont font = font_;
+    if (isShaped)
+        font.setStyleStrategy(QFont::PreferAntialias);
     painter_.setPen(colorOf(foreColor_));
-    painter_.setFont(font_);
-    if (std::any_of(text.begin(), text.end(), needsShaping))
-        width = face_->advanceOf(text) / TwipsPerPoint * em_;
-    else
-        width = -1;
-    drawRun(text, width);
+    painter_.setFont(font);
+    drawRun(text, isShaped ? width : -1);
 }
 
 /// Draws with the top-left corner at the current point.
@@ -232,7 +232,7 @@ void QtDrawingSurface::drawRun(TextView text, double width)
     const QString string = borrowedString(text);
     double squeeze = 1;
     if (width > 0) {
-        const double shaped = QFontMetricsF(font_).horizontalAdvance(string) * fontScale_;
+        const double shaped = QFontMetricsF(painter_.font()).horizontalAdvance(string) * fontScale_;
         squeeze = shaped > width ? width / shaped : 1;
     }
     const QPointF baseline(current_.x, current_.y + face_->ascent() / TwipsPerPoint * em_);
