@@ -3,6 +3,7 @@
 
 #include "platform/qt/grid_for.h"
 
+#include "platform/qt/held_grid.h"
 #include "platform/qt/object_grid.h"
 #include "platform/qt/sql_view_grid.h"
 #include "platform/qt/table_view_grid.h"
@@ -33,6 +34,8 @@ bool isGridItself(const QObject& object)
 
 std::unique_ptr<AutomationObject> gridFor(QObject& object)
 {
+    if (const auto* const held = qobject_cast<HeldGrid*>(&object))
+        return held->share();
     if (isGridItself(object))
         return std::make_unique<ObjectGrid>(object);
     if (auto* const table = qobject_cast<QTableView*>(&object)) {
