@@ -1,0 +1,95 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+// Runs the runner over all cases once and compares what it wrote, one test per case.
+
+#include "comparer/compare.h"
+
+#include "fakes/temp_folder.h"
+#include "platform/qt/qt_text_codec.h"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <cstdlib>
+
+namespace pelloric::cases {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+const fs::path CasesFolder = fs::path(PELLORIC_TESTS_DIR) / "cases";
+
+std::vector<std::string> caseIds()
+{
+    std::vector<std::string> ids;
+    for (const auto& entry : fs::directory_iterator(CasesFolder)) {
+        if (entry.path().extension() == ".json")
+            ids.push_back(entry.path().stem().string());
+    }
+    std::sort(ids.begin(), ids.end());
+    return ids;
+}
+
+class ConformanceCases : public testing::TestWithParam<std::string> {
+protected:
+    static void SetUpTestSuite()
+    {
+        folder_ = std::make_unique<TempFolder>();
+        const std::string command = std::string("\"") + PELLORIC_CASES + "\" \""
+            + CasesFolder.string() + "\" \"" + folder_->path().string() + "\"";
+        status_ = std::system(command.c_str());
+    }
+
+    static void TearDownTestSuite() { folder_.reset(); }
+
+    static inline std::unique_ptr<TempFolder> folder_;
+    static inline int status_ = -1;
+};
+
+std::string nameOf(const testing::TestParamInfo<std::string>& info)
+{
+    std::string name = info.param;
+    std::replace(name.begin(), name.end(), '-', '_');
+    return name;
+}
+
+} // namespace
+
+TEST_P(ConformanceCases, EndsAsExpected)
+{
+    const qt::QtTextCodec codec;
+    const auto difference
+        = compareCase(CasesFolder / (GetParam() + ".json"), folder_->path(), codec);
+    EXPECT_EQ(difference.value_or("no difference"), "no difference");
+}
+
+INSTANTIATE_TEST_SUITE_P(All, ConformanceCases, testing::ValuesIn(caseIds()), nameOf);
+
+TEST(ConformanceRunner, RefusesAFolderThatIsNotThere)
+{
+    const TempFolder folder;
+    const std::string command = std::string("\"") + PELLORIC_CASES + "\" \""
+        + folder.file("none").string() + "\" \"" + folder.file("out").string() + "\" 2>&1";
+    EXPECT_NE(std::system(command.c_str()), 0);
+}
+
+TEST(ConformanceRunner, GoesOnBehindACaseThatItCannotRun)
+{
+    const TempFolder folder;
+    folder.write("a-broken.json", "{");
+    folder.write("b-unknown.json",
+        R"({"id": "b-unknown", "input": {"steps": [["fly"]], "show": []}, "expected": {}})");
+    folder.write("c-good.json",
+        R"({"id": "c-good", "input": {"steps": [["clear"]], "show": []}, "expected": {}})");
+    const std::string command = std::string("\"") + PELLORIC_CASES + "\" \""
+        + folder.path().string() + "\" \"" + folder.file("out").string() + "\" 2>&1";
+    EXPECT_NE(std::system(command.c_str()), 0);
+    EXPECT_FALSE(fs::exists(folder.file("out") / "a-broken.json"));
+    EXPECT_FALSE(fs::exists(folder.file("out") / "b-unknown.json"));
+    EXPECT_EQ(compareCase(folder.file("c-good.json"), folder.file("out"), qt::QtTextCodec()),
+        std::nullopt);
+}
+
+} // namespace pelloric::cases
