@@ -132,37 +132,53 @@ void Canvas::ReDrawZoom(AutomationObject& grid)
 void Canvas::build(AutomationObject& grid, bool takeWidths)
 {
     const FlagChange building(building_, true);
-    {
+    bool isBuilt = false;
+    try {
         const FlagChange hidden(view_.baseVisible, false);
         notifyView();
         platform_.loop.runOnce();
-        GridRequest request { .kind = m_PrintObj,
-            .startRow = platform_.library.MarvenStartRow,
-            .paperWidth = page.myWidth,
-            .leftMargin = page.intLeft,
-            .keptWidths = {},
-            .store = std::make_shared<TextStore>(),
-            .decimalSeparator = platform_.decimalSeparator };
-        if (!takeWidths)
-            request.keptWidths = table_->ColumnWidths;
-        GridTable table = readGrid(grid, request);
-        if (table.rows == nullptr)
-            return;
-        PageDocument earlier = std::exchange(document_, document_.cleared());
-        document_.shareStore(request.store);
-        const ViewState earlierView = view_;
-        try {
-            layOut(table);
-        } catch (...) {
-            document_ = std::move(earlier);
-            recorder_.documentReplaced();
-            view_ = earlierView;
-            end();
-            throw;
-        }
-        table_ = std::move(table);
+        isBuilt = rebuild(grid, takeWidths);
+    } catch (...) {
+        notifyView(); // the paper is visible again
+        throw;
     }
-    showFirstPage();
+    if (isBuilt)
+        showFirstPage();
+    else
+        notifyView();
+}
+
+/// Reads the grid and lays it out.
+/// @return  false: no column is printed, and nothing has changed
+bool Canvas::rebuild(AutomationObject& grid, bool takeWidths)
+{
+    GridRequest request { .kind = m_PrintObj,
+        .startRow = platform_.library.MarvenStartRow,
+        .paperWidth = page.myWidth,
+        .leftMargin = page.intLeft,
+        .keptWidths = {},
+        .store = std::make_shared<TextStore>(),
+        .decimalSeparator = platform_.decimalSeparator };
+    if (!takeWidths)
+        request.keptWidths = table_->ColumnWidths;
+    GridTable table = readGrid(grid, request);
+    if (table.rows == nullptr)
+        return false;
+    PageDocument earlier = std::exchange(document_, document_.cleared());
+    document_.shareStore(request.store);
+    const ViewState earlierView = view_;
+    try {
+        layOut(table);
+    } catch (...) {
+        document_ = std::move(earlier);
+        recorder_.documentReplaced();
+        view_ = earlierView;
+        end();
+        throw;
+    }
+    table.dropBorrowedRows();
+    table_ = std::move(table);
+    return true;
 }
 
 void Canvas::layOut(GridTable& table)
@@ -175,7 +191,6 @@ void Canvas::layOut(GridTable& table)
         platform_, document_, recorder_);
     engine.build(*this);
     titleTop_ = engine.titleTop();
-    table.dropBorrowedRows();
 }
 
 void Canvas::scaleReport(double factor)

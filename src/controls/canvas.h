@@ -171,6 +171,7 @@ private:
     void end() override;
 
     void build(AutomationObject& grid, bool takeWidths);
+    bool rebuild(AutomationObject& grid, bool takeWidths);
     void layOut(GridTable& table);
     void showFirstPage();
     void scaleReport(double factor);
