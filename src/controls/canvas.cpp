@@ -332,8 +332,7 @@ void Canvas::setDispScale(float scale)
 
 void Canvas::setVerticalDir(bool portrait)
 {
-    pelloric::setVerticalDir(view_, page, facts(), portrait);
-    setPrintableTenths(style_, page);
+    pelloric::setVerticalDir(view_, style_, page, facts(), portrait);
     notifyView();
 }
 

@@ -93,8 +93,10 @@ void setPrintableTenths(ReportStyle& style, const PageSetup& setup)
 {
     const double width = static_cast<double>(setup.myWidth) - setup.intRight - setup.intLeft;
     const double height = static_cast<double>(setup.myHeight) - setup.intButtom - setup.intTop;
-    style.printableWidthTenth = roundToInt16(width / 10);
-    style.printableHeightTenth = roundToInt16(height / 10);
+    const std::int16_t widthTenth = roundToInt16(width / 10);
+    const std::int16_t heightTenth = roundToInt16(height / 10);
+    style.printableWidthTenth = widthTenth;
+    style.printableHeightTenth = heightTenth;
 }
 
 void loadReportStyle(ReportStyle& style, PageSetup& setup, const Platform& platform)

@@ -46,7 +46,7 @@ struct ReportStyle {
 };
 
 /// Sets the tenths of the area between the margins.
-/// @throws RunTimeError Overflow: past 16 bits
+/// @throws RunTimeError Overflow: past 16 bits; nothing has changed
 void setPrintableTenths(ReportStyle& style, const PageSetup& setup);
 
 /// Fills style and page set-up from the settings file, key by key.

@@ -6,6 +6,7 @@
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
+#include "report/report_style.h"
 
 #include <algorithm>
 #include <cmath>
@@ -121,11 +122,6 @@ void scroll(Twips& offset, std::int16_t& previous, ScrollBar& bar, std::int32_t 
     offset = roundToInt32(static_cast<double>(offset) - moved);
     previous = now;
     bar.value = now;
-}
-
-std::int16_t tenth(Twips paper, std::int16_t oneMargin, std::int16_t otherMargin)
-{
-    return roundToInt16((static_cast<double>(paper) - oneMargin - otherMargin) / 10);
 }
 
 std::optional<int> existing(const PageFacts& facts, int page)
@@ -319,27 +315,20 @@ void mouseUp(ViewState& view, const PageFacts& facts, double x, double y)
     placeSurfaces(view, facts);
 }
 
-void setVerticalDir(ViewState& view, PageSetup& setup, PageFacts facts, bool portrait)
+void setVerticalDir(
+    ViewState& view, ReportStyle& style, PageSetup& setup, PageFacts facts, bool portrait)
 {
     PageSetup turned = setup;
     if (portrait != view.portrait) {
         turned.myHeight = setup.myWidth;
         turned.myWidth = narrowToInt16(setup.myHeight);
     }
-    updatePrintableSize(view, turned);
+    setPrintableTenths(style, turned);
     setup = turned;
     view.portrait = portrait;
     facts.myWidth = setup.myWidth;
     facts.myHeight = setup.myHeight;
     layOutAgain(view, facts);
-}
-
-void updatePrintableSize(ViewState& view, const PageSetup& setup)
-{
-    const std::int16_t width = tenth(setup.myWidth, setup.intRight, setup.intLeft);
-    const std::int16_t height = tenth(setup.myHeight, setup.intButtom, setup.intTop);
-    view.printableWidthTenth = width;
-    view.printableHeightTenth = height;
 }
 
 } // namespace pelloric

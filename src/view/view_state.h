@@ -12,6 +12,7 @@
 namespace pelloric {
 
 class MessageLoop;
+struct ReportStyle;
 
 /// A scroll bar; its minimum is always 0 and one step is 100 page twips.
 struct ScrollBar {
@@ -52,8 +53,6 @@ struct ViewState {
     std::vector<Tpoint> surfaces { { StartOffset, StartOffset } }; ///< page twips; never empty
     bool baseVisible = false; ///< surface 0 is shown and the start-up icon is hidden
     bool portrait = true; ///< orientation flag
-    std::int16_t printableWidthTenth = 0; ///< tenths of twips between the margins
-    std::int16_t printableHeightTenth = 0; ///< tenths of twips between the margins
 };
 
 /// The page that a paint of a surface shows.
@@ -155,16 +154,14 @@ void mouseDown(ViewState& view, double x, double y);
 /// @throws RunTimeError Overflow: outside 32 bits; the drag is over, nothing has moved
 void mouseUp(ViewState& view, const PageFacts& facts, double x, double y);
 
-/// Sets the orientation; another one exchanges width and height of the paper.
+/// Sets the orientation; another one exchanges width and height of the paper. The printable size
+/// in tenths is taken anew either way.
 ///
 /// @param facts     as they are before
 /// @param portrait  false: landscape
-/// @throws RunTimeError Overflow: the old height, which passes through 16 bits, is above them;
-///                      nothing has changed. Or as `layOutAgain`
-void setVerticalDir(ViewState& view, PageSetup& setup, PageFacts facts, bool portrait);
-
-/// Takes the printable size in tenths anew.
-/// @throws RunTimeError Overflow: past 16 bits; nothing has changed
-void updatePrintableSize(ViewState& view, const PageSetup& setup);
+/// @throws RunTimeError Overflow: the old height, which passes through 16 bits, is above them, or
+///                      a tenth is; nothing has changed. Or as `layOutAgain`
+void setVerticalDir(
+    ViewState& view, ReportStyle& style, PageSetup& setup, PageFacts facts, bool portrait);
 
 } // namespace pelloric

@@ -4,6 +4,7 @@
 #include "view/view_state.h"
 
 #include "fakes/fake_services.h"
+#include "report/report_style.h"
 #include "support/errors.h"
 
 #include <gtest/gtest.h>
@@ -44,6 +45,7 @@ protected:
     ViewState view;
     PageFacts facts { 11907, 16840, 1, 0, 1 };
     PageSetup setup;
+    ReportStyle style;
     FakeMessageLoop loop;
 };
 
@@ -349,14 +351,14 @@ TEST_F(ViewTest, NothingIsDraggedOutsidePanMode)
 
 TEST_F(ViewTest, AnotherOrientationExchangesTheSizes)
 {
-    setVerticalDir(view, setup, facts, false);
+    setVerticalDir(view, style, setup, facts, false);
     EXPECT_EQ(setup.myWidth, 16840);
     EXPECT_EQ(setup.myHeight, 11907);
     EXPECT_FALSE(view.portrait);
     EXPECT_EQ(view.Hbar, (ScrollBar { true, 20, 0, 18, 2 }));
     EXPECT_EQ(view.Vbar, (ScrollBar { true, 33, 0, 24, 2 }));
-    EXPECT_EQ(view.printableWidthTenth, 1457);
-    EXPECT_EQ(view.printableHeightTenth, 964);
+    EXPECT_EQ(style.printableWidthTenth, 1457);
+    EXPECT_EQ(style.printableHeightTenth, 964);
 }
 
 TEST_F(ViewTest, ThePresentOrientationOnlyTakesThePrintableSizeAnew)
@@ -364,10 +366,10 @@ TEST_F(ViewTest, ThePresentOrientationOnlyTakesThePrintableSizeAnew)
     setup.intTop = 907;
     setup.intButtom = 1021;
     setup.intLeft = setup.intRight = 680;
-    setVerticalDir(view, setup, facts, true);
+    setVerticalDir(view, style, setup, facts, true);
     EXPECT_EQ(setup.myWidth, 11907);
-    EXPECT_EQ(view.printableWidthTenth, 1055);
-    EXPECT_EQ(view.printableHeightTenth, 1491);
+    EXPECT_EQ(style.printableWidthTenth, 1055);
+    EXPECT_EQ(style.printableHeightTenth, 1491);
 }
 
 TEST_F(ViewTest, ATurnedHeightPastSixteenBitsChangesNothing)
@@ -375,11 +377,12 @@ TEST_F(ViewTest, ATurnedHeightPastSixteenBitsChangesNothing)
     setup.myHeight = 32768;
     facts.myHeight = 32768;
     const PageSetup before = setup;
-    EXPECT_EQ(errorOf([&] { setVerticalDir(view, setup, facts, false); }), ErrorNumber::Overflow);
+    EXPECT_EQ(
+        errorOf([&] { setVerticalDir(view, style, setup, facts, false); }), ErrorNumber::Overflow);
     EXPECT_EQ(setup, before);
     EXPECT_TRUE(view.portrait);
     setup.myHeight = facts.myHeight = 32767;
-    setVerticalDir(view, setup, facts, false);
+    setVerticalDir(view, style, setup, facts, false);
     EXPECT_EQ(setup.myWidth, 32767);
 }
 
