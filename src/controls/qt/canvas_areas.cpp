@@ -1,0 +1,402 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "controls/qt/canvas_areas.h"
+
+#include "controls/qt/back_screen.h"
+#include "controls/qt/hand_cursor.h"
+#include "controls/qt/member_calls.h"
+#include "controls/qt/progress_area.h"
+#include "controls/qt/start_icon.h"
+#include "platform/numbers.h"
+#include "platform/qt/qt_drawing_surface.h"
+#include "view/page_renderer.h"
+
+#include <QCursor>
+#include <QLabel>
+#include <QPainter>
+#include <QScrollBar>
+#include <QSignalBlocker>
+#include <QStyle>
+#include <QWheelEvent>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <limits>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr double TwipsPerInch = 1440;
+
+constexpr double ScrollStep = 100; ///< what one step of a bar moves: page twips
+
+constexpr double ZoomStep = 1.25; ///< of a wheel click
+
+constexpr double SmallestScale = 1.0 / 1024; ///< the wheel zooms no further out
+constexpr double LargestScale = 64; ///< the wheel zooms no further in
+
+/// Reaches the pages of no document: a coordinate beyond all 32-bit twips has no meaning.
+Twips wholeTwips(double twips)
+{
+    constexpr double Smallest = std::numeric_limits<Twips>::min();
+    constexpr double Largest = std::numeric_limits<Twips>::max();
+    return static_cast<Twips>(std::clamp(twips, Smallest, Largest));
+}
+
+/// What a key does to a scroll bar.
+struct KeyRow {
+    int key;
+    Qt::Orientation bar;
+    QAbstractSlider::SliderAction action;
+};
+
+constexpr auto Keys = std::to_array<KeyRow>({
+    { Qt::Key_Left, Qt::Horizontal, QAbstractSlider::SliderSingleStepSub },
+    { Qt::Key_Right, Qt::Horizontal, QAbstractSlider::SliderSingleStepAdd },
+    { Qt::Key_Up, Qt::Vertical, QAbstractSlider::SliderSingleStepSub },
+    { Qt::Key_Down, Qt::Vertical, QAbstractSlider::SliderSingleStepAdd },
+    { Qt::Key_PageUp, Qt::Vertical, QAbstractSlider::SliderPageStepSub },
+    { Qt::Key_PageDown, Qt::Vertical, QAbstractSlider::SliderPageStepAdd },
+    { Qt::Key_Home, Qt::Vertical, QAbstractSlider::SliderToMinimum },
+    { Qt::Key_End, Qt::Vertical, QAbstractSlider::SliderToMaximum },
+});
+
+QLabel* makeHolder(QWidget& control, const char* name, const QString& accessibleName)
+{
+    auto* const holder = new QLabel(&control);
+    holder->setObjectName(QString::fromLatin1(name));
+    holder->setAccessibleName(accessibleName);
+    holder->hide();
+    return holder;
+}
+
+/// Shows a bar of the canvas without running its change handler.
+void showBar(QScrollBar& bar, const ScrollBar& state)
+{
+    const QSignalBlocker blocker(bar);
+    bar.setEnabled(state.enabled);
+    bar.setRange(0, state.enabled ? state.maximum : 0);
+    bar.setPageStep(state.largeChange);
+    bar.setSingleStep(state.smallChange);
+    bar.setValue(state.value);
+}
+
+/// The value of a bar that moves the pages by so much, kept within the bar.
+int barValueAfter(const ScrollBar& bar, std::int16_t previous, double moved)
+{
+    const double value = previous - moved / ScrollStep;
+    return static_cast<int>(std::nearbyint(std::clamp<double>(value, 0, bar.maximum)));
+}
+
+} // namespace
+
+CanvasAreas::CanvasAreas(
+    QWidget& control, Canvas& canvas, QtFonts& fonts, RightButton rightButton)
+    : control_(control)
+    , canvas_(canvas)
+    , fonts_(fonts)
+    , rightButton_(std::move(rightButton))
+    , backScreen_(new BackScreen(&control))
+    , startIcon_(new StartIcon(&control))
+    , progress_(new ProgressArea(&control))
+    , hand_(makeHolder(control, "imgPan", QObject::tr("Hand cursor")))
+    , Hbar_(makeBar(Qt::Horizontal, "Hbar"))
+    , Vbar_(makeBar(Qt::Vertical, "Vbar"))
+{
+    makeHolder(control, "PicHouse", QObject::tr("Picture"));
+    makeHolder(control, "PicIcon", QObject::tr("Picture"));
+    hand_->setPixmap(handPicture(control.devicePixelRatioF()));
+    Hbar_->setAccessibleName(QObject::tr("Horizontal scroll bar"));
+    Vbar_->setAccessibleName(QObject::tr("Vertical scroll bar"));
+    auto* const base = new PageSurface(*this, backScreen_);
+    base->hide();
+    surfaces_[0] = base;
+    QObject::connect(Hbar_, &QScrollBar::valueChanged, &control_, [this](int value) {
+        MemberCalls::endQuietly([&] { canvas_.setHbar(value); });
+    });
+    QObject::connect(Vbar_, &QScrollBar::valueChanged, &control_, [this](int value) {
+        MemberCalls::endQuietly([&] { canvas_.setVbar(value); });
+    });
+    canvas_.observe(this);
+}
+
+CanvasAreas::~CanvasAreas() { canvas_.observe(nullptr); }
+
+QScrollBar* CanvasAreas::makeBar(Qt::Orientation orientation, const char* name)
+{
+    auto* const bar = new QScrollBar(orientation, &control_);
+    bar->setObjectName(QString::fromLatin1(name));
+    bar->setLayoutDirection(Qt::LeftToRight);
+    bar->setRange(0, 0);
+    bar->setEnabled(false);
+    return bar;
+}
+
+void CanvasAreas::fill(int edge)
+{
+    const int bar = control_.style()->pixelMetric(QStyle::PM_ScrollBarExtent, nullptr, Hbar_);
+    const QRect all = control_.rect().adjusted(edge, edge, -edge, -edge);
+    const QSize view(std::max(0, all.width() - bar), std::max(0, all.height() - bar));
+    const QRect viewport(all.topLeft(), view);
+    backScreen_->setGeometry(viewport);
+    startIcon_->setGeometry(viewport);
+    Hbar_->setGeometry(all.left(), all.top() + view.height(), view.width(), bar);
+    Vbar_->setGeometry(all.left() + view.width(), all.top(), bar, view.height());
+    const int progressHeight = std::max(bar, progress_->sizeHint().height());
+    progress_->setGeometry(
+        all.left(), all.bottom() + 1 - progressHeight, all.width(), progressHeight);
+    setViewport();
+}
+
+void CanvasAreas::setViewport()
+{
+    const double width = backScreen_->width() * TwipsPerInch / control_.logicalDpiX();
+    const double height = backScreen_->height() * TwipsPerInch / control_.logicalDpiY();
+    MemberCalls::endQuietly([&] {
+        canvas_.setViewport(roundToInt32(width), roundToInt32(height));
+        canvas_.OnDraw();
+    });
+    viewChanged();
+}
+
+void CanvasAreas::viewChanged()
+{
+    if (isPainting_)
+        return;
+    startIcon_->setVisible(!canvas_.view().baseVisible && !canvas_.isBuilding());
+    showBars();
+    showCursor();
+    showSurfaces();
+}
+
+void CanvasAreas::progressChanged() { progress_->showProgress(canvas_.progress()); }
+
+void CanvasAreas::showBars()
+{
+    showBar(*Hbar_, canvas_.view().Hbar);
+    showBar(*Vbar_, canvas_.view().Vbar);
+}
+
+void CanvasAreas::showCursor()
+{
+    if (showsHand_ == canvas_.view().pan)
+        return;
+    showsHand_ = canvas_.view().pan;
+    backScreen_->setCursor(showsHand_ ? QCursor(hand_->pixmap()) : QCursor(Qt::ArrowCursor));
+}
+
+bool CanvasAreas::hasScale() const
+{
+    const double divisor = canvas_.view().divisor;
+    return divisor > 0 && std::isfinite(1 / divisor);
+}
+
+QSizeF CanvasAreas::pixelsPerTwip() const
+{
+    const double perTwip = 1 / (TwipsPerInch * canvas_.view().divisor);
+    return { control_.logicalDpiX() * perTwip, control_.logicalDpiY() * perTwip };
+}
+
+QRectF CanvasAreas::pageArea(int surface) const
+{
+    const QSizeF scale = pixelsPerTwip();
+    const Tpoint at = canvas_.view().surfaces[static_cast<std::size_t>(surface)];
+    return { at.x * scale.width(), at.y * scale.height(), canvas_.page.myWidth * scale.width(),
+        canvas_.page.myHeight * scale.height() };
+}
+
+std::vector<int> CanvasAreas::shownSurfaces() const
+{
+    if (!canvas_.view().baseVisible || !hasScale())
+        return {};
+    std::vector<int> shown = surfacesInView(canvas_.view(), canvas_.facts());
+    if (shown.empty() || shown.front() != 0)
+        shown.insert(shown.begin(), 0);
+    return shown;
+}
+
+/// Surfaces that went out of sight serve those that came into it.
+void CanvasAreas::showSurfaces()
+{
+    const std::vector<int> shown = shownSurfaces();
+    std::vector<PageSurface*> spare;
+    for (auto known = surfaces_.begin(); known != surfaces_.end();) {
+        const auto [index, surface] = *known;
+        if (index == 0 || std::ranges::binary_search(shown, index)) {
+            ++known;
+            continue;
+        }
+        spare.push_back(surface);
+        known = surfaces_.erase(known);
+    }
+    std::vector<QRect> areas;
+    for (const int index : shown) {
+        PageSurface& surface = surfaceFor(index, spare);
+        surface.place(pageArea(index));
+        surface.show();
+        surface.update();
+        areas.push_back(surface.geometry());
+    }
+    surfaces_.at(0)->setVisible(!shown.empty());
+    for (PageSurface* surface : spare) {
+        surface->hide();
+        surface->setObjectName({});
+        surface->deleteLater(); // it may be the one that a mouse button is being released over
+    }
+    backScreen_->setPages(std::move(areas));
+}
+
+PageSurface& CanvasAreas::surfaceFor(int index, std::vector<PageSurface*>& spare)
+{
+    PageSurface*& surface = surfaces_[index];
+    if (surface)
+        return *surface;
+    if (spare.empty()) {
+        surface = new PageSurface(*this, backScreen_);
+    } else {
+        surface = spare.back();
+        spare.pop_back();
+    }
+    surface->setIndex(index);
+    surface->raise();
+    return *surface;
+}
+
+void CanvasAreas::paintSurface(
+    int surface, QPainter& painter, QPointF origin, const QRect& exposed)
+{
+    if (canvas_.strSCliectRect == u"small" || !hasScale())
+        return;
+    passPaintThroughShowPage();
+    const auto page = pageOnSurface(canvas_.view(), canvas_.facts(), surface);
+    if (!page)
+        return;
+    const QSizeF scale = pixelsPerTwip();
+    painter.translate(origin);
+    painter.scale(scale.width(), scale.height());
+    replay(*page, painter, painter.transform().inverted().mapRect(QRectF(exposed)));
+}
+
+/// Every paint outside an arrangement goes through `showPage`: the mode becomes `One`. Where the
+/// page was to be centred the areas follow after the paint, so that no paint asks for another.
+void CanvasAreas::passPaintThroughShowPage()
+{
+    if (canvas_.view().multiPage)
+        return;
+    const Tpoint before = canvas_.view().offset;
+    isPainting_ = true;
+    MemberCalls::endQuietly([&] { canvas_.showPage(); });
+    isPainting_ = false;
+    if (canvas_.view().offset != before)
+        QMetaObject::invokeMethod(&control_, [this] { viewChanged(); }, Qt::QueuedConnection);
+}
+
+void CanvasAreas::replay(int page, QPainter& painter, const QRectF& visible)
+{
+    const ViewState& view = canvas_.view();
+    const PageRect part { wholeTwips(std::floor(visible.left())),
+        wholeTwips(std::floor(visible.top())), wholeTwips(std::ceil(visible.right())),
+        wholeTwips(std::ceil(visible.bottom())) };
+    QtDrawingSurface target(
+        painter, fonts_, { .divisor = view.divisor, .page = {}, .visible = visible });
+    ReplayOptions options { .divisor = view.divisor, .fillPageCount = !showsPageWindow(view) };
+    options.visible = part;
+    MemberCalls::endQuietly(
+        [&] { PageRenderer(canvas_.document()).replay(page, options, target); });
+}
+
+/// A mouse over a page always switches pan mode on.
+void CanvasAreas::mouseMoved()
+{
+    if (!canvas_.view().pan)
+        canvas_.mouseMove();
+}
+
+void CanvasAreas::mousePressed(Qt::MouseButton button, QPointF at)
+{
+    if (button == Qt::RightButton)
+        rightButton_.pressed();
+    if (!hasScale())
+        return;
+    const QSizeF scale = pixelsPerTwip();
+    MemberCalls::endQuietly(
+        [&] { canvas_.mouseDown(at.x() / scale.width(), at.y() / scale.height()); });
+}
+
+void CanvasAreas::mouseReleased(Qt::MouseButton button, QPointF at)
+{
+    if (button == Qt::RightButton)
+        rightButton_.released();
+    if (!hasScale())
+        return;
+    const QSizeF scale = pixelsPerTwip();
+    MemberCalls::endQuietly(
+        [&] { canvas_.mouseUp(at.x() / scale.width(), at.y() / scale.height()); });
+}
+
+void CanvasAreas::wheel(QWheelEvent& event)
+{
+    const QPoint angle = event.angleDelta();
+    event.accept();
+    if (event.modifiers() & Qt::ControlModifier) {
+        wheelRest_ += angle.y();
+        const int clicks = wheelRest_ / QWheelEvent::DefaultDeltasPerStep;
+        wheelRest_ -= clicks * QWheelEvent::DefaultDeltasPerStep;
+        if (clicks != 0)
+            zoomAbout(std::pow(ZoomStep, clicks),
+                backScreen_->mapFrom(&control_, event.position()));
+        return;
+    }
+    const bool isAcross = std::abs(angle.x()) > std::abs(angle.y())
+        || (event.modifiers() & Qt::ShiftModifier);
+    QScrollBar* const bar = isAcross ? Hbar_ : Vbar_;
+    QWheelEvent passed(event.position(), event.globalPosition(), event.pixelDelta(), angle,
+        event.buttons(), event.modifiers() & ~Qt::ShiftModifier, event.phase(), event.inverted());
+    if (bar->isEnabled())
+        bar->event(&passed);
+}
+
+/// The bars move the pages, so that page and bar stay in step.
+void CanvasAreas::zoomAbout(double factor, QPointF at)
+{
+    const ViewState& view = canvas_.view();
+    if (!hasScale() || !view.baseVisible)
+        return;
+    const double present = 1 / static_cast<double>(view.divisor);
+    const double scale = std::clamp(present * factor, SmallestScale, LargestScale);
+    if ((factor > 1) != (scale > present))
+        return;
+    const QPointF twips(at.x() * TwipsPerInch / control_.logicalDpiX(),
+        at.y() * TwipsPerInch / control_.logicalDpiY());
+    const QPointF onPage(
+        twips.x() / present - view.offset.x, twips.y() / present - view.offset.y);
+    MemberCalls::endQuietly([&] {
+        canvas_.setDispScale(static_cast<float>(scale));
+        const double divisor = view.divisor;
+        const QPointF moved(twips.x() * divisor - onPage.x() - view.offset.x,
+            twips.y() * divisor - onPage.y() - view.offset.y);
+        if (view.Hbar.enabled)
+            canvas_.setHbar(barValueAfter(view.Hbar, view.previousHbar, moved.x()));
+        if (view.Vbar.enabled)
+            canvas_.setVbar(barValueAfter(view.Vbar, view.previousVbar, moved.y()));
+    });
+    viewChanged();
+}
+
+bool CanvasAreas::key(int key)
+{
+    for (const KeyRow& row : Keys) {
+        if (row.key != key)
+            continue;
+        QScrollBar* const bar = row.bar == Qt::Horizontal ? Hbar_ : Vbar_;
+        if (bar->isEnabled())
+            bar->triggerAction(row.action);
+        return true;
+    }
+    return false;
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,94 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "controls/canvas.h"
+#include "controls/qt/page_surface.h"
+#include "document/page_document.h"
+
+#include <functional>
+#include <map>
+#include <vector>
+
+class QLabel;
+class QScrollBar;
+
+namespace pelloric::qt {
+
+class BackScreen;
+class ProgressArea;
+class QtFonts;
+class StartIcon;
+
+/// The child areas of a canvas: shows what the canvas says, and hands on what people do.
+///
+/// There is a page surface for page surface 0 and for each that lies in the viewport; the others
+/// cost nothing, however many there are.
+class CanvasAreas final : public CanvasObserver, private SurfaceHost {
+public:
+    /// What the right mouse button tells the host.
+    struct RightButton {
+        std::function<void()> pressed;
+        std::function<void()> released;
+    };
+
+    /// @param control  the areas become its children; borrowed
+    /// @param canvas   borrowed
+    /// @param fonts    what pages are painted with; borrowed
+    CanvasAreas(QWidget& control, Canvas& canvas, QtFonts& fonts, RightButton rightButton);
+    ~CanvasAreas() override;
+    CanvasAreas(const CanvasAreas&) = delete;
+    CanvasAreas& operator=(const CanvasAreas&) = delete;
+
+    /// Fills the control with its areas and lays the pages out in the viewport.
+    /// @param edge  what stays free around them: pixels
+    void fill(int edge);
+
+    /// Scrolls by the wheel; with the control key zooms about the pointer.
+    void wheel(QWheelEvent& event);
+
+    /// Scrolls by a key. @return whether the key has a meaning
+    bool key(int key);
+
+    void viewChanged() override;
+    void progressChanged() override;
+
+private:
+    void paintSurface(
+        int surface, QPainter& painter, QPointF origin, const QRect& exposed) override;
+    void mouseMoved() override;
+    void mousePressed(Qt::MouseButton button, QPointF at) override;
+    void mouseReleased(Qt::MouseButton button, QPointF at) override;
+
+    QScrollBar* makeBar(Qt::Orientation orientation, const char* name);
+    void setViewport();
+    void showBars();
+    void showCursor();
+    void showSurfaces();
+    std::vector<int> shownSurfaces() const;
+    PageSurface& surfaceFor(int index, std::vector<PageSurface*>& spare);
+    bool hasScale() const;
+    QSizeF pixelsPerTwip() const;
+    QRectF pageArea(int surface) const;
+    void passPaintThroughShowPage();
+    void replay(int page, QPainter& painter, const QRectF& visible);
+    void zoomAbout(double factor, QPointF at);
+
+    QWidget& control_;
+    Canvas& canvas_;
+    QtFonts& fonts_;
+    RightButton rightButton_;
+    BackScreen* backScreen_;
+    StartIcon* startIcon_;
+    ProgressArea* progress_;
+    QLabel* hand_;
+    QScrollBar* Hbar_;
+    QScrollBar* Vbar_;
+    std::map<int, PageSurface*> surfaces_; ///< those that exist; 0 is always there
+    bool isPainting_ = false;
+    bool showsHand_ = false;
+    int wheelRest_ = 0; ///< eighths of a degree that are no zoom step yet
+};
+
+} // namespace pelloric::qt

@@ -1,0 +1,81 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "controls/qt/member_calls.h"
+
+#include "controls/messages.h"
+#include "platform/platform.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "platform/services.h"
+
+#include <QJSEngine>
+#include <QObject>
+
+namespace pelloric::qt {
+
+namespace {
+
+QJSValue::ErrorType scriptError(ErrorNumber number)
+{
+    switch (number) {
+    case ErrorNumber::Overflow:
+    case ErrorNumber::SubscriptOutOfRange:
+        return QJSValue::RangeError;
+    case ErrorNumber::TypeMismatch:
+        return QJSValue::TypeError;
+    default:
+        return QJSValue::GenericError;
+    }
+}
+
+void throwInScript(QJSEngine& engine, const RunTimeError& error)
+{
+    QJSValue thrown = engine.newErrorObject(scriptError(error.number()), toQString(error.text()));
+    thrown.setProperty(QStringLiteral("number"), static_cast<int>(error.number()));
+    engine.throwError(thrown);
+}
+
+} // namespace
+
+MemberCalls::MemberCalls(QObject& control, Platform& platform)
+    : control_(control)
+    , platform_(platform)
+{
+}
+
+void MemberCalls::run(const std::function<void()>& member)
+{
+    try {
+        member();
+    } catch (const RunTimeError& error) {
+        report(error);
+    } catch (const std::exception& error) {
+        report(RunTimeError(ErrorNumber::InvalidCall, fromUtf8(error.what())));
+    }
+}
+
+void MemberCalls::endQuietly(const std::function<void()>& step)
+{
+    try {
+        step();
+    } catch (const std::exception&) {
+        // The step is over; what it had done by then stays.
+    }
+}
+
+void MemberCalls::refuseRead(const char* name)
+{
+    if (QJSEngine* const engine = qjsEngine(&control_))
+        throwInScript(*engine, RunTimeError(ErrorNumber::NoSuchMember, fromUtf8(name)));
+}
+
+void MemberCalls::report(const RunTimeError& error)
+{
+    if (QJSEngine* const engine = qjsEngine(&control_))
+        throwInScript(*engine, error);
+    else
+        platform_.messages.show(messageOf(error));
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,45 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <functional>
+
+class QObject;
+
+namespace pelloric {
+
+class RunTimeError;
+struct Platform;
+
+} // namespace pelloric
+
+namespace pelloric::qt {
+
+/// The trap that every published member of a control runs under.
+///
+/// An error that reaches it ends there: as an error of the script when the control
+/// belongs to a script engine, else as one message box.
+class MemberCalls {
+public:
+    /// @param control   whose members they are; borrowed
+    /// @param platform  has the message boxes; borrowed
+    MemberCalls(QObject& control, Platform& platform);
+
+    /// Runs a member that the host calls; nothing leaves it.
+    void run(const std::function<void()>& member);
+
+    /// Runs a step that nobody waits for, as a window's events are; its error ends it without a word.
+    static void endQuietly(const std::function<void()>& step);
+
+    /// Refuses to read a property that can only be written: a script gets an error.
+    void refuseRead(const char* name);
+
+private:
+    void report(const RunTimeError& error);
+
+    QObject& control_;
+    Platform& platform_;
+};
+
+} // namespace pelloric::qt

@@ -1,0 +1,122 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "controls/qt/published_values.h"
+
+#include "platform/numbers.h"
+#include "platform/qt/grid_for.h"
+#include "platform/qt/held_value.h"
+#include "platform/qt/qt_text.h"
+#include "platform/qt/script_object.h"
+#include "platform/run_time_error.h"
+
+#include <QJSValue>
+#include <QObject>
+
+#include <cmath>
+#include <limits>
+
+namespace pelloric::qt {
+
+namespace {
+
+[[noreturn]] void refuseType() { throw RunTimeError(ErrorNumber::TypeMismatch); }
+
+bool isScriptValue(const QVariant& argument)
+{
+    return argument.metaType() == QMetaType::fromType<QJSValue>();
+}
+
+/// What a script handed over, as a plain variant.
+QVariant plain(const QVariant& argument)
+{
+    return isScriptValue(argument) ? argument.value<QJSValue>().toVariant() : argument;
+}
+
+/// Numbers, truth values and texts; an object, a list or nothing at all is refused.
+Value simple(const QVariant& argument, HeldValue& held)
+{
+    const QVariant value = plain(argument);
+    switch (value.typeId()) {
+    case QMetaType::Bool:
+    case QMetaType::Char:
+    case QMetaType::SChar:
+    case QMetaType::UChar:
+    case QMetaType::Short:
+    case QMetaType::UShort:
+    case QMetaType::Int:
+    case QMetaType::UInt:
+    case QMetaType::Long:
+    case QMetaType::ULong:
+    case QMetaType::LongLong:
+    case QMetaType::ULongLong:
+    case QMetaType::Float:
+    case QMetaType::Double:
+    case QMetaType::QString:
+        return held.hold(value);
+    default:
+        break;
+    }
+    if (value.metaType().flags() & QMetaType::IsEnumeration)
+        return Value::ofNumber(value.toInt());
+    refuseType();
+}
+
+double numberOf(const QVariant& argument)
+{
+    HeldValue held;
+    const Value value = simple(argument, held);
+    if (value.kind() == ValueKind::Text && !isNumber(value.text()))
+        refuseType();
+    return value.toNumber();
+}
+
+} // namespace
+
+std::int16_t toInt16(const QVariant& argument) { return roundToInt16(numberOf(argument)); }
+
+std::int32_t toInt32(const QVariant& argument) { return roundToInt32(numberOf(argument)); }
+
+float toSingle(const QVariant& argument)
+{
+    const double number = numberOf(argument);
+    if (!(std::abs(number) <= static_cast<double>(std::numeric_limits<float>::max())))
+        throw RunTimeError(ErrorNumber::Overflow);
+    return static_cast<float>(number);
+}
+
+bool toTruth(const QVariant& argument)
+{
+    HeldValue held;
+    const Value value = simple(argument, held);
+    if (value.kind() == ValueKind::Text && (value.text() == u"True" || value.text() == u"False"))
+        return value.text() == u"True";
+    return numberOf(argument) != 0;
+}
+
+QString toPlainText(const QVariant& argument)
+{
+    HeldValue held;
+    Text buffer;
+    return toQString(displayText(simple(argument, held), u'.', buffer));
+}
+
+std::unique_ptr<AutomationObject> toGrid(const QVariant& argument)
+{
+    if (isScriptValue(argument)) {
+        const auto value = argument.value<QJSValue>();
+        if (!value.isQObject())
+            return objectOfScript(value);
+    }
+    const QVariant value = plain(argument);
+    if (value.typeId() == QMetaType::Nullptr)
+        throw RunTimeError(ErrorNumber::ObjectMissing);
+    if (!(value.metaType().flags() & QMetaType::PointerToQObject))
+        refuseType();
+    auto* const object = value.value<QObject*>();
+    if (!object)
+        throw RunTimeError(ErrorNumber::ObjectMissing);
+    return gridFor(*object);
+}
+
+} // namespace pelloric::qt
