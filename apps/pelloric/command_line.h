@@ -1,0 +1,87 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <QCommandLineParser>
+#include <QString>
+#include <QStringList>
+
+#include <initializer_list>
+#include <span>
+#include <stdexcept>
+
+namespace pelloric {
+class RunTimeError;
+}
+
+namespace pelloric::app {
+
+/// Exit statuses of the program; a signal that ends it gives 128 and the signal's number.
+enum ExitStatus { Done = 0, Failed = 1, WrongUsage = 2, SignalBase = 128 };
+
+/// An error for the person who called the program: one line that says what to do.
+class CommandError : public std::runtime_error {
+public:
+    explicit CommandError(const QString& text, int status = Failed)
+        : std::runtime_error(text.toStdString())
+        , status_(status)
+    {
+    }
+
+    /// What the program ends with.
+    int status() const { return status_; }
+
+private:
+    int status_;
+};
+
+/// An option of a command.
+struct Option {
+    const char* name; ///< without the dashes; one letter or a word
+    const char* value; ///< what stands for its value in the help; null: it takes none
+    const char* help;
+};
+
+using OptionTable = std::span<const Option>;
+
+/// The arguments of a command, taken apart.
+class CommandLine {
+public:
+    /// @param files  how many arguments that are no options are needed
+    /// @throws CommandError WrongUsage: unknown options, missing values, another number of files
+    CommandLine(
+        const QStringList& arguments, std::initializer_list<OptionTable> tables, int files);
+
+    bool has(const char* option) const;
+
+    /// The value of an option, the last one given; empty when it was not given.
+    QString value(const char* option) const;
+
+    QString file(int number) const { return parser_.positionalArguments().at(number); }
+
+private:
+    QCommandLineParser parser_;
+};
+
+/// The value of an option as a number.
+/// @param isWhole  whether fractions are refused
+/// @throws CommandError WrongUsage: it is none, or outside the bounds
+double numberOf(const char* option, const QString& text, double least, double most, bool isWhole);
+
+/// One line of help for each option, in columns.
+QString optionHelp(OptionTable options);
+
+/// What an error says besides its number's text.
+QString detailOf(const RunTimeError& error);
+
+/// The one line that tells a person about an error.
+QString describe(const RunTimeError& error);
+
+/// Writes "pelloric: " and the text as one line to standard error.
+void tell(const QString& text);
+
+/// Writes a text to standard output.
+void print(const QString& text);
+
+} // namespace pelloric::app

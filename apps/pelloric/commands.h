@@ -1,0 +1,42 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <QStringList>
+
+#include <span>
+
+namespace pelloric::app {
+
+/// How the program was called.
+struct Invocation {
+    int& argc; ///< for the application object
+    char** argv; ///< for the application object
+    QStringList arguments; ///< what stands behind the command's name
+};
+
+/// One of the things that the program can do.
+struct Command {
+    const char* name;
+    const char* synopsis; ///< what stands behind the name
+    const char* summary; ///< one line
+    int (*run)(const Invocation& invocation); ///< answers the exit status; may throw
+    QString (*details)() = nullptr; ///< the rest of the command's help; may be missing
+};
+
+/// All commands, in the order in which they are listed.
+std::span<const Command> commands();
+
+/// `pelloric export`: a table or a document as PDF, images or a document file; needs no display.
+int runExport(const Invocation& invocation);
+QString exportDetails();
+
+/// `pelloric settings`: shows or restores the settings file; needs no display.
+int runSettings(const Invocation& invocation);
+QString settingsDetails();
+
+/// `pelloric help`: all commands, or one of them at length.
+int runHelp(const Invocation& invocation);
+
+} // namespace pelloric::app

@@ -1,0 +1,106 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "command_line.h"
+#include "commands.h"
+#include "interruption.h"
+#include "platform/run_time_error.h"
+
+#include <QCoreApplication>
+#include <QFile>
+
+#include <array>
+#include <new>
+
+namespace pelloric::app {
+
+namespace {
+
+constexpr auto Commands = std::to_array<Command>({
+    { "export", "FILE -o OUT", "Writes a table as PDF, PNG, SVG or a document file",
+        runExport, exportDetails },
+    { "settings", "", "Shows or restores the settings file", runSettings, settingsDetails },
+    { "help", "[COMMAND]", "Explains the commands", runHelp },
+});
+
+bool asksForHelp(const QString& argument)
+{
+    return argument == QLatin1String("--help") || argument == QLatin1String("-h");
+}
+
+int runCommand(const Command& command, Invocation invocation)
+{
+    for (const QString& argument : invocation.arguments) {
+        if (argument == QLatin1String("--"))
+            break;
+        if (asksForHelp(argument)) {
+            invocation.arguments = { QString::fromLatin1(command.name) };
+            return runHelp(invocation);
+        }
+    }
+    return command.run(invocation);
+}
+
+int run(Invocation invocation)
+{
+    if (invocation.arguments.isEmpty())
+        throw CommandError(
+            QStringLiteral("say what to do, for example \"pelloric export table.csv -o "
+                           "table.pdf\"; see \"pelloric help\""),
+            WrongUsage);
+    const QString name = invocation.arguments.takeFirst();
+    if (name == QLatin1String("--version")) {
+        print(QStringLiteral("pelloric " PELLORIC_VERSION "\n"));
+        return Done;
+    }
+    for (const Command& command : Commands) {
+        if (name == QLatin1String(command.name))
+            return runCommand(command, invocation);
+    }
+    if (asksForHelp(name))
+        return runHelp({ invocation.argc, invocation.argv, {} });
+    throw CommandError(
+        QStringLiteral("no command %1; see \"pelloric help\"").arg(name), WrongUsage);
+}
+
+QStringList argumentsOf(int argc, char** argv)
+{
+    QStringList arguments;
+    for (int at = 1; at < argc; ++at)
+        arguments.append(QFile::decodeName(argv[at]));
+    return arguments;
+}
+
+int statusOf(const RunTimeError& error)
+{
+    if (error.number() == ErrorNumber::Cancelled && Interruption::signal() != 0)
+        return SignalBase + Interruption::signal();
+    tell(describe(error));
+    return Failed;
+}
+
+/// Runs the program; every error becomes one line and an exit status.
+int guardedRun(int argc, char** argv)
+{
+    try {
+        return run({ argc, argv, argumentsOf(argc, argv) });
+    } catch (const CommandError& error) {
+        tell(QString::fromUtf8(error.what()));
+        return error.status();
+    } catch (const RunTimeError& error) {
+        return statusOf(error);
+    } catch (const std::bad_alloc&) {
+        tell(QStringLiteral("there is not enough memory for this table"));
+    } catch (const std::exception& error) {
+        tell(QString::fromUtf8(error.what()));
+    }
+    return Failed;
+}
+
+} // namespace
+
+std::span<const Command> commands() { return Commands; }
+
+} // namespace pelloric::app
+
+int main(int argc, char** argv) { return pelloric::app::guardedRun(argc, argv); }

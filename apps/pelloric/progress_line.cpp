@@ -1,0 +1,75 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "progress_line.h"
+
+#include <algorithm>
+#include <cstdio>
+
+#ifdef Q_OS_WIN
+#include <io.h>
+#else
+#include <unistd.h>
+#endif
+
+namespace pelloric::app {
+
+namespace {
+
+constexpr qint64 MillisecondsBetween = 100;
+constexpr char BackToStart[] = "\r\033[K"; ///< and clears the line
+
+bool isTerminal()
+{
+#ifdef Q_OS_WIN
+    return _isatty(_fileno(stderr)) != 0;
+#else
+    return isatty(fileno(stderr)) != 0;
+#endif
+}
+
+} // namespace
+
+ProgressLine::ProgressLine()
+    : isTerminal_(isTerminal())
+{
+    sinceShown_.start();
+}
+
+ProgressLine::~ProgressLine() { clear(); }
+
+void ProgressLine::show(const char* work, double part)
+{
+    if (!isTerminal_ || sinceShown_.elapsed() < MillisecondsBetween)
+        return;
+    sinceShown_.restart();
+    const int percent = static_cast<int>(std::clamp(part, 0.0, 1.0) * 100);
+    std::fprintf(stderr, "%s%s %d %%", BackToStart, work, percent);
+    isShown_ = true;
+}
+
+void ProgressLine::clear()
+{
+    if (isShown_)
+        std::fputs(BackToStart, stderr);
+    isShown_ = false;
+}
+
+LayoutProgress::LayoutProgress(Canvas& canvas, ProgressLine& line)
+    : canvas_(canvas)
+    , line_(line)
+{
+    canvas_.observe(this);
+}
+
+LayoutProgress::~LayoutProgress() { canvas_.observe(nullptr); }
+
+void LayoutProgress::progressChanged()
+{
+    const ProgressBar& bar = canvas_.progress();
+    if (bar.visible && bar.maximum > 0)
+        line_.show(
+            "Laying out", static_cast<double>(bar.value) / static_cast<double>(bar.maximum));
+}
+
+} // namespace pelloric::app

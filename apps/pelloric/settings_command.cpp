@@ -1,0 +1,70 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "command_line.h"
+#include "commands.h"
+#include "headless.h"
+#include "platform/platform.h"
+#include "platform/qt/qt_platform.h"
+#include "platform/qt/qt_text.h"
+#include "platform/text_codec.h"
+#include "settings/default_settings.h"
+#include "settings/file_bytes.h"
+#include "settings/settings_file.h"
+#include "view/qt/pending_files.h"
+
+#include <QFile>
+
+#include <array>
+
+namespace pelloric::app {
+
+namespace {
+
+constexpr auto Options = std::to_array<Option>({
+    { "path", nullptr, "only say where the file is" },
+    { "reset", nullptr, "put the default settings back" },
+});
+
+void reset(const Platform& platform)
+{
+    std::string bytes;
+    platform.codec.encode(defaultSettingsText(), bytes);
+    qt::PendingFiles files;
+    const auto size = static_cast<qint64>(bytes.size());
+    files.write(settingsPath(platform),
+        [&](QFile& file) { return file.write(bytes.data(), size) == size; });
+    files.putInPlace();
+}
+
+QString settingsText(const Platform& platform)
+{
+    QString text = qt::toQString(readSettingsText(platform));
+    text.remove(QLatin1Char('\r'));
+    return text.mid(1); // the line end that the text begins with
+}
+
+} // namespace
+
+int runSettings(const Invocation& invocation)
+{
+    const CommandLine line(invocation.arguments, { Options }, 0);
+    const HeadlessApplication application(invocation);
+    qt::QtPlatform platform;
+    const Platform record = platform.record();
+    const QString path = qt::toQString(pathText(settingsPath(record)));
+    if (line.has("path")) {
+        print(path + QLatin1Char('\n'));
+        return Done;
+    }
+    deployDefaultSettings(record);
+    if (line.has("reset"))
+        reset(record);
+    else
+        print(settingsText(record));
+    return Done;
+}
+
+QString settingsDetails() { return optionHelp(Options); }
+
+} // namespace pelloric::app

@@ -1,0 +1,127 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "table_source.h"
+
+#include "interruption.h"
+#include "platform/qt/csv_table.h"
+#include "platform/qt/qt_text.h"
+#include "platform/qt/sqlite_table.h"
+#include "platform/run_time_error.h"
+#include "progress_line.h"
+
+#include <QFile>
+#include <QFileInfo>
+
+#include <array>
+
+namespace pelloric::app {
+
+namespace {
+
+constexpr auto Options = std::to_array<Option>({
+    { "query", "SQL", "what to take of a database: a SELECT statement" },
+    { "encoding", "NAME", "of a CSV or TSV file; else found out (UTF-8, GB18030)" },
+});
+
+constexpr char DatabaseMark[] = "SQLite format 3";
+
+bool isDatabase(const QString& name)
+{
+    QFile file(name);
+    return QFileInfo(name).isFile() && file.open(QIODevice::ReadOnly)
+        && file.read(sizeof DatabaseMark - 1) == DatabaseMark;
+}
+
+/// A database file and one of its tables; no table when the name is all file.
+struct DatabaseName {
+    QString file;
+    QString table;
+};
+
+DatabaseName splitName(const QString& name)
+{
+    if (QFileInfo::exists(name))
+        return { name, {} };
+    const auto colon = name.lastIndexOf(QLatin1Char(':'));
+    const QString file = name.left(colon);
+    if (colon > 0 && QFileInfo(file).isFile())
+        return { file, name.mid(colon + 1) };
+    return { name, {} };
+}
+
+void checkReadable(const QString& name)
+{
+    const QFileInfo info(name);
+    if (!info.exists())
+        throw CommandError(QStringLiteral("%1: there is no such file").arg(name));
+    if (info.isDir())
+        throw CommandError(QStringLiteral("%1 is a folder; name a file in it").arg(name));
+    if (!info.isReadable())
+        throw CommandError(QStringLiteral("%1: you may not read this file").arg(name));
+}
+
+TableGrid readDatabase(const DatabaseName& name, const CommandLine& line, ProgressLine& progress)
+{
+    if (line.has("encoding"))
+        throw CommandError(
+            QStringLiteral("--encoding is for CSV and TSV files, not databases"), WrongUsage);
+    if (line.has("query") && !name.table.isEmpty())
+        throw CommandError(
+            QStringLiteral("take either a table or --query, not both"), WrongUsage);
+    qt::SqliteSource source;
+    source.path = pathOf(name.file);
+    source.table = name.table;
+    source.query = line.value("query");
+    source.progress = [&](std::int64_t) {
+        progress.show("Reading", 0);
+        return Interruption::mayGoOn();
+    };
+    return qt::readSqlite(source);
+}
+
+TableGrid readValues(const QString& name, const CommandLine& line, ProgressLine& progress)
+{
+    if (line.has("query"))
+        throw CommandError(QStringLiteral("--query is for databases; %1 is none").arg(name));
+    const auto step = [&](double part) {
+        progress.show("Reading", part);
+        return Interruption::mayGoOn();
+    };
+    return qt::readCsv(pathOf(name), { .encoding = line.value("encoding"), .progress = step });
+}
+
+} // namespace
+
+OptionTable sourceOptions() { return Options; }
+
+std::filesystem::path pathOf(const QString& name) { return qt::toText(name); }
+
+bool isDocumentName(const QString& name)
+{
+    return name.endsWith(QLatin1String(".ostl"), Qt::CaseInsensitive);
+}
+
+QString plainName(const QString& name)
+{
+    return QFileInfo(splitName(name).file).completeBaseName();
+}
+
+TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& progress)
+{
+    const DatabaseName name = splitName(file);
+    checkReadable(name.file);
+    const bool isFromDatabase = isDatabase(name.file);
+    if (!isFromDatabase && !name.table.isEmpty())
+        throw CommandError(QStringLiteral("%1 is no SQLite database").arg(name.file));
+    try {
+        return isFromDatabase ? readDatabase(name, line, progress)
+                              : readValues(name.file, line, progress);
+    } catch (const RunTimeError& error) {
+        if (error.number() == ErrorNumber::Cancelled)
+            throw;
+        throw CommandError(QStringLiteral("%1: %2").arg(name.file, detailOf(error)));
+    }
+}
+
+} // namespace pelloric::app

@@ -1,0 +1,32 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "command_line.h"
+#include "platform/table_grid.h"
+
+#include <filesystem>
+
+namespace pelloric::app {
+
+class ProgressLine;
+
+/// The options that say what is read of a file, for every command that reads tables.
+OptionTable sourceOptions();
+
+/// A path as the person wrote it.
+std::filesystem::path pathOf(const QString& name);
+
+/// Whether a name is that of a document file.
+bool isDocumentName(const QString& name);
+
+/// What a name says without its folder and extension.
+QString plainName(const QString& name);
+
+/// Reads the table that a command's file and options name: a CSV or TSV file, or a table
+/// ("db.sqlite:table") or query of an SQLite database.
+/// @throws CommandError naming the file; RunTimeError Cancelled
+TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& progress);
+
+} // namespace pelloric::app

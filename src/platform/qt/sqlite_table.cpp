@@ -1,0 +1,163 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "platform/qt/sqlite_table.h"
+
+#include "platform/qt/held_value.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "settings/file_bytes.h"
+
+#include <QSqlDatabase>
+#include <QSqlError>
+#include <QSqlQuery>
+#include <QSqlRecord>
+#include <QStringList>
+#include <QUuid>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr std::int64_t RowsPerReport = 1024;
+
+[[noreturn]] void refuse(const QString& what)
+{
+    throw RunTimeError(ErrorNumber::InvalidCall, toText(what));
+}
+
+/// A connection of its own to a database file, for reading only.
+class Connection {
+public:
+    explicit Connection(const std::filesystem::path& path)
+        : name_(QUuid::createUuid().toString())
+        , database_(QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), name_))
+    {
+        database_.setConnectOptions(QStringLiteral("QSQLITE_OPEN_READONLY"));
+        database_.setDatabaseName(toQString(pathText(path)));
+    }
+
+    ~Connection()
+    {
+        database_.close();
+        database_ = QSqlDatabase();
+        QSqlDatabase::removeDatabase(name_);
+    }
+
+    Connection(const Connection&) = delete;
+    Connection& operator=(const Connection&) = delete;
+
+    QSqlDatabase& database() { return database_; }
+
+private:
+    QString name_;
+    QSqlDatabase database_;
+};
+
+/// Tables and views in their order; a file that is no database has none and an error.
+QStringList tablesOf(const QSqlDatabase& database, const std::filesystem::path& path)
+{
+    QSqlQuery query(database);
+    const QString statement = QStringLiteral("SELECT name FROM sqlite_master WHERE type IN "
+                                             "('table', 'view') AND name NOT LIKE 'sqlite\\_%' "
+                                             "ESCAPE '\\' ORDER BY name");
+    if (!query.exec(statement))
+        throw RunTimeError(ErrorNumber::FileNotFound, pathText(path) + u" is no SQLite database");
+    QStringList names;
+    while (query.next())
+        names.append(query.value(0).toString());
+    return names;
+}
+
+QString chosenTable(const SqliteSource& source, const QStringList& tables)
+{
+    const QString list = tables.isEmpty() ? QStringLiteral("none")
+                                          : tables.join(QStringLiteral(", "));
+    if (source.table.isEmpty()) {
+        if (tables.size() != 1)
+            refuse(QStringLiteral("name one of the database's tables: ") + list);
+        return tables.front();
+    }
+    if (!tables.contains(source.table, Qt::CaseInsensitive))
+        refuse(QStringLiteral("no table %1; the database has: %2").arg(source.table, list));
+    return source.table;
+}
+
+QString quoted(QString name)
+{
+    name.replace(QLatin1Char('"'), QLatin1String("\"\""));
+    return QLatin1Char('"') + name + QLatin1Char('"');
+}
+
+TableGrid gridOf(const QSqlRecord& record)
+{
+    std::vector<TableColumn> columns;
+    for (int field = 0; field < record.count(); ++field)
+        columns.push_back({ .title = toText(record.fieldName(field)), .width = -1 });
+    return TableGrid(std::move(columns));
+}
+
+/// The texts of a row, each kept until the next row.
+class RowTexts {
+public:
+    RowTexts(int fields, char16_t separator)
+        : held_(static_cast<std::size_t>(fields))
+        , buffers_(held_.size())
+        , cells_(held_.size())
+        , separator_(separator)
+    {
+    }
+
+    const std::vector<TextView>& read(const QSqlQuery& query)
+    {
+        for (std::size_t field = 0; field < cells_.size(); ++field) {
+            const Value value = held_[field].hold(query.value(static_cast<int>(field)));
+            cells_[field] = displayText(value, separator_, buffers_[field]);
+        }
+        return cells_;
+    }
+
+private:
+    std::vector<HeldValue> held_;
+    std::vector<Text> buffers_;
+    std::vector<TextView> cells_;
+    char16_t separator_;
+};
+
+TableGrid readRows(const SqliteSource& source, QSqlQuery& query)
+{
+    TableGrid grid = gridOf(query.record());
+    RowTexts texts(grid.columnCount(), source.decimalSeparator);
+    while (query.next()) {
+        grid.addRow(texts.read(query));
+        const std::int64_t rows = grid.rowCount();
+        if (rows % RowsPerReport == 0 && source.progress && !source.progress(rows))
+            throw RunTimeError(ErrorNumber::Cancelled);
+    }
+    if (query.lastError().isValid())
+        refuse(query.lastError().databaseText());
+    return grid;
+}
+
+} // namespace
+
+TableGrid readSqlite(const SqliteSource& source)
+{
+    std::error_code ignored;
+    Connection connection(source.path);
+    if (!std::filesystem::is_regular_file(source.path, ignored) || !connection.database().open())
+        throw RunTimeError(ErrorNumber::FileNotFound, pathText(source.path));
+    const QStringList tables = tablesOf(connection.database(), source.path);
+    const QString statement = source.query.isEmpty()
+        ? QStringLiteral("SELECT * FROM ") + quoted(chosenTable(source, tables))
+        : source.query;
+    QSqlQuery query(connection.database());
+    query.setForwardOnly(true);
+    if (!query.exec(statement))
+        refuse(query.lastError().databaseText());
+    if (!query.isSelect() || query.record().isEmpty())
+        refuse(QStringLiteral("the statement answers no rows; give a SELECT"));
+    return readRows(source, query);
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,101 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "report/content_widths.h"
+
+#include "document/cell_lines.h"
+#include "platform/numbers.h"
+#include "platform/table_grid.h"
+#include "platform/text_metrics.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace pelloric {
+
+namespace {
+
+constexpr std::int64_t MeasuredRows = 10000;
+constexpr Twips Clearance = 40; ///< what stays free beside the longest text: twips
+
+/// A column narrower than this is not narrowed further to make a table fit: twips.
+constexpr Twips ReadableWidth = 1200;
+
+/// The advance of the longest line of a text at size 1.
+double longestLine(TextView text, FaceMetrics& face)
+{
+    double longest = 0;
+    while (!text.empty()) {
+        const TextView line = text.substr(0, text.find(u'\n'));
+        longest = std::max(longest, face.advanceOf(trimmed(line)));
+        text.remove_prefix(std::min(text.size(), line.size() + 1));
+    }
+    return longest;
+}
+
+/// The row whose text in a column has the most code units.
+std::int64_t longestRow(const TableGrid& grid, int column)
+{
+    std::int64_t longest = 0;
+    std::size_t most = 0;
+    for (std::int64_t row = 0; row < grid.rowCount(); ++row) {
+        const std::size_t length = grid.cell(row, column).size();
+        if (length > most) {
+            most = length;
+            longest = row;
+        }
+    }
+    return longest;
+}
+
+double longestAdvance(const TableGrid& grid, int column, FaceMetrics& face)
+{
+    double longest = longestLine(grid.column(column).title, face);
+    const std::int64_t rows = grid.rowCount();
+    const std::int64_t step = std::max<std::int64_t>(1, (rows + MeasuredRows - 1) / MeasuredRows);
+    for (std::int64_t row = 0; row < rows; row += step)
+        longest = std::max(longest, longestLine(grid.cell(row, column), face));
+    if (step > 1)
+        longest = std::max(longest, longestLine(grid.cell(longestRow(grid, column), column), face));
+    return longest;
+}
+
+/// The width that no column may exceed for all of them to fit in the room.
+double capFor(std::vector<Twips> widths, Twips room)
+{
+    std::ranges::sort(widths);
+    double left = room;
+    for (std::size_t at = 0; at < widths.size(); ++at) {
+        const double share = left / static_cast<double>(widths.size() - at);
+        if (widths[at] > share)
+            return share;
+        left -= widths[at];
+    }
+    return room;
+}
+
+} // namespace
+
+std::vector<Twips> contentWidths(const TableGrid& grid, FaceMetrics& body, float size)
+{
+    constexpr double Least = NarrowestContent;
+    constexpr double Most = WidestContent;
+    std::vector<Twips> widths;
+    for (int column = 0; column < grid.columnCount(); ++column) {
+        const double advance = longestAdvance(grid, column, body);
+        const double text = std::ceil(advance * std::max(0.0, static_cast<double>(size)));
+        widths.push_back(roundToInt32(std::clamp(text + CellPadding + Clearance, Least, Most)));
+    }
+    return widths;
+}
+
+void fitWidths(std::span<Twips> widths, Twips room)
+{
+    const double cap = std::floor(capFor({ widths.begin(), widths.end() }, room));
+    if (cap < ReadableWidth)
+        return;
+    for (Twips& width : widths)
+        width = std::min(width, roundToInt32(cap));
+}
+
+} // namespace pelloric

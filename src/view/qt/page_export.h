@@ -1,0 +1,68 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <filesystem>
+#include <functional>
+#include <vector>
+
+namespace pelloric {
+class PageDocument;
+struct OstlEncoding;
+struct PageSetup;
+}
+
+namespace pelloric::qt {
+
+class QtFonts;
+
+/// What an export takes of a document, and how.
+struct ExportOptions {
+    /// Zero-based pages in the order in which they are put out; empty: all of them.
+    std::vector<int> pages {};
+    int dpi = 150; ///< of images: pixels per inch, 1 or more
+    Text title {}; ///< of a PDF or SVG file
+    /// Told before each page how many are done; answers whether to go on. May be empty.
+    std::function<bool(int done, int total)> progress {};
+};
+
+/// Writes one PDF file: every page has exactly the paper's size, texts can be searched and copied,
+/// and of each font only the characters that are used are embedded.
+///
+/// Every `PageCountToken` is filled in, here and in the other exports. A file is written under
+/// another name beside its place and put there when all is whole, so that a failure leaves what
+/// there was.
+/// @throws RunTimeError WriteFailed, with the path; Cancelled: the progress said so;
+///         SubscriptOutOfRange: no such page; Overflow: a paper that is no size to write
+void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fonts,
+    const ExportOptions& options, const std::filesystem::path& path);
+
+/// Writes one PNG image on white for each page, "name-001.png" for page 1 at "name.png".
+///
+/// A single page is written to the path itself. A page that is asked for twice is written once.
+/// @return  the files in the order of the pages
+/// @throws RunTimeError as `exportPdf`; Overflow: also an image of more pixels than can be held
+std::vector<std::filesystem::path> exportPngs(const PageDocument& document,
+    const PageSetup& setup, QtFonts& fonts, const ExportOptions& options,
+    const std::filesystem::path& path);
+
+/// Writes one SVG file for each page, named as the images are; texts stay texts.
+///
+/// @return  the files in the order of the pages
+/// @throws RunTimeError as `exportPdf`
+std::vector<std::filesystem::path> exportSvg(const PageDocument& document,
+    const PageSetup& setup, QtFonts& fonts, const ExportOptions& options,
+    const std::filesystem::path& path);
+
+/// Writes a document file, which holds pages from the first on, 131 at most.
+///
+/// @param options  only the progress is looked at
+/// @throws RunTimeError WriteFailed, with the path; Cancelled
+void exportOstl(const PageDocument& document, const PageSetup& setup,
+    const OstlEncoding& encoding, const ExportOptions& options,
+    const std::filesystem::path& path);
+
+} // namespace pelloric::qt
