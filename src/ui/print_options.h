@@ -34,6 +34,27 @@ struct PrintEntries {
 std::variant<Message, PrintArguments> pressPrint(
     const PrinterSystem& printers, const PrintEntries& entries);
 
+/// The choices of the print options dialog besides what is typed.
+struct PrintChoices {
+    bool allPages = true;
+    Text pageList; ///< emptied when all pages are chosen
+    bool rangeEnabled = false; ///< the range box can be typed into
+
+    /// "All" was chosen.
+    void chooseAll();
+    /// "Range" was chosen.
+    void chooseRange();
+};
+
+/// The text of the copies box when the dialog opens.
+inline constexpr TextView InitialCopies = u"1";
+
+/// Makes the first printer whose trimmed device name is this text the current one, if there is one.
+void choosePrinter(PrinterSystem& printers, TextView text);
+
+/// What stays of a text that was typed into the copies box: digits and points.
+Text filteredCopies(TextView text);
+
 /// The text of the copies box after one of its buttons was pressed.
 ///
 /// Up adds one without end; down takes one off only while the number is above 0.

@@ -1,0 +1,139 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <array>
+#include <cstdint>
+#include <filesystem>
+#include <functional>
+
+namespace pelloric {
+
+class AutomationObject;
+class Canvas;
+enum class PrintObjKind : std::int16_t;
+enum class ToolAction;
+
+/// How far a dialog that rewrites settings was taken.
+enum class DialogEnd { Accepted, Cancelled };
+
+/// What a preview window does for its session: everything that needs a window of its own.
+class PreviewHost {
+public:
+    virtual ~PreviewHost() = default;
+
+    /// Shows the grid style dialog modally; OK has rewritten the settings file by then.
+    virtual DialogEnd showGridStyle() = 0;
+    /// Shows the page setup dialog modally; OK has rewritten the settings file by then.
+    virtual DialogEnd showPageSetup() = 0;
+    /// Shows the print options dialog modally; it prints through `PreviewSession::print`.
+    virtual void showPrintOptions() = 0;
+    /// Shows the about box modally.
+    virtual void showAbout() = 0;
+
+    /// Asks for a file to open.
+    /// @throws RunTimeError Cancelled
+    virtual std::filesystem::path chooseFileToOpen() = 0;
+    /// Asks for a file to save to.
+    /// @throws RunTimeError Cancelled
+    virtual std::filesystem::path chooseFileToSave() = 0;
+
+    /// Releases the toolbar and closes the window; the canvas is cleared by then.
+    virtual void unload() = 0;
+
+    /// The session's `state()` is another now: the window applies it without raising changes.
+    virtual void navigationChanged() = 0;
+};
+
+/// What the toolbar shows of a document.
+struct NavigationState {
+    bool first = false; ///< "The First Page" is enabled
+    bool previous = false;
+    bool next = false;
+    bool last = false;
+    Text pageBox; ///< text of the page combo
+    int pageEntries = 0; ///< the page combo lists pages 1 to this
+    Text scale; ///< text of the scale combo
+    Text countLabel; ///< beside the page combo
+
+    bool operator==(const NavigationState&) const = default;
+};
+
+/// The kind of grid that an object is, found by asking for its members.
+PrintObjKind gridKindOf(AutomationObject& grid);
+
+/// What the preview window's tools do with its canvas.
+///
+/// Commands and combo changes run under one error trap: an error ends the command quietly. While
+/// the canvas builds pages, which lets messages run, every command is refused without a word.
+class PreviewSession {
+public:
+    /// Lets the canvas paint from now on.
+    /// @param canvas  outlives the session
+    /// @param host    outlives the session
+    PreviewSession(Canvas& canvas, PreviewHost& host);
+
+    const NavigationState& state() const { return state_; }
+
+    /// Keeps a grid, previews it and refreshes the navigation.
+    /// @param grid  borrowed until the next grid or `forgetGrid`
+    /// @throws RunTimeError of the build; the grid is kept
+    void open(AutomationObject& grid);
+
+    /// The kept grid is about to go.
+    void forgetGrid() { grid_ = nullptr; }
+
+    /// The kept grid, or null.
+    AutomationObject* grid() const { return grid_; }
+
+    /// A tool was clicked; an unknown number does nothing but end pan mode.
+    void click(int id);
+
+    /// The scale combo has a text that was picked or entered: "   150 %".
+    void chooseScale(TextView text);
+
+    /// The page combo has a text that was picked or entered: "   NO. 5"; one that begins with "【"
+    /// is ignored.
+    void choosePage(TextView text);
+
+    /// Builds again from the kept grid, or else takes the layout anew; then the navigation.
+    /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build
+    void refresh(bool rebuild);
+
+    /// Builds again with column widths and style as the canvas holds them.
+    /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build
+    void reZoom();
+
+    /// Prints; see `Canvas::doPrint`.
+    /// @throws RunTimeError the printer's
+    void print(bool allPages, TextView pageList, std::int16_t copies);
+
+private:
+    void quietly(const std::function<void()>& command);
+    void dispatch(ToolAction action);
+    AutomationObject& keptGrid() const;
+
+    void showFirst();
+    void showPrevious();
+    void showNext();
+    void showLast();
+    void showManyPages();
+    void showWindow(std::int16_t pages, int firstPage, int lastPage);
+    void leaveWindow();
+    void afterDialog(DialogEnd end);
+    void openFile();
+
+    void updatePosition();
+    void showScale();
+    void refreshNavigation();
+
+    Canvas& canvas_;
+    PreviewHost& host_;
+    AutomationObject* grid_ = nullptr;
+    NavigationState state_;
+};
+
+} // namespace pelloric
