@@ -10,6 +10,7 @@
 #include "report/late_bound_rows.h"
 #include "report/table_row_set.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace pelloric {
@@ -150,7 +151,7 @@ GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
         appendTitle(table, displayText(title, request.decimalSeparator, buffer), column.position);
     }
     const std::int32_t rows = grid.rows();
-    table.reserveRecords(std::int64_t { rows } - request.startRow);
+    table.reserveRecords(std::int64_t { rows } - std::max(0, request.startRow));
     for (std::int32_t row = request.startRow; row < rows; ++row) {
         table.addRecord();
         int field = 0;

@@ -52,9 +52,10 @@ void LayoutEngine::build(ProgressListener& progress)
     for (std::size_t field = 0; field < source_.widths.size(); ++field)
         titles_.push_back(document_.store().add(source_.rows.fieldName(static_cast<int>(field))));
     recorder_.setLineAttributes(gridPen(source_.style));
-    progress.begin(std::max<std::int64_t>(1, records * bands));
     startBand(0);
-    startPage();
+    drawHeader();
+    progress.begin(std::max<std::int64_t>(1, records * bands));
+    drawColumnTitles();
     source_.rows.moveFirst();
     platform_.loop.runOnce();
     while (!source_.rows.isAfterLast()) {
@@ -90,15 +91,13 @@ void LayoutEngine::startBand(std::size_t band)
     tableRight_ = roundToInt32(left);
 }
 
-/// Draws the header line and the titles of an empty page.
-void LayoutEngine::startPage()
+void LayoutEngine::drawHeader()
 {
     recorder_.moveTo({ tableLeft_, source_.setup.intTop });
     pageLines_.drawPageHeader(document_.currentPage + 1);
-    drawColumnTitles();
-    recorder_.setCurrentX(tableLeft_);
 }
 
+/// Draws the titles, or only the table's top edge, below the current position.
 void LayoutEngine::drawColumnTitles()
 {
     const ReportStyle& style = source_.style;
@@ -286,7 +285,9 @@ void LayoutEngine::breakPage(Twips footerTop)
     else
         pageRowHeights_.clear();
     rowsOnPage_ = 0;
-    startPage();
+    drawHeader();
+    drawColumnTitles();
+    recorder_.setCurrentX(tableLeft_);
 }
 
 void LayoutEngine::drawLine(Tpoint from, Tpoint to)

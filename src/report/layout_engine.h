@@ -78,7 +78,7 @@ private:
     };
 
     void startBand(std::size_t band);
-    void startPage();
+    void drawHeader();
     void drawColumnTitles();
     void drawTitleTexts(Twips top);
     void layoutRow();
