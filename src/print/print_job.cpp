@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/printer.h"
+#include "platform/run_time_error.h"
 #include "print/page_list.h"
 
 #include <vector>
@@ -72,16 +73,33 @@ Text documentTitle(TextView name, int page)
     return title + u"page " + decimal(page + 1);
 }
 
+/// The printer's error with the number of pages that it took before.
+RunTimeError errorAfter(const RunTimeError& error, std::int64_t sent, std::int64_t wanted)
+{
+    const std::size_t plain = errorText(error.number()).size();
+    const TextView text = error.text();
+    Text detail;
+    if (text.size() > plain + 2)
+        detail.append(text.substr(plain + 2)).append(u", ");
+    detail += u"after " + decimal(sent) + u" of " + decimal(wanted) + u" pages";
+    return RunTimeError(error.number(), detail);
+}
+
 std::int64_t printCopies(
     const PageDocument& document, const PrintJob& job, const Font& defaultFont, Printer& printer)
 {
     const std::vector<int> pages = pagesOfCopy(document, job);
+    const std::int64_t wanted = static_cast<std::int64_t>(pages.size()) * job.copies;
     std::int64_t sent = 0;
     printer.endDoc(); // what another program part began is no part of this job
     for (int copy = 1; copy <= job.copies; ++copy) {
         for (const int page : pages) {
-            printer.setDocumentTitle(documentTitle(job.documentName, page));
-            printPage(document, page, defaultFont, printer);
+            try {
+                printer.setDocumentTitle(documentTitle(job.documentName, page));
+                printPage(document, page, defaultFont, printer);
+            } catch (const RunTimeError& error) {
+                throw errorAfter(error, sent, wanted);
+            }
             ++sent;
             if (job.pageSent)
                 job.pageSent(sent);

@@ -43,7 +43,8 @@ std::int64_t pagesToSend(const PageDocument& document, const PrintJob& job);
 /// no page makes no document.
 /// @param defaultFont  as in `printPage`
 /// @return             the number of pages sent
-/// @throws RunTimeError the printer's own, and what `pageSent` throws; the job ends there
+/// @throws RunTimeError the printer's own with ", after N of M pages" behind its text, and what
+///         `pageSent` throws; the job ends there
 std::int64_t doPrint(
     const PageDocument& document, const PrintJob& job, const Font& defaultFont, Printer& printer);
 

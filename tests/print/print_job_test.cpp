@@ -171,6 +171,20 @@ TEST(DoPrint, EndsWithThePrintersErrorAndPutsItsSettingsBack)
     EXPECT_EQ(sent, 1);
 }
 
+TEST(DoPrint, SaysHowManyPagesWentOutBeforeThePrintersError)
+{
+    PageDocument document;
+    addPages(document, 2);
+    JobPrinter printer;
+    printer.failAt = 3;
+    try {
+        doPrint(document, jobOf(u"", 2), DefaultFont, printer);
+        FAIL() << "no error";
+    } catch (const RunTimeError& error) {
+        EXPECT_TRUE(error.text().ends_with(u"after 1 of 6 pages")) << error.what();
+    }
+}
+
 TEST(DoPrint, ReportsEveryPageSentAndStopsWhenAsked)
 {
     PageDocument document;
