@@ -74,11 +74,11 @@ double numberOf(const char* option, const QString& text, double least, double mo
     const double number = text.toDouble(&isNumber);
     const bool isInside = isNumber && number >= least && number <= most;
     if (!isInside || (isWhole && number != std::floor(number)))
-        throw CommandError(QStringLiteral("%1 takes a %2 from %3 to %4, not \"%5\"")
-                               .arg(dashed(option),
-                                   isWhole ? QStringLiteral("whole number")
-                                           : QStringLiteral("number"),
-                                   QString::number(least), QString::number(most), text),
+        throw CommandError(
+            QStringLiteral("%1 takes a %2 from %3 to %4, not \"%5\"")
+                .arg(dashed(option),
+                    isWhole ? QStringLiteral("whole number") : QStringLiteral("number"),
+                    QString::number(least), QString::number(most), text),
             WrongUsage);
     return number;
 }

@@ -50,8 +50,7 @@ class CommandLine {
 public:
     /// @param files  how many arguments that are no options are needed
     /// @throws CommandError WrongUsage: unknown options, missing values, another number of files
-    CommandLine(
-        const QStringList& arguments, std::initializer_list<OptionTable> tables, int files);
+    CommandLine(const QStringList& arguments, std::initializer_list<OptionTable> tables, int files);
 
     bool has(const char* option) const;
 

@@ -133,8 +133,7 @@ void exportPages(const Order& order, const CommandLine& line, const PageDocument
     qt::ExportOptions options;
     options.pages = pagesOf(line.value("pages"), document.Totalpages);
     options.dpi = order.dpi;
-    options.title
-        = qt::toText(line.has("title") ? line.value("title") : plainName(order.file));
+    options.title = qt::toText(line.has("title") ? line.value("title") : plainName(order.file));
     options.progress = [&](int done, int total) {
         progress.show("Writing", static_cast<double>(done) / std::max(1, total));
         return Interruption::mayGoOn();
@@ -176,8 +175,7 @@ void exportTable(
 
 int runExport(const Invocation& invocation)
 {
-    const CommandLine line(
-        invocation.arguments, { Options, sourceOptions(), reportOptions() }, 1);
+    const CommandLine line(invocation.arguments, { Options, sourceOptions(), reportOptions() }, 1);
     const Order order(line);
     const HeadlessApplication application(invocation);
     qt::QtPlatform platform;

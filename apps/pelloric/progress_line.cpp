@@ -68,8 +68,7 @@ void LayoutProgress::progressChanged()
 {
     const ProgressBar& bar = canvas_.progress();
     if (bar.visible && bar.maximum > 0)
-        line_.show(
-            "Laying out", static_cast<double>(bar.value) / static_cast<double>(bar.maximum));
+        line_.show("Laying out", static_cast<double>(bar.value) / static_cast<double>(bar.maximum));
 }
 
 } // namespace pelloric::app

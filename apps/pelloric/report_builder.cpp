@@ -47,9 +47,8 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
     std::vector<Twips> widths = contentWidths(grid, face, font.size);
     // A table exactly as wide as the room is divided.
     fitWidths(widths, canvas.page.myWidth - 2 * canvas.page.intLeft - 1);
-    const QStringList given = line.has("widths")
-        ? line.value("widths").split(QLatin1Char(','))
-        : QStringList();
+    const QStringList given
+        = line.has("widths") ? line.value("widths").split(QLatin1Char(',')) : QStringList();
     if (given.size() > grid.columnCount())
         throw CommandError(QStringLiteral("--widths names %1 columns; the table has %2")
                                .arg(given.size())
@@ -64,8 +63,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
     }
 }
 
-void buildReport(
-    Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress)
+void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress)
 {
     loadSettings(canvas);
     setColumnWidths(grid, line, canvas);

@@ -29,8 +29,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas);
 
 /// Lays a table out with the settings in force.
 /// @throws CommandError settings that cannot be used; RunTimeError of the layout, or Cancelled
-void buildReport(
-    Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress);
+void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress);
 
 /// The zero-based pages that a list such as 1,3,5-12 names; empty for an empty list.
 /// @throws CommandError the list names no page of the document

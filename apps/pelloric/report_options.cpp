@@ -84,6 +84,8 @@ constexpr double MostPaperMm = 2000;
 constexpr double LeastFontSize = 1;
 constexpr double MostFontSize = 200;
 
+constexpr double TitleFactor = 1.5; ///< of a title's size to that of the cells
+
 QString paperNames()
 {
     QStringList names;
@@ -205,8 +207,8 @@ void changeFonts(const CommandLine& line, Changes& changes)
             changes.add(key, name);
     }
     if (line.has("font-size")) {
-        const double size = numberOf(
-            "font-size", line.value("font-size"), LeastFontSize, MostFontSize, false);
+        const double size
+            = numberOf("font-size", line.value("font-size"), LeastFontSize, MostFontSize, false);
         changes.add(u"FontSize", formatNumber(size));
         // Lines of the same text are changed along; these two keep what they had.
         for (const TextView key : { u"HeaderFontSize", u"FooterFontSize" })
@@ -214,8 +216,21 @@ void changeFonts(const CommandLine& line, Changes& changes)
     }
 }
 
+/// A title is larger than the cells, unless the header font is already.
+void enlargeTitle(const CommandLine& line, Changes& changes)
+{
+    const double body = line.has("font-size") ? line.value("font-size").toDouble()
+                                              : leadingNumber(changes.present(u"FontSize"));
+    if (leadingNumber(changes.present(u"HeaderFontSize")) > body)
+        return;
+    changes.add(u"HeaderFontSize", formatNumber(body * TitleFactor));
+    changes.add(u"HeaderFontBold", QStringLiteral("1"));
+}
+
 void changeTexts(const CommandLine& line, Changes& changes)
 {
+    if (line.has("title") && !line.has("header-center"))
+        enlargeTitle(line, changes);
     for (const TextOption& row : TextOptions) {
         if (line.has(row.option))
             changes.add(row.key, line.value(row.option));

@@ -67,8 +67,7 @@ TableGrid readDatabase(const DatabaseName& name, const CommandLine& line, Progre
         throw CommandError(
             QStringLiteral("--encoding is for CSV and TSV files, not databases"), WrongUsage);
     if (line.has("query") && !name.table.isEmpty())
-        throw CommandError(
-            QStringLiteral("take either a table or --query, not both"), WrongUsage);
+        throw CommandError(QStringLiteral("take either a table or --query, not both"), WrongUsage);
     qt::SqliteSource source;
     source.path = pathOf(name.file);
     source.table = name.table;

@@ -16,7 +16,9 @@ namespace pelloric {
 namespace {
 
 constexpr std::int64_t MeasuredRows = 10000;
-constexpr Twips Clearance = 40; ///< what stays free beside the longest text: twips
+/// Twips beside the longest text: a centred text stands right of the middle by half the padding,
+/// so that half of this is what it keeps from the line on its right.
+constexpr Twips Clearance = 100;
 
 /// A column narrower than this is not narrowed further to make a table fit: twips.
 constexpr Twips ReadableWidth = 1200;
