@@ -13,6 +13,7 @@ PackagesBuild=(
     fonts-dejavu-core
     g++
     libcsv-dev
+    libcups2-dev
     libgmock-dev
     libgtest-dev
     libqt6sql6-sqlite

@@ -3,6 +3,8 @@
 
 #include "controls/qt/default_platform.h"
 
+#include "print/qt/qt_printing.h"
+
 #include <QCoreApplication>
 
 #include <memory>
@@ -11,24 +13,29 @@ namespace pelloric::qt {
 
 namespace {
 
-std::unique_ptr<QtPlatform>& platform()
+struct Services {
+    QtPlatform platform;
+    QtPrinting printing { platform };
+};
+
+std::unique_ptr<Services>& services()
 {
-    static std::unique_ptr<QtPlatform> instance;
+    static std::unique_ptr<Services> instance;
     return instance;
 }
 
 /// Fonts must not outlive the application.
-void dropPlatform() { platform().reset(); }
+void dropServices() { services().reset(); }
 
 } // namespace
 
 QtPlatform& defaultPlatform()
 {
-    if (!platform()) {
-        platform() = std::make_unique<QtPlatform>();
-        qAddPostRoutine(dropPlatform);
+    if (!services()) {
+        services() = std::make_unique<Services>();
+        qAddPostRoutine(dropServices);
     }
-    return *platform();
+    return services()->platform;
 }
 
 } // namespace pelloric::qt

@@ -1,0 +1,94 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/printer.h"
+
+#include <memory>
+
+class QPageSize;
+class QPrinterInfo;
+
+namespace pelloric::qt {
+
+class QtDrawingSurface;
+class QtFonts;
+
+/// The current printer of a printer system.
+///
+/// A document begins at the first drawing call, or at the first attribute behind a new title, so
+/// that a page without records is sent as a blank page. Each document is a job with settings of its
+/// own: paper, orientation, one-sided, one copy; the printer's defaults are never touched. Before a
+/// document begins the print system is asked whether it takes one, and when it ends, whether it
+/// took it. A document that is open when the object goes is handed over.
+class QtPrinter final : public Printer {
+public:
+    /// @param system  says which printer is the current one; borrowed
+    /// @param fonts   borrowed
+    QtPrinter(const PrinterSystem& system, QtFonts& fonts);
+    ~QtPrinter() override;
+
+    void clear() override;
+    void setFontName(TextView name) override;
+    void setFontSize(float size) override;
+    void setFontBold(bool bold) override;
+    void setFontItalic(bool italic) override;
+    void setFontTransparent(bool transparent) override;
+    void setForeColor(Color color) override;
+    void setDrawWidth(std::int16_t width) override;
+    void setDrawStyle(std::int16_t style) override;
+    void setFillStyle(std::int16_t style) override;
+    void setFillColor(Color color) override;
+    void setCurrentX(Twips x) override;
+    void setCurrentY(Twips y) override;
+    void line(Tpoint from, Tpoint to) override;
+    void box(Tpoint corner, Tpoint opposite, Color outline) override;
+    void print(TextView text) override;
+    void picture(TextView filePath, Tpoint topLeft, Tpoint size) override;
+
+    Text deviceName() const override;
+
+    /// The paper of the printer itself until one is applied; 0 when it is none of the forms.
+    std::int16_t paperSize() const override;
+    std::int16_t orientation() const override { return orientation_; }
+    void applyPaperSize(std::int16_t code) override;
+    void applyOrientation(std::int16_t code) override { orientation_ = code; }
+    void setDocumentTitle(TextView title) override;
+    void newPage() override;
+    void endDoc() override;
+
+private:
+    /// What a document begins with.
+    struct Attributes {
+        Text fontName;
+        float fontSize = 0;
+        bool fontBold = false;
+        bool fontItalic = false;
+        bool fontTransparent = true;
+        Color foreColor = 0;
+        std::int16_t drawWidth = 1;
+        std::int16_t drawStyle = 0;
+        std::int16_t fillStyle = 1;
+        Color fillColor = 0;
+        Tpoint current;
+    };
+    struct Document;
+
+    DrawingSurface& drawing();
+    DrawingSurface* attributeSurface();
+    QPageSize paperOf(const QPrinterInfo& printer) const;
+    void begin();
+    void applyAttributes(DrawingSurface& surface) const;
+
+    const PrinterSystem& system_;
+    QtFonts& fonts_;
+    Attributes attributes_;
+    Text title_;
+    bool isAnnounced_ = false; ///< a title was set and no document has begun since
+    std::int16_t paperSize_ = 0; ///< 0: the printer's own
+    std::int16_t orientation_ = 1;
+    std::unique_ptr<Document> document_; ///< null between documents
+};
+
+} // namespace pelloric::qt
