@@ -16,15 +16,11 @@ namespace {
 
 TextView slotName(std::int32_t location)
 {
-    switch (static_cast<AlignmentType>(location)) {
-    case AlignmentType::LocLeft:
+    if (location == static_cast<std::int32_t>(AlignmentType::LocLeft))
         return u"Left";
-    case AlignmentType::LocCenter:
+    if (location == static_cast<std::int32_t>(AlignmentType::LocCenter))
         return u"Center";
-    case AlignmentType::LocRight:
-    default:
-        return u"Right";
-    }
+    return u"Right";
 }
 
 /// A setting is one line of its file.
