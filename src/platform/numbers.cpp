@@ -5,6 +5,7 @@
 
 #include "platform/run_time_error.h"
 
+#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <limits>
@@ -87,14 +88,31 @@ NumberSpan scanNumber(std::string_view text)
     return span;
 }
 
-/// The parser leaves a number out of range alone: a large exponent is infinite, a small one 0.
+/// The exponent behind the mark, held within what can be added to a place in a text.
+std::int64_t exponentOf(std::string_view digits, std::size_t mark)
+{
+    constexpr std::int64_t largest = std::int64_t { 1 } << 60;
+    if (mark == digits.size())
+        return 0;
+    std::int64_t exponent = 0;
+    const char* end = digits.data() + digits.size();
+    const auto result = std::from_chars(digits.data() + mark + 1, end, exponent);
+    if (result.ec == std::errc::result_out_of_range)
+        return digits[mark + 1] == '-' ? -largest : largest;
+    return std::clamp(exponent, -largest, largest);
+}
+
+/// The parser leaves a number out of range alone: one that is too large is infinite, one that is
+/// too small 0. Where the first digit that counts stands tells which it is.
 double outOfRange(const std::string& digits)
 {
-    const bool negative = digits.front() == '-';
-    const std::size_t exponent = digits.find('e');
-    const bool tiny = exponent != std::string::npos && digits[exponent + 1] == '-';
+    const std::size_t mark = std::min(digits.find('e'), digits.size());
+    const std::size_t point = std::min(digits.find('.'), mark);
+    const std::size_t first = std::min(digits.find_first_of("123456789"), mark);
+    const auto places = static_cast<std::int64_t>(point) - static_cast<std::int64_t>(first);
+    const bool tiny = first == mark || places + exponentOf(digits, mark) <= 0;
     const double value = tiny ? 0.0 : std::numeric_limits<double>::infinity();
-    return negative ? -value : value;
+    return digits.front() == '-' ? -value : value;
 }
 
 double parse(std::string_view text)
