@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "document/text_store.h"
+
+#include <gtest/gtest.h>
+
+namespace pelloric {
+
+TEST(TextStore, KeepsEveryTextWhereItIs)
+{
+    TextStore store;
+    std::vector<std::pair<Text, TextView>> kept;
+    for (int length = 0; length < 3000; length += 7) {
+        const Text text(
+            static_cast<std::size_t>(length), static_cast<char16_t>(u'a' + length % 26));
+        kept.emplace_back(text, store.add(text));
+    }
+    for (const auto& [text, view] : kept)
+        EXPECT_EQ(view, text);
+}
+
+TEST(TextStore, TakesAnEmptyTextAndOneLargerThanItsBlocks)
+{
+    TextStore store;
+    EXPECT_EQ(store.add({}), TextView());
+    const Text large(5000000, u'x');
+    const TextView before = store.add(u"before");
+    EXPECT_EQ(store.add(large), large);
+    EXPECT_EQ(store.add(u"after"), u"after");
+    EXPECT_EQ(before, u"before");
+}
+
+TEST(TextStore, WastesLittle)
+{
+    TextStore store;
+    const Text text(100, u'x');
+    for (int copy = 0; copy < 100000; ++copy)
+        store.add(text);
+    EXPECT_GE(store.capacityBytes(), 100000U * 200);
+    EXPECT_LE(store.capacityBytes(), 100000U * 200 * 5 / 4);
+}
+
+} // namespace pelloric

@@ -1,0 +1,68 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "controls/canvas.h"
+#include "fakes/fake_platform.h"
+#include "platform/table_grid.h"
+#include "settings/default_settings.h"
+
+#include <initializer_list>
+#include <utility>
+#include <vector>
+
+namespace pelloric {
+
+/// A flex grid of columns (title and width) and rows of texts.
+inline TableGrid gridOf(
+    std::vector<TableColumn> columns, const std::vector<std::vector<Text>>& rows)
+{
+    TableGrid grid(std::move(columns));
+    for (const auto& row : rows)
+        grid.addRow(std::vector<TextView>(row.begin(), row.end()));
+    return grid;
+}
+
+/// Rows "r1c1", "r1c2", ...
+inline std::vector<std::vector<Text>> numberedRows(int rows, int columns)
+{
+    std::vector<std::vector<Text>> cells;
+    for (int row = 1; row <= rows; ++row) {
+        auto& line = cells.emplace_back();
+        for (int column = 1; column <= columns; ++column)
+            line.push_back(u"r" + decimal(row) + u"c" + decimal(column));
+    }
+    return cells;
+}
+
+/// A canvas on a platform whose settings file holds the default settings, with the footer empty.
+class ReportWorld : public FakePlatform {
+public:
+    using Settings = std::initializer_list<std::pair<Text, Text>>;
+
+    ReportWorld(Settings changes = {})
+        : canvas(services())
+    {
+        set(changes);
+    }
+
+    /// Writes the settings file anew: the default settings with these values changed.
+    void set(Settings changes)
+    {
+        Text text;
+        for (const DefaultSetting& setting : defaultSettings()) {
+            Text value(setting.key == u"FooterCenter" ? TextView() : setting.value);
+            for (const auto& [key, changed] : changes) {
+                if (key == setting.key)
+                    value = changed;
+            }
+            text.append(setting.key).append(u"= ").append(value).append(u"\r\n");
+        }
+        folder.write("OstlConfig.ini", toUtf8(text));
+    }
+
+    Canvas canvas;
+};
+
+} // namespace pelloric
