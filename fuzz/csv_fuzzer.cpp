@@ -1,0 +1,51 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+// Any bytes as a file of separated values; the first byte chooses how it is named and encoded.
+
+#include "fuzz_platform.h"
+
+#include "platform/qt/csv_table.h"
+#include "platform/run_time_error.h"
+
+using namespace pelloric;
+
+namespace {
+
+struct Form {
+    const char* name;
+    const char* encoding;
+};
+
+constexpr Form Forms[] = {
+    { "table.csv", "" },
+    { "table.tsv", "" },
+    { "table.csv", "GB18030" },
+    { "table.csv", "UTF-8" },
+};
+
+} // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
+{
+    static const fuzz::ProcessFolder folder;
+    if (size == 0 || size > 1U << 14U)
+        return 0;
+    const Form& form = Forms[data[0] % std::size(Forms)];
+    const auto path
+        = folder.write(form.name, { reinterpret_cast<const char*>(data) + 1, size - 1 });
+    qt::CsvOptions options;
+    options.encoding = QString::fromLatin1(form.encoding);
+    try {
+        const TableGrid table = qt::readCsv(path, options);
+        fuzz::require(table.columnCount() > 0);
+        for (std::int64_t row = 0; row < table.rowCount(); ++row) {
+            for (int column = 0; column < table.columnCount(); ++column)
+                fuzz::require(table.cell(row, column).size() <= size);
+        }
+    } catch (const RunTimeError& error) {
+        fuzz::require(
+            error.number() == ErrorNumber::TypeMismatch || error.number() == ErrorNumber::Overflow);
+    }
+    return 0;
+}
