@@ -4,6 +4,8 @@
 #pragma once
 
 #include <array>
+#include <cstddef>
+#include <optional>
 #include <vector>
 
 namespace pelloric {
@@ -82,9 +84,8 @@ public:
     /// A button goes down on a line: over a line a drag begins.
     void mouseDown(Margin line, double x, double y);
     /// A button is released: the dragged margin is what its line says now.
-    /// @param released  takes the margin that was dragged
-    /// @return          whether one was dragged
-    bool mouseUp(Margin& released);
+    /// @return  the margin that was dragged, or nothing
+    std::optional<Margin> mouseUp();
 
     SketchPointer pointer() const { return pointer_; }
     bool isDragging() const { return dragging_; }
@@ -100,7 +101,7 @@ private:
     bool staysInside(Margin line, double position) const;
 
     std::array<double, 4> margins_ { SketchScale, SketchScale, SketchScale, SketchScale };
-    std::array<double, 4> positions_ {};
+    std::array<double, 4> positions_ {}; ///< Top or Left of the lines
     double width_ = 0;
     double height_ = 0;
     SketchPointer pointer_ = SketchPointer::Default;

@@ -27,9 +27,6 @@ std::vector<PaperRow> paperRows(const std::vector<PaperForm>& forms);
 /// Columns of the list of papers.
 inline constexpr TextView PaperColumns[] = { u"name", u"cx", u"cy", u"value" };
 
-/// Two decimals and always ".": the form in which the dialog shows measured lengths.
-Text twoDecimals(double value);
-
 /// The paper group of the page setup dialog: name, code, orientation and the two size boxes.
 struct PaperChoice {
     Text paperName;

@@ -126,6 +126,7 @@ private:
     void afterDialog(DialogEnd end);
     void openFile();
 
+    void takePosition();
     void updatePosition();
     void showScale();
     void refreshNavigation();

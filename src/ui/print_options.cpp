@@ -7,6 +7,7 @@
 #include "platform/numbers.h"
 #include "platform/printer.h"
 #include "print/page_list.h"
+#include "ui/numeric_text.h"
 
 namespace pelloric {
 
@@ -24,6 +25,26 @@ std::variant<Message, PrintArguments> pressPrint(
     return PrintArguments { entries.allPages, pageListOf(trimmed(entries.range)),
         copiesOf(entries.copies) };
 }
+
+void PrintChoices::chooseAll() { *this = {}; }
+
+void PrintChoices::chooseRange()
+{
+    allPages = false;
+    rangeEnabled = true;
+}
+
+void choosePrinter(PrinterSystem& printers, TextView text)
+{
+    for (const Text& name : printers.printerNames()) {
+        if (trimmed(name) == text) {
+            printers.makeCurrent(name);
+            return;
+        }
+    }
+}
+
+Text filteredCopies(TextView text) { return numericCharacters(text); }
 
 Text steppedCopies(TextView text, bool up)
 {

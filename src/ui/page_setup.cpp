@@ -1,0 +1,198 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/page_setup.h"
+
+#include "platform/numbers.h"
+#include "platform/platform.h"
+#include "platform/run_time_error.h"
+#include "ui/font_description.h"
+#include "ui/numeric_text.h"
+
+#include <cmath>
+#include <utility>
+
+namespace pelloric {
+
+namespace {
+
+constexpr TextView SizeUnit = u"mm";
+constexpr TextView MarginUnit = u" mm";
+
+/// The keys of the six boxes, in the order of the boxes.
+constexpr auto FormatKeys = std::to_array<TextView>({
+    u"HeaderLeft",
+    u"HeaderCenter",
+    u"HeaderRight",
+    u"FooterLeft",
+    u"FooterCenter",
+    u"FooterRight",
+});
+static_assert(FormatKeys.size() == PageSetupState::FormatBoxes);
+constexpr std::size_t FooterBox = 3; ///< index of the first footer box
+
+struct MarginKey {
+    TextView key;
+    Margin margin;
+};
+
+/// In the order in which the margins are loaded and saved.
+constexpr auto MarginKeys = std::to_array<MarginKey>({
+    { u"Top", Margin::Top },
+    { u"Buttom", Margin::Bottom },
+    { u"Left", Margin::Left },
+    { u"Right", Margin::Right },
+});
+
+Text marginText(double millimetres) { return formatNumber(millimetres).append(MarginUnit); }
+
+/// Adds what stands before "mm" in a size box; an empty box leaves its key alone.
+/// @throws RunTimeError InvalidCall: the box holds something, but no "mm"
+void addSize(SettingChanges& changes, TextView key, TextView box)
+{
+    if (box.empty())
+        return;
+    const std::size_t unit = box.find(SizeUnit);
+    if (unit == TextView::npos)
+        throw RunTimeError(ErrorNumber::InvalidCall, key);
+    changes.addText(key, box.substr(0, unit));
+}
+
+} // namespace
+
+PageSetupState::PageSetupState(const Platform& platform)
+    : platform_(platform)
+    , rows_(pelloric::paperRows(platform.printers.forms()))
+{
+    restoreMargins();
+    const LenientSettings settings(platform);
+    headerFont = settings.font(u"Header");
+    footerFont = settings.font(u"Footer");
+    loadTexts(settings);
+    loadPaper(settings);
+    loadMargins(settings);
+}
+
+void PageSetupState::loadTexts(const LenientSettings& settings)
+{
+    for (std::size_t box = 0; box < formatTexts.size(); ++box)
+        formatTexts[box] = settings.text(FormatKeys[box]).value_or(Text());
+}
+
+void PageSetupState::loadPaper(const LenientSettings& settings)
+{
+    paper.paperName = settings.text(u"PagerSize").value_or(Text());
+    try {
+        paper.paperCode = strictInt16(settings.text(u"PagerSizeValue").value_or(u"0"));
+    } catch (const RunTimeError&) {
+        paper.paperCode = 0; // no form has this code
+    }
+    if (const auto width = settings.text(u"PagerWidth"))
+        paper.widthBox = *width + Text(SizeUnit);
+    if (const auto height = settings.text(u"PagerHeight"))
+        paper.heightBox = *height + Text(SizeUnit);
+    chooseOrientation(roundHalfEven(settings.number(u"PagerOrientation").value_or(1)) == 1);
+}
+
+void PageSetupState::loadMargins(const LenientSettings& settings)
+{
+    for (const MarginKey& row : MarginKeys) {
+        const double stored = settings.number(row.key).value_or(0);
+        if (stored != 0)
+            writeBox(row.margin, marginText(stored));
+    }
+}
+
+void PageSetupState::writeBox(Margin margin, Text text)
+{
+    const double units = toSketchUnits(leadingNumber(text));
+    boxes_[static_cast<std::size_t>(margin)] = std::move(text);
+    if (std::isfinite(units))
+        sketch_.setMargin(margin, units);
+}
+
+void PageSetupState::typeMargin(Margin margin, TextView text)
+{
+    writeBox(margin, numericCharacters(text).append(MarginUnit));
+}
+
+void PageSetupState::stepMargin(Margin margin, bool up)
+{
+    const double value = leadingNumber(marginBox(margin));
+    if (up || value > 0)
+        writeBox(margin, marginText(up ? value + 1 : value - 1));
+}
+
+void PageSetupState::restoreMargins()
+{
+    for (const Margin margin : AllMargins)
+        writeBox(margin, marginText(toMillimetres(SketchScale)));
+}
+
+void PageSetupState::releaseLine()
+{
+    if (const auto margin = sketch_.mouseUp())
+        writeBox(*margin, twoDecimals(toMillimetres(sketch_.margin(*margin))).append(MarginUnit));
+}
+
+void PageSetupState::chooseOrientation(bool portrait)
+{
+    paper.chooseOrientation(portrait);
+    sizeSketch();
+}
+
+void PageSetupState::setFrame(double width, double height)
+{
+    frameWidth_ = width;
+    frameHeight_ = height;
+    sizeSketch();
+}
+
+void PageSetupState::sizeSketch()
+{
+    picture_ = sketchRect(frameWidth_, frameHeight_, paper.isPortrait());
+    sketch_.setSize(picture_.width, picture_.height);
+}
+
+void PageSetupState::focusFormatBox(int box)
+{
+    if (box >= 1 && box <= FormatBoxes)
+        lastFormatBox_ = box;
+}
+
+void PageSetupState::chooseField(int entry)
+{
+    if (lastFormatBox_ == 0 || entry < 0 || entry >= static_cast<int>(FieldEntries.size()))
+        return;
+    formatTexts[static_cast<std::size_t>(lastFormatBox_ - 1)]
+        = FieldEntries[static_cast<std::size_t>(entry)].field;
+}
+
+Text PageSetupState::headerFontText() const { return fontDescription(headerFont.font); }
+
+Text PageSetupState::footerFontText() const { return fontDescription(footerFont.font); }
+
+SaveOutcome PageSetupState::save() const
+{
+    SettingChanges changes(platform_);
+    changes.addText(u"PagerSize", paper.paperName);
+    try {
+        addSize(changes, u"PagerWidth", paper.widthBox);
+        addSize(changes, u"PagerHeight", paper.heightBox);
+    } catch (const RunTimeError&) {
+        return SaveOutcome::NothingWritten;
+    }
+    changes.addNumber(u"PagerOrientation", paper.orientation);
+    changes.addNumber(u"PagerSizeValue", paper.paperCode);
+    for (const MarginKey& row : MarginKeys)
+        changes.addNumber(row.key, toMillimetres(sketch_.margin(row.margin)));
+    changes.addFont(u"Header", headerFont);
+    for (std::size_t box = 0; box < FooterBox; ++box)
+        changes.addText(FormatKeys[box], trimmed(formatTexts[box]));
+    changes.addFont(u"Footer", footerFont);
+    for (std::size_t box = FooterBox; box < formatTexts.size(); ++box)
+        changes.addText(FormatKeys[box], trimmed(formatTexts[box]));
+    return changes.save(FailurePolicy::StopAtFirst);
+}
+
+} // namespace pelloric
