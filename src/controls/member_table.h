@@ -47,7 +47,8 @@ inline constexpr auto SorvaneMembers = std::to_array<MemberRow>({
     { "showWholePage" },
     { "showPage" },
     { "showAllPage" },
-    { "showMuliPage", MemberKind::Method, MemberType::None, { { { "nPages", MemberType::Int16 } } } },
+    { "showMuliPage", MemberKind::Method, MemberType::None,
+        { { { "nPages", MemberType::Int16 } } } },
     { "CurrentX", MemberKind::PropertyGet, MemberType::Int32 },
     { "CurrentX", MemberKind::PropertyPut, MemberType::Int32 },
     { "CurrentY", MemberKind::PropertyGet, MemberType::Int32 },
@@ -67,7 +68,8 @@ inline constexpr auto SorvaneMembers = std::to_array<MemberRow>({
             { "nPrintPageNum", MemberType::Int16 } } } },
     { "PageHeader", MemberKind::PropertyGet, MemberType::Text },
     { "PageHeader", MemberKind::PropertyPut, MemberType::Text },
-    { "doPreview", MemberKind::Method, MemberType::None, { { { "PrintObj", MemberType::Object } } } },
+    { "doPreview", MemberKind::Method, MemberType::None,
+        { { { "PrintObj", MemberType::Object } } } },
     { "ReSetLeftTop", MemberKind::PropertyGet, MemberType::Truth },
     { "ReSetLeftTop", MemberKind::PropertyPut, MemberType::Truth },
     { "SetShowStyle", MemberKind::Method, MemberType::None,
@@ -88,7 +90,8 @@ inline constexpr auto SorvaneMembers = std::to_array<MemberRow>({
 
 /// What `Kestrane` publishes, in the order of the interface; it has no events.
 inline constexpr auto KestraneMembers = std::to_array<MemberRow>({
-    { "doPreview", MemberKind::Method, MemberType::None, { { { "PrintObj", MemberType::Object } } } },
+    { "doPreview", MemberKind::Method, MemberType::None,
+        { { { "PrintObj", MemberType::Object } } } },
     { "AddHeader", MemberKind::Method, MemberType::None,
         { { { "strHeader", MemberType::Text }, { "Location", MemberType::Enum } } } },
     { "AddFooter", MemberKind::Method, MemberType::None,

@@ -93,8 +93,7 @@ int barValueAfter(const ScrollBar& bar, std::int16_t previous, double moved)
 
 } // namespace
 
-CanvasAreas::CanvasAreas(
-    QWidget& control, Canvas& canvas, QtFonts& fonts, RightButton rightButton)
+CanvasAreas::CanvasAreas(QWidget& control, Canvas& canvas, QtFonts& fonts, RightButton rightButton)
     : control_(control)
     , canvas_(canvas)
     , fonts_(fonts)
@@ -114,12 +113,10 @@ CanvasAreas::CanvasAreas(
     auto* const base = new PageSurface(*this, backScreen_);
     base->hide();
     surfaces_[0] = base;
-    QObject::connect(Hbar_, &QScrollBar::valueChanged, &control_, [this](int value) {
-        MemberCalls::endQuietly([&] { canvas_.setHbar(value); });
-    });
-    QObject::connect(Vbar_, &QScrollBar::valueChanged, &control_, [this](int value) {
-        MemberCalls::endQuietly([&] { canvas_.setVbar(value); });
-    });
+    QObject::connect(Hbar_, &QScrollBar::valueChanged, &control_,
+        [this](int value) { MemberCalls::endQuietly([&] { canvas_.setHbar(value); }); });
+    QObject::connect(Vbar_, &QScrollBar::valueChanged, &control_,
+        [this](int value) { MemberCalls::endQuietly([&] { canvas_.setVbar(value); }); });
     canvas_.observe(this);
 }
 
@@ -166,7 +163,7 @@ void CanvasAreas::viewChanged()
 {
     if (isPainting_)
         return;
-    startIcon_->setVisible(!canvas_.view().baseVisible && !canvas_.isBuilding());
+    startIcon_->setVisible(isAtStart());
     showBars();
     showCursor();
     showSurfaces();
@@ -174,10 +171,14 @@ void CanvasAreas::viewChanged()
 
 void CanvasAreas::progressChanged() { progress_->showProgress(canvas_.progress()); }
 
+/// Before a document is shown; a build hides the pages, too, but not for long.
+bool CanvasAreas::isAtStart() const { return !canvas_.view().baseVisible && !canvas_.isBuilding(); }
+
+/// There is nothing to scroll at the start.
 void CanvasAreas::showBars()
 {
-    showBar(*Hbar_, canvas_.view().Hbar);
-    showBar(*Vbar_, canvas_.view().Vbar);
+    showBar(*Hbar_, isAtStart() ? ScrollBar() : canvas_.view().Hbar);
+    showBar(*Vbar_, isAtStart() ? ScrollBar() : canvas_.view().Vbar);
 }
 
 void CanvasAreas::showCursor()
@@ -265,8 +266,7 @@ PageSurface& CanvasAreas::surfaceFor(int index, std::vector<PageSurface*>& spare
     return *surface;
 }
 
-void CanvasAreas::paintSurface(
-    int surface, QPainter& painter, QPointF origin, const QRect& exposed)
+void CanvasAreas::paintSurface(int surface, QPainter& painter, QPointF origin, const QRect& exposed)
 {
     if (canvas_.strSCliectRect == u"small" || !hasScale())
         return;
@@ -291,7 +291,8 @@ void CanvasAreas::passPaintThroughShowPage()
     MemberCalls::endQuietly([&] { canvas_.showPage(); });
     isPainting_ = false;
     if (canvas_.view().offset != before)
-        QMetaObject::invokeMethod(&control_, [this] { viewChanged(); }, Qt::QueuedConnection);
+        QMetaObject::invokeMethod(
+            &control_, [this] { viewChanged(); }, Qt::QueuedConnection);
 }
 
 void CanvasAreas::replay(int page, QPainter& painter, const QRectF& visible)
@@ -346,12 +347,12 @@ void CanvasAreas::wheel(QWheelEvent& event)
         const int clicks = wheelRest_ / QWheelEvent::DefaultDeltasPerStep;
         wheelRest_ -= clicks * QWheelEvent::DefaultDeltasPerStep;
         if (clicks != 0)
-            zoomAbout(std::pow(ZoomStep, clicks),
-                backScreen_->mapFrom(&control_, event.position()));
+            zoomAbout(
+                std::pow(ZoomStep, clicks), backScreen_->mapFrom(&control_, event.position()));
         return;
     }
-    const bool isAcross = std::abs(angle.x()) > std::abs(angle.y())
-        || (event.modifiers() & Qt::ShiftModifier);
+    const bool isAcross
+        = std::abs(angle.x()) > std::abs(angle.y()) || (event.modifiers() & Qt::ShiftModifier);
     QScrollBar* const bar = isAcross ? Hbar_ : Vbar_;
     QWheelEvent passed(event.position(), event.globalPosition(), event.pixelDelta(), angle,
         event.buttons(), event.modifiers() & ~Qt::ShiftModifier, event.phase(), event.inverted());
@@ -371,8 +372,7 @@ void CanvasAreas::zoomAbout(double factor, QPointF at)
         return;
     const QPointF twips(at.x() * TwipsPerInch / control_.logicalDpiX(),
         at.y() * TwipsPerInch / control_.logicalDpiY());
-    const QPointF onPage(
-        twips.x() / present - view.offset.x, twips.y() / present - view.offset.y);
+    const QPointF onPage(twips.x() / present - view.offset.x, twips.y() / present - view.offset.y);
     MemberCalls::endQuietly([&] {
         canvas_.setDispScale(static_cast<float>(scale));
         const double divisor = view.divisor;

@@ -63,6 +63,7 @@ private:
 
     QScrollBar* makeBar(Qt::Orientation orientation, const char* name);
     void setViewport();
+    bool isAtStart() const;
     void showBars();
     void showCursor();
     void showSurfaces();

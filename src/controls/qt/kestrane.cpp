@@ -34,7 +34,7 @@ Kestrane::Kestrane(QtPlatform& platform, QWidget* parent)
     : QWidget(parent)
     , platform_(platform.record())
     , facade_(platform_, opener_)
-    , calls_(*this, platform_)
+    , calls_(*this, platform_, [] {})
 {
     setObjectName(QStringLiteral("Kestrane"));
     setAccessibleName(tr("Print preview"));

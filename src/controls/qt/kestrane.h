@@ -17,14 +17,16 @@ class QtPlatform;
 /// The facade: previews a grid in the preview window, and keeps header, footer and switches.
 ///
 /// Every member is published by its name, too, and takes and answers variants there. No error
-/// leaves a member: it becomes an error of the script that the control belongs to, or a message box.
+/// leaves a member: it becomes an error of the script that the control belongs to, or a message
+/// box.
 class Kestrane : public QWidget {
     Q_OBJECT
     Q_PROPERTY(
         QVariant ShowHeader READ getShowHeader WRITE putShowHeader DESIGNABLE false STORED false)
-    Q_PROPERTY(QVariant MarvenStartRow READ getMarvenStartRow WRITE putMarvenStartRow DESIGNABLE
-            false STORED false)
-    Q_PROPERTY(QVariant MergeGrid READ getMergeGrid WRITE putMergeGrid DESIGNABLE false STORED false)
+    Q_PROPERTY(QVariant MarvenStartRow READ getMarvenStartRow WRITE putMarvenStartRow
+            DESIGNABLE false STORED false)
+    Q_PROPERTY(
+        QVariant MergeGrid READ getMergeGrid WRITE putMergeGrid DESIGNABLE false STORED false)
 
 public:
     /// Slots of a header or footer line, by name for scripts.

@@ -38,9 +38,10 @@ void throwInScript(QJSEngine& engine, const RunTimeError& error)
 
 } // namespace
 
-MemberCalls::MemberCalls(QObject& control, Platform& platform)
+MemberCalls::MemberCalls(QObject& control, Platform& platform, std::function<void()> restore)
     : control_(control)
     , platform_(platform)
+    , restore_(std::move(restore))
 {
 }
 
@@ -72,6 +73,7 @@ void MemberCalls::refuseRead(const char* name)
 
 void MemberCalls::report(const RunTimeError& error)
 {
+    restore_();
     if (QJSEngine* const engine = qjsEngine(&control_))
         throwInScript(*engine, error);
     else

@@ -24,12 +24,14 @@ class MemberCalls {
 public:
     /// @param control   whose members they are; borrowed
     /// @param platform  has the message boxes; borrowed
-    MemberCalls(QObject& control, Platform& platform);
+    /// @param restore   shows what is left of the control's state after an error
+    MemberCalls(QObject& control, Platform& platform, std::function<void()> restore);
 
     /// Runs a member that the host calls; nothing leaves it.
     void run(const std::function<void()>& member);
 
-    /// Runs a step that nobody waits for, as a window's events are; its error ends it without a word.
+    /// Runs a step that nobody waits for, as a window's events are; its error ends it without a
+    /// word.
     static void endQuietly(const std::function<void()>& step);
 
     /// Refuses to read a property that can only be written: a script gets an error.
@@ -40,6 +42,7 @@ private:
 
     QObject& control_;
     Platform& platform_;
+    std::function<void()> restore_;
 };
 
 } // namespace pelloric::qt

@@ -7,6 +7,7 @@
 #include <QPaintEvent>
 #include <QPainter>
 
+#include <algorithm>
 #include <cmath>
 
 namespace pelloric::qt {
@@ -17,9 +18,25 @@ namespace {
 /// coordinates get near their limit.
 constexpr double FarthestEdge = 200'000;
 
-int wholePixel(double position)
+double withinReach(double position) { return std::clamp(position, -FarthestEdge, FarthestEdge); }
+
+int wholePixel(double position) { return static_cast<int>(std::nearbyint(withinReach(position))); }
+
+/// One direction of a page: whole pixels, and always as many of them wherever the page stands.
+struct Span {
+    int begin = 0;
+    int length = 1;
+    double origin = 0; ///< where the page's own edge lies from the beginning
+};
+
+Span spanOf(double begin, double length)
 {
-    return static_cast<int>(std::nearbyint(std::clamp(position, -FarthestEdge, FarthestEdge)));
+    Span span { .begin = wholePixel(begin) };
+    if (begin < -FarthestEdge)
+        span.origin = begin + FarthestEdge;
+    const double end = span.begin + span.origin + std::nearbyint(length);
+    span.length = std::max(1, wholePixel(end) - span.begin);
+    return span;
 }
 
 } // namespace
@@ -45,14 +62,10 @@ void PageSurface::setIndex(int index)
 
 void PageSurface::place(const QRectF& page)
 {
-    const QPoint corner(wholePixel(page.left()), wholePixel(page.top()));
-    const QPoint opposite(wholePixel(page.right()), wholePixel(page.bottom()));
-    // A page's own corner is a whole pixel, so that its lines do not blur while it moves.
-    const QPointF at(page.left() < -FarthestEdge ? page.left() : corner.x(),
-        page.top() < -FarthestEdge ? page.top() : corner.y());
-    origin_ = at - corner;
-    setGeometry(QRect(corner, QSize(std::max(1, opposite.x() - corner.x()),
-                                  std::max(1, opposite.y() - corner.y()))));
+    const Span across = spanOf(page.left(), page.width());
+    const Span down = spanOf(page.top(), page.height());
+    origin_ = { across.origin, down.origin };
+    setGeometry(across.begin, down.begin, across.length, down.length);
 }
 
 void PageSurface::paintEvent(QPaintEvent* event)

@@ -15,7 +15,6 @@
 #include <QWheelEvent>
 
 #include <filesystem>
-#include <type_traits>
 
 namespace pelloric::qt {
 
@@ -40,10 +39,7 @@ constexpr short RightButtonNumber = 2;
 
 constexpr int FocusEdge = 2; ///< shows whether the control has the focus: pixels
 
-std::filesystem::path pathOf(const QString& path)
-{
-    return std::filesystem::path(toText(path));
-}
+std::filesystem::path pathOf(const QString& path) { return std::filesystem::path(toText(path)); }
 
 QObject& objectOf(QObject* object)
 {
@@ -63,7 +59,7 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
     : QWidget(parent)
     , platform_(platform.record())
     , canvas_(platform_)
-    , calls_(*this, platform_)
+    , calls_(*this, platform_, [this] { areas_->viewChanged(); })
     , areas_(std::make_unique<CanvasAreas>(*this, canvas_, platform.fonts(),
           CanvasAreas::RightButton { [this] { emit Click(RightButtonNumber); },
               [this] { emit MouseUp(RightButtonNumber); } }))
@@ -103,8 +99,7 @@ void Sorvane::showMuliPage(std::int16_t nPages)
     calls_.run([&] { canvas_.showMuliPage(nPages); });
 }
 
-void Sorvane::SetShowStyle(
-    std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage)
+void Sorvane::SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage)
 {
     calls_.run([&] { canvas_.SetShowStyle(nPages, nStartPage, nEndPage); });
 }
@@ -233,15 +228,17 @@ void Sorvane::doPreview(const QVariant& PrintObj)
 void Sorvane::SetShowStyle(
     const QVariant& nPages, const QVariant& nStartPage, const QVariant& nEndPage)
 {
-    calls_.run([&] {
-        canvas_.SetShowStyle(toInt16(nPages), toInt16(nStartPage), toInt16(nEndPage));
-    });
+    calls_.run(
+        [&] { canvas_.SetShowStyle(toInt16(nPages), toInt16(nStartPage), toInt16(nEndPage)); });
 }
 
-QVariant Sorvane::WindowOrderStyle() const
-{
-    return static_cast<int>(canvas_.WindowOrderStyle());
-}
+QVariant Sorvane::WindowMinPage() const { return QVariant::fromValue(canvas_.WindowMinPage()); }
+
+QVariant Sorvane::WindowMaxPage() const { return QVariant::fromValue(canvas_.WindowMaxPage()); }
+
+QVariant Sorvane::WindowPages() const { return QVariant::fromValue(canvas_.WindowPages()); }
+
+QVariant Sorvane::WindowOrderStyle() const { return static_cast<int>(canvas_.WindowOrderStyle()); }
 
 void Sorvane::OnDraw()
 {

@@ -35,10 +35,9 @@ class Sorvane : public QWidget {
     Q_PROPERTY(
         QVariant Totalpages READ getTotalpages WRITE putTotalpages DESIGNABLE false STORED false)
     Q_PROPERTY(QVariant bGetText READ getBGetText WRITE putBGetText DESIGNABLE false STORED false)
-    Q_PROPERTY(
-        QVariant m_PrintObj READ getPrintObj WRITE putPrintObj DESIGNABLE false STORED false)
-    Q_PROPERTY(QVariant strSCliectRect READ getStrSCliectRect WRITE putStrSCliectRect DESIGNABLE
-            false STORED false)
+    Q_PROPERTY(QVariant m_PrintObj READ getPrintObj WRITE putPrintObj DESIGNABLE false STORED false)
+    Q_PROPERTY(QVariant strSCliectRect READ getStrSCliectRect WRITE putStrSCliectRect
+            DESIGNABLE false STORED false)
     Q_PROPERTY(
         QVariant Currentpage READ getCurrentpage WRITE putCurrentpage DESIGNABLE false STORED false)
     Q_PROPERTY(QVariant CurrentX READ getCurrentX WRITE putCurrentX DESIGNABLE false STORED false)
@@ -49,8 +48,8 @@ class Sorvane : public QWidget {
         QVariant VerticalDir READ getVerticalDir WRITE putVerticalDir DESIGNABLE false STORED false)
     Q_PROPERTY(
         QVariant PageHeader READ getPageHeader WRITE putPageHeader DESIGNABLE false STORED false)
-    Q_PROPERTY(QVariant ReSetLeftTop READ getReSetLeftTop WRITE putReSetLeftTop DESIGNABLE false
-            STORED false)
+    Q_PROPERTY(QVariant ReSetLeftTop READ getReSetLeftTop WRITE putReSetLeftTop
+            DESIGNABLE false STORED false)
 
 public:
     /// Display modes, by name for scripts.
@@ -102,14 +101,14 @@ public:
     Q_INVOKABLE void Maximum();
     Q_INVOKABLE void setMouse();
     Q_INVOKABLE void Pan();
-    Q_INVOKABLE void doPrint(const QVariant& bAllPrint, const QVariant& strPrintRange,
-        const QVariant& nPrintPageNum);
+    Q_INVOKABLE void doPrint(
+        const QVariant& bAllPrint, const QVariant& strPrintRange, const QVariant& nPrintPageNum);
     Q_INVOKABLE void doPreview(const QVariant& PrintObj);
     Q_INVOKABLE void SetShowStyle(
         const QVariant& nPages, const QVariant& nStartPage, const QVariant& nEndPage);
-    Q_INVOKABLE QVariant WindowMinPage() const { return canvas_.WindowMinPage(); }
-    Q_INVOKABLE QVariant WindowMaxPage() const { return canvas_.WindowMaxPage(); }
-    Q_INVOKABLE QVariant WindowPages() const { return canvas_.WindowPages(); }
+    Q_INVOKABLE QVariant WindowMinPage() const;
+    Q_INVOKABLE QVariant WindowMaxPage() const;
+    Q_INVOKABLE QVariant WindowPages() const;
     Q_INVOKABLE QVariant WindowOrderStyle() const;
     Q_INVOKABLE void OnDraw();
     Q_INVOKABLE void SaveFile(const QVariant& FilePath);
