@@ -32,6 +32,14 @@ std::span<const Command> commands();
 int runExport(const Invocation& invocation);
 QString exportDetails();
 
+/// `pelloric print`: a table or a document on a printer; needs no display.
+int runPrint(const Invocation& invocation);
+QString printDetails();
+
+/// `pelloric printers`: the printers of the system and whether they take jobs; needs no display.
+int runPrinters(const Invocation& invocation);
+QString printersDetails();
+
 /// `pelloric settings`: shows or restores the settings file; needs no display.
 int runSettings(const Invocation& invocation);
 QString settingsDetails();

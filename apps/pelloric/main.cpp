@@ -19,6 +19,8 @@ namespace {
 constexpr auto Commands = std::to_array<Command>({
     { "export", "FILE -o OUT", "Writes a table as PDF, PNG, SVG or a document file",
         runExport, exportDetails },
+    { "print", "FILE", "Prints a table or a document file", runPrint, printDetails },
+    { "printers", "", "Lists the printers", runPrinters, printersDetails },
     { "settings", "", "Shows or restores the settings file", runSettings, settingsDetails },
     { "help", "[COMMAND]", "Explains the commands", runHelp },
 });

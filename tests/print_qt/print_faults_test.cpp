@@ -73,6 +73,15 @@ protected:
             [&] { EXPECT_TRUE(cups.command(program, arguments)); });
     }
 
+    std::string failureWithTemporaryFolder(const QByteArray& temporary)
+    {
+        const QByteArray folder = qgetenv("TMPDIR");
+        qputenv("TMPDIR", temporary);
+        const std::string failure = failureOf(threePages(), printing.printer());
+        folder.isEmpty() ? qunsetenv("TMPDIR") : qputenv("TMPDIR", folder);
+        return failure;
+    }
+
     void expectSettingsRestored()
     {
         EXPECT_EQ(printing.printer().paperSize(), 9);
@@ -169,13 +178,16 @@ TEST_F(PrintFaultTest, SaysThatADocumentWasRefusedWhenItWasHandedOver)
     EXPECT_TRUE(cups.jobs().empty());
 }
 
-TEST_F(PrintFaultTest, NamesTheFolderOfTemporaryFilesWhenItIsMissing)
+TEST_F(PrintFaultTest, BeginsNoDocumentWhenTheFolderOfTemporaryFilesIsMissing)
 {
-    const QByteArray folder = qgetenv("TMPDIR");
-    qputenv("TMPDIR", (cups.folder() + QStringLiteral("/missing")).toUtf8());
-    const std::string failure = failureOf(threePages(), printing.printer());
-    folder.isEmpty() ? qunsetenv("TMPDIR") : qputenv("TMPDIR", folder);
-    EXPECT_EQ(failure, Refused + "T1: the document could not be begun, after 0 of 3 pages");
+    EXPECT_EQ(failureWithTemporaryFolder((cups.folder() + QStringLiteral("/missing")).toUtf8()),
+        Refused + "T1: the document could not be begun, after 0 of 3 pages");
+}
+
+TEST_F(PrintFaultTest, BeginsNoDocumentWhenTheFolderOfTemporaryFilesIsFull)
+{
+    EXPECT_EQ(failureWithTemporaryFolder("/proc"),
+        Refused + "T1: no room for the document in /proc, after 0 of 3 pages");
 }
 
 TEST_F(SmallSpoolTest, SaysThatTheSpoolerTookNoDocumentForWantOfRoom)

@@ -33,17 +33,13 @@ constexpr qint64 RoomForDocument = 8 * 1024 * 1024;
 
 [[noreturn]] void refuse(const QString& printer, const QString& reason)
 {
-    throw RunTimeError(ErrorNumber::InvalidCall, toText(printer + QStringLiteral(": ") + reason));
+    const QString text = printer.isEmpty() ? reason : printer + QStringLiteral(": ") + reason;
+    throw RunTimeError(ErrorNumber::InvalidCall, toText(text));
 }
 
 /// @throws RunTimeError InvalidCall: the printer takes no document now
 void requireTaker(const QString& printer)
 {
-    if (printer.isEmpty()) {
-        const QString silence = silenceOfSystem();
-        throw RunTimeError(ErrorNumber::InvalidCall,
-            silence.isEmpty() ? Text(u"there is no printer") : toText(silence));
-    }
     const QString refusal = refusalOf(printer);
     if (!refusal.isEmpty())
         refuse(printer, refusal);

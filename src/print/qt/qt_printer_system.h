@@ -21,7 +21,8 @@ public:
     void makeCurrent(TextView name) override;
     bool opens(TextView name) const override;
 
-    /// Why a printer takes no jobs, in plain English; empty: it takes them.
+    /// Why a printer takes no jobs, in plain English; empty: it takes them. The empty name, which
+    /// stands for no printer at all, is told why there is none.
     QString refusal(TextView name) const;
 
     std::vector<PaperForm> forms() const override;

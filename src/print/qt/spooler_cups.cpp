@@ -41,8 +41,7 @@ Destination destinationOf(const QString& printer)
 
 QString lastError() { return QString::fromUtf8(cupsLastErrorString()); }
 
-} // namespace
-
+/// Why the print system cannot be asked; empty: it answers.
 QString silenceOfSystem()
 {
     http_t* const connection = httpConnect2(
@@ -53,8 +52,14 @@ QString silenceOfSystem()
     return {};
 }
 
+} // namespace
+
 QString refusalOf(const QString& printer)
 {
+    if (printer.isEmpty()) {
+        const QString silence = silenceOfSystem();
+        return silence.isEmpty() ? QStringLiteral("there is no printer") : silence;
+    }
     const Destination destination = destinationOf(printer);
     if (!destination) {
         const QString silence = silenceOfSystem();

@@ -7,10 +7,10 @@
 
 namespace pelloric::qt {
 
-QString silenceOfSystem() { return {}; }
-
 QString refusalOf(const QString& printer)
 {
+    if (printer.isEmpty())
+        return QStringLiteral("there is no printer");
     const QPrinterInfo info = QPrinterInfo::printerInfo(printer);
     if (info.isNull())
         return QStringLiteral("there is no such printer");

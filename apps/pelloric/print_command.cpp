@@ -1,0 +1,199 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "command_line.h"
+#include "commands.h"
+#include "controls/canvas.h"
+#include "document/ostl_reader.h"
+#include "headless.h"
+#include "interruption.h"
+#include "platform/platform.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "print/page_list.h"
+#include "print/print_job.h"
+#include "print/qt/qt_printing.h"
+#include "progress_line.h"
+#include "report_builder.h"
+#include "report_options.h"
+#include "table_source.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <limits>
+#include <memory>
+
+namespace pelloric::app {
+
+namespace {
+
+constexpr auto Options = std::to_array<Option>({
+    { "printer", "NAME", "where to: a name of \"pelloric printers\" (the current one)" },
+    { "pages", "LIST", "only these pages: 1,3,5-12" },
+    { "copies", "N", "whole copies, one after the other (1)" },
+});
+
+constexpr double MostCopies = std::numeric_limits<std::int16_t>::max();
+
+constexpr double TwipsPerMm = TwipsPerCm / 10.0;
+constexpr double SamePaperMm = 2;
+
+/// What the options say, checked before anything is read.
+struct Order {
+    explicit Order(const CommandLine& line)
+        : file(line.file(0))
+        , title(line.has("title") ? line.value("title") : plainName(file))
+        , pages(line.value("pages").trimmed())
+    {
+        if (line.has("copies"))
+            copies = static_cast<std::int16_t>(
+                numberOf("copies", line.value("copies"), 1, MostCopies, true));
+    }
+
+    QString file;
+    QString title;
+    QString pages;
+    std::int16_t copies = 1;
+};
+
+/// The printers of this program's run, with the one that the options name.
+void choosePrinter(const CommandLine& line, qt::QtPrinting& printing)
+{
+    qt::QtPrinterSystem& system = printing.system();
+    const Text name = qt::toText(line.value("printer"));
+    if (line.has("printer")) {
+        const std::vector<Text> names = system.printerNames();
+        if (std::find(names.begin(), names.end(), name) == names.end())
+            throw CommandError(QStringLiteral("no printer \"%1\"; see \"pelloric printers\"")
+                                   .arg(line.value("printer")));
+        system.makeCurrent(name);
+    }
+    if (system.currentPrinter().empty())
+        throw CommandError(system.refusal({}));
+}
+
+bool isSameLength(double mm, Twips twips)
+{
+    return std::abs(mm - twips / TwipsPerMm) < SamePaperMm;
+}
+
+/// Whether a form has the size of the pages, upright or turned.
+bool fits(const PaperForm& form, const PageSetup& setup)
+{
+    const auto [narrow, wide] = std::minmax(form.widthMm, form.heightMm);
+    return isSameLength(narrow, std::min(setup.myWidth, setup.myHeight))
+        && isSameLength(wide, std::max(setup.myWidth, setup.myHeight));
+}
+
+/// The code of the paper that the pages were laid out for.
+/// @param wanted  taken where it fits, and where nothing does
+std::int16_t paperFor(
+    const PageSetup& setup, std::int16_t wanted, const std::vector<PaperForm>& forms)
+{
+    const auto at = static_cast<std::size_t>(wanted) - 1;
+    if (wanted >= 1 && at < forms.size() && fits(forms[at], setup))
+        return wanted;
+    const auto found = std::find_if(
+        forms.begin(), forms.end(), [&setup](const PaperForm& form) { return fits(form, setup); });
+    return found == forms.end() ? wanted : static_cast<std::int16_t>(found - forms.begin() + 1);
+}
+
+/// Prints the pages and says how many there were.
+void printPages(const Order& order, const PageDocument& document, PrintJob job,
+    const Font& defaultFont, qt::QtPrinting& printing, ProgressLine& progress)
+{
+    job.allPages = order.pages.isEmpty();
+    if (!job.allPages) {
+        pagesOf(order.pages, document.Totalpages); // refuses a list that names no page
+        job.pageList = pageListOf(qt::toText(order.pages));
+    }
+    job.copies = order.copies;
+    job.documentName = qt::toText(order.title);
+    const std::int64_t total = pagesToSend(document, job);
+    job.pageSent = [&](std::int64_t sent) {
+        progress.show("Printing", static_cast<double>(sent) / static_cast<double>(total));
+        if (!Interruption::mayGoOn() && sent < total)
+            throw RunTimeError(ErrorNumber::Cancelled);
+    };
+    try {
+        doPrint(document, job, defaultFont, printing.printer());
+    } catch (const RunTimeError& error) {
+        if (error.number() != ErrorNumber::InvalidCall)
+            throw;
+        throw CommandError(detailOf(error));
+    }
+    progress.clear();
+    print(QStringLiteral("%1: %2 %3 sent\n")
+              .arg(qt::toQString(printing.system().currentPrinter()))
+              .arg(total)
+              .arg(QLatin1String(total == 1 ? "page" : "pages")));
+}
+
+void printDocument(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
+    qt::QtPrinting& printing, ProgressLine& progress)
+{
+    const char* const option = firstReportOption(line);
+    if (option != nullptr && QLatin1String(option) != QLatin1String("title"))
+        throw CommandError(
+            QStringLiteral("--%1 does not apply to a saved document, whose pages are laid out")
+                .arg(QString::fromLatin1(option)),
+            WrongUsage);
+    PageDocument document;
+    PageSetup setup;
+    const Platform record = platform.record();
+    if (readOstl(record.codec, pathOf(order.file), document, setup) == OstlResult::BadHeader)
+        throw CommandError(QStringLiteral("%1 is no document file").arg(order.file));
+    PrintJob job;
+    job.paperSize = paperFor(setup, job.paperSize, printing.system().forms());
+    job.orientation = setup.myWidth > setup.myHeight ? 2 : 1;
+    printPages(order, document, job, Font {}, printing, progress);
+}
+
+void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
+    qt::QtPrinting& printing, ProgressLine& progress)
+{
+    auto grid = std::make_unique<TableGrid>(readTable(order.file, line, progress));
+    const PrivateSettings settings(platform, line);
+    Platform record = platform.record();
+    Canvas canvas(record);
+    buildReport(canvas, *grid, line, progress);
+    grid.reset();
+    PrintJob job;
+    const ReportStyle& style = canvas.style();
+    job.paperSize = paperFor(canvas.page, style.PagerSizeValue, printing.system().forms());
+    job.orientation = style.PagerOrientation;
+    printPages(order, canvas.document(), job, canvas.recorder().textFont(), printing, progress);
+}
+
+} // namespace
+
+int runPrint(const Invocation& invocation)
+{
+    const CommandLine line(invocation.arguments, { Options, sourceOptions(), reportOptions() }, 1);
+    const Order order(line);
+    const HeadlessApplication application(invocation);
+    qt::QtPlatform platform;
+    qt::StreamMessages messages;
+    platform.useMessages(messages);
+    qt::QtPrinting printing(platform);
+    choosePrinter(line, printing);
+    const Interruption interruption(platform.loop());
+    ProgressLine progress;
+    if (isDocumentName(order.file))
+        printDocument(order, line, platform, printing, progress);
+    else
+        printTable(order, line, platform, printing, progress);
+    return messages.exitStatus();
+}
+
+QString printDetails()
+{
+    return QStringLiteral(
+               "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
+               "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
+               "Every page is a job of its own, one-sided, on the paper it was laid out for.\n\n")
+        + optionHelp(Options) + optionHelp(sourceOptions()) + optionHelp(reportOptions());
+}
+
+} // namespace pelloric::app
