@@ -29,11 +29,11 @@ inline constexpr TextView PaperColumns[] = { u"name", u"cx", u"cy", u"value" };
 
 /// The paper group of the page setup dialog: name, code, orientation and the two size boxes.
 struct PaperChoice {
-    Text paperName;
+    Text paperName {};
     std::int16_t paperCode = 0; ///< 1-based place in the list of forms
     std::int16_t orientation = 1; ///< 1 portrait, 2 landscape
-    Text widthBox; ///< the number, then "mm"
-    Text heightBox; ///< the number, then "mm"
+    Text widthBox {}; ///< the number, then "mm"
+    Text heightBox {}; ///< the number, then "mm"
     Text caption { u"PagerSize" }; ///< what the label over the boxes says
 
     bool isPortrait() const { return orientation == 1; }

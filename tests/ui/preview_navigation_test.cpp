@@ -1,0 +1,366 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/preview_navigation.h"
+
+#include "controls/canvas.h"
+#include "controls/messages.h"
+#include "fakes/fake_platform.h"
+#include "platform/table_grid.h"
+#include "settings/default_settings.h"
+#include "support/errors.h"
+
+#include <gtest/gtest.h>
+
+namespace pelloric {
+
+namespace {
+
+class FakeHost : public PreviewHost {
+public:
+    DialogEnd showGridStyle() override { return ended("grid style"); }
+    DialogEnd showPageSetup() override { return ended("page setup"); }
+    void showPrintOptions() override { log += "print options;"; }
+    void showAbout() override { log += "about;"; }
+    std::filesystem::path chooseFileToOpen() override { return chosen("open;"); }
+    std::filesystem::path chooseFileToSave() override { return chosen("save;"); }
+    void unload() override { log += "unload;"; }
+    void navigationChanged() override { ++changes; }
+
+    std::string log;
+    std::filesystem::path path; ///< empty: the user cancels
+    DialogEnd end = DialogEnd::Cancelled;
+    int changes = 0;
+
+private:
+    DialogEnd ended(const std::string& dialog)
+    {
+        log += dialog + ";";
+        return end;
+    }
+
+    std::filesystem::path chosen(const std::string& dialog)
+    {
+        log += dialog;
+        if (path.empty())
+            throw RunTimeError(ErrorNumber::Cancelled);
+        return path;
+    }
+};
+
+/// A session over a canvas with so many empty A4 pages.
+struct Fixture {
+    explicit Fixture(int pages)
+        : canvas(platform.services())
+    {
+        canvas.page.myWidth = 11907;
+        canvas.page.myHeight = 16840;
+        for (int page = 1; page < pages; ++page)
+            canvas.newPage();
+        canvas.setCurrentpage(1);
+    }
+
+    void click(const std::vector<int>& ids)
+    {
+        for (const int id : ids)
+            session().click(id);
+    }
+
+    PreviewSession& session()
+    {
+        if (!session_)
+            session_.emplace(canvas, host);
+        return *session_;
+    }
+
+    /// Current page, window, enabled tools 5 to 8, text of the page box.
+    std::string position()
+    {
+        const NavigationState& state = session().state();
+        std::string text = std::to_string(canvas.Currentpage()) + " ("
+            + std::to_string(canvas.WindowPages()) + "," + std::to_string(canvas.WindowMinPage())
+            + "," + std::to_string(canvas.WindowMaxPage()) + ") ";
+        for (const bool enabled : { state.first, state.previous, state.next, state.last })
+            text += enabled ? '+' : '-';
+        return text + " " + toUtf8(state.pageBox);
+    }
+
+    FakePlatform platform;
+    FakeHost host;
+    Canvas canvas;
+
+private:
+    std::optional<PreviewSession> session_;
+};
+
+/// An object that answers nothing but the members that it is given.
+class NamedObject : public AutomationObject {
+public:
+    explicit NamedObject(std::vector<Text> members, AutomationObject* items = nullptr)
+        : members_(std::move(members))
+        , items_(items)
+    {
+    }
+
+    std::optional<MemberId> findMember(TextView name) override
+    {
+        for (std::size_t id = 0; id < members_.size(); ++id) {
+            if (members_[id] == name)
+                return static_cast<MemberId>(id);
+        }
+        return std::nullopt;
+    }
+    const void* memberTable() const override { return this; }
+    Value get(MemberId, std::span<const Value>) override
+    {
+        return items_ ? Value::ofObject(*items_) : Value();
+    }
+    void put(MemberId, std::span<const Value>, const Value&) override { }
+
+private:
+    std::vector<Text> members_;
+    AutomationObject* items_;
+};
+
+} // namespace
+
+TEST(PreviewNavigation, MovesAndArrangesAsEachToolSays)
+{
+    struct Case {
+        int pages;
+        std::vector<int> clicks;
+        std::string position;
+    };
+    const Case cases[] = {
+        { 1, {}, "1 (0,0,0) ---- NO. 1" },
+        { 1, { 5 }, "1 (0,0,0) ---- NO. 1" },
+        { 1, { 6 }, "1 (0,0,0) ---- NO. 1" },
+        { 1, { 8 }, "1 (0,0,0) ---- NO. 1" },
+        { 1, { 9 }, "1 (0,0,0) ---- NO. 1" },
+        { 1, { 10 }, "1 (0,0,0) ---- NO. 1" },
+        { 1, { 15 }, "1 (0,0,0) ---- NO. 1" },
+        { 1, { 16 }, "1 (2,0,1) ---- 【1-1】" },
+        { 1, { 18 }, "1 (4,0,3) ---- 【1-1】" },
+        { 2, {}, "1 (0,0,0) --++ NO. 1" },
+        { 2, { 7 }, "2 (0,0,0) ++-- NO. 2" },
+        { 2, { 7, 6 }, "1 (0,0,0) --++ NO. 1" },
+        { 2, { 8 }, "2 (0,0,0) ++-- NO. 2" },
+        { 2, { 8, 8 }, "2 (0,0,0) ++-- NO. 2" },
+        { 2, { 8, 5 }, "1 (0,0,0) --++ NO. 1" },
+        { 2, { 8, 9 }, "1 (0,0,0) --++ NO. 1" },
+        { 2, { 8, 15 }, "2 (0,0,0) ++-- NO. 2" },
+        { 2, { 16 }, "1 (2,0,1) ---- 【1-2】" },
+        { 2, { 8, 16 }, "2 (2,1,2) ++-- 【2-2】" },
+        { 2, { 18, 10 }, "1 (0,0,0) --++ NO. 1" },
+        { 5, { 7 }, "2 (0,0,0) ++++ NO. 2" },
+        { 5, { 8 }, "5 (0,0,0) ++-- NO. 5" },
+        { 5, { 8, 6 }, "4 (0,0,0) ++++ NO. 4" },
+        { 5, { 7, 10 }, "2 (0,0,0) ++++ NO. 2" },
+        { 5, { 16 }, "1 (2,0,1) --++ 【1-2】" },
+        { 5, { 16, 7 }, "2 (2,2,3) ++++ 【3-4】" },
+        { 5, { 16, 7, 7 }, "3 (2,4,5) ++-- 【5-5】" },
+        { 5, { 16, 7, 6 }, "1 (2,0,1) --++ 【1-2】" },
+        { 5, { 16, 7, 6, 6 }, "1 (2,0,1) --++ 【1-2】" },
+        { 5, { 16, 8 }, "5 (2,3,4) ++-- 【4-5】" },
+        { 5, { 16, 8, 6 }, "4 (2,1,2) ++++ 【2-3】" },
+        { 5, { 16, 8, 6, 6 }, "3 (2,-1,0) --++ 【1-2】" },
+        { 5, { 16, 8, 5 }, "1 (2,0,1) --++ 【1-2】" },
+        { 5, { 18 }, "1 (4,0,3) --++ 【1-4】" },
+        { 5, { 18, 7 }, "2 (4,4,7) ++-- 【5-5】" },
+        { 5, { 18, 8 }, "5 (4,1,4) ++-- 【2-5】" },
+        { 5, { 18, 15 }, "1 (0,0,0) --++ NO. 1" },
+        { 20, { 8, 9 }, "1 (0,0,0) --++ NO. 1" },
+        { 20, { 9, 7 }, "2 (0,0,0) ++++ NO. 2" },
+        { 20, { 18, 8 }, "20 (4,16,19) ++-- 【17-20】" },
+        { 21, { 9 }, "1 (6,0,5) --++ 【1-6】" },
+        { 21, { 7, 7, 9 }, "3 (6,2,7) ++++ 【3-8】" },
+        { 21, { 9, 7 }, "2 (6,6,11) ++++ 【7-12】" },
+        { 21, { 9, 7, 7, 7 }, "4 (6,18,23) ++-- 【19-21】" },
+        { 21, { 9, 7, 6 }, "1 (6,0,5) --++ 【1-6】" },
+        { 21, { 9, 8 }, "21 (6,15,20) ++-- 【16-21】" },
+        { 21, { 9, 8, 6 }, "20 (6,9,14) ++++ 【10-15】" },
+        { 21, { 9, 8, 5 }, "1 (6,0,5) --++ 【1-6】" },
+        { 21, { 9, 8, 10 }, "21 (0,0,0) ++-- NO. 21" },
+        { 21, { 9, 15 }, "1 (0,0,0) --++ NO. 1" },
+        { 21, { 9, 16 }, "1 (2,0,1) --++ 【1-2】" },
+    };
+    for (const Case& row : cases) {
+        Fixture fixture(row.pages);
+        fixture.click(row.clicks);
+        EXPECT_EQ(fixture.position(), row.position)
+            << row.pages << " pages, " << testing::PrintToString(row.clicks);
+    }
+}
+
+TEST(PreviewNavigation, ShowsTwentyPagesAtOnceAndAWindowOfTwentyOne)
+{
+    Fixture twenty(20);
+    twenty.click({ 9 });
+    EXPECT_EQ(twenty.canvas.WindowOrderStyle(), OrderStyle::Multiple);
+    EXPECT_EQ(twenty.canvas.view().surfaces.size(), 20U);
+    Fixture more(21);
+    more.click({ 9 });
+    EXPECT_EQ(more.canvas.WindowOrderStyle(), OrderStyle::Six);
+    EXPECT_EQ(more.canvas.view().surfaces.size(), 6U);
+}
+
+TEST(PreviewNavigation, TellsOnceThatThereIsNoNextPage)
+{
+    Fixture fixture(2);
+    fixture.click({ 8, 7 });
+    EXPECT_EQ(
+        fixture.platform.messages.take(), std::vector<Message> { messageOf(Notice::NoNextPage) });
+    EXPECT_EQ(fixture.position(), "2 (0,0,0) ++-- NO. 2");
+}
+
+TEST(PreviewNavigation, OpensOnPageOneAndLetsTheCanvasPaint)
+{
+    Fixture fixture(3);
+    const NavigationState expected { .first = false,
+        .previous = false,
+        .next = true,
+        .last = true,
+        .pageBox = u"NO. 1",
+        .pageEntries = 3,
+        .scale = u"   100 %",
+        .countLabel = u" 【共 3 页】" };
+    EXPECT_EQ(fixture.session().state(), expected);
+    EXPECT_EQ(fixture.canvas.strSCliectRect, u"full");
+    EXPECT_EQ(fixture.host.changes, 0);
+}
+
+TEST(PreviewNavigation, ZoomsAndShowsTheScale)
+{
+    Fixture fixture(1);
+    fixture.click({ 3 });
+    EXPECT_EQ(fixture.session().state().scale, u"200%");
+    fixture.click({ 4, 4 });
+    EXPECT_EQ(fixture.session().state().scale, u"50%");
+    EXPECT_EQ(fixture.canvas.DispScale(), 2.0F);
+}
+
+TEST(PreviewNavigation, SetsTheScaleThatWasChosen)
+{
+    Fixture fixture(1);
+    fixture.session().chooseScale(u"   25 %");
+    EXPECT_EQ(fixture.canvas.DispScale(), 4.0F);
+    fixture.session().chooseScale(u"   200 %");
+    EXPECT_EQ(fixture.canvas.DispScale(), 0.5F);
+    for (const TextView text : { u"0", u"abc", u"1e300", u"" }) {
+        fixture.session().chooseScale(text);
+        EXPECT_EQ(fixture.canvas.DispScale(), 0.5F);
+    }
+}
+
+TEST(PreviewNavigation, ShowsThePageThatWasChosen)
+{
+    Fixture fixture(21);
+    PreviewSession& session = fixture.session();
+    session.choosePage(u"   NO. 5");
+    EXPECT_EQ(fixture.position(), "5 (0,0,0) ++++ NO. 5");
+    session.choosePage(u"  【1-6】");
+    EXPECT_EQ(fixture.position(), "5 (0,0,0) ++++ NO. 5");
+    session.choosePage(u"NO. 21");
+    EXPECT_EQ(fixture.position(), "21 (0,0,0) ++-- NO. 21");
+    session.choosePage(u"3");
+    EXPECT_EQ(fixture.position(), "3 (0,0,0) ++++ NO. 3");
+    session.choosePage(u"99999");
+    EXPECT_EQ(fixture.position(), "3 (0,0,0) ++++ NO. 3");
+    session.choosePage(u"NO. 22");
+    EXPECT_EQ(fixture.platform.messages.take().size(), 1U);
+    EXPECT_EQ(fixture.position(), "3 (0,0,0) ++++ NO. 3");
+}
+
+TEST(PreviewNavigation, LeavesPanModeAndCentresOnEveryClick)
+{
+    Fixture fixture(2);
+    fixture.click({ 11 });
+    EXPECT_TRUE(fixture.canvas.view().pan);
+    fixture.click({ 14 });
+    EXPECT_FALSE(fixture.canvas.view().pan);
+    EXPECT_TRUE(fixture.canvas.ReSetLeftTop());
+}
+
+TEST(PreviewNavigation, HandsDialogsToItsHost)
+{
+    Fixture fixture(2);
+    fixture.click({ 1, 13, 12, 19, 20, 21 });
+    EXPECT_EQ(fixture.host.log, "grid style;page setup;print options;about;open;save;");
+    EXPECT_EQ(fixture.canvas.Totalpages(), 2);
+    fixture.click({ 17 });
+    EXPECT_EQ(fixture.canvas.document().pageCount(), 1);
+}
+
+TEST(PreviewNavigation, RefreshesTheNavigationAfterClearing)
+{
+    Fixture fixture(5);
+    fixture.click({ 8, 22 });
+    EXPECT_EQ(fixture.position(), "1 (0,0,0) ---- NO. 1");
+    EXPECT_EQ(fixture.session().state().pageEntries, 1);
+    EXPECT_EQ(fixture.session().state().countLabel, u" 【共 1 页】");
+}
+
+TEST(PreviewNavigation, OpensWhatItSaved)
+{
+    Fixture fixture(5);
+    fixture.host.path = fixture.platform.folder.file("pages.ostl");
+    fixture.click({ 21, 22, 20 });
+    EXPECT_EQ(fixture.position(), "1 (0,0,4) --++ NO. 1");
+    EXPECT_EQ(fixture.session().state().pageEntries, 5);
+}
+
+TEST(PreviewNavigation, ReadsNavigationAnewWhenAFileCannotBeOpened)
+{
+    Fixture fixture(5);
+    fixture.host.path = fixture.platform.folder.file("none.ostl");
+    fixture.click({ 20 });
+    EXPECT_EQ(fixture.session().state().countLabel, u" 【共 1 页】");
+}
+
+TEST(PreviewNavigation, BuildsRefreshesAndZoomsAGrid)
+{
+    Fixture fixture(1);
+    deployDefaultSettings(fixture.platform.services());
+    TableGrid grid({ { u"a", 1000 }, { u"b", 2000 } });
+    grid.addRow(std::vector<TextView> { u"1", u"2" });
+    fixture.session().open(grid);
+    EXPECT_EQ(fixture.canvas.m_PrintObj, PrintObjKind::MSHFlexGrid);
+    EXPECT_EQ(fixture.session().state().scale, u"100%");
+    fixture.click({ 23 });
+    EXPECT_DOUBLE_EQ(fixture.canvas.table()->ColumnWidths[0], 1100);
+    fixture.click({ 24 });
+    EXPECT_DOUBLE_EQ(fixture.canvas.table()->ColumnWidths[0], 990);
+    fixture.click({ 2 });
+    EXPECT_DOUBLE_EQ(fixture.canvas.table()->ColumnWidths[0], 1000);
+    fixture.session().forgetGrid();
+    EXPECT_EQ(errorOf([&] { fixture.session().refresh(true); }), ErrorNumber::ObjectMissing);
+    EXPECT_EQ(errorOf([&] { fixture.session().reZoom(); }), ErrorNumber::ObjectMissing);
+    fixture.click({ 2, 23, 24 });
+}
+
+TEST(PreviewNavigation, RefreshesAfterOkAndNotAfterCancel)
+{
+    Fixture fixture(5);
+    fixture.click({ 8, 1 });
+    EXPECT_EQ(fixture.position(), "5 (0,0,0) ++-- NO. 5");
+    fixture.host.end = DialogEnd::Accepted;
+    fixture.click({ 13 });
+    EXPECT_EQ(fixture.position(), "5 (0,0,0) --++ NO. 5");
+}
+
+TEST(PreviewNavigation, FindsTheKindOfAGridByItsMembers)
+{
+    NamedObject items({ u"Count" });
+    NamedObject bare({});
+    NamedObject flex({ u"TextMatrix", u"ListItems" });
+    NamedObject list({ u"ListItems" }, &items);
+    NamedObject uncounted({ u"ListItems" }, &bare);
+    NamedObject empty({ u"ListItems" });
+    NamedObject data({ u"DataSource" });
+    EXPECT_EQ(gridKindOf(flex), PrintObjKind::MSHFlexGrid);
+    EXPECT_EQ(gridKindOf(list), PrintObjKind::ListView);
+    for (NamedObject* const object : { &uncounted, &empty, &data })
+        EXPECT_EQ(gridKindOf(*object), PrintObjKind::datagrid);
+}
+
+} // namespace pelloric
