@@ -113,12 +113,10 @@ void writePage(const PageDocument& document, int page, LineWriter& writer)
     writer.line(ostl::TextsEnd);
 }
 
+/// The index of the last page that a file holds; -1 when there is none.
 int lastPageOf(const PageDocument& document)
 {
-    const int last = std::min(document.Totalpages - 1, ostl::LastPageIndex);
-    if (last >= document.pageCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
-    return last;
+    return std::min(document.Totalpages - 1, ostl::LastPageIndex);
 }
 
 /// A file beside another one, removed unless it has taken that one's place.
@@ -264,7 +262,8 @@ void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlE
     for (int page = 0; page <= last; ++page) {
         if (progress)
             progress(page, last);
-        writePage(document, page, writer);
+        if (document.hasPage(page))
+            writePage(document, page, writer);
     }
     writer.line(ostl::Quote);
     writer.flush();
@@ -273,7 +272,6 @@ void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlE
 void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
     const OstlProgress& progress, const std::filesystem::path& path)
 {
-    lastPageOf(document);
     const auto compose
         = [&](std::ostream& stream) { writeOstl(document, setup, encoding, progress, stream); };
     if (!saveTo(targetOf(path), compose))

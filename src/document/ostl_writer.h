@@ -28,10 +28,9 @@ using OstlProgress = std::function<void(int page, int last)>;
 ///
 /// Pages 0 to `Totalpages` - 1 are written, 130 being the last index that a file holds. Every
 /// `PageCountToken` becomes `Totalpages`. Texts stand as they are: a line break or a quote in one
-/// breaks the file's structure.
+/// breaks the file's structure. A page that `Totalpages` counts but that does not exist is passed
+/// over.
 /// @param progress  may be empty
-/// @throws RunTimeError SubscriptOutOfRange: `Totalpages` counts pages that do not exist; nothing
-///         has been written
 void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
     const OstlProgress& progress, std::ostream& stream);
 
@@ -40,7 +39,7 @@ void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlE
 /// The file is written under another name beside its place and put there when it is whole, so a
 /// save that fails, or that `progress` ends with an error, changes nothing. A file in a folder
 /// that takes no new one is rewritten in place.
-/// @throws RunTimeError WriteFailed, with the path; SubscriptOutOfRange as above
+/// @throws RunTimeError WriteFailed, with the path
 void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
     const OstlProgress& progress, const std::filesystem::path& path);
 
