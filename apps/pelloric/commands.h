@@ -28,9 +28,25 @@ struct Command {
 /// All commands, in the order in which they are listed.
 std::span<const Command> commands();
 
+/// `pelloric demo`: a host with all kinds of grids.
+int runDemo(const Invocation& invocation);
+QString demoDetails();
+
+/// `pelloric preview`: a table in the preview window.
+int runPreview(const Invocation& invocation);
+QString previewDetails();
+
+/// `pelloric open`: a saved document in the preview window.
+int runOpen(const Invocation& invocation);
+QString openDetails();
+
 /// `pelloric export`: a table or a document as PDF, images or a document file; needs no display.
 int runExport(const Invocation& invocation);
 QString exportDetails();
+
+/// `pelloric run`: a script that drives the controls by name; needs no display.
+int runScript(const Invocation& invocation);
+QString scriptDetails();
 
 /// `pelloric print`: a table or a document on a printer; needs no display.
 int runPrint(const Invocation& invocation);

@@ -17,13 +17,18 @@ void keepGraveMessages(QtMsgType type, const QMessageLogContext&, const QString&
 
 } // namespace
 
-HeadlessApplication::Surroundings::Surroundings()
+HeadlessSurroundings::HeadlessSurroundings()
 {
     qInstallMessageHandler(keepGraveMessages);
     qputenv("QT_QPA_PLATFORM", "offscreen");
 }
 
 HeadlessApplication::HeadlessApplication(const Invocation& invocation)
+    : application_(invocation.argc, invocation.argv)
+{
+}
+
+HeadlessWidgets::HeadlessWidgets(const Invocation& invocation)
     : application_(invocation.argc, invocation.argv)
 {
 }

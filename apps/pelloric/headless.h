@@ -5,23 +5,33 @@
 
 #include "commands.h"
 
-#include <QGuiApplication>
+#include <QApplication>
 
 namespace pelloric::app {
 
-/// The application object of a command without windows: it needs no display and no desktop, and
-/// keeps the toolkit's remarks to itself.
+/// Makes the toolkit need no display and no desktop, and keep its remarks to itself.
+struct HeadlessSurroundings {
+    HeadlessSurroundings();
+};
+
+/// The application object of a command without windows.
 class HeadlessApplication {
 public:
     explicit HeadlessApplication(const Invocation& invocation);
 
 private:
-    struct Surroundings {
-        Surroundings();
-    };
-
-    Surroundings surroundings_;
+    HeadlessSurroundings surroundings_;
     QGuiApplication application_;
+};
+
+/// The application object of a command whose controls nobody sees.
+class HeadlessWidgets {
+public:
+    explicit HeadlessWidgets(const Invocation& invocation);
+
+private:
+    HeadlessSurroundings surroundings_;
+    QApplication application_;
 };
 
 } // namespace pelloric::app

@@ -17,8 +17,13 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Commands = std::to_array<Command>({
-    { "export", "FILE -o OUT", "Writes a table as PDF, PNG, SVG or a document file",
-        runExport, exportDetails },
+    { "demo", "", "Shows all kinds of grids on sample tables", runDemo, demoDetails },
+    { "preview", "FILE", "Shows a table in the preview window", runPreview, previewDetails },
+    { "open", "FILE.ostl", "Shows a saved document in the preview window", runOpen, openDetails },
+    { "export", "FILE -o OUT", "Writes a table as PDF, PNG, SVG or a document file", runExport,
+        exportDetails },
+    { "run", "SCRIPT.js [ARGUMENT...]", "Runs a script that drives the controls by name", runScript,
+        scriptDetails },
     { "print", "FILE", "Prints a table or a document file", runPrint, printDetails },
     { "printers", "", "Lists the printers", runPrinters, printersDetails },
     { "settings", "", "Shows or restores the settings file", runSettings, settingsDetails },

@@ -4,8 +4,7 @@
 #include "controls/qt/script_host.h"
 
 #include "controls/canvas.h"
-#include "controls/qt/kestrane.h"
-#include "controls/qt/sorvane.h"
+#include "controls/qt/script_controls.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
@@ -15,8 +14,6 @@
 #include <QDeadlineTimer>
 #include <QEventLoop>
 #include <QFile>
-#include <QPixmap>
-#include <QWidget>
 
 #include <algorithm>
 #include <array>
@@ -40,7 +37,7 @@ constexpr auto ExitMark = "pelloric: the script asked to end";
 
 /// What the script finds besides the language itself.
 constexpr auto Prelude = R"js(
-(function (host, argumentList) {
+(function (global, host, argumentList) {
     const enumerations = {
         OrderStyle: { Whole: 0, One: 1, Two: 2, Four: 3, Multiple: 4, UserCustom: 5, Six: 6 },
         PrintObjKind: { MSHFlexGrid: 0, MSFlexGrid: 1, ListView: 2, datagrid: 3 },
@@ -55,13 +52,10 @@ constexpr auto Prelude = R"js(
         ColPos: { StartCol: 0, EndCol: 0 },
         MuliPageType: { nPages: 0, MinPage: 0, MaxPage: 0 },
     };
-    const define = (name, value) => Object.defineProperty(globalThis, name, { value });
+    const define = (name, value) => Object.defineProperty(global, name, { value });
     const control = (make, constants) => {
         const constructor = function () {
-            const made = make();
-            made.grab = (path) => host.grab(made, path);
-            made.resize = (width, height) => host.resize(made, width, height);
-            return Object.preventExtensions(made);
+            return Object.preventExtensions(make());
         };
         return Object.assign(constructor, constants);
     };
@@ -81,7 +75,7 @@ constexpr auto Prelude = R"js(
     define("texts", (canvas, page) => host.texts(canvas, page));
     define("placePicture", (canvas, page, picture) => host.placePicture(canvas, page, picture));
     const messages = [];
-    Object.defineProperty(globalThis, "messages", {
+    Object.defineProperty(global, "messages", {
         get: () => { messages.push(...host.takeMessages()); return messages; },
     });
 })
@@ -152,9 +146,8 @@ MapLocation pictureOf(const QJSValue& value)
     const auto shortOf = [&](const char* name) {
         return roundToInt16(value.property(QLatin1String(name)).toNumber());
     };
-    const auto textOf = [&](const char* name) {
-        return toText(value.property(QLatin1String(name)).toString());
-    };
+    const auto textOf
+        = [&](const char* name) { return toText(value.property(QLatin1String(name)).toString()); };
     return { shortOf("nLeft"), shortOf("nTop"), shortOf("nWidth"), shortOf("nHeight"),
         textOf("nFJBH"), textOf("strFilePath") };
 }
@@ -210,7 +203,9 @@ QJSValue ScriptHost::evaluatePrelude(const QStringList& arguments)
         list.setProperty(static_cast<quint32>(index), arguments[index]);
     QJSEngine::setObjectOwnership(this, QJSEngine::CppOwnership);
     const QJSValue prelude = engine_->evaluate(QString::fromUtf8(Prelude));
-    return prelude.isError() ? prelude : prelude.call({ engine_->newQObject(this), list });
+    return prelude.isError()
+        ? prelude
+        : prelude.call({ engine_->globalObject(), engine_->newQObject(this), list });
 }
 
 int ScriptHost::report(const QJSValue& error, const QString& name)
@@ -218,16 +213,13 @@ int ScriptHost::report(const QJSValue& error, const QString& name)
     if (!error.isError())
         return 0;
     const QJSValue number = error.property(QStringLiteral("number"));
-    const QString kind = number.isNumber()
-        ? QStringLiteral(" (error %1)").arg(number.toInt())
-        : QString();
+    const QString kind
+        = number.isNumber() ? QStringLiteral(" (error %1)").arg(number.toInt()) : QString();
     std::fprintf(stderr, "%s:%d: %s%s\n", qPrintable(name),
         error.property(QStringLiteral("lineNumber")).toInt(), qPrintable(error.toString()),
         qPrintable(kind));
     return 1;
 }
-
-void ScriptHost::fail(const QString& text) { engine_->throwError(text); }
 
 /// An error of the library becomes an exception of the script.
 QJSValue ScriptHost::answer(const std::function<QJSValue()>& call)
@@ -235,8 +227,7 @@ QJSValue ScriptHost::answer(const std::function<QJSValue()>& call)
     try {
         return call();
     } catch (const RunTimeError& error) {
-        QJSValue thrown
-            = engine_->newErrorObject(QJSValue::GenericError, toQString(error.text()));
+        QJSValue thrown = engine_->newErrorObject(QJSValue::GenericError, toQString(error.text()));
         thrown.setProperty(QStringLiteral("number"), static_cast<int>(error.number()));
         engine_->throwError(thrown);
     }
@@ -267,28 +258,9 @@ QJSValue ScriptHost::sqlite(const QString& path, const QString& tableOrQuery)
     return answer([&] { return engine_->newQObject(tables_.sqlite(path, tableOrQuery)); });
 }
 
-QJSValue ScriptHost::newSorvane() { return engine_->newQObject(new Sorvane(platform_)); }
+QJSValue ScriptHost::newSorvane() { return engine_->newQObject(new ScriptSorvane(platform_)); }
 
-QJSValue ScriptHost::newKestrane() { return engine_->newQObject(new Kestrane(platform_)); }
-
-void ScriptHost::grab(QObject* control, const QString& path)
-{
-    auto* const widget = qobject_cast<QWidget*>(control);
-    if (widget == nullptr)
-        return fail(QStringLiteral("grab: no control"));
-    if (!widget->grab().save(path))
-        fail(QStringLiteral("grab: cannot write ") + path);
-}
-
-void ScriptHost::resize(QObject* control, int width, int height)
-{
-    auto* const widget = qobject_cast<QWidget*>(control);
-    if (widget == nullptr)
-        return fail(QStringLiteral("resize: no control"));
-    widget->resize(width, height);
-    widget->show();
-    QCoreApplication::processEvents();
-}
+QJSValue ScriptHost::newKestrane() { return engine_->newQObject(new ScriptKestrane(platform_)); }
 
 void ScriptHost::wait(int milliseconds)
 {

@@ -27,7 +27,8 @@ public:
     /// A grid over a CSV or TSV file. @throws RunTimeError the file's own
     virtual QObject* csv(const QString& path) = 0;
 
-    /// A grid over a table or a query of an SQLite database. @throws RunTimeError the database's own
+    /// A grid over a table or a query of an SQLite database. @throws RunTimeError the database's
+    /// own
     virtual QObject* sqlite(const QString& path, const QString& tableOrQuery) = 0;
 };
 
@@ -64,9 +65,6 @@ public:
     Q_INVOKABLE QJSValue sqlite(const QString& path, const QString& tableOrQuery);
     Q_INVOKABLE QJSValue newSorvane();
     Q_INVOKABLE QJSValue newKestrane();
-    /// Saves a picture of a control.
-    Q_INVOKABLE void grab(QObject* control, const QString& path);
-    Q_INVOKABLE void resize(QObject* control, int width, int height);
     /// Lets pending messages run for some milliseconds, 10,000 at most.
     Q_INVOKABLE void wait(int milliseconds);
     /// The lines of a page (from 0) as `Lineobj` records.
@@ -79,7 +77,6 @@ public:
     Q_INVOKABLE QJSValue takeMessages();
 
 private:
-    void fail(const QString& text);
     QJSValue answer(const std::function<QJSValue()>& call);
     QJSValue evaluatePrelude(const QStringList& arguments);
     int report(const QJSValue& error, const QString& name);

@@ -1,0 +1,91 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "command_line.h"
+#include "commands.h"
+#include "controls/qt/script_host.h"
+#include "headless.h"
+#include "platform/platform.h"
+#include "platform/qt/csv_table.h"
+#include "platform/qt/held_grid.h"
+#include "platform/qt/qt_platform.h"
+#include "platform/qt/sqlite_table.h"
+#include "platform/text_metrics.h"
+#include "report/content_widths.h"
+#include "settings/default_settings.h"
+#include "table_source.h"
+
+#include <memory>
+
+namespace pelloric::app {
+
+namespace {
+
+constexpr float MeasuredSize = 9; ///< points; columns suit texts of this size
+constexpr auto MeasuredFace = u"宋体";
+
+/// Reads tables whose columns are as wide as what they hold.
+class Tables final : public qt::ScriptTables {
+public:
+    explicit Tables(TextMetrics& metrics)
+        : metrics_(metrics)
+    {
+    }
+
+    QObject* csv(const QString& path) override { return held(qt::readCsv(pathOf(path), {})); }
+
+    QObject* sqlite(const QString& path, const QString& tableOrQuery) override
+    {
+        const bool isQuery = tableOrQuery.trimmed().contains(QLatin1Char(' '));
+        return held(qt::readSqlite({ .path = pathOf(path),
+            .table = isQuery ? QString() : tableOrQuery,
+            .query = isQuery ? tableOrQuery : QString() }));
+    }
+
+private:
+    QObject* held(TableGrid table) const
+    {
+        auto grid = std::make_shared<TableGrid>(std::move(table));
+        FaceMetrics& face = metrics_.face(MeasuredFace, false, false);
+        const std::vector<Twips> widths = contentWidths(*grid, face, MeasuredSize);
+        const MemberId colWidth = memberOf(*grid, u"ColWidth");
+        for (std::size_t column = 0; column < widths.size(); ++column) {
+            const Value index = Value::ofNumber(static_cast<double>(column));
+            grid->put(colWidth, { &index, 1 }, Value::ofNumber(widths[column]));
+        }
+        return new qt::HeldGrid(std::move(grid));
+    }
+
+    TextMetrics& metrics_;
+};
+
+} // namespace
+
+int runScript(const Invocation& invocation)
+{
+    if (invocation.arguments.isEmpty())
+        throw CommandError(
+            QStringLiteral("say which script to run, for example \"pelloric run report.js\""),
+            WrongUsage);
+    const HeadlessWidgets application(invocation);
+    qt::QtPlatform platform;
+    const Platform record = platform.record();
+    deployDefaultSettings(record);
+    Tables tables(record.metrics);
+    qt::ScriptHost host(platform, tables);
+    QStringList arguments = invocation.arguments;
+    const QString script = arguments.takeFirst();
+    return host.run(script, arguments);
+}
+
+QString scriptDetails()
+{
+    return QStringLiteral(
+        "The script finds Sorvane and Kestrane, the records and enumerations of their interface,\n"
+        "args, messages, print(...), exit(status), csv(path), sqlite(path, tableOrQuery),\n"
+        "lines(canvas, page), texts(canvas, page), placePicture(canvas, page, picture) and\n"
+        "wait(milliseconds). A control also has grab(path) and resize(width, height).\n"
+        "An exception that it does not catch ends the program with status 1.\n");
+}
+
+} // namespace pelloric::app
