@@ -121,7 +121,8 @@ QByteArray encodingOf(QIODevice& file, const QString& asked)
     if (isAll(file, Utf8))
         return Utf8;
     if (!isAll(file, Gb18030))
-        refuseBytes(file, Utf8, u"bytes that are neither UTF-8 nor GB18030 text; name the encoding");
+        refuseBytes(
+            file, Utf8, u"bytes that are neither UTF-8 nor GB18030 text; name the encoding");
     return Gb18030;
 }
 
@@ -213,8 +214,8 @@ public:
     void take(const QByteArray& bytes)
     {
         const auto size = static_cast<std::size_t>(bytes.size());
-        if (csv_parse(&parser_, bytes.constData(), size, &CsvParser::onCell, &CsvParser::onLine,
-                this)
+        if (csv_parse(
+                &parser_, bytes.constData(), size, &CsvParser::onCell, &CsvParser::onLine, this)
             != size)
             refuse(atLine(line_, u"a value that is too long"));
         throwFailure();

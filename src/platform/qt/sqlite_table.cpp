@@ -71,8 +71,8 @@ QStringList tablesOf(const QSqlDatabase& database, const std::filesystem::path& 
 
 QString chosenTable(const SqliteSource& source, const QStringList& tables)
 {
-    const QString list = tables.isEmpty() ? QStringLiteral("none")
-                                          : tables.join(QStringLiteral(", "));
+    const QString list
+        = tables.isEmpty() ? QStringLiteral("none") : tables.join(QStringLiteral(", "));
     if (source.table.isEmpty()) {
         if (tables.size() != 1)
             refuse(QStringLiteral("name one of the database's tables: ") + list);

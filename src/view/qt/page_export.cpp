@@ -9,6 +9,7 @@
 #include "platform/qt/qt_drawing_surface.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "view/joined_lines.h"
 #include "view/page_renderer.h"
 #include "view/qt/exact_page_device.h"
 #include "view/qt/pending_files.h"
@@ -100,7 +101,9 @@ public:
         painter.save();
         painter.scale(resolution / TwipsPerInch, resolution / TwipsPerInch);
         QtDrawingSurface surface(painter, fonts_, { .page = isWhite ? paper_ : QRectF() });
-        renderer_.replay(page, {}, surface);
+        JoinedLines joined(surface);
+        renderer_.replay(page, {}, joined);
+        joined.finish();
         painter.restore();
     }
 
@@ -112,8 +115,8 @@ private:
 
 void setUpPdf(QPdfWriter& writer, const PageSetup& setup, const Text& title)
 {
-    const QSizeF points(ExactPageDevice::wholePoints(setup.myWidth),
-        ExactPageDevice::wholePoints(setup.myHeight));
+    const QSizeF points(
+        ExactPageDevice::wholePoints(setup.myWidth), ExactPageDevice::wholePoints(setup.myHeight));
     const QPageSize size(points, QPageSize::Point, QStringLiteral("Paper"), QPageSize::ExactMatch);
     writer.setResolution(PdfResolution);
     writer.setPageLayout(QPageLayout(size, QPageLayout::Portrait, QMarginsF()));
@@ -124,8 +127,7 @@ void setUpPdf(QPdfWriter& writer, const PageSetup& setup, const Text& title)
 std::filesystem::path numberedPath(
     const std::filesystem::path& path, int page, const PageDocument& document)
 {
-    const std::size_t digits
-        = std::max(FewestDigits, std::to_string(document.pageCount()).size());
+    const std::size_t digits = std::max(FewestDigits, std::to_string(document.pageCount()).size());
     const std::string number = std::to_string(page + 1);
     std::filesystem::path name = path.stem();
     name += "-" + std::string(digits - number.size(), '0') + number;
@@ -188,9 +190,8 @@ void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fo
     files.putInPlace();
 }
 
-std::vector<std::filesystem::path> exportPngs(const PageDocument& document,
-    const PageSetup& setup, QtFonts& fonts, const ExportOptions& options,
-    const std::filesystem::path& path)
+std::vector<std::filesystem::path> exportPngs(const PageDocument& document, const PageSetup& setup,
+    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path)
 {
     checkPaper(setup);
     const PagePainter pagePainter(document, setup, fonts);
@@ -209,9 +210,8 @@ std::vector<std::filesystem::path> exportPngs(const PageDocument& document,
     });
 }
 
-std::vector<std::filesystem::path> exportSvg(const PageDocument& document,
-    const PageSetup& setup, QtFonts& fonts, const ExportOptions& options,
-    const std::filesystem::path& path)
+std::vector<std::filesystem::path> exportSvg(const PageDocument& document, const PageSetup& setup,
+    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path)
 {
     checkPaper(setup);
     const PagePainter pagePainter(document, setup, fonts);
@@ -231,9 +231,8 @@ std::vector<std::filesystem::path> exportSvg(const PageDocument& document,
     });
 }
 
-void exportOstl(const PageDocument& document, const PageSetup& setup,
-    const OstlEncoding& encoding, const ExportOptions& options,
-    const std::filesystem::path& path)
+void exportOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
+    const ExportOptions& options, const std::filesystem::path& path)
 {
     const auto step = [&](int page, int last) {
         tell(options, static_cast<std::size_t>(page), static_cast<std::size_t>(last) + 1);

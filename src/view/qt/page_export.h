@@ -45,24 +45,21 @@ void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fo
 /// A single page is written to the path itself. A page that is asked for twice is written once.
 /// @return  the files in the order of the pages
 /// @throws RunTimeError as `exportPdf`; Overflow: also an image of more pixels than can be held
-std::vector<std::filesystem::path> exportPngs(const PageDocument& document,
-    const PageSetup& setup, QtFonts& fonts, const ExportOptions& options,
-    const std::filesystem::path& path);
+std::vector<std::filesystem::path> exportPngs(const PageDocument& document, const PageSetup& setup,
+    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path);
 
 /// Writes one SVG file for each page, named as the images are; texts stay texts.
 ///
 /// @return  the files in the order of the pages
 /// @throws RunTimeError as `exportPdf`
-std::vector<std::filesystem::path> exportSvg(const PageDocument& document,
-    const PageSetup& setup, QtFonts& fonts, const ExportOptions& options,
-    const std::filesystem::path& path);
+std::vector<std::filesystem::path> exportSvg(const PageDocument& document, const PageSetup& setup,
+    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path);
 
 /// Writes a document file, which holds pages from the first on, 131 at most.
 ///
 /// @param options  only the progress is looked at
 /// @throws RunTimeError WriteFailed, with the path; Cancelled
-void exportOstl(const PageDocument& document, const PageSetup& setup,
-    const OstlEncoding& encoding, const ExportOptions& options,
-    const std::filesystem::path& path);
+void exportOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
+    const ExportOptions& options, const std::filesystem::path& path);
 
 } // namespace pelloric::qt

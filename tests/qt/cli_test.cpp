@@ -1,0 +1,251 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "fakes/temp_folder.h"
+
+#include <QFile>
+#include <QImage>
+#include <QProcess>
+#include <QProcessEnvironment>
+
+#include <gtest/gtest.h>
+
+#include <csignal>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr int LongestRun = 60000; ///< milliseconds
+
+/// How a run of the program ended.
+struct Ended {
+    int status = -1;
+    std::string output;
+    std::string errors;
+};
+
+/// Runs the program in a folder of its own, with settings of its own and without a display.
+class Program : public testing::Test {
+protected:
+    Ended run(const QStringList& arguments)
+    {
+        QProcess process;
+        start(process, arguments);
+        return finish(process);
+    }
+
+    void start(QProcess& process, const QStringList& arguments) const
+    {
+        QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+        for (const char* name : { "DISPLAY", "WAYLAND_DISPLAY", "QT_QPA_PLATFORM" })
+            environment.remove(QString::fromLatin1(name));
+        environment.insert(QStringLiteral("XDG_CONFIG_HOME"),
+            QString::fromStdString(folder_.file("config").string()));
+        process.setProcessEnvironment(environment);
+        process.setWorkingDirectory(QString::fromStdString(folder_.path().string()));
+        process.start(QStringLiteral(PELLORIC_PROGRAM), arguments);
+    }
+
+    static Ended finish(QProcess& process)
+    {
+        EXPECT_TRUE(process.waitForFinished(LongestRun));
+        return { process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1,
+            process.readAllStandardOutput().toStdString(),
+            process.readAllStandardError().toStdString() };
+    }
+
+    std::string settings() const
+    {
+        return TempFolder::bytesOf(folder_.file("config") / "pelloric" / "OstlConfig.ini");
+    }
+
+    std::string pdfText(const std::string& name) const
+    {
+        QProcess process;
+        process.start(QStringLiteral("pdftotext"),
+            { QStringLiteral("-layout"), QString::fromStdString(folder_.file(name).string()),
+                QStringLiteral("-") });
+        process.waitForFinished();
+        return process.readAllStandardOutput().toStdString();
+    }
+
+    TempFolder folder_;
+};
+
+QStringList words(const char* line)
+{
+    return QString::fromUtf8(line).split(QLatin1Char(' '), Qt::SkipEmptyParts);
+}
+
+bool has(const std::string& text, std::string_view part)
+{
+    return text.find(part) != std::string::npos;
+}
+
+} // namespace
+
+TEST_F(Program, ExportsATableAsPdf)
+{
+    folder_.write("towns.csv", "城市,n\n北京,1\n上海,2\n");
+    const Ended ended
+        = run(words("export towns.csv -o towns.pdf --title 城市表 --footer-right [Date&Time]"));
+    EXPECT_EQ(ended.status, 0) << ended.errors;
+    EXPECT_EQ(ended.errors, "");
+    const std::string text = pdfText("towns.pdf");
+    for (const char* part : { "城市表", "北京", "上海", "1 of 1" })
+        EXPECT_TRUE(has(text, part)) << part << " in\n" << text;
+}
+
+TEST_F(Program, AppliesTheOptionsOfAReport)
+{
+    folder_.write("t.csv", "a,b\nx,1\nx,2\n");
+    const Ended ended = run(words("export t.csv -o t.png --dpi 100 --paper 100x150mm --landscape "
+                                  "--merge --no-headers --font-size 12 --widths 1500,2000"));
+    EXPECT_EQ(ended.status, 0) << ended.errors;
+    const QImage image(QString::fromStdString(folder_.file("t.png").string()));
+    EXPECT_EQ(image.size(), QSize(591, 394));
+}
+
+TEST_F(Program, LeavesTheUsersSettingsAlone)
+{
+    EXPECT_EQ(run(words("settings")).status, 0);
+    const std::string before = settings();
+    EXPECT_TRUE(has(before, "PagerWidth= 210"));
+    folder_.write("t.csv", "a\n1\n");
+    EXPECT_EQ(run(words("export t.csv -o t.pdf --paper A3 --title T --font-size 20")).status, 0);
+    EXPECT_EQ(settings(), before);
+}
+
+TEST_F(Program, ShowsAndRestoresTheSettings)
+{
+    const Ended path = run(words("settings --path"));
+    EXPECT_EQ(
+        path.output, (folder_.file("config") / "pelloric" / "OstlConfig.ini").string() + "\n");
+    const Ended shown = run(words("settings"));
+    EXPECT_TRUE(shown.output.starts_with("ShowHeaders= 1\n")) << shown.output;
+    const std::string before = settings();
+    folder_.write("config/pelloric/OstlConfig.ini", "broken");
+    const Ended reset = run(words("settings --reset"));
+    EXPECT_EQ(reset.status, 0) << reset.errors;
+    EXPECT_EQ(settings(), before);
+}
+
+TEST_F(Program, ExportsASavedDocument)
+{
+    folder_.write("t.csv", "a\n北京\n");
+    EXPECT_EQ(run(words("export t.csv -o t.ostl")).status, 0);
+    EXPECT_EQ(run(words("export t.ostl -o again.ostl")).status, 0);
+    EXPECT_EQ(run(words("export t.ostl -o t.pdf")).status, 0);
+    EXPECT_TRUE(has(pdfText("t.pdf"), "北京"));
+}
+
+TEST_F(Program, ReadsTablesAndQueriesOfADatabase)
+{
+    QFile::copy(QStringLiteral(PELLORIC_TESTS_DIR "/../samples/samples.sqlite"),
+        QString::fromStdString(folder_.file("s.sqlite").string()));
+    EXPECT_EQ(run(words("export s.sqlite:countries_zh -o a.pdf --pages 1")).status, 0);
+    EXPECT_TRUE(has(pdfText("a.pdf"), "安道尔"));
+    const QStringList query { QStringLiteral("export"), QStringLiteral("s.sqlite"),
+        QStringLiteral("--query"), QStringLiteral("SELECT count(*) AS total FROM wine"),
+        QStringLiteral("-o"), QStringLiteral("b.pdf") };
+    EXPECT_EQ(run(query).status, 0);
+    EXPECT_TRUE(has(pdfText("b.pdf"), "178"));
+    const Ended missing = run(words("export s.sqlite:nothing -o c.pdf"));
+    EXPECT_EQ(missing.status, 1);
+    EXPECT_EQ(missing.errors,
+        "pelloric: s.sqlite: no table nothing; the database has: countries_zh, time_zones, wine\n");
+}
+
+namespace {
+
+struct ErrorCase {
+    const char* arguments;
+    int status;
+    const char* message; ///< what the one line holds
+};
+
+} // namespace
+
+TEST_F(Program, ExplainsEveryErrorInOneLine)
+{
+    folder_.write("t.csv", "a\n1\n");
+    folder_.write("open_quote.csv", "a\n1\n\"x\n");
+    folder_.write("bad_bytes.csv", "a\n\xFF\xFF\n");
+    folder_.write("empty.csv", "");
+    folder_.write("broken.ostl", "nothing");
+    folder_.write("kept.pdf", "old");
+    const ErrorCase cases[] = {
+        { "", 2, "pelloric help" },
+        { "dance", 2, "no command dance" },
+        { "export", 2, "the file is missing" },
+        { "export t.csv", 2, "-o OUT" },
+        { "export t.csv more.csv -o t.pdf", 2, "more.csv" },
+        { "export t.csv -o t.doc", 2, ".pdf, .png, .svg or .ostl" },
+        { "export t.csv -o t.pdf --bogus", 2, "bogus" },
+        { "export t.csv -o t.pdf --paper Q7", 2, "Q7" },
+        { "export t.csv -o t.png --dpi x", 2, "from 10 to 2400" },
+        { "export t.csv -o t.ostl --pages 1", 2, "--pages" },
+        { "export t.csv -o t.pdf --landscape --portrait", 2, "not both" },
+        { "export missing.csv -o t.pdf", 1, "missing.csv: there is no such file" },
+        { "export open_quote.csv -o kept.pdf", 1, "line 3: a quoted value that never ends" },
+        { "export bad_bytes.csv -o kept.pdf", 1, "line 2: bytes that are neither" },
+        { "export empty.csv -o kept.pdf", 1, "empty.csv: the file is empty" },
+        { "export t.csv -o kept.pdf --encoding no", 1, "unknown encoding no" },
+        { "export t.csv -o kept.pdf --pages 9", 1, "the document has 1" },
+        { "export t.csv -o kept.pdf --widths 0", 1, "--widths" },
+        { "export t.csv -o kept.pdf --query x", 1, "t.csv is none" },
+        { "export t.csv -o missing/t.pdf", 1, "missing/t.pdf; check that the folder exists" },
+        { "export broken.ostl -o kept.pdf", 1, "broken.ostl is no document file" },
+        { "settings --bogus", 2, "bogus" },
+        { "help dance", 2, "no command dance" },
+    };
+    for (const ErrorCase& row : cases) {
+        const Ended ended = run(words(row.arguments));
+        EXPECT_EQ(ended.status, row.status) << row.arguments;
+        EXPECT_TRUE(ended.errors.starts_with("pelloric: ")) << row.arguments;
+        EXPECT_TRUE(has(ended.errors, row.message)) << row.arguments << '\n' << ended.errors;
+        EXPECT_EQ(std::count(ended.errors.begin(), ended.errors.end(), '\n'), 1) << row.arguments;
+        EXPECT_EQ(ended.output, "") << row.arguments;
+    }
+    EXPECT_EQ(folder_.read("kept.pdf"), "old");
+    EXPECT_EQ(folder_.names().size(), 7U); // the files above and the settings
+}
+
+TEST_F(Program, SaysWhatADocumentFileCannotHold)
+{
+    std::string rows = "n\n";
+    for (int row = 0; row < 12000; ++row)
+        rows += "1\n";
+    folder_.write("long.csv", rows);
+    const Ended ended = run(words("export long.csv -o long.ostl"));
+    EXPECT_EQ(ended.status, 0);
+    EXPECT_TRUE(has(ended.errors, "a document file holds 131 pages; the last ")) << ended.errors;
+}
+
+#if defined(__unix__)
+
+TEST_F(Program, EndsCleanlyWhenInterrupted)
+{
+    std::string rows = "n,text\n";
+    for (int row = 0; row < 300000; ++row)
+        rows += "1,some text\n";
+    folder_.write("long.csv", rows);
+    folder_.write("long.pdf", "old");
+    QProcess process;
+    start(process, words("export long.csv -o long.pdf"));
+    // The file that is being written shows that the work is under way.
+    for (int wait = 0; wait < 600 && folder_.names().size() < 4; ++wait)
+        process.waitForFinished(50);
+    ASSERT_EQ(process.state(), QProcess::Running);
+    kill(static_cast<pid_t>(process.processId()), SIGINT);
+    const Ended ended = finish(process);
+    EXPECT_EQ(ended.status, 130);
+    EXPECT_EQ(ended.errors, "");
+    EXPECT_EQ(folder_.read("long.pdf"), "old");
+    EXPECT_EQ(folder_.names().size(), 3U); // the table, the old file and the settings
+}
+
+#endif
+
+} // namespace pelloric::qt
