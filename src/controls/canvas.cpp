@@ -96,6 +96,8 @@ void Canvas::setCurrentpage(std::int16_t page)
 
 void Canvas::clear()
 {
+    if (building_)
+        return;
     recorder_.clear();
     endArrangement(view_);
     if (table_)
@@ -105,6 +107,8 @@ void Canvas::clear()
 
 void Canvas::newPage()
 {
+    if (building_)
+        return;
     recorder_.newPage();
     unloadSurfaces(view_);
     notifyView();
@@ -195,6 +199,8 @@ void Canvas::layOut(GridTable& table)
 
 void Canvas::scaleReport(double factor)
 {
+    if (building_)
+        return;
     if (!table_)
         throw RunTimeError(ErrorNumber::ObjectMissing, u"no report was built yet");
     for (double& width : table_->ColumnWidths)
@@ -224,6 +230,8 @@ bool Canvas::SaveFile(const std::filesystem::path& path)
 
 void Canvas::OpenFile(const std::filesystem::path& path)
 {
+    if (building_)
+        return;
     clear();
     try {
         if (readOstl(platform_.codec, path, document_, page) == OstlResult::BadHeader) {

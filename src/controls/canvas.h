@@ -41,7 +41,8 @@ public:
 
 /// What `Sorvane` publishes, without a window: every member hands on to the rooms that do the work.
 ///
-/// Members throw `RunTimeError`; the control that publishes them turns it into a message box.
+/// Members throw `RunTimeError`; the control that publishes them turns it into a message box. While
+/// a build runs, members that would change the document are refused without a word.
 class Canvas : private ProgressListener {
 public:
     /// @param platform  outlives the canvas
@@ -84,8 +85,7 @@ public:
 
     /// Builds the pages from a grid with the settings as they are now, and shows page 1.
     ///
-    /// A build that ends early leaves the document as it was. While one runs another is refused
-    /// without a word.
+    /// A build that ends early leaves the document as it was.
     /// @throws RunTimeError of the settings file, the grid, the layout, or Cancelled
     void doPreview(AutomationObject& grid);
 

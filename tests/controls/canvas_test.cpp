@@ -380,6 +380,26 @@ TEST_F(CanvasTest, RefusesANestedBuildWithoutAWord)
     EXPECT_FALSE(other.isBuilding());
 }
 
+TEST_F(CanvasTest, KeepsTheDocumentOfABuildFromItsHostWhileItRuns)
+{
+    BusyLoop busy;
+    Platform platform { metrics, codec, messages, busy, clock, folders, printer, printers,
+        library };
+    Canvas other(platform);
+    TableGrid grid = gridOf({ { u"title", 1000 } }, { { u"row" } });
+    busy.action = [&] {
+        if (!other.isBuilding())
+            return;
+        other.clear();
+        other.newPage();
+        other.OpenFile(folder.file("missing.ostl"));
+        EXPECT_NO_THROW(other.Maximum());
+    };
+    other.doPreview(grid);
+    EXPECT_EQ(textsOf(other.document(), 0), "title|row");
+    EXPECT_EQ(other.Totalpages(), 1);
+}
+
 TEST_F(CanvasTest, SavesAndOpensADocumentAndShowsItsFirstPage)
 {
     TableGrid grid = gridOf({ { u"A", 1000 } }, numberedRows(100, 1));
