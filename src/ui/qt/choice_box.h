@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <QComboBox>
+
+namespace pelloric::qt {
+
+/// An editable combo box whose text is a command: it acts on Enter and on a picked entry only.
+///
+/// What the program puts in raises no change, and a text that was typed and left is taken back.
+/// The wheel steps through the entries only while the box has the focus.
+class ChoiceBox final : public QComboBox {
+    Q_OBJECT
+
+public:
+    explicit ChoiceBox(QWidget* parent = nullptr);
+
+    /// Shows a text; no change is raised.
+    /// @param entry  the entry from which the arrow keys go on; -1: none
+    void showText(const QString& text, int entry);
+
+    /// Puts other entries in; no change is raised, and the text stays.
+    void setEntries(const QStringList& entries);
+
+signals:
+    /// A text was entered or picked.
+    void chosen(const QString& text);
+    /// The user left the box by the Escape key.
+    void left();
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+
+private:
+    void takeBack();
+
+    QString shown_; ///< as the program put it in
+    int entry_ = -1; ///< as the program put it in
+};
+
+} // namespace pelloric::qt

@@ -1,0 +1,54 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "controls/facade.h"
+#include "ui/qt/preview_prompts.h"
+
+#include <QPointer>
+
+namespace pelloric::qt {
+
+class PreviewWindow;
+class QtPlatform;
+
+/// Opens the one preview window; a window that is open already is used again and raised.
+class QtPreviewOpener final : public PreviewOpener {
+public:
+    /// @param platform  outlives the opener
+    explicit QtPreviewOpener(QtPlatform& platform);
+    /// Closes the window.
+    ~QtPreviewOpener() override;
+    QtPreviewOpener(const QtPreviewOpener&) = delete;
+    QtPreviewOpener& operator=(const QtPreviewOpener&) = delete;
+
+    /// What windows that are made from now on ask people.
+    void setPrompts(PreviewPrompts prompts) { prompts_ = std::move(prompts); }
+
+    /// Shows the window, then has it preview the grid.
+    /// @throws RunTimeError as `PreviewWindow::preview`
+    void openPreview(std::unique_ptr<AutomationObject> grid) override;
+
+    /// Shows the window, which is made if need be, and raises it.
+    PreviewWindow& showWindow();
+
+    /// The window, or null when none is open.
+    PreviewWindow* window() const;
+
+private:
+    QtPlatform& platform_;
+    PreviewPrompts prompts_;
+    QPointer<PreviewWindow> window_;
+};
+
+/// From now on the facades of the program preview in the preview window on these services.
+///
+/// @param platform  outlives the application object, or is given up by installing another
+/// @return          the opener; gone with the application object
+QtPreviewOpener& installPreviewWindow(QtPlatform& platform);
+
+/// The same on the default services, to which the system's printers are given.
+QtPreviewOpener& installPreviewWindow();
+
+} // namespace pelloric::qt

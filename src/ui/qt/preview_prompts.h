@@ -1,0 +1,39 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <QString>
+
+#include <functional>
+
+class QWidget;
+
+namespace pelloric::qt {
+
+/// A question for the path of a document file.
+struct FileQuestion {
+    QString title;
+    QString folder; ///< shown first
+    QString filter; ///< in the toolkit's form: "Name (*.suffix)"
+    bool isSave = false;
+};
+
+/// What the preview window asks people and tells about itself; a host may put its own in.
+struct PreviewPrompts {
+    /// Answers the chosen path, or an empty one for a cancelled question.
+    std::function<QString(QWidget& window, const FileQuestion& question)> chooseFile;
+
+    /// Shows the about box and returns when it is closed.
+    std::function<void(QWidget& window)> showAbout;
+};
+
+/// The toolkit's file dialog, and a box with the library's name and version.
+PreviewPrompts standardPrompts();
+
+/// The question that a title of the tool table stands for.
+FileQuestion openFileQuestion();
+/// The question that a title of the tool table stands for.
+FileQuestion saveFileQuestion();
+
+} // namespace pelloric::qt

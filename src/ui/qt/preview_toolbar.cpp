@@ -1,0 +1,246 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/qt/preview_toolbar.h"
+
+#include "platform/numbers.h"
+#include "platform/qt/qt_text.h"
+#include "ui/preview_navigation.h"
+#include "ui/qt/choice_box.h"
+#include "ui/qt/icon_set.h"
+#include "ui/tool_table.h"
+
+#include <QAction>
+#include <QEvent>
+#include <QLabel>
+#include <QShortcut>
+#include <QToolButton>
+
+#include <array>
+
+namespace pelloric::qt {
+
+namespace {
+
+/// From left to right; the tools of a group stand in the order of the table.
+constexpr auto GroupOrder = std::to_array<ToolGroup>({
+    ToolGroup::File,
+    ToolGroup::Print,
+    ToolGroup::Report,
+    ToolGroup::Zoom,
+    ToolGroup::Pages,
+    ToolGroup::Arrangement,
+    ToolGroup::Window,
+});
+
+constexpr int ScaleLetters = 9; ///< room for "   500 %" and what is typed
+constexpr int PageLetters = 11; ///< room for "   NO. 32767" but for a letter
+
+/// Keys beside those of the table: on many keyboards "+" needs the shift key.
+constexpr auto FurtherKeys = std::to_array<std::pair<ToolAction, const char*>>({
+    { ToolAction::ZoomOut, "Ctrl+=" },
+    { ToolAction::ShowPrintOptions, "Print" },
+});
+
+/// A caption as a tip names it, without the blanks around it and the doubled ones in it.
+QString plainCaption(const PreviewTool& tool) { return toQString(tool.caption).simplified(); }
+
+QKeySequence keysOf(const PreviewTool& tool)
+{
+    return QKeySequence::fromString(toQString(tool.shortcut), QKeySequence::PortableText);
+}
+
+/// "Zoom In (Ctrl++)".
+QString tipOf(const PreviewTool& tool)
+{
+    const QString keys = keysOf(tool).toString(QKeySequence::NativeText);
+    return keys.isEmpty() ? plainCaption(tool)
+                          : QStringLiteral("%1 (%2)").arg(plainCaption(tool), keys);
+}
+
+void describe(QObject& object, const PreviewTool& tool)
+{
+    object.setObjectName(toQString(tool.name));
+    object.setProperty("toolId", tool.id);
+    object.setProperty("category", toQString(ToolCategory));
+    if (tool.kind == ToolKind::Combo)
+        object.setProperty("band", toQString(ToolBandName));
+}
+
+QStringList scaleEntries()
+{
+    QStringList entries;
+    for (const TextView entry : ScaleEntries)
+        entries.append(toQString(entry));
+    return entries;
+}
+
+/// The entry that stands for the same scale as a text; -1: none does.
+int scaleEntryOf(TextView text)
+{
+    const double scale = leadingNumber(text);
+    for (std::size_t entry = 0; entry < ScaleEntries.size(); ++entry) {
+        if (leadingNumber(ScaleEntries[entry]) == scale)
+            return static_cast<int>(entry);
+    }
+    return -1;
+}
+
+} // namespace
+
+PreviewToolbar::PreviewToolbar(QWidget* parent)
+    : QToolBar(parent)
+{
+    setObjectName(toQString(ToolbarName));
+    setWindowTitle(tr("Tools"));
+    setAccessibleName(tr("Tools"));
+    setMovable(false);
+    setFloatable(false);
+    setContextMenuPolicy(Qt::PreventContextMenu);
+    setToolButtonStyle(Qt::ToolButtonTextUnderIcon);
+    for (const ToolGroup group : GroupOrder) {
+        if (group != GroupOrder.front())
+            addSeparator();
+        for (const PreviewTool& tool : PreviewTools) {
+            if (tool.group == group)
+                addTool(tool);
+        }
+    }
+    scaleBox_->setEntries(scaleEntries());
+    scaleBox_->showText(toQString(InitialScaleText), scaleEntryOf(InitialScaleText));
+    pageBox_->setEntries({ toQString(pageEntry(1)) });
+    pageBox_->showText(toQString(pageBoxText(1)), 0);
+    drawIcons();
+    widthWithTexts_ = sizeHint().width();
+    setToolButtonStyle(Qt::ToolButtonIconOnly);
+}
+
+void PreviewToolbar::addTool(const PreviewTool& tool)
+{
+    switch (tool.kind) {
+    case ToolKind::Button:
+        addButton(tool);
+        break;
+    case ToolKind::Combo:
+        addCombo(tool);
+        break;
+    case ToolKind::MenuItem:
+        // Its keys work wherever the toolbar's do.
+        window()->addAction(makeAction(tool));
+        break;
+    }
+}
+
+QAction* PreviewToolbar::makeAction(const PreviewTool& tool)
+{
+    auto* const action = new QAction(toQString(tool.caption), this);
+    describe(*action, tool);
+    action->setIconText(toQString(tool.caption));
+    action->setToolTip(tipOf(tool));
+    action->setEnabled(tool.enabled);
+    QList<QKeySequence> keys;
+    if (!tool.shortcut.empty())
+        keys.append(keysOf(tool));
+    for (const auto& [of, further] : FurtherKeys) {
+        if (of == tool.action)
+            keys.append(QKeySequence(QLatin1String(further)));
+    }
+    action->setShortcuts(keys);
+    action->setAutoRepeat(tool.group == ToolGroup::Pages || tool.group == ToolGroup::Zoom);
+    connect(action, &QAction::triggered, this, [this, id = tool.id] { emit clicked(id); });
+    actions_[tool.id] = action;
+    return action;
+}
+
+void PreviewToolbar::addButton(const PreviewTool& tool)
+{
+    QAction* const action = makeAction(tool);
+    addAction(action);
+    QWidget* const button = widgetForAction(action);
+    describe(*button, tool);
+    button->setAccessibleName(plainCaption(tool));
+}
+
+void PreviewToolbar::addCombo(const PreviewTool& tool)
+{
+    auto* const box = new ChoiceBox(this);
+    const bool isScale = tool.action == ToolAction::ChooseScale;
+    describe(*box, tool);
+    box->setAccessibleName(plainCaption(tool));
+    box->setToolTip(tipOf(tool));
+    box->setProperty("caption", toQString(tool.caption));
+    box->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+    box->setMinimumContentsLength(isScale ? ScaleLetters : PageLetters);
+    addWidget(box);
+    connect(box, &ChoiceBox::chosen, this,
+        isScale ? &PreviewToolbar::scaleChosen : &PreviewToolbar::pageChosen);
+    auto* const keys = new QShortcut(keysOf(tool), window());
+    connect(keys, &QShortcut::activated, box, [box] { box->setFocus(Qt::ShortcutFocusReason); });
+    if (isScale) {
+        scaleBox_ = box;
+        return;
+    }
+    pageBox_ = box;
+    pageCount_ = new QLabel(toQString(pageCountLabel(1)), this);
+    pageCount_->setObjectName(QStringLiteral("PageCount"));
+    pageCount_->setProperty("band", toQString(ToolBandName));
+    addWidget(pageCount_);
+}
+
+void PreviewToolbar::showNavigation(const NavigationState& state, int currentPage)
+{
+    const std::pair<int, bool> enabled[]
+        = { { 5, state.first }, { 6, state.previous }, { 7, state.next }, { 8, state.last } };
+    for (const auto& [id, isEnabled] : enabled)
+        actions_.at(id)->setEnabled(isEnabled);
+    if (pageBox_->count() != state.pageEntries) {
+        QStringList entries;
+        for (int number = 1; number <= state.pageEntries; ++number)
+            entries.append(toQString(pageEntry(number)));
+        pageBox_->setEntries(entries);
+    }
+    const bool isOnEntry = currentPage >= 0 && currentPage < pageBox_->count();
+    pageBox_->showText(toQString(state.pageBox), isOnEntry ? currentPage : -1);
+    scaleBox_->showText(toQString(state.scale), scaleEntryOf(state.scale));
+    pageCount_->setText(toQString(state.countLabel));
+}
+
+std::vector<QAction*> PreviewToolbar::contextActions() const
+{
+    std::vector<QAction*> actions;
+    for (const int id : ContextMenuTools)
+        actions.push_back(actions_.at(id));
+    return actions;
+}
+
+void PreviewToolbar::changeEvent(QEvent* event)
+{
+    QToolBar::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange)
+        drawIcons();
+}
+
+void PreviewToolbar::drawIcons()
+{
+    for (const PreviewTool& tool : PreviewTools) {
+        if (tool.kind != ToolKind::Combo)
+            actions_.at(tool.id)->setIcon(libraryIcon(toQString(tool.icon), palette()));
+    }
+}
+
+void PreviewToolbar::resizeEvent(QResizeEvent* event)
+{
+    QToolBar::resizeEvent(event);
+    chooseButtonStyle();
+}
+
+/// Captions stand under the icons where there is room for all of them.
+void PreviewToolbar::chooseButtonStyle()
+{
+    const auto style
+        = width() >= widthWithTexts_ ? Qt::ToolButtonTextUnderIcon : Qt::ToolButtonIconOnly;
+    if (style != toolButtonStyle())
+        setToolButtonStyle(style);
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,336 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/qt/preview_window.h"
+
+#include "controls/messages.h"
+#include "controls/qt/sorvane.h"
+#include "platform/automation_object.h"
+#include "platform/qt/qt_platform.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "platform/services.h"
+#include "settings/settings_file.h"
+#include "ui/qt/choice_box.h"
+#include "ui/qt/grid_style_dialog.h"
+#include "ui/qt/icon_set.h"
+#include "ui/qt/page_setup_dialog.h"
+#include "ui/qt/preview_toolbar.h"
+#include "ui/qt/print_options_dialog.h"
+#include "ui/tool_table.h"
+
+#include <QCloseEvent>
+#include <QContextMenuEvent>
+#include <QCursor>
+#include <QMenu>
+#include <QPointer>
+#include <QScreen>
+#include <QScrollBar>
+#include <QSettings>
+#include <QShortcut>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr QSize FirstSize { 1180, 860 }; ///< before the user has chosen another: pixels
+
+constexpr short RightButtonNumber = 2;
+
+constexpr int ExitTool = 17;
+constexpr int PreviousTool = 6;
+constexpr int NextTool = 7;
+
+/// Where size and place of the window are kept.
+QSettings placeSettings()
+{
+    return QSettings(QSettings::IniFormat, QSettings::UserScope, QStringLiteral("Pelloric"),
+        QStringLiteral("PreviewWindow"));
+}
+
+const QString PlaceKey = QStringLiteral("geometry");
+
+} // namespace
+
+/// A command that runs; a window that was closed meanwhile closes when the last one ends.
+class PreviewWindow::Command {
+public:
+    explicit Command(PreviewWindow& window)
+        : window_(window)
+    {
+        ++window_.running_;
+    }
+
+    ~Command()
+    {
+        if (--window_.running_ > 0)
+            return;
+        window_.services_.loop().forgetCancel();
+        if (window_.closesAfterwards_)
+            window_.close();
+    }
+
+    Command(const Command&) = delete;
+    Command& operator=(const Command&) = delete;
+
+private:
+    PreviewWindow& window_;
+};
+
+PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
+    : QMainWindow(parent, Qt::Window)
+    , services_(platform)
+    , platform_(platform.record())
+    , prompts_(standardPrompts())
+    , toolbar_(new PreviewToolbar(this))
+    , canvas_(new Sorvane(platform, this))
+    , contextMenu_(new QMenu(this))
+{
+    setObjectName(QStringLiteral("frmPrintPreview"));
+    setAttribute(Qt::WA_DeleteOnClose);
+    setWindowTitle(toQString(PreviewTitle));
+    setWindowIcon(libraryIcon(QStringLiteral("print"), palette()));
+    setContextMenuPolicy(Qt::DefaultContextMenu);
+    addToolBar(toolbar_);
+    canvas_->setObjectName(QStringLiteral("Sorvane1"));
+    canvas_->installEventFilter(this);
+    setCentralWidget(canvas_);
+    contextMenu_->setObjectName(QStringLiteral("PopMenu"));
+    for (QAction* const action : toolbar_->contextActions())
+        contextMenu_->addAction(action);
+    connectTools();
+    session_.emplace(canvas_->canvas(), static_cast<PreviewHost&>(*this));
+    navigationChanged();
+    restorePlace();
+    canvas_->setFocus();
+}
+
+PreviewWindow::~PreviewWindow() { canvas_->removeEventFilter(this); }
+
+void PreviewWindow::connectTools()
+{
+    connect(toolbar_, &PreviewToolbar::clicked, this, &PreviewWindow::click);
+    connect(toolbar_, &PreviewToolbar::scaleChosen, this, [this](const QString& text) {
+        const Command command(*this);
+        session_->chooseScale(viewOf(text));
+        navigationChanged();
+    });
+    connect(toolbar_, &PreviewToolbar::pageChosen, this, [this](const QString& text) {
+        const Command command(*this);
+        session_->choosePage(viewOf(text));
+        navigationChanged();
+    });
+    const auto focusCanvas = [this] { canvas_->setFocus(); };
+    connect(&toolbar_->scaleBox(), &ChoiceBox::left, this, focusCanvas);
+    connect(&toolbar_->pageBox(), &ChoiceBox::left, this, focusCanvas);
+    connect(canvas_, &Sorvane::MouseUp, this, [this](short button) {
+        if (button == RightButtonNumber)
+            showContextMenu(QCursor::pos());
+    });
+    auto* const escape = new QShortcut(QKeySequence(Qt::Key_Escape), this);
+    connect(escape, &QShortcut::activated, this, &PreviewWindow::leave);
+}
+
+void PreviewWindow::setPrompts(PreviewPrompts prompts)
+{
+    const PreviewPrompts standard = standardPrompts();
+    prompts_ = std::move(prompts);
+    if (!prompts_.chooseFile)
+        prompts_.chooseFile = standard.chooseFile;
+    if (!prompts_.showAbout)
+        prompts_.showAbout = standard.showAbout;
+}
+
+void PreviewWindow::preview(std::unique_ptr<AutomationObject> grid)
+{
+    if (isBusy())
+        return;
+    const Command command(*this);
+    session_->forgetGrid();
+    grid_ = std::move(grid);
+    try {
+        session_->open(*grid_);
+    } catch (const RunTimeError& error) {
+        if (error.number() != ErrorNumber::Cancelled)
+            throw;
+    }
+}
+
+void PreviewWindow::openDocument(const std::filesystem::path& path)
+{
+    if (isBusy())
+        return;
+    const Command command(*this);
+    try {
+        canvas_->canvas().OpenFile(path);
+    } catch (const RunTimeError&) {
+        session_->refresh(false); // the canvas holds other pages than before
+        throw;
+    }
+    session_->refresh(false);
+}
+
+void PreviewWindow::refresh(bool rebuild)
+{
+    if (isBusy())
+        return;
+    const Command command(*this);
+    session_->refresh(rebuild);
+}
+
+void PreviewWindow::reZoom()
+{
+    if (isBusy())
+        return;
+    const Command command(*this);
+    session_->reZoom();
+}
+
+void PreviewWindow::print(bool allPages, TextView pageList, std::int16_t copies)
+{
+    const Command command(*this);
+    try {
+        session_->print(allPages, pageList, copies);
+    } catch (const RunTimeError& error) {
+        platform_.messages.show(messageOf(error));
+    }
+}
+
+void PreviewWindow::click(int id)
+{
+    const Command command(*this);
+    session_->click(id);
+}
+
+/// Ends a build that runs, or else the preview.
+void PreviewWindow::leave()
+{
+    if (canvas_->canvas().isBuilding())
+        services_.loop().cancel();
+    else if (!isBusy())
+        click(ExitTool);
+}
+
+void PreviewWindow::closeEvent(QCloseEvent* event)
+{
+    if (!isBusy()) {
+        savePlace();
+        isClosed_ = true;
+        canvas_->canvas().clear();
+        return QMainWindow::closeEvent(event);
+    }
+    closesAfterwards_ = true;
+    if (canvas_->canvas().isBuilding())
+        services_.loop().cancel();
+    for (QDialog* const dialog : findChildren<QDialog*>())
+        dialog->reject();
+    event->ignore();
+    savePlace();
+    hide();
+}
+
+void PreviewWindow::unload() { close(); }
+
+void PreviewWindow::navigationChanged()
+{
+    if (session_)
+        toolbar_->showNavigation(session_->state(), canvas_->canvas().document().currentPage);
+}
+
+DialogEnd PreviewWindow::showGridStyle()
+{
+    GridStyleDialog dialog(platform_, this);
+    const int result = dialog.exec();
+    return endOf(result, dialog.saved());
+}
+
+DialogEnd PreviewWindow::showPageSetup()
+{
+    PageSetupDialog dialog(platform_, this);
+    const int result = dialog.exec();
+    return endOf(result, dialog.saved());
+}
+
+/// A file that could not be written would leave the user wondering why nothing has changed.
+DialogEnd PreviewWindow::endOf(int result, std::optional<SaveOutcome> saved)
+{
+    if (result != QDialog::Accepted)
+        return DialogEnd::Cancelled;
+    if (saved == SaveOutcome::WriteFailed) {
+        const Text path = settingsPath(platform_).u16string();
+        platform_.messages.show(messageOf(RunTimeError(ErrorNumber::WriteFailed, path)));
+    }
+    return DialogEnd::Accepted;
+}
+
+void PreviewWindow::showPrintOptions()
+{
+    const auto procedure = [this](const PrintArguments& arguments) {
+        print(arguments.allPages, arguments.pageList, arguments.copies);
+    };
+    PrintOptionsDialog(platform_, procedure, this).exec();
+}
+
+void PreviewWindow::showAbout() { prompts_.showAbout(*this); }
+
+std::filesystem::path PreviewWindow::chooseFileToOpen() { return choose(openFileQuestion()); }
+
+std::filesystem::path PreviewWindow::chooseFileToSave() { return choose(saveFileQuestion()); }
+
+std::filesystem::path PreviewWindow::choose(const FileQuestion& question)
+{
+    const QString path = prompts_.chooseFile(*this, question);
+    if (path.isEmpty())
+        throw RunTimeError(ErrorNumber::Cancelled);
+    return toText(path);
+}
+
+void PreviewWindow::showContextMenu(QPoint at)
+{
+    if (!isBusy())
+        contextMenu_->popup(at);
+}
+
+/// The menu key; the right mouse button opens the menu when the canvas tells of it.
+void PreviewWindow::contextMenuEvent(QContextMenuEvent* event)
+{
+    event->accept();
+    if (event->reason() == QContextMenuEvent::Keyboard)
+        showContextMenu(canvas_->mapToGlobal(canvas_->rect().center()));
+}
+
+/// Where a page cannot be scrolled on, the keys that scroll it turn the page.
+bool PreviewWindow::turnsPage(int key)
+{
+    if (key != Qt::Key_PageUp && key != Qt::Key_PageDown)
+        return false;
+    const ScrollBar& bar = canvas_->canvas().view().Vbar;
+    const bool isDown = key == Qt::Key_PageDown;
+    if (bar.enabled && bar.value != (isDown ? bar.maximum : 0))
+        return false;
+    const int tool = isDown ? NextTool : PreviousTool;
+    if (toolbar_->toolActions().at(tool)->isEnabled())
+        click(tool);
+    return true;
+}
+
+bool PreviewWindow::eventFilter(QObject* watched, QEvent* event)
+{
+    if (watched == canvas_ && event->type() == QEvent::KeyPress && !isBusy()
+        && turnsPage(static_cast<QKeyEvent*>(event)->key()))
+        return true;
+    return QMainWindow::eventFilter(watched, event);
+}
+
+void PreviewWindow::restorePlace()
+{
+    const QByteArray place = placeSettings().value(PlaceKey).toByteArray();
+    if (!place.isEmpty() && restoreGeometry(place))
+        return;
+    const QSize room = screen()->availableSize();
+    resize(FirstSize.boundedTo(room * 9 / 10));
+}
+
+void PreviewWindow::savePlace() const { placeSettings().setValue(PlaceKey, saveGeometry()); }
+
+} // namespace pelloric::qt

@@ -1,0 +1,113 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/platform.h"
+#include "ui/preview_navigation.h"
+#include "ui/qt/preview_prompts.h"
+
+#include <QMainWindow>
+
+#include <memory>
+#include <optional>
+
+class QMenu;
+
+namespace pelloric {
+enum class SaveOutcome;
+}
+
+namespace pelloric::qt {
+
+class PreviewToolbar;
+class QtPlatform;
+class Sorvane;
+
+/// The preview window `frmPrintPreview`: a canvas, `Sorvane1`, and the toolbar that drives it.
+///
+/// It closes itself only between commands: a window that is closed while pages are built ends the
+/// build, and goes when the build has ended. A closed window deletes itself.
+class PreviewWindow final : public QMainWindow, private PreviewHost {
+    Q_OBJECT
+
+public:
+    /// @param platform  outlives the window
+    explicit PreviewWindow(QtPlatform& platform, QWidget* parent = nullptr);
+    ~PreviewWindow() override;
+
+    /// Puts other questions and another about box in; an empty function means the standard one.
+    void setPrompts(PreviewPrompts prompts);
+
+    /// Previews a grid, which the window keeps until the next one.
+    ///
+    /// While a command runs it is refused without a word. A build that the user ends leaves the
+    /// earlier pages, without a word too.
+    /// @throws RunTimeError of the build; the grid is kept
+    void preview(std::unique_ptr<AutomationObject> grid);
+
+    /// Opens a document file and shows its first page.
+    /// @throws RunTimeError as `Canvas::OpenFile`
+    void openDocument(const std::filesystem::path& path);
+
+    /// Builds again from the kept grid, or only takes the layout anew.
+    /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build
+    void refresh(bool rebuild);
+
+    /// Builds again with column widths and style as the canvas holds them.
+    /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build
+    void reZoom();
+
+    /// Prints all pages or a page list; a printer's error is told in a message box.
+    void print(bool allPages, TextView pageList, std::int16_t copies);
+
+    /// Whether a command, a build among them, runs at the moment.
+    bool isBusy() const { return running_ > 0; }
+
+    /// Whether the window is closed and only waits to be deleted.
+    bool isClosed() const { return isClosed_; }
+
+    Sorvane& canvas() { return *canvas_; }
+    const PreviewSession& session() const { return *session_; }
+
+protected:
+    void closeEvent(QCloseEvent* event) override;
+    void contextMenuEvent(QContextMenuEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    class Command;
+
+    DialogEnd showGridStyle() override;
+    DialogEnd showPageSetup() override;
+    void showPrintOptions() override;
+    void showAbout() override;
+    std::filesystem::path chooseFileToOpen() override;
+    std::filesystem::path chooseFileToSave() override;
+    void unload() override;
+    void navigationChanged() override;
+
+    void connectTools();
+    void click(int id);
+    void leave();
+    void showContextMenu(QPoint at);
+    bool turnsPage(int key);
+    DialogEnd endOf(int result, std::optional<SaveOutcome> saved);
+    std::filesystem::path choose(const FileQuestion& question);
+    void restorePlace();
+    void savePlace() const;
+
+    QtPlatform& services_;
+    Platform platform_;
+    PreviewPrompts prompts_;
+    std::unique_ptr<AutomationObject> grid_;
+    PreviewToolbar* toolbar_;
+    Sorvane* canvas_;
+    QMenu* contextMenu_;
+    std::optional<PreviewSession> session_;
+    int running_ = 0; ///< commands that have not ended
+    bool closesAfterwards_ = false;
+    bool isClosed_ = false;
+};
+
+} // namespace pelloric::qt
