@@ -21,6 +21,8 @@ if(TARGET pelloric)
 endif()
 if(TARGET pelloric_app)
     install(TARGETS pelloric_app)
+    install(DIRECTORY "${PROJECT_SOURCE_DIR}/samples/" DESTINATION "${CMAKE_INSTALL_DATADIR}/pelloric/samples"
+        FILES_MATCHING PATTERN "*.csv" PATTERN "*.tsv" PATTERN "*.sqlite" PATTERN "README.md")
 endif()
 
 configure_package_config_file("${PROJECT_SOURCE_DIR}/cmake/PelloricConfig.cmake.in"

@@ -1,0 +1,35 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "command_line.h"
+#include "commands.h"
+#include "controls/qt/default_platform.h"
+#include "table_source.h"
+#include "ui/qt/preview_opener.h"
+#include "ui/qt/preview_window.h"
+#include "windows.h"
+
+#include <QFileInfo>
+
+namespace pelloric::app {
+
+int runOpen(const Invocation& invocation)
+{
+    const CommandLine line(invocation.arguments, {}, 1);
+    const QString file = line.file(0);
+    if (!QFileInfo(file).isFile())
+        throw CommandError(QStringLiteral("%1: there is no such file").arg(file));
+    WindowedApplication application(invocation);
+    qt::QtPreviewOpener& opener = qt::installPreviewWindow();
+    prepareSettings(qt::defaultPlatform().record());
+    opener.showWindow().openDocument(pathOf(file));
+    return application.run();
+}
+
+QString openDetails()
+{
+    return QStringLiteral("FILE is a document file (.ostl) that the preview window or\n"
+                          "\"pelloric export\" has saved.\n");
+}
+
+} // namespace pelloric::app

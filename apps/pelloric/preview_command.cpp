@@ -1,0 +1,70 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "command_line.h"
+#include "commands.h"
+#include "controls/canvas.h"
+#include "controls/qt/default_platform.h"
+#include "interruption.h"
+#include "platform/run_time_error.h"
+#include "progress_line.h"
+#include "report_builder.h"
+#include "report_options.h"
+#include "table_source.h"
+#include "ui/qt/preview_opener.h"
+#include "windows.h"
+
+#include <optional>
+
+namespace pelloric::app {
+
+namespace {
+
+/// The widths are those of the settings in force.
+void prepareWidths(TableGrid& grid, const CommandLine& line, Platform platform)
+{
+    Canvas canvas(platform);
+    canvas.loadReportStyle();
+    setColumnWidths(grid, line, canvas);
+}
+
+} // namespace
+
+int runPreview(const Invocation& invocation)
+{
+    const CommandLine line(invocation.arguments, { sourceOptions(), reportOptions() }, 1);
+    if (isDocumentName(line.file(0)))
+        throw CommandError(QStringLiteral("%1 is a saved document; show it with \"pelloric open\"")
+                               .arg(line.file(0)),
+            WrongUsage);
+    WindowedApplication application(invocation);
+    qt::QtPreviewOpener& opener = qt::installPreviewWindow();
+    qt::QtPlatform& platform = qt::defaultPlatform();
+    std::unique_ptr<TableGrid> grid;
+    {
+        const Interruption interruption(platform.loop());
+        ProgressLine progress;
+        grid = std::make_unique<TableGrid>(readTable(line.file(0), line, progress));
+    }
+    // What the dialogs change is kept, unless options say how this one report looks.
+    std::optional<PrivateSettings> settings;
+    if (firstReportOption(line) != nullptr)
+        settings.emplace(platform, line);
+    else
+        prepareSettings(platform.record());
+    prepareWidths(*grid, line, platform.record());
+    opener.openPreview(std::move(grid));
+    return application.run();
+}
+
+QString previewDetails()
+{
+    return QStringLiteral("FILE is a CSV or TSV file, whose first row holds the titles, or an "
+                          "SQLite database\n"
+                          "(db.sqlite:table, or db.sqlite with --query). With one of the options "
+                          "for headers,\n"
+                          "paper and so on, what the window's dialogs change is not kept.\n\n")
+        + optionHelp(sourceOptions()) + optionHelp(reportOptions());
+}
+
+} // namespace pelloric::app
