@@ -93,7 +93,7 @@ TEST_F(PrintCommand, ListsPrintersWithTheirStateAndPapers)
 TEST(PrintCommandAlone, SaysThatThereIsNoPrinter)
 {
     PrivateCups cups;
-    ASSERT_EQ(cups.failure(), QString());
+    ASSERT_EQ(cups.failure(), "");
     for (const char* const command : { "print", "printers" }) {
         QStringList arguments { QString::fromLatin1(command) };
         if (arguments.front() == QStringLiteral("print"))

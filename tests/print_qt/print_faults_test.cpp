@@ -57,7 +57,7 @@ std::string failureOf(
 /// A scheduler without printers.
 class NoPrinterTest : public testing::Test {
 protected:
-    void SetUp() override { ASSERT_EQ(cups.failure(), QString()); }
+    void SetUp() override { ASSERT_EQ(cups.failure(), ""); }
 
     PrivateCups cups;
     QtPlatform platform;

@@ -22,7 +22,7 @@ protected:
 
     void SetUp() override
     {
-        ASSERT_EQ(cups.failure(), QString());
+        ASSERT_EQ(cups.failure(), "");
         ASSERT_TRUE(cups.addPrinter(QStringLiteral("T1")));
         ASSERT_TRUE(cups.command(
             QStringLiteral("lpadmin"), { QStringLiteral("-d"), QStringLiteral("T1") }));

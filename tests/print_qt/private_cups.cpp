@@ -18,7 +18,7 @@ namespace pelloric::qt {
 namespace {
 
 constexpr int StartMs = 10000;
-constexpr int ProgramMs = 60000;
+constexpr int LongestRunMs = 60000;
 constexpr int JobsMs = 60000;
 constexpr int PauseMs = 30;
 
@@ -43,7 +43,7 @@ ProgramResult runProgram(const QString& program, const QStringList& arguments)
 {
     QProcess process;
     process.start(program, arguments);
-    if (!process.waitForFinished(ProgramMs) || process.exitStatus() != QProcess::NormalExit)
+    if (!process.waitForFinished(LongestRunMs) || process.exitStatus() != QProcess::NormalExit)
         return { -1, {}, program + QStringLiteral(": ") + process.errorString() };
     return { process.exitCode(), QString::fromUtf8(process.readAllStandardOutput()),
         QString::fromUtf8(process.readAllStandardError()) };

@@ -9,6 +9,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <string>
 #include <vector>
 
 namespace pelloric::qt {
@@ -42,7 +43,7 @@ public:
     ~PrivateCups();
 
     /// Why it does not run, empty when it does.
-    const QString& failure() const { return failure_; }
+    std::string failure() const { return failure_.toStdString(); }
 
     /// Adds a printer with the papers of tests/data/forms.ppd, two-sided by default.
     bool addPrinter(const QString& name);

@@ -238,6 +238,24 @@ TEST_F(QtPrinterTest, TakesTheDefaultPrinterAtFirstAndAnotherWhenTold)
     EXPECT_EQ(jobs[0].printer, QStringLiteral("A0"));
 }
 
+TEST_F(QtPrinterTest, LeavesEachPrinterItsOwnPaper)
+{
+    ASSERT_TRUE(cups.addPrinter(QStringLiteral("A0")));
+    ASSERT_TRUE(cups.command(QStringLiteral("lpadmin"),
+        { QStringLiteral("-p"), QStringLiteral("A0"), QStringLiteral("-o"),
+            QStringLiteral("PageSize=A3") }));
+    Printer& printer = printing.printer();
+    doPrint(twoPages(), jobOf(1), DefaultFont, printer);
+    EXPECT_EQ(printer.paperSize(), 9);
+    printing.system().makeCurrent(u"A0");
+    EXPECT_EQ(printer.paperSize(), 8);
+    doPrint(twoPages(), jobOf(1, 0), DefaultFont, printer);
+    const std::vector<SpooledJob> jobs = cups.jobs();
+    ASSERT_EQ(jobs.size(), 4U);
+    EXPECT_EQ(jobs[1].media, QStringLiteral("A4"));
+    EXPECT_EQ(jobs[3].media, QStringLiteral("A3"));
+}
+
 TEST_F(QtPrinterTest, PrintsTheRealPagesOfAnEndlessRangeAndSkipsNonsense)
 {
     const PageDocument document = twoPages();

@@ -191,16 +191,19 @@ Text QtPrinter::deviceName() const { return system_.currentPrinter(); }
 
 std::int16_t QtPrinter::paperSize() const
 {
-    if (paperSize_ != 0)
-        return paperSize_;
-    const QPrinterInfo info = QPrinterInfo::printerInfo(toQString(deviceName()));
+    const Text name = deviceName();
+    if (const std::int16_t applied = appliedPaper(name); applied != 0)
+        return applied;
+    const QPrinterInfo info = QPrinterInfo::printerInfo(toQString(name));
     return info.isNull() ? std::int16_t { 0 } : formCodeOf(info, info.defaultPageSize());
 }
 
 void QtPrinter::applyPaperSize(std::int16_t code)
 {
-    if (code >= 1 && static_cast<std::size_t>(code) <= system_.forms().size())
-        paperSize_ = code;
+    if (code < 1 || static_cast<std::size_t>(code) > system_.forms().size())
+        return;
+    paperSize_ = code;
+    paperPrinter_ = deviceName();
 }
 
 void QtPrinter::setDocumentTitle(TextView title)
@@ -249,9 +252,15 @@ DrawingSurface* QtPrinter::attributeSurface()
     return document_ ? &*document_->surface : nullptr;
 }
 
+/// 0: none.
+std::int16_t QtPrinter::appliedPaper(const Text& printer) const
+{
+    return printer == paperPrinter_ ? paperSize_ : std::int16_t { 0 };
+}
+
 QPageSize QtPrinter::paperOf(const QPrinterInfo& printer) const
 {
-    const QPageSize paper = pageSizeOf(printer, paperSize_);
+    const QPageSize paper = pageSizeOf(printer, appliedPaper(toText(printer.printerName())));
     return paper.isValid() ? paper : printer.defaultPageSize();
 }
 

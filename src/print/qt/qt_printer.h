@@ -49,7 +49,7 @@ public:
 
     Text deviceName() const override;
 
-    /// The paper of the printer itself until one is applied; 0 when it is none of the forms.
+    /// The paper of the printer itself until one is applied to it; 0 when it is none of the forms.
     std::int16_t paperSize() const override;
     std::int16_t orientation() const override { return orientation_; }
     void applyPaperSize(std::int16_t code) override;
@@ -77,6 +77,7 @@ private:
 
     DrawingSurface& drawing();
     DrawingSurface* attributeSurface();
+    std::int16_t appliedPaper(const Text& printer) const;
     QPageSize paperOf(const QPrinterInfo& printer) const;
     void begin();
     void applyAttributes(DrawingSurface& surface) const;
@@ -87,6 +88,7 @@ private:
     Text title_;
     bool isAnnounced_ = false; ///< a title was set and no document has begun since
     std::int16_t paperSize_ = 0; ///< 0: the printer's own
+    Text paperPrinter_; ///< the printer that it was applied to; another one has its own paper
     std::int16_t orientation_ = 1;
     std::unique_ptr<Document> document_; ///< null between documents
 };
