@@ -28,6 +28,9 @@
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
+#include <algorithm>
+#include <initializer_list>
+
 namespace pelloric::app {
 
 namespace {
@@ -39,6 +42,12 @@ constexpr int Margin = 12; ///< pixels
 constexpr int WidestColumn = 260; ///< of a view when it opens: pixels
 
 constexpr int LastStartRow = 9999;
+
+constexpr int ColumnAir = 18; ///< pixels
+
+constexpr int RowHeight = 24; ///< of the tables: pixels
+
+constexpr int FacadeSize = 28; ///< pixels
 
 /// The connection's name in the program.
 const QString Connection = QStringLiteral("samples");
@@ -66,11 +75,13 @@ QStringList titlesOf(const TableGrid& table)
     return titles;
 }
 
-void narrowColumns(QHeaderView& header)
+/// Columns as wide as what they hold, with some air; the report takes these widths.
+void fitColumns(QHeaderView& header)
 {
-    header.setMaximumSectionSize(WidestColumn);
     header.resizeSections(QHeaderView::ResizeToContents);
-    header.setMaximumSectionSize(-1);
+    for (int section = 0; section < header.count(); ++section)
+        header.resizeSection(
+            section, std::min(header.sectionSize(section) + ColumnAir, WidestColumn));
 }
 
 } // namespace
@@ -125,6 +136,7 @@ QWidget* DemoWindow::makeReportBox()
     auto* const box = new QGroupBox(tr("Report"));
     auto* const layout = new QHBoxLayout(box);
     facade_->setToolTip(tr("The control Kestrane, which previews the tables"));
+    facade_->setFixedSize(FacadeSize, FacadeSize);
     showHeader_ = new QCheckBox(tr("Column &titles"));
     showHeader_->setObjectName(QStringLiteral("ShowHeader"));
     mergeGrid_ = new QCheckBox(tr("&Merge equal cells"));
@@ -187,7 +199,8 @@ QAbstractItemView* DemoWindow::makeFlexGrid(const QString& file)
     }
     view->setEditTriggers(QAbstractItemView::NoEditTriggers);
     view->setTabKeyNavigation(false);
-    narrowColumns(*view->horizontalHeader());
+    view->verticalHeader()->setDefaultSectionSize(RowHeight);
+    fitColumns(*view->horizontalHeader());
     return view;
 }
 
@@ -203,7 +216,7 @@ QAbstractItemView* DemoWindow::makeListView(const QString& file)
         for (int column = 0; column < table.columnCount(); ++column)
             item->setText(column, cellText(table, row, column));
     }
-    narrowColumns(*view->header());
+    fitColumns(*view->header());
     return view;
 }
 
@@ -224,7 +237,8 @@ QAbstractItemView* DemoWindow::makeDataGrid(const QString& file)
     view->setModel(model);
     view->setEditTriggers(QAbstractItemView::NoEditTriggers);
     view->setTabKeyNavigation(false);
-    narrowColumns(*view->horizontalHeader());
+    view->verticalHeader()->setDefaultSectionSize(RowHeight);
+    fitColumns(*view->horizontalHeader());
     return view;
 }
 

@@ -18,7 +18,6 @@ ChoiceBox::ChoiceBox(QWidget* parent)
     setInsertPolicy(NoInsert);
     setCompleter(nullptr);
     setFocusPolicy(Qt::StrongFocus);
-    lineEdit()->installEventFilter(this);
     connect(this, &QComboBox::textActivated, this, &ChoiceBox::chosen);
 }
 
@@ -46,38 +45,41 @@ void ChoiceBox::takeBack()
     lineEdit()->setCursorPosition(0);
 }
 
-/// Enter is handled before the line edit sees it: the box would raise a change of its own for a
-/// text that is the same as an entry.
-bool ChoiceBox::eventFilter(QObject* watched, QEvent* event)
+/// Enter is kept from the line edit: the box would raise a change of its own for a text that is the
+/// same as an entry.
+void ChoiceBox::keyPressEvent(QKeyEvent* event)
 {
-    if (watched != lineEdit())
-        return QComboBox::eventFilter(watched, event);
+    switch (event->key()) {
+    case Qt::Key_Return:
+    case Qt::Key_Enter:
+        emit chosen(currentText());
+        lineEdit()->selectAll();
+        break;
+    case Qt::Key_Escape:
+        takeBack();
+        emit left();
+        break;
+    default:
+        QComboBox::keyPressEvent(event);
+    }
+}
+
+/// Escape leaves the box; without this it would be the window's.
+bool ChoiceBox::event(QEvent* event)
+{
     if (event->type() == QEvent::ShortcutOverride
         && static_cast<QKeyEvent*>(event)->key() == Qt::Key_Escape) {
-        event->accept(); // Escape leaves the box, not the window
+        event->accept();
         return true;
     }
-    if (event->type() == QEvent::FocusOut) {
-        const auto reason = static_cast<QFocusEvent*>(event)->reason();
-        if (reason != Qt::PopupFocusReason && reason != Qt::ActiveWindowFocusReason)
-            takeBack();
-    }
-    if (event->type() == QEvent::KeyPress) {
-        switch (static_cast<QKeyEvent*>(event)->key()) {
-        case Qt::Key_Return:
-        case Qt::Key_Enter:
-            emit chosen(currentText());
-            lineEdit()->selectAll();
-            return true;
-        case Qt::Key_Escape:
-            takeBack();
-            emit left();
-            return true;
-        default:
-            break;
-        }
-    }
-    return QComboBox::eventFilter(watched, event);
+    return QComboBox::event(event);
+}
+
+void ChoiceBox::focusOutEvent(QFocusEvent* event)
+{
+    if (event->reason() != Qt::PopupFocusReason && event->reason() != Qt::ActiveWindowFocusReason)
+        takeBack();
+    QComboBox::focusOutEvent(event);
 }
 
 void ChoiceBox::wheelEvent(QWheelEvent* event)

@@ -13,6 +13,7 @@
 #include <QAction>
 #include <QEvent>
 #include <QLabel>
+#include <QLineEdit>
 #include <QShortcut>
 #include <QToolButton>
 
@@ -159,6 +160,7 @@ void PreviewToolbar::addButton(const PreviewTool& tool)
     QWidget* const button = widgetForAction(action);
     describe(*button, tool);
     button->setAccessibleName(plainCaption(tool));
+    button->setFocusPolicy(Qt::TabFocus);
 }
 
 void PreviewToolbar::addCombo(const PreviewTool& tool)
@@ -175,7 +177,7 @@ void PreviewToolbar::addCombo(const PreviewTool& tool)
     connect(box, &ChoiceBox::chosen, this,
         isScale ? &PreviewToolbar::scaleChosen : &PreviewToolbar::pageChosen);
     auto* const keys = new QShortcut(keysOf(tool), window());
-    connect(keys, &QShortcut::activated, box, [box] { box->setFocus(Qt::ShortcutFocusReason); });
+    connect(keys, &QShortcut::activated, box, [this, box] { focusBox(*box); });
     if (isScale) {
         scaleBox_ = box;
         return;
@@ -185,6 +187,16 @@ void PreviewToolbar::addCombo(const PreviewTool& tool)
     pageCount_->setObjectName(QStringLiteral("PageCount"));
     pageCount_->setProperty("band", toQString(ToolBandName));
     addWidget(pageCount_);
+}
+
+/// A box that does not fit is behind the arrow, which is opened first.
+void PreviewToolbar::focusBox(ChoiceBox& box)
+{
+    auto* const arrow = findChild<QToolButton*>(QStringLiteral("qt_toolbar_ext_button"));
+    if (!box.isVisible() && arrow && !arrow->isChecked())
+        arrow->click();
+    box.setFocus(Qt::ShortcutFocusReason);
+    box.lineEdit()->selectAll();
 }
 
 void PreviewToolbar::showNavigation(const NavigationState& state, int currentPage)

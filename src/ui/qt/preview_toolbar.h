@@ -60,6 +60,7 @@ private:
     void addButton(const PreviewTool& tool);
     void addCombo(const PreviewTool& tool);
     QAction* makeAction(const PreviewTool& tool);
+    void focusBox(ChoiceBox& box);
     void drawIcons();
     void chooseButtonStyle();
 
