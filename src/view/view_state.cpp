@@ -225,7 +225,9 @@ void showMuliPage(ViewState& view, const PageFacts& facts, std::int16_t pages, M
     view.style = styleOf(pages, view.style);
     takeGrid(view, facts);
     fitGrid(view, facts);
+    const OrderStyle style = view.style;
     loop.runOnce();
+    view.style = style; // a paint meanwhile goes through `showPage`, which ends the mode
     loadSurfaces(view, facts, view.window.nPages);
     layOutAgain(view, facts);
 }
