@@ -1,0 +1,433 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/qt/page_setup_dialog.h"
+
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "ui/numeric_text.h"
+#include "ui/qt/dialog_parts.h"
+#include "ui/qt/page_sketch.h"
+#include "ui/qt/sheet_picture.h"
+#include "ui/qt/up_down_box.h"
+
+#include <QContextMenuEvent>
+#include <QGridLayout>
+#include <QGroupBox>
+#include <QHeaderView>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMenu>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QTabWidget>
+#include <QToolButton>
+#include <QTreeWidget>
+#include <QVBoxLayout>
+
+#include <algorithm>
+
+namespace pelloric::qt {
+
+namespace {
+
+struct MarginRow {
+    Margin margin;
+    const char* caption;
+    const char* spin;
+    const char* text;
+    char key;
+};
+
+/// In the order in which the boxes stand.
+constexpr MarginRow MarginRows[] = {
+    { Margin::Top, "Top:", "cmdTop", "txtTop", 'T' },
+    { Margin::Bottom, "Buttom:", "cmdButtom", "txtButtom", 'B' },
+    { Margin::Left, "Left:", "cmdLeft", "txtLeft", 'L' },
+    { Margin::Right, "Right:", "cmdRight", "txtRight", 'R' },
+};
+
+constexpr const char* SlotHints[]
+    = { QT_TR_NOOP("Left"), QT_TR_NOOP("Center"), QT_TR_NOOP("Right") };
+
+/// Wide enough for every field with its caret: pixels.
+int fieldWidth(const QFontMetrics& metrics)
+{
+    int width = 0;
+    for (const FieldEntry& entry : FieldEntries)
+        width = std::max(width, metrics.horizontalAdvance(toQString(entry.field)));
+    return width + 2 * metrics.averageCharWidth();
+}
+
+QFrame* bareFrame(const QString& name, QWidget* parent)
+{
+    auto* frame = new QFrame(parent);
+    frame->setObjectName(name);
+    return frame;
+}
+
+} // namespace
+
+PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent)
+    : QDialog(parent)
+    , platform_(platform)
+    , state_(platform_)
+{
+    setWindowTitle(toQString(PageSetupTitle));
+    setModal(true);
+    makeFieldMenu();
+    auto* tabs = new QTabWidget(this);
+    tabs->setObjectName(QStringLiteral("tabStrip1"));
+    tabs->addTab(makePageTab(), toQString(PageSetupTabs[0]));
+    tabs->addTab(makeMarginsTab(), toQString(PageSetupTabs[1]));
+    tabs->addTab(makeTextsTab(), toQString(PageSetupTabs[2]));
+    auto* layout = new QVBoxLayout(this);
+    layout->addWidget(tabs);
+    const ClosingButtons buttons
+        = addClosingButtons(*this, *layout, QStringLiteral("OK"), QStringLiteral("Cancel"));
+    connect(buttons.ok, &QPushButton::clicked, this, &PageSetupDialog::save);
+    showPaper();
+    showMargins();
+    showFont(true);
+    showFont(false);
+}
+
+QWidget* PageSetupDialog::makePageTab()
+{
+    auto* page = new QWidget(this);
+    auto* group = new QGroupBox(QStringLiteral("Page"), page);
+    group->setObjectName(QStringLiteral("Frame1"));
+    auto* below = new QHBoxLayout;
+    below->addLayout(makeSizeBoxes(group));
+    below->addStretch();
+    below->addLayout(makeOrientation(group));
+    auto* inside = new QVBoxLayout(group);
+    inside->addWidget(makePaperList(group), 1);
+    inside->addLayout(below);
+    auto* layout = new QVBoxLayout(page);
+    layout->addWidget(group);
+    return page;
+}
+
+QWidget* PageSetupDialog::makePaperList(QWidget* parent)
+{
+    papers_ = new QTreeWidget(parent);
+    papers_->setObjectName(QStringLiteral("ListView1"));
+    papers_->setAccessibleName(tr("Papers"));
+    papers_->setRootIsDecorated(false);
+    papers_->setUniformRowHeights(true);
+    papers_->setAllColumnsShowFocus(true);
+    QStringList columns;
+    for (const TextView column : PaperColumns)
+        columns.append(toQString(column));
+    papers_->setHeaderLabels(columns);
+    const QIcon sheet = paperIcon(false);
+    const QIcon envelope = paperIcon(true);
+    for (const PaperRow& row : state_.paperRows()) {
+        auto* item = new QTreeWidgetItem(papers_,
+            { toQString(row.name), toQString(row.cx), toQString(row.cy), toQString(row.value) });
+        item->setIcon(0, row.isEnvelope ? envelope : sheet);
+        for (int column = 1; column < papers_->columnCount(); ++column)
+            item->setTextAlignment(column, Qt::AlignRight | Qt::AlignVCenter);
+    }
+    QHeaderView& header = *papers_->header();
+    header.setStretchLastSection(false);
+    header.setSectionResizeMode(QHeaderView::ResizeToContents);
+    header.setSectionResizeMode(0, QHeaderView::Stretch);
+    // The arrow keys go on from the paper in force, which is not a choice of the user's yet.
+    if (QTreeWidgetItem* present = papers_->topLevelItem(state_.paper.paperCode - 1)) {
+        papers_->setCurrentItem(present, 0, QItemSelectionModel::NoUpdate);
+        papers_->scrollToItem(present, QAbstractItemView::PositionAtCenter);
+    }
+    connect(papers_, &QTreeWidget::itemSelectionChanged, this, &PageSetupDialog::clickPaper);
+    connect(papers_, &QTreeWidget::itemClicked, this, &PageSetupDialog::clickPaper);
+    return papers_;
+}
+
+QLayout* PageSetupDialog::makeSizeBoxes(QWidget* parent)
+{
+    paperName_ = captionFor({}, 0, nullptr, parent, QStringLiteral("labPagerSize"));
+    width_ = new QLineEdit(parent);
+    width_->setObjectName(QStringLiteral("txtWidth"));
+    connect(width_, &QLineEdit::textEdited, this,
+        [this](const QString& text) { state_.paper.widthBox = toText(text); });
+    height_ = new QLineEdit(parent);
+    height_->setObjectName(QStringLiteral("txtHeight"));
+    connect(height_, &QLineEdit::textEdited, this,
+        [this](const QString& text) { state_.paper.heightBox = toText(text); });
+    auto* grid = new QGridLayout;
+    grid->addWidget(paperName_, 0, 0, 1, 2);
+    grid->addWidget(captionFor(QStringLiteral("Width:"), 'W', width_, parent), 1, 0);
+    grid->addWidget(width_, 1, 1);
+    grid->addWidget(captionFor(QStringLiteral("Height:"), 'H', height_, parent), 2, 0);
+    grid->addWidget(height_, 2, 1);
+    grid->setRowStretch(3, 1);
+    return grid;
+}
+
+QLayout* PageSetupDialog::makeOrientation(QWidget* parent)
+{
+    auto* portrait = new QRadioButton(QStringLiteral("Portrait"), parent);
+    portrait->setObjectName(elementName("Option1", 1));
+    setAltKey(*portrait, 'P');
+    auto* landscape = new QRadioButton(QStringLiteral("Landscape"), parent);
+    landscape->setObjectName(elementName("Option1", 2));
+    setAltKey(*landscape, 'L');
+    (state_.paper.isPortrait() ? portrait : landscape)->setChecked(true);
+    connect(portrait, &QRadioButton::toggled, this, &PageSetupDialog::chooseOrientation);
+    upright_ = new SheetPicture(QStringLiteral("ImgV"), true, parent);
+    lying_ = new SheetPicture(QStringLiteral("ImgH"), false, parent);
+    auto* options = new QVBoxLayout;
+    options->addStretch();
+    options->addWidget(portrait);
+    options->addWidget(landscape);
+    options->addStretch();
+    auto* layout = new QHBoxLayout;
+    layout->addLayout(options);
+    layout->addWidget(upright_);
+    layout->addWidget(lying_);
+    return layout;
+}
+
+QWidget* PageSetupDialog::makeMarginsTab()
+{
+    auto* page = new QWidget(this);
+    QFrame* frame = bareFrame(QStringLiteral("Frame2"), page);
+    auto* grid = new QGridLayout(frame);
+    grid->setContentsMargins(0, 0, 0, 0);
+    int line = 0;
+    for (const MarginRow& row : MarginRows) {
+        UpDownBox* box = makeMarginBox(row.margin, frame);
+        box->setObjectName(QLatin1String(row.spin));
+        box->textBox()->setObjectName(QLatin1String(row.text));
+        grid->addWidget(captionFor(QLatin1String(row.caption), row.key, box, frame), line, 0);
+        grid->addWidget(box, line++, 1);
+    }
+    auto* restore = new QPushButton(QStringLiteral("Restore Original"), frame);
+    restore->setObjectName(QStringLiteral("cmdRestore"));
+    restore->setAutoDefault(false);
+    setAltKey(*restore, 'O');
+    connect(restore, &QPushButton::clicked, this, [this] {
+        state_.restoreMargins();
+        showMargins();
+    });
+    grid->addWidget(restore, line, 0, 1, 2);
+    grid->setRowMinimumHeight(line, restore->sizeHint().height() * 2);
+    grid->setRowStretch(line + 1, 1);
+    auto* back = new QGroupBox(QStringLiteral("Preview"), page);
+    back->setObjectName(QStringLiteral("fraBack"));
+    sketch_ = new PageSketch(state_, back);
+    connect(sketch_, &PageSketch::lineReleased, this, &PageSetupDialog::showMargins);
+    auto* inside = new QVBoxLayout(back);
+    inside->addWidget(sketch_);
+    auto* layout = new QHBoxLayout(page);
+    layout->addWidget(frame);
+    layout->addWidget(back, 1);
+    return page;
+}
+
+UpDownBox* PageSetupDialog::makeMarginBox(Margin margin, QWidget* parent)
+{
+    auto* box = new UpDownBox({}, {}, parent);
+    margins_[static_cast<std::size_t>(margin)] = box;
+    box->onStep([this, margin](bool up) {
+        state_.stepMargin(margin, up);
+        showMargins();
+    });
+    connect(box->textBox(), &QLineEdit::textChanged, this, [this, margin] { typeMargin(margin); });
+    return box;
+}
+
+QWidget* PageSetupDialog::makeTextsTab()
+{
+    auto* page = new QWidget(this);
+    auto* layout = new QVBoxLayout(page);
+    layout->addWidget(makeTextsGroup(true, page));
+    layout->addWidget(makeTextsGroup(false, page));
+    layout->addStretch();
+    return page;
+}
+
+QWidget* PageSetupDialog::makeTextsGroup(bool isHeader, QWidget* parent)
+{
+    QFrame* frame
+        = bareFrame(isHeader ? QStringLiteral("Frame4") : QStringLiteral("Frame5"), parent);
+    frame->setFrameShape(QFrame::StyledPanel);
+    auto* grid = new QGridLayout(frame);
+    const int first = isHeader ? 1 : PageSetupState::FormatBoxes / 2 + 1;
+    for (int slot = 0; slot < 3; ++slot) {
+        grid->addWidget(makeFormatBox(first + slot, frame), 1, slot);
+        grid->setColumnStretch(slot, 1);
+    }
+    QLineEdit* firstBox = formatBoxes_[static_cast<std::size_t>(first - 1)];
+    QLabel* caption = isHeader
+        ? captionFor(QStringLiteral("Header"), 'H', firstBox, frame, QStringLiteral("Label3"))
+        : captionFor(QStringLiteral("Footer"), 'F', firstBox, frame, QStringLiteral("Label4"));
+    grid->addWidget(caption, 0, 0, 1, 3);
+    auto* description = new QLineEdit(frame);
+    description->setObjectName(
+        isHeader ? QStringLiteral("txtHeaderFont") : QStringLiteral("txtFooterFont"));
+    description->setReadOnly(true);
+    (isHeader ? headerFont_ : footerFont_) = description;
+    auto* change = new QPushButton(QStringLiteral("Font..."), frame);
+    change->setObjectName(
+        isHeader ? QStringLiteral("cmdHeaderFont") : QStringLiteral("cmdFooterFont"));
+    change->setAutoDefault(false);
+    setAltKey(*change, isHeader ? 'N' : 'T');
+    connect(change, &QPushButton::clicked, this, [this, isHeader] { askFont(isHeader); });
+    description->setAccessibleName(isHeader ? tr("Header font") : tr("Footer font"));
+    change->setAccessibleName(description->accessibleName());
+    grid->addWidget(description, 2, 0, 1, 2);
+    grid->addWidget(change, 2, 2, Qt::AlignLeft);
+    return frame;
+}
+
+QWidget* PageSetupDialog::makeFormatBox(int box, QWidget* parent)
+{
+    auto* holder = new QWidget(parent);
+    const auto index = static_cast<std::size_t>(box - 1);
+    const QString hint = tr(SlotHints[index % std::size(SlotHints)]);
+    auto* text = new QLineEdit(toQString(state_.formatTexts[index]), holder);
+    formatBoxes_[index] = text;
+    text->setObjectName(elementName("txtFormat", box));
+    text->setPlaceholderText(hint);
+    text->setAccessibleName(hint);
+    text->setMinimumWidth(fieldWidth(text->fontMetrics()));
+    text->setCursorPosition(0);
+    text->installEventFilter(this);
+    connect(text, &QLineEdit::textChanged, this,
+        [this, index](const QString& now) { state_.formatTexts[index] = toText(now); });
+    auto* fields = new QToolButton(holder);
+    fields->setObjectName(elementName("cmdField", box));
+    fields->setArrowType(Qt::DownArrow);
+    fields->setFocusPolicy(Qt::NoFocus);
+    fields->setToolTip(tr("Put in a field"));
+    fields->setAccessibleName(fields->toolTip());
+    connect(fields, &QToolButton::clicked, this,
+        [this, box, text] { openFieldMenu(box, text->mapToGlobal(QPoint(0, text->height()))); });
+    auto* layout = new QHBoxLayout(holder);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(1);
+    layout->addWidget(text, 1);
+    layout->addWidget(fields);
+    return holder;
+}
+
+void PageSetupDialog::makeFieldMenu()
+{
+    fields_ = new QMenu(QStringLiteral("PopMenu"), this);
+    fields_->setObjectName(QStringLiteral("ActiveBar1"));
+    for (std::size_t entry = 0; entry < FieldEntries.size(); ++entry) {
+        QAction* action = fields_->addAction(toQString(FieldEntries[entry].caption));
+        connect(action, &QAction::triggered, this,
+            [this, entry] { chooseField(static_cast<int>(entry)); });
+    }
+}
+
+void PageSetupDialog::clickPaper()
+{
+    const QList<QTreeWidgetItem*> chosen = papers_->selectedItems();
+    if (chosen.isEmpty())
+        return;
+    const int row = papers_->indexOfTopLevelItem(chosen.front());
+    state_.paper.chooseRow(state_.paperRows()[static_cast<std::size_t>(row)]);
+    showPaper();
+}
+
+void PageSetupDialog::chooseOrientation(bool portrait)
+{
+    state_.chooseOrientation(portrait);
+    showPaper();
+    sketch_->refresh();
+}
+
+void PageSetupDialog::showPaper()
+{
+    paperName_->setText(toQString(state_.paper.caption));
+    width_->setText(toQString(state_.paper.widthBox));
+    height_->setText(toQString(state_.paper.heightBox));
+    upright_->setVisible(state_.paper.isPortrait());
+    lying_->setVisible(!state_.paper.isPortrait());
+}
+
+void PageSetupDialog::typeMargin(Margin margin)
+{
+    QLineEdit& box = *margins_[static_cast<std::size_t>(margin)]->textBox();
+    const QString typed = box.text();
+    const Text before = numericCharacters(viewOf(QStringView(typed).first(box.cursorPosition())));
+    state_.typeMargin(margin, toText(typed));
+    rewriteText(box, toQString(state_.marginBox(margin)), static_cast<int>(before.size()));
+    sketch_->refresh();
+}
+
+void PageSetupDialog::showMargins()
+{
+    for (const Margin margin : AllMargins) {
+        const QString text = toQString(state_.marginBox(margin));
+        rewriteText(*margins_[static_cast<std::size_t>(margin)]->textBox(), text,
+            static_cast<int>(text.indexOf(QLatin1Char(' '))));
+    }
+    sketch_->refresh();
+}
+
+bool PageSetupDialog::eventFilter(QObject* watched, QEvent* event)
+{
+    for (std::size_t index = 0; index < formatBoxes_.size(); ++index) {
+        if (watched != formatBoxes_[index])
+            continue;
+        const int box = static_cast<int>(index) + 1;
+        if (event->type() == QEvent::FocusIn)
+            state_.focusFormatBox(box);
+        if (event->type() != QEvent::ContextMenu)
+            break;
+        openFieldMenu(box, static_cast<QContextMenuEvent*>(event)->globalPos());
+        return true;
+    }
+    return QDialog::eventFilter(watched, event);
+}
+
+void PageSetupDialog::openFieldMenu(int box, const QPoint& globalPosition)
+{
+    formatBoxes_[static_cast<std::size_t>(box - 1)]->setFocus();
+    state_.focusFormatBox(box);
+    fields_->popup(globalPosition);
+}
+
+void PageSetupDialog::chooseField(int entry)
+{
+    state_.chooseField(entry);
+    const int box = state_.lastFormatBox();
+    if (box == 0)
+        return;
+    const auto index = static_cast<std::size_t>(box - 1);
+    formatBoxes_[index]->setText(toQString(state_.formatTexts[index]));
+}
+
+void PageSetupDialog::askFont(bool isHeader)
+{
+    try {
+        if (isHeader)
+            state_.setHeaderFont(chooseFont_(this, state_.headerFont));
+        else
+            state_.setFooterFont(chooseFont_(this, state_.footerFont));
+        showFont(isHeader);
+    } catch (const RunTimeError&) {
+        // The user cancelled: the font stays.
+    }
+}
+
+void PageSetupDialog::showFont(bool isHeader)
+{
+    QLineEdit& box = isHeader ? *headerFont_ : *footerFont_;
+    box.setText(toQString(isHeader ? state_.headerFontText() : state_.footerFontText()));
+    box.setCursorPosition(0);
+    showInColor(box, isHeader ? state_.headerFont.color : state_.footerFont.color);
+}
+
+void PageSetupDialog::save()
+{
+    saved_ = state_.save();
+    accept();
+}
+
+} // namespace pelloric::qt

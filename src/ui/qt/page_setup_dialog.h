@@ -1,0 +1,87 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/platform.h"
+#include "ui/page_setup.h"
+#include "ui/qt/font_chooser.h"
+
+#include <QDialog>
+
+#include <array>
+#include <optional>
+
+class QLabel;
+class QLayout;
+class QLineEdit;
+class QMenu;
+class QRadioButton;
+class QTreeWidget;
+
+namespace pelloric::qt {
+
+class PageSketch;
+class SheetPicture;
+class UpDownBox;
+
+/// The modal dialog "Page Setup": paper, margins, header and footer of the settings file.
+class PageSetupDialog final : public QDialog {
+    Q_OBJECT
+
+public:
+    /// Loads the settings.
+    /// @param platform  its services outlive the dialog
+    explicit PageSetupDialog(const Platform& platform, QWidget* parent = nullptr);
+
+    /// Replaces the font dialog.
+    void useFontDialog(ChooseFont choose) { chooseFont_ = std::move(choose); }
+
+    /// How the save of "OK" ended, of which the dialog itself tells nobody; nothing before.
+    std::optional<SaveOutcome> saved() const { return saved_; }
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    QWidget* makePageTab();
+    QWidget* makePaperList(QWidget* parent);
+    QLayout* makeSizeBoxes(QWidget* parent);
+    QLayout* makeOrientation(QWidget* parent);
+    QWidget* makeMarginsTab();
+    UpDownBox* makeMarginBox(Margin margin, QWidget* parent);
+    QWidget* makeTextsTab();
+    QWidget* makeTextsGroup(bool isHeader, QWidget* parent);
+    QWidget* makeFormatBox(int box, QWidget* parent);
+    void makeFieldMenu();
+
+    void clickPaper();
+    void chooseOrientation(bool portrait);
+    void showPaper();
+    void typeMargin(Margin margin);
+    void showMargins();
+    void openFieldMenu(int box, const QPoint& globalPosition);
+    void chooseField(int entry);
+    void askFont(bool isHeader);
+    void showFont(bool isHeader);
+    void save();
+
+    Platform platform_;
+    PageSetupState state_;
+    ChooseFont chooseFont_ = chooseFont;
+    std::optional<SaveOutcome> saved_;
+    QTreeWidget* papers_ = nullptr;
+    QLabel* paperName_ = nullptr;
+    QLineEdit* width_ = nullptr;
+    QLineEdit* height_ = nullptr;
+    SheetPicture* upright_ = nullptr;
+    SheetPicture* lying_ = nullptr;
+    std::array<UpDownBox*, 4> margins_ {};
+    PageSketch* sketch_ = nullptr;
+    QMenu* fields_ = nullptr;
+    std::array<QLineEdit*, PageSetupState::FormatBoxes> formatBoxes_ {};
+    QLineEdit* headerFont_ = nullptr;
+    QLineEdit* footerFont_ = nullptr;
+};
+
+} // namespace pelloric::qt
