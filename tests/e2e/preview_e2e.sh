@@ -1,0 +1,189 @@
+#!/usr/bin/env bash
+# SPDX-FileCopyrightText: The Pelloric authors
+# SPDX-License-Identifier: MIT
+
+# Drives the demonstration on a real window server with real keys and a real pointer:
+#   preview_e2e.sh PROGRAM FOLDER
+# The program's state log tells what came of each step; screenshots stay in the folder.
+
+set -euo pipefail
+
+Program=$1
+Folder=$2
+Log=$Folder/state.log
+Patience=200 # looks at the log, 50 ms apart, before a step has failed
+
+fail() {
+    printf 'preview_e2e: %s\n' "$1" >&2
+    [ ! -f "$Log" ] || tail -n 3 "$Log" >&2
+    exit 1
+}
+
+# needTool PROGRAM PACKAGE
+needTool() {
+    command -v "$1" > /dev/null 2>&1 || fail "$1 is missing; install the Debian package $2"
+}
+
+needTool Xvfb xvfb
+needTool openbox openbox
+needTool xdotool xdotool
+needTool import imagemagick
+
+rm -rf "$Folder"
+mkdir -p "$Folder/config"
+mkdir -m 700 "$Folder/run"
+Processes=()
+
+# Only what this script started is ended, by its number.
+finish() {
+    local process
+    for process in "${Processes[@]}"; do
+        kill "$process" 2> /dev/null || true
+    done
+    wait 2> /dev/null || true
+}
+trap finish EXIT
+
+Xvfb -displayfd 3 -screen 0 1400x1000x24 -nolisten tcp 3> "$Folder/display" 2> "$Folder/server.log" &
+Processes+=($!)
+for ((look = 0; look < Patience; look++)); do
+    [ ! -s "$Folder/display" ] || break
+    sleep 0.05
+done
+[ -s "$Folder/display" ] || fail "the window server did not start"
+DISPLAY=:$(cat "$Folder/display")
+export DISPLAY
+export XDG_RUNTIME_DIR=$Folder/run XDG_CONFIG_HOME=$Folder/config QT_QPA_PLATFORM=xcb LC_ALL=C.UTF-8
+unset QT_SCALE_FACTOR QT_FONT_DPI WAYLAND_DISPLAY
+
+openbox --sm-disable > "$Folder/openbox.log" 2>&1 &
+Processes+=($!)
+"$Program" demo --log "$Log" > "$Folder/program.log" 2>&1 &
+Demo=$!
+Processes+=("$Demo")
+
+# waitFor PATTERN: until the last state matches the extended regular expression.
+waitFor() {
+    local look last
+    for ((look = 0; look < Patience; look++)); do
+        last=$(grep '^state' "$Log" 2> /dev/null | tail -n 1 || true)
+        if [[ $last =~ $1 ]]; then
+            return 0
+        fi
+        kill -0 "$Demo" 2> /dev/null || fail "the program has ended; waited for: $1"
+        sleep 0.05
+    done
+    fail "waited for: $1"
+}
+
+# valueOf NAME: a value of the last state.
+valueOf() {
+    grep '^state' "$Log" | tail -n 1 | tr ' ' '\n' | sed -n "s/^$1=//p"
+}
+
+# toWindow TITLE: waits for the window and makes it the active one.
+toWindow() {
+    Window=$(timeout 20 xdotool search --all --sync --onlyvisible --pid "$Demo" --name "$1" | head -n 1) ||
+        fail "no window named $1"
+    timeout 10 xdotool windowactivate --sync "$Window" || fail "the window $1 does not come up"
+}
+
+# pointAt NAME NUMBER: the pointer over a control of the preview window.
+pointAt() {
+    local place
+    place=$(grep "^place $1 $2 " "$Log" | tail -n 1) || fail "no place of $1 $2"
+    read -r _ _ _ X Y _ <<< "$place"
+    xdotool mousemove --window "$Window" "$X" "$Y"
+    sleep 0.05
+}
+
+shoot() {
+    import -window root "$Folder/$1.png"
+}
+
+# clickTool NAME NUMBER PATTERN: clicks a tool, waits for its state, takes a picture.
+clickTool() {
+    pointAt "$1" "$2"
+    xdotool click 1
+    waitFor "$3"
+    shoot "$1-$2"
+}
+
+toWindow '^Pelloric Demonstration'
+shoot demo
+xdotool key alt+p
+waitFor 'open busy=0 total=[1-9][0-9]+ current=1 mode=1 .*top=-'
+toWindow '^Print Preview'
+sleep 0.3
+Total=$(valueOf total)
+shoot preview
+
+clickTool tool7 7 'current=2 '
+clickTool tool8 8 "current=$Total "
+clickTool tool5 5 'current=1 '
+clickTool tool15 16 'mode=2 window=2 first=0 last=1 '
+clickTool tool15 18 'mode=3 window=4 first=0 last=3 '
+clickTool tool9 9 'mode=4 window=0 '
+clickTool tool10 10 'mode=1 '
+clickTool tool15 15 'mode=[01] .*visible=1'
+xdotool key ctrl+l
+xdotool type 100
+xdotool key Return
+waitFor 'divisor=1 '
+clickTool toolOut 3 'divisor=0.5 '
+
+# A drag over the page moves it when the button is released.
+Before=$(valueOf y)
+xdotool mousemove --window "$Window" 500 500
+sleep 0.1
+xdotool mousedown 1
+xdotool mousemove --window "$Window" 480 420
+xdotool mousemove --window "$Window" 460 340
+xdotool mouseup 1
+for ((look = 0; look < Patience; look++)); do
+    [ "$(valueOf y)" = "$Before" ] || break
+    sleep 0.05
+done
+[ "$(valueOf y)" -lt "$Before" ] || fail "dragging did not move the page"
+shoot dragged
+
+xdotool key ctrl+s
+waitFor 'top=QFileDialog'
+sleep 0.3
+xdotool type --delay 5 "$Folder/saved.ostl"
+xdotool key Return
+waitFor 'top=-'
+for ((look = 0; look < Patience; look++)); do
+    [ ! -s "$Folder/saved.ostl" ] || break
+    sleep 0.05
+done
+[ -s "$Folder/saved.ostl" ] || fail "the document was not saved"
+
+xdotool mousemove --window "$Window" 500 500 click 3
+waitFor 'top=QMenu'
+shoot menu
+xdotool key Down Return
+waitFor 'total=1 .*top=-'
+shoot cleared
+
+xdotool key ctrl+o
+waitFor 'top=QFileDialog'
+sleep 0.3
+shoot open-dialog
+xdotool type --delay 5 "$Folder/saved.ostl"
+xdotool key Return
+waitFor "total=$Total current=1 .*top=-"
+shoot reopened
+
+pointAt toolExit 17
+xdotool click 1
+waitFor 'state closed'
+toWindow '^Pelloric Demonstration'
+xdotool key alt+F4
+for ((look = 0; look < Patience; look++)); do
+    kill -0 "$Demo" 2> /dev/null || break
+    sleep 0.05
+done
+wait "$Demo" || fail "the program ended with status $?"
+[ ! -s "$Folder/program.log" ] || fail "the program said: $(head -n 1 "$Folder/program.log")"
+printf 'preview_e2e: %s pages, every step as expected\n' "$Total"
