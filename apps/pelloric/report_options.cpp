@@ -3,6 +3,7 @@
 
 #include "report_options.h"
 
+#include "platform/file_bytes.h"
 #include "platform/numbers.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_platform.h"
@@ -11,7 +12,6 @@
 #include "platform/text_codec.h"
 #include "print/paper_names.h"
 #include "settings/default_settings.h"
-#include "settings/file_bytes.h"
 #include "settings/settings_file.h"
 
 #include <QRegularExpression>

@@ -4,12 +4,12 @@
 #include "command_line.h"
 #include "commands.h"
 #include "headless.h"
+#include "platform/file_bytes.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/text_codec.h"
 #include "settings/default_settings.h"
-#include "settings/file_bytes.h"
 #include "settings/settings_file.h"
 #include "view/qt/pending_files.h"
 

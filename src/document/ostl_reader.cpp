@@ -6,10 +6,10 @@
 #include "document/line_reader.h"
 #include "document/ostl_format.h"
 #include "document/page_document.h"
+#include "platform/file_bytes.h"
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
 #include "platform/text_codec.h"
-#include "settings/file_bytes.h"
 
 #include <algorithm>
 #include <charconv>

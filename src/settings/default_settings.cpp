@@ -3,10 +3,10 @@
 
 #include "settings/default_settings.h"
 
+#include "platform/file_bytes.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
 #include "platform/text_codec.h"
-#include "settings/file_bytes.h"
 #include "settings/settings_file.h"
 #include "settings/settings_keys.h"
 

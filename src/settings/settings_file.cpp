@@ -3,11 +3,11 @@
 
 #include "settings/settings_file.h"
 
+#include "platform/file_bytes.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 #include "platform/text_codec.h"
-#include "settings/file_bytes.h"
 
 #include <optional>
 

@@ -3,10 +3,10 @@
 
 #include "platform/qt/sqlite_table.h"
 
+#include "platform/file_bytes.h"
 #include "platform/qt/held_value.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
-#include "settings/file_bytes.h"
 
 #include <QSqlDatabase>
 #include <QSqlError>

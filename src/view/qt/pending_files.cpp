@@ -3,8 +3,8 @@
 
 #include "view/qt/pending_files.h"
 
+#include "platform/file_bytes.h"
 #include "platform/run_time_error.h"
-#include "settings/file_bytes.h"
 
 #include <string>
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "settings/file_bytes.h"
+#include "platform/file_bytes.h"
 
 #include "platform/run_time_error.h"
 
