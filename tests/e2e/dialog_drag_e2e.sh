@@ -41,7 +41,7 @@ wait_for() {
     exit 1
 }
 
-Xvfb -displayfd 3 -screen 0 1280x1024x24 3>"$folder/display" 2>"$folder/xvfb.log" &
+Xvfb -noreset -displayfd 3 -screen 0 1280x1024x24 3>"$folder/display" 2>"$folder/xvfb.log" &
 started+=($!)
 wait_for "$folder/display" '[0-9]'
 export DISPLAY=:$(cat "$folder/display")
@@ -49,14 +49,25 @@ export QT_QPA_PLATFORM=xcb
 unset QT_SCALE_FACTOR QT_FONT_DPI
 openbox --config-file /etc/xdg/openbox/rc.xml >"$folder/openbox.log" 2>&1 &
 started+=($!)
+for _ in $(seq 100); do
+    xdotool get_num_desktops >/dev/null 2>&1 && break # the window manager answers
+    sleep 0.1
+done
 
 mkdir "$folder/settings"
 "$program" "$folder/settings" >"$folder/places" 2>"$folder/program.log" &
 shown=$!
 started+=("$shown")
 wait_for "$folder/places" '^ready$'
-window=$(timeout 20 xdotool search --sync --onlyvisible --pid "$shown" --name '^Page Setup$' | tail -1)
-timeout 20 xdotool windowactivate --sync "$window"
+window=
+for _ in $(seq 100); do
+    window=$(timeout 5 xdotool search --onlyvisible --all --pid "$shown" --name 'Page Setup' | tail -1 || true)
+    if [ -n "$window" ] && timeout 5 xdotool windowactivate --sync "$window"; then
+        break
+    fi
+    sleep 0.2
+done
+[ -n "$window" ] || { echo "the dialog does not come up" >&2; exit 1; }
 
 # place NAME: where its middle is in the window.
 place() {

@@ -31,7 +31,7 @@ constexpr auto UsualSizes
     = std::to_array<double>({ 8, 9, 10, 10.5, 11, 12, 14, 16, 18, 20, 22, 24, 26, 28, 36, 48, 72 });
 
 constexpr double LargestSize = 1638; ///< points
-constexpr double LargestSample = 24; ///< points; larger fonts are shown in this size
+constexpr double LargestSample = 20; ///< points; larger fonts are shown in this size
 constexpr int SampleHeight = 72; ///< pixels
 
 bool isUsableSize(double size) { return size > 0 && size <= LargestSize; }
@@ -121,7 +121,7 @@ QWidget* FontChooser::makeStyleGroup()
 
 QWidget* FontChooser::makeSample()
 {
-    sample_ = new QLineEdit(QStringLiteral("AaBbYyZz 0123 中文字样"), this);
+    sample_ = new QLineEdit(QStringLiteral("AaBbYyZz 中文字样"), this);
     sample_->setObjectName(QStringLiteral("txtSample"));
     sample_->setAccessibleName(tr("Sample"));
     sample_->setReadOnly(true);

@@ -97,12 +97,12 @@ QWidget* PageSetupDialog::makePageTab()
     auto* page = new QWidget(this);
     auto* group = new QGroupBox(QStringLiteral("Page"), page);
     group->setObjectName(QStringLiteral("Frame1"));
+    auto* inside = new QVBoxLayout(group);
+    inside->addWidget(makePaperList(group), 1);
     auto* below = new QHBoxLayout;
     below->addLayout(makeSizeBoxes(group));
     below->addStretch();
     below->addLayout(makeOrientation(group));
-    auto* inside = new QVBoxLayout(group);
-    inside->addWidget(makePaperList(group), 1);
     inside->addLayout(below);
     auto* layout = new QVBoxLayout(page);
     layout->addWidget(group);
