@@ -20,7 +20,6 @@
 #include <QLineEdit>
 #include <QPushButton>
 #include <QSpinBox>
-#include <QSqlError>
 #include <QSqlTableModel>
 #include <QTabWidget>
 #include <QTableView>
@@ -52,13 +51,19 @@ constexpr int FacadeSize = 28; ///< pixels
 /// The connection's name in the program.
 const QString Connection = QStringLiteral("samples");
 
+[[noreturn]] void refuseSample(const QString& file)
+{
+    throw CommandError(
+        QStringLiteral("%1 cannot be read; name the folder of the samples with --samples")
+            .arg(file));
+}
+
 TableGrid readSample(const QString& file)
 {
     try {
         return qt::readCsv(pathOf(file), {});
-    } catch (const RunTimeError& error) {
-        throw CommandError(QStringLiteral("%1: %2; name the folder of the samples with --samples")
-                               .arg(file, detailOf(error)));
+    } catch (const RunTimeError&) {
+        refuseSample(file);
     }
 }
 
@@ -226,8 +231,7 @@ QAbstractItemView* DemoWindow::makeDataGrid(const QString& file)
     database_.setConnectOptions(QStringLiteral("QSQLITE_OPEN_READONLY"));
     database_.setDatabaseName(file);
     if (!database_.open())
-        throw CommandError(QStringLiteral("%1: %2; name the folder of the samples with --samples")
-                               .arg(file, database_.lastError().databaseText()));
+        refuseSample(file);
     auto* const view = new QTableView;
     auto* const model = new QSqlTableModel(view, database_);
     model->setTable(QStringLiteral("time_zones"));

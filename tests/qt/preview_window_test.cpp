@@ -8,6 +8,7 @@
 #include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
 #include "platform/qt/qt_platform.h"
+#include "platform/run_time_error.h"
 #include "platform/table_grid.h"
 #include "settings/default_settings.h"
 #include "ui/qt/choice_box.h"
@@ -544,6 +545,15 @@ TEST_F(PreviewWindowTest, GoesAfterTheBuildDuringWhichItWasClosed)
     EXPECT_EQ(opener_.window(), nullptr);
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     EXPECT_TRUE(window.isNull());
+}
+
+TEST_F(PreviewWindowTest, GoesAfterABuildThatAHostHasBegunOnTheCanvas)
+{
+    const QPointer<PreviewWindow> window = &preview(3);
+    const auto grid = gridOf(400);
+    QTimer::singleShot(0, window, [&] { window->close(); });
+    EXPECT_THROW(canvas().doPreview(*grid), RunTimeError); // ended by the user
+    EXPECT_TRUE(QTest::qWaitFor([&] { return window.isNull(); }));
 }
 
 TEST_F(PreviewWindowTest, RefusesAGridWithoutAWordWhileItBuilds)

@@ -34,6 +34,10 @@ constexpr auto GroupOrder = std::to_array<ToolGroup>({
     ToolGroup::Window,
 });
 
+constexpr int ArrowSize = 10; ///< of the picture on the arrow at the end: pixels
+
+constexpr int BoxGap = 4; ///< in front of a combo: pixels
+
 constexpr int ScaleLetters = 9; ///< room for "   500 %" and what is typed
 constexpr int PageLetters = 11; ///< room for "   NO. 32767" but for a letter
 
@@ -173,6 +177,9 @@ void PreviewToolbar::addCombo(const PreviewTool& tool)
     box->setProperty("caption", toQString(tool.caption));
     box->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     box->setMinimumContentsLength(isScale ? ScaleLetters : PageLetters);
+    auto* const gap = new QWidget(this);
+    gap->setFixedWidth(BoxGap);
+    addWidget(gap);
     addWidget(box);
     connect(box, &ChoiceBox::chosen, this,
         isScale ? &PreviewToolbar::scaleChosen : &PreviewToolbar::pageChosen);
@@ -189,12 +196,17 @@ void PreviewToolbar::addCombo(const PreviewTool& tool)
     addWidget(pageCount_);
 }
 
+QToolButton* PreviewToolbar::arrow() const
+{
+    return findChild<QToolButton*>(QStringLiteral("qt_toolbar_ext_button"));
+}
+
 /// A box that does not fit is behind the arrow, which is opened first.
 void PreviewToolbar::focusBox(ChoiceBox& box)
 {
-    auto* const arrow = findChild<QToolButton*>(QStringLiteral("qt_toolbar_ext_button"));
-    if (!box.isVisible() && arrow && !arrow->isChecked())
-        arrow->click();
+    QToolButton* const button = arrow();
+    if (!box.isVisible() && button && !button->isChecked())
+        button->click();
     box.setFocus(Qt::ShortcutFocusReason);
     box.lineEdit()->selectAll();
 }
@@ -228,7 +240,7 @@ std::vector<QAction*> PreviewToolbar::contextActions() const
 void PreviewToolbar::changeEvent(QEvent* event)
 {
     QToolBar::changeEvent(event);
-    if (event->type() == QEvent::PaletteChange)
+    if (event->type() == QEvent::PaletteChange || event->type() == QEvent::StyleChange)
         drawIcons();
 }
 
@@ -237,6 +249,11 @@ void PreviewToolbar::drawIcons()
     for (const PreviewTool& tool : PreviewTools) {
         if (tool.kind != ToolKind::Combo)
             actions_.at(tool.id)->setIcon(libraryIcon(toQString(tool.icon), palette()));
+    }
+    // The style's own arrow is black on every ground.
+    if (QToolButton* const button = arrow()) {
+        button->setIcon(libraryIcon(QStringLiteral("more-tools"), palette()));
+        button->setIconSize({ ArrowSize, ArrowSize });
     }
 }
 

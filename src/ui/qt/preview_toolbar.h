@@ -10,6 +10,7 @@
 
 class QAction;
 class QLabel;
+class QToolButton;
 
 namespace pelloric {
 
@@ -60,6 +61,8 @@ private:
     void addButton(const PreviewTool& tool);
     void addCombo(const PreviewTool& tool);
     QAction* makeAction(const PreviewTool& tool);
+    /// The button behind which tools are that do not fit.
+    QToolButton* arrow() const;
     void focusBox(ChoiceBox& box);
     void drawIcons();
     void chooseButtonStyle();

@@ -28,6 +28,7 @@
 #include <QScrollBar>
 #include <QSettings>
 #include <QShortcut>
+#include <QTimer>
 
 namespace pelloric::qt {
 
@@ -40,6 +41,8 @@ constexpr short RightButtonNumber = 2;
 constexpr int ExitTool = 17;
 constexpr int PreviousTool = 6;
 constexpr int NextTool = 7;
+
+constexpr int CloseAgainMs = 20;
 
 /// Where size and place of the window are kept.
 QSettings placeSettings()
@@ -141,6 +144,8 @@ void PreviewWindow::setPrompts(PreviewPrompts prompts)
         prompts_.showAbout = standard.showAbout;
 }
 
+bool PreviewWindow::isBusy() const { return running_ > 0 || canvas_->canvas().isBuilding(); }
+
 void PreviewWindow::preview(std::unique_ptr<AutomationObject> grid)
 {
     if (isBusy())
@@ -224,6 +229,9 @@ void PreviewWindow::closeEvent(QCloseEvent* event)
         services_.loop().cancel();
     for (QDialog* const dialog : findChildren<QDialog*>())
         dialog->reject();
+    // A build that a host has begun on the canvas is no command, and nobody tells when it ends.
+    if (running_ == 0)
+        QTimer::singleShot(CloseAgainMs, this, &QWidget::close);
     event->ignore();
     savePlace();
     hide();

@@ -62,7 +62,7 @@ public:
     void print(bool allPages, TextView pageList, std::int16_t copies);
 
     /// Whether a command, a build among them, runs at the moment.
-    bool isBusy() const { return running_ > 0; }
+    bool isBusy() const;
 
     /// Whether the window is closed and only waits to be deleted.
     bool isClosed() const { return isClosed_; }
