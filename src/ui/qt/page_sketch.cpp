@@ -60,12 +60,16 @@ public:
 protected:
     void paintEvent(QPaintEvent*) override
     {
+        // Equally thick wherever it stands, on screens of broken scales too.
+        QPen pen(QColor(LineColor), std::floor(devicePixelRatioF()));
+        pen.setCosmetic(true);
         QPainter painter(this);
-        const QColor color(LineColor);
+        painter.setPen(pen);
+        constexpr double Middle = LineReach + 0.5;
         if (isHorizontal())
-            painter.fillRect(QRect(0, LineReach, width(), 1), color);
+            painter.drawLine(QPointF(0, Middle), QPointF(width(), Middle));
         else
-            painter.fillRect(QRect(LineReach, 0, 1, height()), color);
+            painter.drawLine(QPointF(Middle, 0), QPointF(Middle, height()));
     }
 
     void mousePressEvent(QMouseEvent* event) override
