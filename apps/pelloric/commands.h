@@ -12,16 +12,16 @@ namespace pelloric::app {
 /// How the program was called.
 struct Invocation {
     int& argc; ///< for the application object
-    char** argv; ///< for the application object
+    char** argv = nullptr; ///< for the application object
     QStringList arguments; ///< what stands behind the command's name
 };
 
 /// One of the things that the program can do.
 struct Command {
-    const char* name;
-    const char* synopsis; ///< what stands behind the name
-    const char* summary; ///< one line
-    int (*run)(const Invocation& invocation); ///< answers the exit status; may throw
+    const char* name = nullptr;
+    const char* synopsis = nullptr; ///< what stands behind the name
+    const char* summary = nullptr; ///< one line
+    int (*run)(const Invocation& invocation) = nullptr; ///< answers the exit status; may throw
     QString (*details)() = nullptr; ///< the rest of the command's help; may be missing
 };
 
