@@ -5,7 +5,6 @@
 #include "commands.h"
 #include "controls/canvas.h"
 #include "document/ostl_format.h"
-#include "document/ostl_reader.h"
 #include "document/ostl_writer.h"
 #include "headless.h"
 #include "interruption.h"
@@ -145,18 +144,8 @@ void exportPages(const Order& order, const CommandLine& line, const PageDocument
 void exportDocument(
     const Order& order, const CommandLine& line, qt::QtPlatform& platform, ProgressLine& progress)
 {
-    const char* const option = firstReportOption(line);
-    if (option != nullptr && QLatin1String(option) != QLatin1String("title"))
-        throw CommandError(
-            QStringLiteral("--%1 does not apply to a saved document, whose pages are laid out")
-                .arg(QString::fromLatin1(option)),
-            WrongUsage);
-    PageDocument document;
-    PageSetup setup;
-    const Platform record = platform.record();
-    if (readOstl(record.codec, pathOf(order.file), document, setup) == OstlResult::BadHeader)
-        throw CommandError(QStringLiteral("%1 is no document file").arg(order.file));
-    exportPages(order, line, document, setup, platform, progress);
+    const SavedDocument saved = readDocument(order.file, line, platform.record());
+    exportPages(order, line, saved.document, saved.setup, platform, progress);
 }
 
 void exportTable(

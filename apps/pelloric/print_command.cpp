@@ -4,7 +4,6 @@
 #include "command_line.h"
 #include "commands.h"
 #include "controls/canvas.h"
-#include "document/ostl_reader.h"
 #include "headless.h"
 #include "interruption.h"
 #include "platform/platform.h"
@@ -133,21 +132,11 @@ void printPages(const Order& order, const PageDocument& document, PrintJob job,
 void printDocument(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
     qt::QtPrinting& printing, ProgressLine& progress)
 {
-    const char* const option = firstReportOption(line);
-    if (option != nullptr && QLatin1String(option) != QLatin1String("title"))
-        throw CommandError(
-            QStringLiteral("--%1 does not apply to a saved document, whose pages are laid out")
-                .arg(QString::fromLatin1(option)),
-            WrongUsage);
-    PageDocument document;
-    PageSetup setup;
-    const Platform record = platform.record();
-    if (readOstl(record.codec, pathOf(order.file), document, setup) == OstlResult::BadHeader)
-        throw CommandError(QStringLiteral("%1 is no document file").arg(order.file));
+    const SavedDocument saved = readDocument(order.file, line, platform.record());
     PrintJob job;
-    job.paperSize = paperFor(setup, job.paperSize, printing.system().forms());
-    job.orientation = setup.myWidth > setup.myHeight ? 2 : 1;
-    printPages(order, document, job, Font {}, printing, progress);
+    job.paperSize = paperFor(saved.setup, job.paperSize, printing.system().forms());
+    job.orientation = saved.setup.myWidth > saved.setup.myHeight ? 2 : 1;
+    printPages(order, saved.document, job, Font {}, printing, progress);
 }
 
 void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& platform,

@@ -4,6 +4,7 @@
 #include "report_builder.h"
 
 #include "controls/canvas.h"
+#include "document/ostl_reader.h"
 #include "platform/automation_object.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
@@ -13,6 +14,8 @@
 #include "print/page_list.h"
 #include "progress_line.h"
 #include "report/content_widths.h"
+#include "report_options.h"
+#include "table_source.h"
 
 namespace pelloric::app {
 
@@ -72,6 +75,21 @@ void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, Progr
     if (canvas.table() == nullptr)
         throw CommandError(QStringLiteral("no column is wide enough to be printed; give other "
                                           "--widths"));
+}
+
+SavedDocument readDocument(const QString& file, const CommandLine& line, const Platform& platform)
+{
+    const char* const option = firstReportOption(line);
+    if (option != nullptr && QLatin1String(option) != QLatin1String("title"))
+        throw CommandError(
+            QStringLiteral("--%1 does not apply to a saved document, whose pages are laid out")
+                .arg(QString::fromLatin1(option)),
+            WrongUsage);
+    SavedDocument saved;
+    if (readOstl(platform.codec, pathOf(file), saved.document, saved.setup)
+        == OstlResult::BadHeader)
+        throw CommandError(QStringLiteral("%1 is no document file").arg(file));
+    return saved;
 }
 
 std::vector<int> pagesOf(const QString& list, int pageCount)

@@ -4,12 +4,14 @@
 #pragma once
 
 #include "command_line.h"
+#include "document/page_document.h"
 
 #include <vector>
 
 namespace pelloric {
 class Canvas;
 class TableGrid;
+struct Platform;
 }
 
 namespace pelloric::qt {
@@ -30,6 +32,16 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas);
 /// Lays a table out with the settings in force.
 /// @throws CommandError settings that cannot be used; RunTimeError of the layout, or Cancelled
 void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress);
+
+/// A document that was saved.
+struct SavedDocument {
+    PageDocument document;
+    PageSetup setup;
+};
+
+/// Reads a document file; of the options for reports only the title applies to it.
+/// @throws CommandError it is no document file, or other options are given; RunTimeError of reading
+SavedDocument readDocument(const QString& file, const CommandLine& line, const Platform& platform);
 
 /// The zero-based pages that a list such as 1,3,5-12 names; empty for an empty list.
 /// @throws CommandError the list names no page of the document
