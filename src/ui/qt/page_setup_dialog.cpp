@@ -4,28 +4,23 @@
 #include "ui/qt/page_setup_dialog.h"
 
 #include "platform/qt/qt_text.h"
-#include "platform/run_time_error.h"
 #include "ui/numeric_text.h"
 #include "ui/qt/dialog_parts.h"
 #include "ui/qt/page_sketch.h"
+#include "ui/qt/page_texts_tab.h"
 #include "ui/qt/sheet_picture.h"
 #include "ui/qt/up_down_box.h"
 
-#include <QContextMenuEvent>
 #include <QGridLayout>
 #include <QGroupBox>
 #include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
-#include <QMenu>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QTabWidget>
-#include <QToolButton>
 #include <QTreeWidget>
 #include <QVBoxLayout>
-
-#include <algorithm>
 
 namespace pelloric::qt {
 
@@ -47,18 +42,6 @@ constexpr MarginRow MarginRows[] = {
     { Margin::Right, "Right:", "cmdRight", "txtRight", 'R' },
 };
 
-constexpr const char* SlotHints[]
-    = { QT_TR_NOOP("Left"), QT_TR_NOOP("Center"), QT_TR_NOOP("Right") };
-
-/// Wide enough for every field with its caret: pixels.
-int fieldWidth(const QFontMetrics& metrics)
-{
-    int width = 0;
-    for (const FieldEntry& entry : FieldEntries)
-        width = std::max(width, metrics.horizontalAdvance(toQString(entry.field)));
-    return width + 2 * metrics.averageCharWidth();
-}
-
 QFrame* bareFrame(const QString& name, QWidget* parent)
 {
     auto* frame = new QFrame(parent);
@@ -75,12 +58,12 @@ PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent)
 {
     setWindowTitle(toQString(PageSetupTitle));
     setModal(true);
-    makeFieldMenu();
     auto* tabs = new QTabWidget(this);
     tabs->setObjectName(QStringLiteral("tabStrip1"));
     tabs->addTab(makePageTab(), toQString(PageSetupTabs[0]));
     tabs->addTab(makeMarginsTab(), toQString(PageSetupTabs[1]));
-    tabs->addTab(makeTextsTab(), toQString(PageSetupTabs[2]));
+    texts_ = new PageTextsTab(state_, this);
+    tabs->addTab(texts_, toQString(PageSetupTabs[2]));
     auto* layout = new QVBoxLayout(this);
     layout->addWidget(tabs);
     const ClosingButtons buttons
@@ -88,9 +71,9 @@ PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent)
     connect(buttons.ok, &QPushButton::clicked, this, &PageSetupDialog::save);
     showPaper();
     showMargins();
-    showFont(true);
-    showFont(false);
 }
+
+void PageSetupDialog::useFontDialog(ChooseFont choose) { texts_->useFontDialog(std::move(choose)); }
 
 QWidget* PageSetupDialog::makePageTab()
 {
@@ -238,92 +221,6 @@ UpDownBox* PageSetupDialog::makeMarginBox(Margin margin, QWidget* parent)
     return box;
 }
 
-QWidget* PageSetupDialog::makeTextsTab()
-{
-    auto* page = new QWidget(this);
-    auto* layout = new QVBoxLayout(page);
-    layout->addWidget(makeTextsGroup(true, page));
-    layout->addWidget(makeTextsGroup(false, page));
-    layout->addStretch();
-    return page;
-}
-
-QWidget* PageSetupDialog::makeTextsGroup(bool isHeader, QWidget* parent)
-{
-    QFrame* frame
-        = bareFrame(isHeader ? QStringLiteral("Frame4") : QStringLiteral("Frame5"), parent);
-    frame->setFrameShape(QFrame::StyledPanel);
-    auto* grid = new QGridLayout(frame);
-    const int first = isHeader ? 1 : PageSetupState::FormatBoxes / 2 + 1;
-    for (int slot = 0; slot < 3; ++slot) {
-        grid->addWidget(makeFormatBox(first + slot, frame), 1, slot);
-        grid->setColumnStretch(slot, 1);
-    }
-    QLineEdit* firstBox = formatBoxes_[static_cast<std::size_t>(first - 1)];
-    QLabel* caption = isHeader
-        ? captionFor(QStringLiteral("Header"), 'H', firstBox, frame, QStringLiteral("Label3"))
-        : captionFor(QStringLiteral("Footer"), 'F', firstBox, frame, QStringLiteral("Label4"));
-    grid->addWidget(caption, 0, 0, 1, 3);
-    auto* description = new QLineEdit(frame);
-    description->setObjectName(
-        isHeader ? QStringLiteral("txtHeaderFont") : QStringLiteral("txtFooterFont"));
-    description->setReadOnly(true);
-    (isHeader ? headerFont_ : footerFont_) = description;
-    auto* change = new QPushButton(QStringLiteral("Font..."), frame);
-    change->setObjectName(
-        isHeader ? QStringLiteral("cmdHeaderFont") : QStringLiteral("cmdFooterFont"));
-    change->setAutoDefault(false);
-    setAltKey(*change, isHeader ? 'N' : 'T');
-    connect(change, &QPushButton::clicked, this, [this, isHeader] { askFont(isHeader); });
-    description->setAccessibleName(isHeader ? tr("Header font") : tr("Footer font"));
-    change->setAccessibleName(description->accessibleName());
-    grid->addWidget(description, 2, 0, 1, 2);
-    grid->addWidget(change, 2, 2, Qt::AlignLeft);
-    return frame;
-}
-
-QWidget* PageSetupDialog::makeFormatBox(int box, QWidget* parent)
-{
-    auto* holder = new QWidget(parent);
-    const auto index = static_cast<std::size_t>(box - 1);
-    const QString hint = tr(SlotHints[index % std::size(SlotHints)]);
-    auto* text = new QLineEdit(toQString(state_.formatTexts[index]), holder);
-    formatBoxes_[index] = text;
-    text->setObjectName(elementName("txtFormat", box));
-    text->setPlaceholderText(hint);
-    text->setAccessibleName(hint);
-    text->setMinimumWidth(fieldWidth(text->fontMetrics()));
-    text->setCursorPosition(0);
-    text->installEventFilter(this);
-    connect(text, &QLineEdit::textChanged, this,
-        [this, index](const QString& now) { state_.formatTexts[index] = toText(now); });
-    auto* fields = new QToolButton(holder);
-    fields->setObjectName(elementName("cmdField", box));
-    fields->setArrowType(Qt::DownArrow);
-    fields->setFocusPolicy(Qt::NoFocus);
-    fields->setToolTip(tr("Put in a field"));
-    fields->setAccessibleName(fields->toolTip());
-    connect(fields, &QToolButton::clicked, this,
-        [this, box, text] { openFieldMenu(box, text->mapToGlobal(QPoint(0, text->height()))); });
-    auto* layout = new QHBoxLayout(holder);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(1);
-    layout->addWidget(text, 1);
-    layout->addWidget(fields);
-    return holder;
-}
-
-void PageSetupDialog::makeFieldMenu()
-{
-    fields_ = new QMenu(QStringLiteral("PopMenu"), this);
-    fields_->setObjectName(QStringLiteral("ActiveBar1"));
-    for (std::size_t entry = 0; entry < FieldEntries.size(); ++entry) {
-        QAction* action = fields_->addAction(toQString(FieldEntries[entry].caption));
-        connect(action, &QAction::triggered, this,
-            [this, entry] { chooseField(static_cast<int>(entry)); });
-    }
-}
-
 void PageSetupDialog::clickPaper()
 {
     const QList<QTreeWidgetItem*> chosen = papers_->selectedItems();
@@ -368,60 +265,6 @@ void PageSetupDialog::showMargins()
             static_cast<int>(text.indexOf(QLatin1Char(' '))));
     }
     sketch_->refresh();
-}
-
-bool PageSetupDialog::eventFilter(QObject* watched, QEvent* event)
-{
-    for (std::size_t index = 0; index < formatBoxes_.size(); ++index) {
-        if (watched != formatBoxes_[index])
-            continue;
-        const int box = static_cast<int>(index) + 1;
-        if (event->type() == QEvent::FocusIn)
-            state_.focusFormatBox(box);
-        if (event->type() != QEvent::ContextMenu)
-            break;
-        openFieldMenu(box, static_cast<QContextMenuEvent*>(event)->globalPos());
-        return true;
-    }
-    return QDialog::eventFilter(watched, event);
-}
-
-void PageSetupDialog::openFieldMenu(int box, const QPoint& globalPosition)
-{
-    formatBoxes_[static_cast<std::size_t>(box - 1)]->setFocus();
-    state_.focusFormatBox(box);
-    fields_->popup(globalPosition);
-}
-
-void PageSetupDialog::chooseField(int entry)
-{
-    state_.chooseField(entry);
-    const int box = state_.lastFormatBox();
-    if (box == 0)
-        return;
-    const auto index = static_cast<std::size_t>(box - 1);
-    formatBoxes_[index]->setText(toQString(state_.formatTexts[index]));
-}
-
-void PageSetupDialog::askFont(bool isHeader)
-{
-    try {
-        if (isHeader)
-            state_.setHeaderFont(chooseFont_(this, state_.headerFont));
-        else
-            state_.setFooterFont(chooseFont_(this, state_.footerFont));
-        showFont(isHeader);
-    } catch (const RunTimeError&) {
-        // The user cancelled: the font stays.
-    }
-}
-
-void PageSetupDialog::showFont(bool isHeader)
-{
-    QLineEdit& box = isHeader ? *headerFont_ : *footerFont_;
-    box.setText(toQString(isHeader ? state_.headerFontText() : state_.footerFontText()));
-    box.setCursorPosition(0);
-    showInColor(box, isHeader ? state_.headerFont.color : state_.footerFont.color);
 }
 
 void PageSetupDialog::save()

@@ -15,13 +15,13 @@
 class QLabel;
 class QLayout;
 class QLineEdit;
-class QMenu;
 class QRadioButton;
 class QTreeWidget;
 
 namespace pelloric::qt {
 
 class PageSketch;
+class PageTextsTab;
 class SheetPicture;
 class UpDownBox;
 
@@ -35,13 +35,10 @@ public:
     explicit PageSetupDialog(const Platform& platform, QWidget* parent = nullptr);
 
     /// Replaces the font dialog.
-    void useFontDialog(ChooseFont choose) { chooseFont_ = std::move(choose); }
+    void useFontDialog(ChooseFont choose);
 
     /// How the save of "OK" ended, of which the dialog itself tells nobody; nothing before.
     std::optional<SaveOutcome> saved() const { return saved_; }
-
-protected:
-    bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     QWidget* makePageTab();
@@ -50,25 +47,16 @@ private:
     QLayout* makeOrientation(QWidget* parent);
     QWidget* makeMarginsTab();
     UpDownBox* makeMarginBox(Margin margin, QWidget* parent);
-    QWidget* makeTextsTab();
-    QWidget* makeTextsGroup(bool isHeader, QWidget* parent);
-    QWidget* makeFormatBox(int box, QWidget* parent);
-    void makeFieldMenu();
 
     void clickPaper();
     void chooseOrientation(bool portrait);
     void showPaper();
     void typeMargin(Margin margin);
     void showMargins();
-    void openFieldMenu(int box, const QPoint& globalPosition);
-    void chooseField(int entry);
-    void askFont(bool isHeader);
-    void showFont(bool isHeader);
     void save();
 
     Platform platform_;
     PageSetupState state_;
-    ChooseFont chooseFont_ = chooseFont;
     std::optional<SaveOutcome> saved_;
     QTreeWidget* papers_ = nullptr;
     QLabel* paperName_ = nullptr;
@@ -78,10 +66,7 @@ private:
     SheetPicture* lying_ = nullptr;
     std::array<UpDownBox*, 4> margins_ {};
     PageSketch* sketch_ = nullptr;
-    QMenu* fields_ = nullptr;
-    std::array<QLineEdit*, PageSetupState::FormatBoxes> formatBoxes_ {};
-    QLineEdit* headerFont_ = nullptr;
-    QLineEdit* footerFont_ = nullptr;
+    PageTextsTab* texts_ = nullptr;
 };
 
 } // namespace pelloric::qt
