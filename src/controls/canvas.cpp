@@ -7,6 +7,7 @@
 #include "document/ostl_reader.h"
 #include "document/ostl_writer.h"
 #include "platform/automation_object.h"
+#include "platform/file_bytes.h"
 #include "platform/numbers.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
@@ -182,6 +183,7 @@ bool Canvas::rebuild(AutomationObject& grid, bool takeWidths)
     }
     table.dropBorrowedRows();
     table_ = std::move(table);
+    openedName_.clear();
     return true;
 }
 
@@ -233,6 +235,7 @@ void Canvas::OpenFile(const std::filesystem::path& path)
     if (building_)
         return;
     clear();
+    openedName_ = pathText(path.stem());
     try {
         if (readOstl(platform_.codec, path, document_, page) == OstlResult::BadHeader) {
             platform_.messages.show(messageOf(Notice::BadDocumentFile));
@@ -249,8 +252,7 @@ void Canvas::OpenFile(const std::filesystem::path& path)
 void Canvas::showFirstPage()
 {
     document_.currentPage = 0;
-    showNewDocument(view_, facts());
-    notifyView();
+    changeView([this] { showNewDocument(view_, facts()); });
 }
 
 void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrintPageNum)
@@ -260,7 +262,7 @@ void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrint
         .copies = nPrintPageNum,
         .paperSize = style_.PagerSizeValue,
         .orientation = style_.PagerOrientation,
-        .documentName = documentName,
+        .documentName = openedName_.empty() ? documentName : openedName_,
         .pageSent = {} };
     progress_ = { true, std::max<std::int64_t>(1, pagesToSend(document_, job)), 0 };
     job.pageSent = [this](std::int64_t sent) {
@@ -293,26 +295,22 @@ void Canvas::setPaper(TextView name)
 
 void Canvas::showWholePage()
 {
-    pelloric::showWholePage(view_, facts());
-    notifyView();
+    changeView([&] { pelloric::showWholePage(view_, facts()); });
 }
 
 void Canvas::showPage()
 {
-    pelloric::showPage(view_, facts());
-    notifyView();
+    changeView([&] { pelloric::showPage(view_, facts()); });
 }
 
 void Canvas::showAllPage()
 {
-    pelloric::showAllPage(view_, facts(), platform_.loop);
-    notifyView();
+    changeView([&] { pelloric::showAllPage(view_, facts(), platform_.loop); });
 }
 
 void Canvas::showMuliPage(std::int16_t nPages)
 {
-    pelloric::showMuliPage(view_, facts(), nPages, platform_.loop);
-    notifyView();
+    changeView([&] { pelloric::showMuliPage(view_, facts(), nPages, platform_.loop); });
 }
 
 void Canvas::SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage)
@@ -322,44 +320,37 @@ void Canvas::SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int
 
 void Canvas::zoomIn()
 {
-    pelloric::zoomIn(view_, facts());
-    notifyView();
+    changeView([&] { pelloric::zoomIn(view_, facts()); });
 }
 
 void Canvas::zoomOut()
 {
-    pelloric::zoomOut(view_, facts());
-    notifyView();
+    changeView([&] { pelloric::zoomOut(view_, facts()); });
 }
 
 void Canvas::setDispScale(float scale)
 {
-    pelloric::setDispScale(view_, facts(), scale);
-    notifyView();
+    changeView([&] { pelloric::setDispScale(view_, facts(), scale); });
 }
 
 void Canvas::setVerticalDir(bool portrait)
 {
-    pelloric::setVerticalDir(view_, style_, page, facts(), portrait);
-    notifyView();
+    changeView([&] { pelloric::setVerticalDir(view_, style_, page, facts(), portrait); });
 }
 
 void Canvas::OnDraw()
 {
-    layOutAgain(view_, facts());
-    notifyView();
+    changeView([&] { layOutAgain(view_, facts()); });
 }
 
 void Canvas::setMouse()
 {
-    pelloric::setMouse(view_);
-    notifyView();
+    changeView([this] { pelloric::setMouse(view_); }, &CanvasObserver::viewScrolled);
 }
 
 void Canvas::Pan()
 {
-    pan(view_);
-    notifyView();
+    changeView([this] { pan(view_); }, &CanvasObserver::viewScrolled);
 }
 
 void Canvas::setViewport(Twips width, Twips height)
@@ -370,28 +361,24 @@ void Canvas::setViewport(Twips width, Twips height)
 
 void Canvas::setHbar(std::int32_t value)
 {
-    pelloric::setHbar(view_, facts(), value);
-    notifyView();
+    changeView([&] { pelloric::setHbar(view_, facts(), value); }, &CanvasObserver::viewScrolled);
 }
 
 void Canvas::setVbar(std::int32_t value)
 {
-    pelloric::setVbar(view_, facts(), value);
-    notifyView();
+    changeView([&] { pelloric::setVbar(view_, facts(), value); }, &CanvasObserver::viewScrolled);
 }
 
 void Canvas::mouseMove()
 {
-    pelloric::mouseMove(view_);
-    notifyView();
+    changeView([this] { pelloric::mouseMove(view_); }, &CanvasObserver::viewScrolled);
 }
 
 void Canvas::mouseDown(double x, double y) { pelloric::mouseDown(view_, x, y); }
 
 void Canvas::mouseUp(double x, double y)
 {
-    pelloric::mouseUp(view_, facts(), x, y);
-    notifyView();
+    changeView([&] { pelloric::mouseUp(view_, facts(), x, y); }, &CanvasObserver::viewScrolled);
 }
 
 void Canvas::begin(std::int64_t maximum)
@@ -415,6 +402,19 @@ void Canvas::end()
     progress_.visible = false;
     if (observer_ != nullptr)
         observer_->progressChanged();
+}
+
+/// Tells the observer after a change, also of what an error left behind.
+void Canvas::changeView(const std::function<void()>& change, Notification notification)
+{
+    try {
+        change();
+    } catch (...) {
+        notifyView();
+        throw;
+    }
+    if (observer_ != nullptr)
+        (observer_->*notification)();
 }
 
 void Canvas::notifyView()

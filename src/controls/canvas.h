@@ -11,6 +11,7 @@
 #include "view/view_state.h"
 
 #include <filesystem>
+#include <functional>
 #include <optional>
 
 namespace pelloric {
@@ -35,14 +36,19 @@ public:
     /// Surfaces, bars, mode or pages are others now.
     virtual void viewChanged() = 0;
 
+    /// Nothing but where the surfaces stand in the viewport, the bars and the pan mode are others
+    /// now; each page looks as before.
+    virtual void viewScrolled() { viewChanged(); }
+
     /// The progress bar has moved, appeared or gone.
     virtual void progressChanged() = 0;
 };
 
 /// What `Sorvane` publishes, without a window: every member hands on to the rooms that do the work.
 ///
-/// Members throw `RunTimeError`; the control that publishes them turns it into a message box. While
-/// a build runs, members that would change the document are refused without a word.
+/// Members throw `RunTimeError`; the control that publishes them turns it into a message box. What
+/// a member had changed by then stays, and the observer is told of it all the same. While a build
+/// runs, members that would change the document are refused without a word.
 class Canvas : private ProgressListener {
 public:
     /// @param platform  outlives the canvas
@@ -113,7 +119,8 @@ public:
     void doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrintPageNum);
     /// Sends one page to the printer. @param number  from 1
     void printPage(std::int16_t number);
-    /// What the documents are called in the printer's queue.
+    /// What the documents are called in the printer's queue; one that was opened has its file's
+    /// name.
     Text documentName;
 
     /// Gives the page the size of a named paper; an unknown name shows a message.
@@ -175,6 +182,9 @@ private:
     void layOut(GridTable& table);
     void showFirstPage();
     void scaleReport(double factor);
+    using Notification = void (CanvasObserver::*)();
+    void changeView(const std::function<void()>& change,
+        Notification notification = &CanvasObserver::viewChanged);
     void notifyView();
 
     Platform& platform_;
@@ -186,6 +196,7 @@ private:
     ProgressBar progress_;
     ProgressBar buildProgress_;
     CanvasObserver* observer_ = nullptr;
+    Text openedName_; ///< of the file that the document was opened from
     double titleTop_ = 0;
     bool building_ = false;
 };

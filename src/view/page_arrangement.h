@@ -45,6 +45,8 @@ struct PageFacts {
     std::int16_t Totalpages = 1; ///< as published; a host may have written it
     std::int16_t currentPage = 0; ///< zero-based; may name no page
     int pageCount = 1; ///< pages that exist
+
+    bool operator==(const PageFacts&) const = default;
 };
 
 /// The facts of a document on its paper.

@@ -464,4 +464,21 @@ TEST_F(CanvasTest, HidesTheProgressBarWhenThePrinterFails)
     EXPECT_FALSE(other.progress().visible);
 }
 
+TEST_F(CanvasTest, TellsItsObserverOfWhatAFailedMemberLeft)
+{
+    addPages(canvas.document(), 9999);
+    canvas.setDispScale(0.01F);
+    observer.divisor = 0;
+    // The scroll range of so many pages is too long, but the pages are placed by then.
+    EXPECT_EQ(errorOf([&] { canvas.showAllPage(); }), ErrorNumber::Overflow);
+    EXPECT_EQ(canvas.view().surfaces.size(), 10'000U);
+    EXPECT_EQ(observer.divisor, canvas.view().divisor);
+    EXPECT_TRUE(observer.paper.back());
+
+    canvas.document().currentPage = -5;
+    observer.paper.clear();
+    EXPECT_EQ(errorOf([&] { canvas.showPage(); }), ErrorNumber::SubscriptOutOfRange);
+    EXPECT_EQ(observer.paper.size(), 1U);
+}
+
 } // namespace pelloric
