@@ -84,6 +84,14 @@ QtDrawingSurface::QtDrawingSurface(QPainter& painter, QtFonts& fonts, const Surf
     painter_.setRenderHint(QPainter::Antialiasing, false);
     painter_.setRenderHint(QPainter::TextAntialiasing, true);
     painter_.setRenderHint(QPainter::SmoothPixmapTransform, true);
+    if (options_.isScreen && !options_.visible.isEmpty())
+        greeked_.emplace(painter_, options_.visible);
+}
+
+QtDrawingSurface::~QtDrawingSurface()
+{
+    if (greeked_)
+        greeked_->paint();
 }
 
 void QtDrawingSurface::clear()
@@ -140,14 +148,14 @@ void QtDrawingSurface::line(Tpoint from, Tpoint to)
     current_ = to;
     if (!isVisible(QRectF(pointOf(from), pointOf(to)).normalized()))
         return;
-    QPen pen = penOf(foreColor_);
     if (from == to) {
+        QPen pen = penOf(foreColor_);
         pen.setStyle(pen.style() == Qt::NoPen ? Qt::NoPen : Qt::SolidLine);
-        painter_.setPen(pen);
+        setPen(pen);
         painter_.drawPoint(pointOf(from));
         return;
     }
-    painter_.setPen(pen);
+    takeLinePen();
     painter_.drawLine(pointOf(from), pointOf(to));
 }
 
@@ -162,14 +170,28 @@ void QtDrawingSurface::box(Tpoint corner, Tpoint opposite, Color outline)
     const QTransform transform = painter_.transform();
     if (transform.m11() != 0 && transform.m22() != 0)
         brush.setTransform(QTransform::fromScale(1 / transform.m11(), 1 / transform.m22()));
-    painter_.setPen(penOf(outline));
+    setPen(penOf(outline));
     painter_.setBrush(brush);
     painter_.drawRect(area);
     painter_.setBrush(Qt::NoBrush);
 }
 
+/// A line that nobody can read has about the height of its em.
+bool QtDrawingSurface::printGreeked(TextView text)
+{
+    const double em = emOfSize();
+    if (!greeked_ || !greeked_->takes(em))
+        return false;
+    if (!text.empty() && em > 0)
+        greeked_->add(pointOf(current_), em, text, foreColor_);
+    current_ = { 0, static_cast<Twips>(std::nearbyint(current_.y + em)) };
+    return true;
+}
+
 void QtDrawingSurface::print(TextView text)
 {
+    if (printGreeked(text))
+        return;
     takeFont();
     const double height = face_->lineHeight() / TwipsPerPoint * em_;
     const double left = current_.x;
@@ -194,15 +216,20 @@ void QtDrawingSurface::picture(TextView filePath, Tpoint topLeft, Tpoint size)
         painter_.drawImage(area, image_);
 }
 
+double QtDrawingSurface::emOfSize() const
+{
+    const double em
+        = static_cast<double>(fontSize_) * static_cast<double>(options_.divisor) * TwipsPerPoint;
+    return em > 0 ? std::min(em, LargestEm) : 0;
+}
+
 void QtDrawingSurface::takeFont()
 {
     if (!isFontStale_)
         return;
     isFontStale_ = false;
     face_ = &fonts_.face(fontName_, bold_, italic_);
-    const double em
-        = static_cast<double>(fontSize_) * static_cast<double>(options_.divisor) * TwipsPerPoint;
-    em_ = em > 0 ? std::min(em, LargestEm) : 0;
+    em_ = emOfSize();
     const int pixels = std::max(1, static_cast<int>(std::nearbyint(em_)));
     fontScale_ = std::abs(em_ - pixels) < WholePixel ? 1 : em_ / pixels;
     font_ = isPaper_ ? face_->font(pixels) : face_->installedFont(pixels);
@@ -220,7 +247,7 @@ void QtDrawingSurface::drawText(TextView text)
     QFont font = font_;
     if (isShaped)
         font.setStyleStrategy(QFont::PreferAntialias);
-    painter_.setPen(colorOf(foreColor_));
+    setPen(colorOf(foreColor_));
     painter_.setFont(font);
     drawRun(text, isShaped ? width : -1);
 }
@@ -248,6 +275,22 @@ void QtDrawingSurface::drawRun(TextView text, double width)
         painter_.drawText(at + QPointF(em_ / fontScale_ * BoldShift, 0), string);
     if (isScaled)
         painter_.setTransform(before);
+}
+
+void QtDrawingSurface::setPen(const QPen& pen)
+{
+    painter_.setPen(pen);
+    linePen_.reset();
+}
+
+/// Neighbouring lines mostly have the same pen.
+void QtDrawingSurface::takeLinePen()
+{
+    const LinePenKey key { foreColor_, drawWidth_, drawStyle_ };
+    if (linePen_ == key)
+        return;
+    painter_.setPen(penOf(foreColor_));
+    linePen_ = key;
 }
 
 QPen QtDrawingSurface::penOf(Color color) const

@@ -4,11 +4,14 @@
 #pragma once
 
 #include "platform/drawing_surface.h"
+#include "platform/qt/greeked_texts.h"
 
 #include <QFont>
 #include <QImage>
 #include <QPen>
 #include <QRectF>
+
+#include <optional>
 
 class QPainter;
 
@@ -23,6 +26,7 @@ struct SurfaceOptions {
     QRectF
         page {}; ///< what `clear` makes white: twips; empty: nothing, the paper is blank by itself
     QRectF visible {}; ///< what lies outside need not be drawn: twips; empty: everything is drawn
+    bool isScreen = false; ///< texts too small to be read become faint bars; needs `visible`
 };
 
 /// A page on a painter that is scaled to twips, so that the painter's scale carries the zoom.
@@ -35,6 +39,10 @@ public:
     /// @param painter  active, 1 unit = 1 twip; borrowed, its font, pen and brush are changed
     /// @param fonts    borrowed
     QtDrawingSurface(QPainter& painter, QtFonts& fonts, const SurfaceOptions& options = {});
+    /// Draws what is still gathered.
+    ~QtDrawingSurface() override;
+    QtDrawingSurface(const QtDrawingSurface&) = delete;
+    QtDrawingSurface& operator=(const QtDrawingSurface&) = delete;
 
     void clear() override;
     void setFontName(TextView name) override;
@@ -55,15 +63,29 @@ public:
     void picture(TextView filePath, Tpoint topLeft, Tpoint size) override;
 
 private:
+    /// What tells the pen of one line from another's.
+    struct LinePenKey {
+        Color color = 0;
+        std::int16_t width = 1;
+        std::int16_t style = SolidPen;
+
+        bool operator==(const LinePenKey&) const = default;
+    };
+
+    bool printGreeked(TextView text);
+    double emOfSize() const;
     void takeFont();
     void drawText(TextView text);
     void drawRun(TextView text, double width);
+    void setPen(const QPen& pen);
+    void takeLinePen();
     QPen penOf(Color color) const;
     bool isVisible(const QRectF& area) const;
 
     QPainter& painter_;
     QtFonts& fonts_;
     SurfaceOptions options_;
+    std::optional<GreekedTexts> greeked_; ///< on a screen
     bool isPaper_; ///< PDF, SVG and the like: keeps texts as texts
 
     Text fontName_;
@@ -82,6 +104,7 @@ private:
     std::int16_t drawStyle_ = SolidPen;
     std::int16_t fillStyle_ = TransparentFill;
     Color fillColor_ = 0;
+    std::optional<LinePenKey> linePen_; ///< of the painter, when a line set it last
     Tpoint current_;
     Text imagePath_;
     QImage image_;
