@@ -3,6 +3,7 @@
 
 #include "controls/qt/back_screen.h"
 
+#include <QMouseEvent>
 #include <QPaintEvent>
 #include <QPainter>
 
@@ -23,29 +24,43 @@ constexpr int MiddleLightness = 128; ///< below this a palette is a dark one
 void drawShadow(QPainter& painter, const QRect& page)
 {
     const int reach = std::min(ShadowReach, page.width() / ShadowPart);
-    painter.setBrush(QColor(0, 0, 0, ShadowAlpha));
-    for (int ring = reach; ring > 0; --ring) {
-        const QRect area = page.translated(0, std::min(ShadowDrop, reach));
-        painter.drawRoundedRect(area.adjusted(-ring, -ring, ring, ring), ring, ring);
+    const QRect area = page.translated(0, std::min(ShadowDrop, reach));
+    const QColor faint(0, 0, 0, ShadowAlpha);
+    if (reach == 1) { // too small for a round corner
+        painter.fillRect(area.adjusted(-1, -1, 1, 1), faint);
+        return;
     }
+    painter.setBrush(faint);
+    for (int ring = reach; ring > 0; --ring)
+        painter.drawRoundedRect(area.adjusted(-ring, -ring, ring, ring), ring, ring);
 }
 
 } // namespace
 
-BackScreen::BackScreen(QWidget* parent)
+BackScreen::BackScreen(SurfaceHost& host, QWidget* parent)
     : QWidget(parent)
+    , host_(host)
 {
     setObjectName(QStringLiteral("Backscreen"));
     setAccessibleName(tr("Pages"));
     setAttribute(Qt::WA_OpaquePaintEvent);
+    setMouseTracking(true);
 }
 
-void BackScreen::setPages(std::vector<QRect> pages)
+void BackScreen::setPages(std::vector<Page> pages)
 {
-    if (pages_ == pages)
+    const bool isPainter
+        = std::ranges::any_of(pages, [](const Page& page) { return !page.isWidget; });
+    if (!isPainter && pages_ == pages)
         return;
     pages_ = std::move(pages);
     update();
+}
+
+void BackScreen::movePages(QPoint moved)
+{
+    if (!moved.isNull())
+        scroll(moved.x(), moved.y());
 }
 
 QColor BackScreen::grey(const QPalette& palette)
@@ -62,10 +77,64 @@ void BackScreen::paintEvent(QPaintEvent* event)
     painter.setPen(Qt::NoPen);
     const QRect near = event->rect().adjusted(
         -2 * ShadowReach, -2 * ShadowReach, 2 * ShadowReach, 2 * ShadowReach);
-    for (const QRect& page : pages_) {
-        if (page.intersects(near))
-            drawShadow(painter, page);
+    for (const Page& page : pages_) {
+        if (page.place.area.intersects(near))
+            drawShadow(painter, page.place.area);
     }
+    for (const Page& page : pages_) {
+        if (!page.isWidget && event->region().intersects(page.place.area))
+            paintPage(page, painter, event->rect() & page.place.area);
+    }
+}
+
+void BackScreen::paintPage(const Page& page, QPainter& painter, const QRect& exposed)
+{
+    painter.save();
+    painter.setClipRect(exposed);
+    painter.fillRect(exposed, Qt::white);
+    host_.paintSurface(
+        page.surface, painter, page.place.area.topLeft() + page.place.origin, exposed);
+    painter.restore();
+}
+
+/// The page that the viewport stands in for at a position, or null.
+const BackScreen::Page* BackScreen::pageAt(QPoint position) const
+{
+    const auto found = std::ranges::find_if(pages_,
+        [&](const Page& page) { return !page.isWidget && page.place.area.contains(position); });
+    return found == pages_.end() ? nullptr : &*found;
+}
+
+void BackScreen::mouseMoveEvent(QMouseEvent* event)
+{
+    if (pressed_ || pageAt(event->position().toPoint()))
+        host_.mouseMoved();
+    else
+        event->ignore();
+}
+
+void BackScreen::mousePressEvent(QMouseEvent* event)
+{
+    const Page* const page = pageAt(event->position().toPoint());
+    if (!page) {
+        event->ignore();
+        return;
+    }
+    pressed_ = page->place.area.topLeft() + page->place.origin;
+    host_.mousePressed(event->button(), event->position() - *pressed_);
+}
+
+/// Belongs to the page of the press, wherever the pointer is by then.
+void BackScreen::mouseReleaseEvent(QMouseEvent* event)
+{
+    if (!pressed_) {
+        event->ignore();
+        return;
+    }
+    const QPointF at = event->position() - *pressed_;
+    if (event->buttons() == Qt::NoButton)
+        pressed_.reset();
+    host_.mouseReleased(event->button(), at);
 }
 
 } // namespace pelloric::qt

@@ -3,7 +3,6 @@
 
 #include "controls/qt/canvas_areas.h"
 
-#include "controls/qt/back_screen.h"
 #include "controls/qt/hand_cursor.h"
 #include "controls/qt/member_calls.h"
 #include "controls/qt/progress_area.h"
@@ -33,6 +32,9 @@ constexpr double TwipsPerInch = 1440;
 
 constexpr double ScrollStep = 100; ///< what one step of a bar moves: page twips
 
+/// So many page surfaces are widgets; the toolkit takes long to move thousands of them.
+constexpr std::size_t MostSurfaces = 64;
+
 constexpr double ZoomStep = 1.25; ///< of a wheel click
 
 constexpr double SmallestScale = 1.0 / 1024; ///< the wheel zooms no further out
@@ -44,6 +46,12 @@ Twips wholeTwips(double twips)
     constexpr double Smallest = std::numeric_limits<Twips>::min();
     constexpr double Largest = std::numeric_limits<Twips>::max();
     return static_cast<Twips>(std::clamp(twips, Smallest, Largest));
+}
+
+int wholePixel(double position)
+{
+    constexpr double Reach = std::numeric_limits<int>::max() / 4;
+    return static_cast<int>(std::nearbyint(std::clamp(position, -Reach, Reach)));
 }
 
 /// What a key does to a scroll bar.
@@ -98,7 +106,7 @@ CanvasAreas::CanvasAreas(QWidget& control, Canvas& canvas, QtFonts& fonts, Right
     , canvas_(canvas)
     , fonts_(fonts)
     , rightButton_(std::move(rightButton))
-    , backScreen_(new BackScreen(&control))
+    , backScreen_(new BackScreen(*this, &control))
     , startIcon_(new StartIcon(&control))
     , progress_(new ProgressArea(&control))
     , hand_(makeHolder(control, "imgPan", QObject::tr("Hand cursor")))
@@ -169,6 +177,19 @@ void CanvasAreas::viewChanged()
     showSurfaces();
 }
 
+void CanvasAreas::viewScrolled()
+{
+    if (isPainting_)
+        return;
+    if (look() != shownLook_) {
+        viewChanged();
+        return;
+    }
+    showBars();
+    showCursor();
+    scrollSurfaces();
+}
+
 void CanvasAreas::progressChanged() { progress_->showProgress(canvas_.progress()); }
 
 /// Before a document is shown; a build hides the pages, too, but not for long.
@@ -201,11 +222,26 @@ QSizeF CanvasAreas::pixelsPerTwip() const
     return { control_.logicalDpiX() * perTwip, control_.logicalDpiY() * perTwip };
 }
 
+/// Surface 0 stands at the nearest whole pixel and the others at whole pixels from it, so that all
+/// of them move by the same pixels.
+QPoint CanvasAreas::firstCorner() const
+{
+    if (!hasScale())
+        return {};
+    const QSizeF scale = pixelsPerTwip();
+    const Tpoint first = canvas_.view().surfaces.front();
+    return { wholePixel(first.x * scale.width()), wholePixel(first.y * scale.height()) };
+}
+
 QRectF CanvasAreas::pageArea(int surface) const
 {
     const QSizeF scale = pixelsPerTwip();
+    const Tpoint first = canvas_.view().surfaces.front();
     const Tpoint at = canvas_.view().surfaces[static_cast<std::size_t>(surface)];
-    return { at.x * scale.width(), at.y * scale.height(), canvas_.page.myWidth * scale.width(),
+    const double across = std::nearbyint((static_cast<double>(at.x) - first.x) * scale.width());
+    const double down = std::nearbyint((static_cast<double>(at.y) - first.y) * scale.height());
+    return { std::nearbyint(first.x * scale.width()) + across,
+        std::nearbyint(first.y * scale.height()) + down, canvas_.page.myWidth * scale.width(),
         canvas_.page.myHeight * scale.height() };
 }
 
@@ -219,10 +255,38 @@ std::vector<int> CanvasAreas::shownSurfaces() const
     return shown;
 }
 
-/// Surfaces that went out of sight serve those that came into it.
+CanvasAreas::Look CanvasAreas::look() const
+{
+    const ViewState& view = canvas_.view();
+    return { .divisor = view.divisor,
+        .facts = canvas_.facts(),
+        .grid = view.grid,
+        .window = view.window,
+        .surfaces = view.surfaces.size(),
+        .multiPage = view.multiPage,
+        .visible = view.baseVisible,
+        .small = canvas_.strSCliectRect == u"small" };
+}
+
 void CanvasAreas::showSurfaces()
 {
-    const std::vector<int> shown = shownSurfaces();
+    shownLook_ = look();
+    shownCorner_ = firstCorner();
+    backScreen_->setPages(placeSurfaces());
+    for (const auto& [index, surface] : surfaces_)
+        surface->update();
+}
+
+/// The surfaces move with the pixels of the viewport first, so that placing them paints nothing.
+void CanvasAreas::scrollSurfaces()
+{
+    const QPoint moved = firstCorner() - std::exchange(shownCorner_, firstCorner());
+    backScreen_->movePages(moved);
+    backScreen_->takePages(placeSurfaces());
+}
+
+std::vector<PageSurface*> CanvasAreas::takeSpareSurfaces(const std::vector<int>& shown)
+{
     std::vector<PageSurface*> spare;
     for (auto known = surfaces_.begin(); known != surfaces_.end();) {
         const auto [index, surface] = *known;
@@ -233,13 +297,25 @@ void CanvasAreas::showSurfaces()
         spare.push_back(surface);
         known = surfaces_.erase(known);
     }
-    std::vector<QRect> areas;
+    return spare;
+}
+
+/// Surfaces that went out of sight serve those that came into it.
+std::vector<BackScreen::Page> CanvasAreas::placeSurfaces()
+{
+    const std::vector<int> shown = shownSurfaces();
+    std::vector<PageSurface*> spare = takeSpareSurfaces(shown);
+    std::vector<BackScreen::Page> pages;
+    pages.reserve(shown.size());
     for (const int index : shown) {
+        const PagePlace place = placeOf(pageArea(index));
+        const bool isWidget = surfaces_.contains(index) || surfaces_.size() < MostSurfaces;
+        pages.push_back({ index, place, isWidget });
+        if (!isWidget)
+            continue;
         PageSurface& surface = surfaceFor(index, spare);
-        surface.place(pageArea(index));
+        surface.place(place);
         surface.show();
-        surface.update();
-        areas.push_back(surface.geometry());
     }
     surfaces_.at(0)->setVisible(!shown.empty());
     for (PageSurface* surface : spare) {
@@ -247,7 +323,7 @@ void CanvasAreas::showSurfaces()
         surface->setObjectName({});
         surface->deleteLater(); // it may be the one that a mouse button is being released over
     }
-    backScreen_->setPages(std::move(areas));
+    return pages;
 }
 
 PageSurface& CanvasAreas::surfaceFor(int index, std::vector<PageSurface*>& spare)
@@ -301,8 +377,8 @@ void CanvasAreas::replay(int page, QPainter& painter, const QRectF& visible)
     const PageRect part { wholeTwips(std::floor(visible.left())),
         wholeTwips(std::floor(visible.top())), wholeTwips(std::ceil(visible.right())),
         wholeTwips(std::ceil(visible.bottom())) };
-    QtDrawingSurface target(
-        painter, fonts_, { .divisor = view.divisor, .page = {}, .visible = visible });
+    QtDrawingSurface target(painter, fonts_,
+        { .divisor = view.divisor, .page = {}, .visible = visible, .isScreen = true });
     ReplayOptions options { .divisor = view.divisor, .fillPageCount = !showsPageWindow(view) };
     options.visible = part;
     MemberCalls::endQuietly(

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "controls/canvas.h"
+#include "controls/qt/back_screen.h"
 #include "controls/qt/page_surface.h"
 #include "document/page_document.h"
 
@@ -16,15 +17,14 @@ class QScrollBar;
 
 namespace pelloric::qt {
 
-class BackScreen;
 class ProgressArea;
 class QtFonts;
 class StartIcon;
 
 /// The child areas of a canvas: shows what the canvas says, and hands on what people do.
 ///
-/// There is a page surface for page surface 0 and for each that lies in the viewport; the others
-/// cost nothing, however many there are.
+/// There is a widget for page surface 0 and for each that lies in the viewport, but for no more
+/// than some dozens; the viewport stands in for the rest. What is out of sight costs nothing.
 class CanvasAreas final : public CanvasObserver, private SurfaceHost {
 public:
     /// What the right mouse button tells the host.
@@ -52,9 +52,24 @@ public:
     bool key(int key);
 
     void viewChanged() override;
+    void viewScrolled() override;
     void progressChanged() override;
 
 private:
+    /// What pages look like: as long as it stays, a move of the pages only moves pixels.
+    struct Look {
+        float divisor = 1;
+        PageFacts facts;
+        PageGrid grid;
+        MuliPageType window;
+        std::size_t surfaces = 0;
+        bool multiPage = false;
+        bool visible = false;
+        bool small = false;
+
+        bool operator==(const Look&) const = default;
+    };
+
     void paintSurface(
         int surface, QPainter& painter, QPointF origin, const QRect& exposed) override;
     void mouseMoved() override;
@@ -67,7 +82,12 @@ private:
     void showBars();
     void showCursor();
     void showSurfaces();
+    void scrollSurfaces();
+    std::vector<BackScreen::Page> placeSurfaces();
+    std::vector<PageSurface*> takeSpareSurfaces(const std::vector<int>& shown);
     std::vector<int> shownSurfaces() const;
+    Look look() const;
+    QPoint firstCorner() const;
     PageSurface& surfaceFor(int index, std::vector<PageSurface*>& spare);
     bool hasScale() const;
     QSizeF pixelsPerTwip() const;
@@ -87,6 +107,8 @@ private:
     QScrollBar* Hbar_;
     QScrollBar* Vbar_;
     std::map<int, PageSurface*> surfaces_; ///< those that exist; 0 is always there
+    Look shownLook_;
+    QPoint shownCorner_; ///< of surface 0 when the surfaces were placed last: pixels
     bool isPainting_ = false;
     bool showsHand_ = false;
     int wheelRest_ = 0; ///< eighths of a degree that are no zoom step yet

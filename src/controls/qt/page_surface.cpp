@@ -41,6 +41,14 @@ Span spanOf(double begin, double length)
 
 } // namespace
 
+PagePlace placeOf(const QRectF& page)
+{
+    const Span across = spanOf(page.left(), page.width());
+    const Span down = spanOf(page.top(), page.height());
+    return { { across.begin, down.begin, across.length, down.length },
+        { across.origin, down.origin } };
+}
+
 PageSurface::PageSurface(SurfaceHost& host, QWidget* parent)
     : QWidget(parent)
     , host_(host)
@@ -56,16 +64,17 @@ PageSurface::PageSurface(SurfaceHost& host, QWidget* parent)
 void PageSurface::setIndex(int index)
 {
     index_ = index;
+    update();
     setObjectName(QStringLiteral("paper(%1)").arg(index));
     setAccessibleName(tr("Page surface %1").arg(index + 1));
 }
 
-void PageSurface::place(const QRectF& page)
+void PageSurface::place(const PagePlace& place)
 {
-    const Span across = spanOf(page.left(), page.width());
-    const Span down = spanOf(page.top(), page.height());
-    origin_ = { across.origin, down.origin };
-    setGeometry(across.begin, down.begin, across.length, down.length);
+    if (origin_ != place.origin)
+        update();
+    origin_ = place.origin;
+    setGeometry(place.area);
 }
 
 void PageSurface::paintEvent(QPaintEvent* event)

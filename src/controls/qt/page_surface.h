@@ -4,9 +4,24 @@
 #pragma once
 
 #include <QPointF>
+#include <QRect>
 #include <QWidget>
 
 namespace pelloric::qt {
+
+/// Where a page becomes pixels.
+struct PagePlace {
+    QRect area; ///< pixels of the viewport
+    QPointF origin; ///< of the page in the area: pixels
+
+    bool operator==(const PagePlace&) const = default;
+};
+
+/// The pixels of a page.
+///
+/// Of a page that reaches far past the viewport only what is near it becomes the area.
+/// @param page  pixels of the viewport; the corner is a whole one
+PagePlace placeOf(const QRectF& page);
 
 /// What page surfaces tell of, and who paints them.
 class SurfaceHost {
@@ -40,11 +55,8 @@ public:
     /// Makes this the surface of that number.
     void setIndex(int index);
 
-    /// Puts the surface where a page lies.
-    ///
-    /// Of a page that reaches far past the viewport only what is near it becomes the widget.
-    /// @param page  pixels of the viewport
-    void place(const QRectF& page);
+    /// Puts the surface where a page lies; what it shows stays.
+    void place(const PagePlace& place);
 
 protected:
     void paintEvent(QPaintEvent* event) override;
