@@ -11,6 +11,7 @@
 
 #include <QJSEngine>
 #include <QObject>
+#include <QPointer>
 
 namespace pelloric::qt {
 
@@ -45,14 +46,18 @@ MemberCalls::MemberCalls(QObject& control, Platform& platform, std::function<voi
 {
 }
 
+/// A host may delete the control while its member lets messages run: nobody is told then.
 void MemberCalls::run(const std::function<void()>& member)
 {
+    const QPointer<QObject> control(&control_);
     try {
         member();
     } catch (const RunTimeError& error) {
-        report(error);
+        if (control)
+            report(error);
     } catch (const std::exception& error) {
-        report(RunTimeError(ErrorNumber::InvalidCall, fromUtf8(error.what())));
+        if (control)
+            report(RunTimeError(ErrorNumber::InvalidCall, fromUtf8(error.what())));
     }
 }
 

@@ -6,10 +6,13 @@
 #include "controls/qt/canvas_areas.h"
 #include "controls/qt/default_platform.h"
 #include "controls/qt/published_values.h"
+#include "platform/platform.h"
 #include "platform/qt/grid_for.h"
+#include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
+#include <QGuiApplication>
 #include <QKeyEvent>
 #include <QPainter>
 #include <QWheelEvent>
@@ -50,6 +53,19 @@ QObject& objectOf(QObject* object)
 
 } // namespace
 
+/// What works without the window.
+struct Sorvane::Parts {
+    explicit Parts(QtPlatform& services)
+        : platform(services.record())
+        , canvas(platform)
+    {
+    }
+
+    Platform platform;
+    Canvas canvas;
+    std::unique_ptr<AutomationObject> grid; ///< of the last build, alive while it runs
+};
+
 Sorvane::Sorvane(QWidget* parent)
     : Sorvane(defaultPlatform(), parent)
 {
@@ -57,13 +73,14 @@ Sorvane::Sorvane(QWidget* parent)
 
 Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
     : QWidget(parent)
-    , platform_(platform.record())
-    , canvas_(platform_)
-    , calls_(*this, platform_, [this] { areas_->viewChanged(); })
+    , parts_(std::make_shared<Parts>(platform))
+    , canvas_(parts_->canvas)
+    , calls_(*this, parts_->platform, [this] { areas_->viewChanged(); })
     , areas_(std::make_unique<CanvasAreas>(*this, canvas_, platform.fonts(),
           CanvasAreas::RightButton { [this] { emit Click(RightButtonNumber); },
               [this] { emit MouseUp(RightButtonNumber); } }))
 {
+    canvas_.documentName = toText(QGuiApplication::applicationDisplayName());
     setObjectName(QStringLiteral("Sorvane"));
     setAccessibleName(tr("Page preview"));
     setFocusPolicy(Qt::StrongFocus);
@@ -72,71 +89,79 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
 
 Sorvane::~Sorvane() = default;
 
+/// Some members let messages run, in which a host may delete the control: what they work on stays
+/// until they are through.
+void Sorvane::run(const std::function<void()>& member)
+{
+    const std::shared_ptr<Parts> alive = parts_;
+    calls_.run(member);
+}
+
 std::int16_t Sorvane::Currentpage()
 {
     std::int16_t page = 0;
-    calls_.run([&] { page = canvas_.Currentpage(); });
+    run([&] { page = canvas_.Currentpage(); });
     return page;
 }
 
 void Sorvane::setCurrentpage(std::int16_t page)
 {
-    calls_.run([&] { canvas_.setCurrentpage(page); });
+    run([&] { canvas_.setCurrentpage(page); });
 }
 
 void Sorvane::setDispScale(float scale)
 {
-    calls_.run([&] { canvas_.setDispScale(scale); });
+    run([&] { canvas_.setDispScale(scale); });
 }
 
 void Sorvane::setVerticalDir(bool portrait)
 {
-    calls_.run([&] { canvas_.setVerticalDir(portrait); });
+    run([&] { canvas_.setVerticalDir(portrait); });
 }
 
 void Sorvane::showMuliPage(std::int16_t nPages)
 {
-    calls_.run([&] { canvas_.showMuliPage(nPages); });
+    run([&] { canvas_.showMuliPage(nPages); });
 }
 
 void Sorvane::SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage)
 {
-    calls_.run([&] { canvas_.SetShowStyle(nPages, nStartPage, nEndPage); });
+    run([&] { canvas_.SetShowStyle(nPages, nStartPage, nEndPage); });
 }
 
 void Sorvane::doPrint(bool bAllPrint, const QString& strPrintRange, std::int16_t nPrintPageNum)
 {
-    calls_.run([&] { canvas_.doPrint(bAllPrint, viewOf(strPrintRange), nPrintPageNum); });
+    run([&] { canvas_.doPrint(bAllPrint, viewOf(strPrintRange), nPrintPageNum); });
 }
 
 void Sorvane::SaveFile(const QString& FilePath)
 {
-    calls_.run([&] { canvas_.SaveFile(pathOf(FilePath)); });
+    run([&] { canvas_.SaveFile(pathOf(FilePath)); });
 }
 
 void Sorvane::OpenFile(const QString& FilePath)
 {
-    calls_.run([&] { canvas_.OpenFile(pathOf(FilePath)); });
+    run([&] { canvas_.OpenFile(pathOf(FilePath)); });
 }
 
 void Sorvane::doPreview(AutomationObject& PrintObj)
 {
-    calls_.run([&] { canvas_.doPreview(PrintObj); });
+    run([&] { canvas_.doPreview(PrintObj); });
 }
 
 void Sorvane::doPreview(QObject* PrintObj)
 {
-    calls_.run([&] { preview(gridFor(objectOf(PrintObj))); });
+    run([&] { preview(gridFor(objectOf(PrintObj))); });
 }
 
 void Sorvane::ReDrawZoom(AutomationObject& PrintObj)
 {
-    calls_.run([&] { canvas_.ReDrawZoom(PrintObj); });
+    run([&] { canvas_.ReDrawZoom(PrintObj); });
 }
 
 void Sorvane::ReDrawZoom(QObject* PrintObj)
 {
-    calls_.run([&] { redraw(gridFor(objectOf(PrintObj))); });
+    run([&] { redraw(gridFor(objectOf(PrintObj))); });
 }
 
 /// A build that is asked for while another runs is refused, and must not touch the other's grid.
@@ -144,77 +169,77 @@ void Sorvane::preview(std::unique_ptr<AutomationObject> grid)
 {
     if (canvas_.isBuilding())
         return;
-    grid_ = std::move(grid);
-    canvas_.doPreview(*grid_);
+    parts_->grid = std::move(grid);
+    canvas_.doPreview(*parts_->grid);
 }
 
 void Sorvane::redraw(std::unique_ptr<AutomationObject> grid)
 {
     if (canvas_.isBuilding())
         return;
-    grid_ = std::move(grid);
-    canvas_.ReDrawZoom(*grid_);
+    parts_->grid = std::move(grid);
+    canvas_.ReDrawZoom(*parts_->grid);
 }
 
 void Sorvane::showWholePage()
 {
-    calls_.run([&] { canvas_.showWholePage(); });
+    run([&] { canvas_.showWholePage(); });
 }
 
 void Sorvane::showPage()
 {
-    calls_.run([&] { canvas_.showPage(); });
+    run([&] { canvas_.showPage(); });
 }
 
 void Sorvane::showAllPage()
 {
-    calls_.run([&] { canvas_.showAllPage(); });
+    run([&] { canvas_.showAllPage(); });
 }
 
 void Sorvane::showMuliPage(const QVariant& nPages)
 {
-    calls_.run([&] { canvas_.showMuliPage(toInt16(nPages)); });
+    run([&] { canvas_.showMuliPage(toInt16(nPages)); });
 }
 
 void Sorvane::clear()
 {
-    calls_.run([&] { canvas_.clear(); });
+    run([&] { canvas_.clear(); });
 }
 
 void Sorvane::zoomIn()
 {
-    calls_.run([&] { canvas_.zoomIn(); });
+    run([&] { canvas_.zoomIn(); });
 }
 
 void Sorvane::zoomOut()
 {
-    calls_.run([&] { canvas_.zoomOut(); });
+    run([&] { canvas_.zoomOut(); });
 }
 
 void Sorvane::Minimum()
 {
-    calls_.run([&] { canvas_.Minimum(); });
+    run([&] { canvas_.Minimum(); });
 }
 
 void Sorvane::Maximum()
 {
-    calls_.run([&] { canvas_.Maximum(); });
+    run([&] { canvas_.Maximum(); });
 }
 
 void Sorvane::setMouse()
 {
-    calls_.run([&] { canvas_.setMouse(); });
+    run([&] { canvas_.setMouse(); });
 }
 
 void Sorvane::Pan()
 {
-    calls_.run([&] { canvas_.Pan(); });
+    run([&] { canvas_.Pan(); });
 }
 
 void Sorvane::doPrint(
     const QVariant& bAllPrint, const QVariant& strPrintRange, const QVariant& nPrintPageNum)
 {
-    calls_.run([&] {
+    run([&] {
         const QString range = toPlainText(strPrintRange);
         canvas_.doPrint(toTruth(bAllPrint), viewOf(range), toInt16(nPrintPageNum));
     });
@@ -222,14 +247,13 @@ void Sorvane::doPrint(
 
 void Sorvane::doPreview(const QVariant& PrintObj)
 {
-    calls_.run([&] { preview(toGrid(PrintObj)); });
+    run([&] { preview(toGrid(PrintObj)); });
 }
 
 void Sorvane::SetShowStyle(
     const QVariant& nPages, const QVariant& nStartPage, const QVariant& nEndPage)
 {
-    calls_.run(
-        [&] { canvas_.SetShowStyle(toInt16(nPages), toInt16(nStartPage), toInt16(nEndPage)); });
+    run([&] { canvas_.SetShowStyle(toInt16(nPages), toInt16(nStartPage), toInt16(nEndPage)); });
 }
 
 QVariant Sorvane::WindowMinPage() const { return QVariant::fromValue(canvas_.WindowMinPage()); }
@@ -242,22 +266,22 @@ QVariant Sorvane::WindowOrderStyle() const { return static_cast<int>(canvas_.Win
 
 void Sorvane::OnDraw()
 {
-    calls_.run([&] { canvas_.OnDraw(); });
+    run([&] { canvas_.OnDraw(); });
 }
 
 void Sorvane::SaveFile(const QVariant& FilePath)
 {
-    calls_.run([&] { canvas_.SaveFile(pathOf(toPlainText(FilePath))); });
+    run([&] { canvas_.SaveFile(pathOf(toPlainText(FilePath))); });
 }
 
 void Sorvane::OpenFile(const QVariant& FilePath)
 {
-    calls_.run([&] { canvas_.OpenFile(pathOf(toPlainText(FilePath))); });
+    run([&] { canvas_.OpenFile(pathOf(toPlainText(FilePath))); });
 }
 
 void Sorvane::ReDrawZoom(const QVariant& PrintObj)
 {
-    calls_.run([&] { redraw(toGrid(PrintObj)); });
+    run([&] { redraw(toGrid(PrintObj)); });
 }
 
 QVariant Sorvane::getPrintObj() const { return static_cast<int>(canvas_.m_PrintObj); }
@@ -276,87 +300,87 @@ QVariant Sorvane::getPageHeader() const { return toQString(canvas_.PageHeader); 
 
 void Sorvane::putIntTop(const QVariant& value)
 {
-    calls_.run([&] { canvas_.page.intTop = toInt16(value); });
+    run([&] { canvas_.page.intTop = toInt16(value); });
 }
 
 void Sorvane::putIntButtom(const QVariant& value)
 {
-    calls_.run([&] { canvas_.page.intButtom = toInt16(value); });
+    run([&] { canvas_.page.intButtom = toInt16(value); });
 }
 
 void Sorvane::putIntLeft(const QVariant& value)
 {
-    calls_.run([&] { canvas_.page.intLeft = toInt16(value); });
+    run([&] { canvas_.page.intLeft = toInt16(value); });
 }
 
 void Sorvane::putIntRight(const QVariant& value)
 {
-    calls_.run([&] { canvas_.page.intRight = toInt16(value); });
+    run([&] { canvas_.page.intRight = toInt16(value); });
 }
 
 void Sorvane::putMyHeight(const QVariant& value)
 {
-    calls_.run([&] { canvas_.page.myHeight = toInt32(value); });
+    run([&] { canvas_.page.myHeight = toInt32(value); });
 }
 
 void Sorvane::putMyWidth(const QVariant& value)
 {
-    calls_.run([&] { canvas_.page.myWidth = toInt32(value); });
+    run([&] { canvas_.page.myWidth = toInt32(value); });
 }
 
 void Sorvane::putTotalpages(const QVariant& value)
 {
-    calls_.run([&] { canvas_.setTotalpages(toInt16(value)); });
+    run([&] { canvas_.setTotalpages(toInt16(value)); });
 }
 
 void Sorvane::putBGetText(const QVariant& value)
 {
-    calls_.run([&] { canvas_.bGetText = toTruth(value); });
+    run([&] { canvas_.bGetText = toTruth(value); });
 }
 
 void Sorvane::putPrintObj(const QVariant& value)
 {
-    calls_.run([&] { canvas_.m_PrintObj = static_cast<CoreKind>(toInt16(value)); });
+    run([&] { canvas_.m_PrintObj = static_cast<CoreKind>(toInt16(value)); });
 }
 
 void Sorvane::putStrSCliectRect(const QVariant& value)
 {
-    calls_.run([&] { canvas_.strSCliectRect = toText(toPlainText(value)); });
+    run([&] { canvas_.strSCliectRect = toText(toPlainText(value)); });
 }
 
 void Sorvane::putCurrentpage(const QVariant& value)
 {
-    calls_.run([&] { canvas_.setCurrentpage(toInt16(value)); });
+    run([&] { canvas_.setCurrentpage(toInt16(value)); });
 }
 
 void Sorvane::putCurrentX(const QVariant& value)
 {
-    calls_.run([&] { canvas_.setCurrentX(toInt32(value)); });
+    run([&] { canvas_.setCurrentX(toInt32(value)); });
 }
 
 void Sorvane::putCurrentY(const QVariant& value)
 {
-    calls_.run([&] { canvas_.setCurrentY(toInt32(value)); });
+    run([&] { canvas_.setCurrentY(toInt32(value)); });
 }
 
 void Sorvane::putDispScale(const QVariant& value)
 {
-    calls_.run([&] { canvas_.setDispScale(toSingle(value)); });
+    run([&] { canvas_.setDispScale(toSingle(value)); });
 }
 
 void Sorvane::putVerticalDir(const QVariant& value)
 {
-    calls_.run([&] { canvas_.setVerticalDir(toTruth(value)); });
+    run([&] { canvas_.setVerticalDir(toTruth(value)); });
 }
 
 void Sorvane::putPageHeader(const QVariant& value)
 {
-    calls_.run([&] { canvas_.PageHeader = toText(toPlainText(value)); });
+    run([&] { canvas_.PageHeader = toText(toPlainText(value)); });
 }
 
 void Sorvane::putReSetLeftTop(const QVariant& value)
 {
-    calls_.run([&] { canvas_.setReSetLeftTop(toTruth(value)); });
+    run([&] { canvas_.setReSetLeftTop(toTruth(value)); });
 }
 
 QSize Sorvane::sizeHint() const { return { 640, 480 }; }

@@ -4,12 +4,13 @@
 #pragma once
 
 #include "controls/canvas.h"
+#include "controls/facade.h"
 #include "controls/qt/member_calls.h"
-#include "platform/platform.h"
 
 #include <QVariant>
 #include <QWidget>
 
+#include <functional>
 #include <memory>
 
 namespace pelloric::qt {
@@ -173,10 +174,13 @@ private:
     void preview(std::unique_ptr<AutomationObject> grid);
     void redraw(std::unique_ptr<AutomationObject> grid);
 
-    Platform platform_;
-    Canvas canvas_;
+    struct Parts;
+
+    void run(const std::function<void()>& member);
+
+    std::shared_ptr<Parts> parts_; ///< shared with the members that run
+    Canvas& canvas_; ///< one of the parts
     MemberCalls calls_;
-    std::unique_ptr<AutomationObject> grid_; ///< of the last build, alive while it runs
     std::unique_ptr<CanvasAreas> areas_;
 };
 

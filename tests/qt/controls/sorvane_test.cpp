@@ -7,14 +7,19 @@
 #include "qt/platform/uming.h"
 
 #include <QApplication>
+#include <QPaintEvent>
 #include <QPainter>
+#include <QPointer>
 #include <QProgressBar>
+#include <QScreen>
 #include <QSignalSpy>
 #include <QTest>
+#include <QTimer>
 #include <QWheelEvent>
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <array>
 #include <string>
 
@@ -149,8 +154,9 @@ TEST(Sorvane, PutsSurfacesWhereTheCanvasSaysInEveryMode)
             ASSERT_NE(world.paper(index), nullptr) << row.mode << index;
             const QRect area = world.paper(index)->geometry();
             const QRectF expected = world.expectedArea(index);
-            EXPECT_NEAR(area.left(), expected.left(), 0.51) << row.mode << index;
-            EXPECT_NEAR(area.top(), expected.top(), 0.51) << row.mode << index;
+            const double rounding = index == 0 ? 0.51 : 1.01; // its own and that of surface 0
+            EXPECT_NEAR(area.left(), expected.left(), rounding) << row.mode << index;
+            EXPECT_NEAR(area.top(), expected.top(), rounding) << row.mode << index;
             EXPECT_NEAR(area.width(), expected.width(), 1.01) << row.mode << index;
             EXPECT_NEAR(area.height(), expected.height(), 1.01) << row.mode << index;
         }
@@ -426,15 +432,126 @@ TEST(Sorvane, HasSurfacesOnlyForPagesThatAreSeen)
     ASSERT_EQ(world.canvas.view().surfaces.size(), 10'000U);
     const auto shown = surfacesInView(world.canvas.view(), world.canvas.facts()).size();
     ASSERT_LT(shown, 4'000U);
-    EXPECT_EQ(shownPapers(world.sorvane).size(), shown);
+    ASSERT_GT(shown, 64U);
+    EXPECT_EQ(shownPapers(world.sorvane).size(), 64U);
     PaintCounter counter;
     world.sorvane.grab();
     EXPECT_GT(counter.count, 0);
-    EXPECT_LE(static_cast<std::size_t>(counter.count), shown);
+    EXPECT_LE(counter.count, 64);
     auto* const down = world.child<QScrollBar>("Vbar");
     down->setValue(down->maximum());
     EXPECT_NE(world.paper(0), nullptr);
-    EXPECT_NE(world.paper(9'999), nullptr);
+    EXPECT_LE(shownPapers(world.sorvane).size(), 64U);
+}
+
+TEST(Sorvane, StandsInForThePagesThatAreNoWidgets)
+{
+    SorvaneWorld world;
+    world.makePages(3'000);
+    PageDocument& document = world.canvas.document();
+    const LinePen black { .FillStyle = SolidFill, .FillColor = 0 };
+    constexpr int Far = 500; // beyond the first surfaces, and in view
+    document.currentPage = Far;
+    addLine(document, { 0, 0 }, { 11907, 8000 }, black);
+    document.currentPage = 0;
+    world.canvas.setDispScale(1.0F / 48);
+    world.canvas.showAllPage();
+    const auto seen = surfacesInView(world.canvas.view(), world.canvas.facts());
+    ASSERT_TRUE(std::ranges::binary_search(seen, Far));
+    ASSERT_EQ(world.paper(Far), nullptr);
+    QWidget* const screen = world.child("Backscreen");
+    const QRect area = world.expectedArea(Far).toRect();
+    const QPoint upper(area.center().x(), area.top() + area.height() / 4);
+    const QPoint lower(area.center().x(), area.bottom() - area.height() / 4);
+    const QImage image = grabbed(world.sorvane);
+    EXPECT_EQ(image.pixel(screen->mapTo(&world.sorvane, upper)), qRgb(0, 0, 0));
+    EXPECT_EQ(image.pixel(screen->mapTo(&world.sorvane, lower)), qRgb(255, 255, 255));
+
+    QSignalSpy clicks(&world.sorvane, &Sorvane::Click);
+    QSignalSpy releases(&world.sorvane, &Sorvane::MouseUp);
+    QTest::mouseClick(screen, Qt::RightButton, {}, upper);
+    EXPECT_EQ(clicks.count(), 1);
+    EXPECT_EQ(releases.count(), 1);
+    QTest::mouseClick(screen, Qt::RightButton, {}, { screen->width() - 1, area.top() });
+    EXPECT_EQ(clicks.count(), 1);
+    EXPECT_EQ(releases.count(), 1);
+
+    QTest::mouseMove(screen, upper);
+    EXPECT_TRUE(world.canvas.view().pan);
+    const Tpoint before = world.canvas.view().offset;
+    QTest::mousePress(screen, Qt::LeftButton, {}, upper);
+    QTest::mouseRelease(screen, Qt::LeftButton, {}, upper + QPoint(10, -20));
+    const double pixel = 15.0 * static_cast<double>(world.canvas.view().divisor);
+    EXPECT_NEAR(world.canvas.view().offset.x, before.x + 10 * pixel, 1);
+    EXPECT_NEAR(world.canvas.view().offset.y, before.y - 20 * pixel, 1);
+}
+
+TEST(Sorvane, LooksScrolledAsItLooksPaintedAnew)
+{
+    SorvaneWorld world;
+    world.makePages(3'000);
+    PageDocument& document = world.canvas.document();
+    const LinePen black { .FillStyle = SolidFill, .FillColor = 0 };
+    for (std::int16_t page = 0; page < 3'000; ++page) {
+        document.currentPage = page;
+        addLine(document, { 0, 0 }, { page * 3, 16840 - page * 5 }, black);
+        addText(document, { 1000, 9000 }, u"small", { { .size = 11 }, 0xFF0000 });
+    }
+    document.currentPage = 0;
+    struct Row {
+        float scale;
+        void (Canvas::*show)();
+    };
+    for (const Row& row : { Row { 1.0F / 48, &Canvas::showAllPage }, { 2, &Canvas::showPage } }) {
+        world.canvas.showPage();
+        world.canvas.setDispScale(row.scale);
+        (world.canvas.*row.show)();
+        QTest::qWait(20);
+        for (const int step : { 1, 7, 50, 3, 400, 20 }) {
+            auto* const down = world.child<QScrollBar>("Vbar");
+            auto* const across = world.child<QScrollBar>("Hbar");
+            down->setValue(step);
+            across->setValue(step / 2);
+            QTest::qWait(20);
+            const QImage moved = world.sorvane.screen()
+                                     ->grabWindow(world.sorvane.winId())
+                                     .toImage()
+                                     .convertToFormat(QImage::Format_RGB32);
+            world.canvas.OnDraw();
+            QTest::qWait(20);
+            const QImage anew = world.sorvane.screen()
+                                    ->grabWindow(world.sorvane.winId())
+                                    .toImage()
+                                    .convertToFormat(QImage::Format_RGB32);
+            ASSERT_FALSE(moved.isNull());
+            EXPECT_EQ(moved, anew) << row.scale << ' ' << step;
+        }
+    }
+}
+
+TEST(Sorvane, PaintsOnlyWhatComesIntoSightWhenItScrolls)
+{
+    class Watch : public QObject {
+    public:
+        bool eventFilter(QObject*, QEvent* event) override
+        {
+            if (event->type() == QEvent::Paint)
+                painted = static_cast<QPaintEvent*>(event)->region().boundingRect();
+            return false;
+        }
+        QRect painted;
+    } watch;
+    SorvaneWorld world;
+    world.makePages(3'000);
+    world.canvas.setDispScale(1.0F / 48);
+    world.canvas.showAllPage();
+    QTest::qWait(20);
+    QWidget* const screen = world.child("Backscreen");
+    screen->installEventFilter(&watch);
+    world.child<QScrollBar>("Vbar")->setValue(72); // ten pixels
+    QTest::qWait(20);
+    EXPECT_EQ(watch.painted.height(), 10);
+    EXPECT_EQ(watch.painted.bottom(), screen->rect().bottom());
 }
 
 TEST(Sorvane, ShowsAllPagesThoughTheirScrollRangeOverflows)
@@ -499,6 +616,25 @@ TEST(Sorvane, ShowsTheProgressOfABuildOnly)
     EXPECT_TRUE(world.paper(0)->isVisible());
     EXPECT_FALSE(world.child("frmIcon")->isVisible());
     EXPECT_GT(world.canvas.Totalpages(), 10);
+}
+
+TEST(Sorvane, MayBeDeletedWhileItBuilds)
+{
+    QuietPlatform platform;
+    TableGrid grid({ { u"Name", 2000 } });
+    grid.addRow(std::array<TextView, 1> { u"name" });
+    for (const bool isShownAll : { false, true }) {
+        QPointer<Sorvane> sorvane(new Sorvane(platform));
+        sorvane->show();
+        QCoreApplication::processEvents();
+        QTimer::singleShot(0, [&] { delete sorvane.data(); });
+        if (isShownAll)
+            sorvane->showAllPage();
+        else
+            sorvane->doPreview(static_cast<AutomationObject&>(grid));
+        EXPECT_TRUE(sorvane.isNull());
+    }
+    EXPECT_TRUE(platform.messages.take().empty());
 }
 
 TEST(Sorvane, TellsOfAFailedBuildOnceAndShowsWhatItShowed)
