@@ -11,7 +11,7 @@ namespace pelloric::app {
 
 /// How the program was called.
 struct Invocation {
-    int& argc; ///< for the application object
+    int& argc; ///< for the application object, which learns only the program's name
     char** argv = nullptr; ///< for the application object
     QStringList arguments; ///< what stands behind the command's name
 };

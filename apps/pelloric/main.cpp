@@ -9,6 +9,7 @@
 #include <QCoreApplication>
 #include <QFile>
 
+#include <algorithm>
 #include <array>
 #include <new>
 
@@ -89,8 +90,10 @@ int statusOf(const RunTimeError& error)
 /// Runs the program; every error becomes one line and an exit status.
 int guardedRun(int argc, char** argv)
 {
+    // The toolkit would take options such as "--title" for its own.
+    int applicationArgc = std::min(argc, 1);
     try {
-        return run({ argc, argv, argumentsOf(argc, argv) });
+        return run({ applicationArgc, argv, argumentsOf(argc, argv) });
     } catch (const CommandError& error) {
         tell(QString::fromUtf8(error.what()));
         return error.status();

@@ -7,6 +7,10 @@
 #include "platform/run_time_error.h"
 #include "settings/default_settings.h"
 
+#include <QWidget>
+
+#include <algorithm>
+
 namespace pelloric::app {
 
 bool hasDisplay()
@@ -28,7 +32,14 @@ WindowedApplication::WindowedApplication(const Invocation& invocation)
     application_ = std::make_unique<QApplication>(invocation.argc, invocation.argv);
 }
 
-int WindowedApplication::run() { return QApplication::exec(); }
+/// A window that was closed while it was filled, before the program waits for the user, is no
+/// reason to wait.
+int WindowedApplication::run()
+{
+    const QWidgetList windows = QApplication::topLevelWidgets();
+    const bool isShown = std::ranges::any_of(windows, &QWidget::isVisible);
+    return isShown ? QApplication::exec() : Done;
+}
 
 void prepareSettings(const Platform& platform)
 {
