@@ -255,8 +255,8 @@ void PreviewSession::leaveWindow()
 void PreviewSession::chooseScale(TextView text)
 {
     quietly([&] {
-        state_.scale = text;
         canvas_.setDispScale(toSingle(leadingNumber(text) / 100));
+        state_.scale = text; // a scale that is refused leaves the one in force
     });
 }
 

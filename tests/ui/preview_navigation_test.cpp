@@ -249,6 +249,7 @@ TEST(PreviewNavigation, SetsTheScaleThatWasChosen)
     for (const TextView text : { u"0", u"abc", u"1e300", u"" }) {
         fixture.session().chooseScale(text);
         EXPECT_EQ(fixture.canvas.DispScale(), 0.5F);
+        EXPECT_EQ(fixture.session().state().scale, u"   200 %"); // the one in force
     }
 }
 
