@@ -189,9 +189,11 @@ int ScriptHost::runText(const QString& text, const QString& name, const QStringL
     engine_ = std::make_unique<QJSEngine>();
     engine_->installExtensions(QJSEngine::ConsoleExtension);
     QJSValue result = evaluatePrelude(arguments);
+    QStringList trace; // a script may throw what is no error, a text for example
     if (!result.isError())
-        result = engine_->evaluate(text, name);
-    const int status = exitStatus_ ? *exitStatus_ : report(result, name);
+        result = engine_->evaluate(text, name, 1, &trace);
+    const bool isThrown = result.isError() || !trace.isEmpty();
+    const int status = exitStatus_ ? *exitStatus_ : isThrown ? report(result, name) : 0;
     engine_.reset();
     return status;
 }
@@ -210,8 +212,6 @@ QJSValue ScriptHost::evaluatePrelude(const QStringList& arguments)
 
 int ScriptHost::report(const QJSValue& error, const QString& name)
 {
-    if (!error.isError())
-        return 0;
     const QJSValue number = error.property(QStringLiteral("number"));
     const QString kind
         = number.isNumber() ? QStringLiteral(" (error %1)").arg(number.toInt()) : QString();
