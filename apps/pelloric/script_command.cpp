@@ -11,6 +11,7 @@
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/sqlite_table.h"
 #include "platform/text_metrics.h"
+#include "print/qt/qt_printing.h"
 #include "report/content_widths.h"
 #include "settings/default_settings.h"
 #include "table_source.h"
@@ -69,6 +70,7 @@ int runScript(const Invocation& invocation)
             WrongUsage);
     const HeadlessWidgets application(invocation);
     qt::QtPlatform platform;
+    const qt::QtPrinting printing(platform);
     const Platform record = platform.record();
     deployDefaultSettings(record);
     Tables tables(record.metrics);
