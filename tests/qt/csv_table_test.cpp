@@ -99,6 +99,9 @@ TEST(CsvTable, NamesTheLineOfWhatItCannotRead)
         { "bad_bytes.csv", "a\n1\n\xFF\xFF\n",
             "Type mismatch: line 3: bytes that are neither UTF-8 nor GB18030 text; name the "
             "encoding" },
+        { "cut_gb.csv", "\xB3\xC7\n\xB1\xB1\n\xBE",
+            "Type mismatch: line 3: bytes that are neither UTF-8 nor GB18030 text; name the "
+            "encoding" },
         { "zero.csv", std::string_view("a\n\"x\ny\"\n\0\n", 10),
             "Type mismatch: line 4: a zero byte; this is no text file" },
         { "empty.csv", "", "Type mismatch: the file is empty" },
@@ -210,6 +213,45 @@ TEST_F(SqliteTable, NeverChangesTheDatabase)
     const std::string before = TempFolder::bytesOf(path());
     EXPECT_NE(read({}, QStringLiteral("DELETE FROM t")).find("readonly"), std::string::npos);
     EXPECT_EQ(TempFolder::bytesOf(path()), before);
+}
+
+TEST_F(SqliteTable, RefusesEveryStatementThatIsNoQuery)
+{
+    const std::filesystem::path copy = path().parent_path() / "copy.db";
+    const QString target = QString::fromStdString(copy.string());
+    for (const char* statement : { "VACUUM INTO '%1'", " /* SELECT */ vacuum into '%1'",
+             "-- SELECT\nVACUUM INTO '%1'", "ATTACH DATABASE '%1' AS other", "" })
+        read({}, QString::fromLatin1(statement).arg(target));
+    EXPECT_FALSE(std::filesystem::exists(copy));
+    EXPECT_EQ(read({}, QStringLiteral("BEGIN")),
+        "Invalid procedure call or argument: the statement is no query; give a SELECT");
+    EXPECT_EQ(read({}, QStringLiteral("SELECT 1; SELECT 2")),
+        "Invalid procedure call or argument: give one statement only");
+    EXPECT_EQ(read({}, QStringLiteral("-- one\n/* two */ values (1)")), "column1|/1|");
+}
+
+TEST_F(SqliteTable, TellsALockedDatabaseFromNone)
+{
+    const QString other = QStringLiteral("other");
+    {
+        QSqlDatabase database = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), other);
+        database.setDatabaseName(QString::fromStdString(path().string()));
+        ASSERT_TRUE(database.open());
+        QSqlQuery query(database);
+        ASSERT_TRUE(query.exec(QStringLiteral("BEGIN EXCLUSIVE")));
+        EXPECT_EQ(
+            read(QStringLiteral("t")), "Invalid procedure call or argument: database is locked");
+    }
+    QSqlDatabase::removeDatabase(other);
+    TempFolder folder;
+    const auto broken = folder.write("b.db", "SQLite format 3" + std::string(2000, 'x'));
+    try {
+        readSqlite({ .path = broken, .table = {}, .query = {} });
+        FAIL() << "it was read all the same";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(
+            toUtf8(error.text()), "Invalid procedure call or argument: this is no SQLite database");
+    }
 }
 
 } // namespace pelloric::qt

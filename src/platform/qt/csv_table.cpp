@@ -79,20 +79,22 @@ bool isAll(QIODevice& file, const QByteArray& encoding)
 /// The first line with bytes that are no text; 0 when the lines tell nothing.
 std::int64_t badLine(QIODevice& file, const QByteArray& encoding)
 {
+    file.seek(0);
     std::int64_t line = 0;
     for (QByteArray bytes = file.readLine(); !bytes.isEmpty(); bytes = file.readLine()) {
         ++line;
         QStringDecoder decoder(encoding.constData());
         const QString ignored = decoder(bytes);
+        const QString end = decoder(QByteArrayView("\n", 1));
         if (decoder.hasError())
             return line;
     }
     return 0;
 }
 
-[[noreturn]] void refuseBytes(QIODevice& file, const QByteArray& encoding, TextView what)
+/// @param line  where the bytes are; 0 when no line tells
+[[noreturn]] void refuseBytes(std::int64_t line, TextView what)
 {
-    const std::int64_t line = badLine(file, encoding);
     refuse(line > 0 ? atLine(line, what) : Text(what));
 }
 
@@ -112,7 +114,7 @@ QByteArray encodingOf(QIODevice& file, const QString& asked)
             refuse(u"unknown encoding " + toText(asked)
                 + u"; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others");
         if (!isAll(file, encoding))
-            refuseBytes(file, encoding, u"bytes that are no " + named(encoding));
+            refuseBytes(badLine(file, encoding), u"bytes that are no " + named(encoding));
         return encoding;
     }
     const QByteArray marked = encodingOfMark(file.peek(4));
@@ -121,8 +123,9 @@ QByteArray encodingOf(QIODevice& file, const QString& asked)
     if (isAll(file, Utf8))
         return Utf8;
     if (!isAll(file, Gb18030))
-        refuseBytes(
-            file, Utf8, u"bytes that are neither UTF-8 nor GB18030 text; name the encoding");
+        // The encoding that fits longer is the likelier one.
+        refuseBytes(std::max(badLine(file, Utf8), badLine(file, Gb18030)),
+            u"bytes that are neither UTF-8 nor GB18030 text; name the encoding");
     return Gb18030;
 }
 

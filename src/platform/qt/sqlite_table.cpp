@@ -8,6 +8,7 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
+#include <QRegularExpression>
 #include <QSqlDatabase>
 #include <QSqlError>
 #include <QSqlQuery>
@@ -15,15 +16,43 @@
 #include <QStringList>
 #include <QUuid>
 
+#include <algorithm>
+
 namespace pelloric::qt {
 
 namespace {
 
 constexpr std::int64_t RowsPerReport = 1024;
 
+/// What a statement that only reads begins with; others may write files beside the database.
+constexpr const char* ReadingWords[] = { "SELECT", "WITH", "VALUES", "PRAGMA", "EXPLAIN" };
+
+/// Error numbers of the database as the driver spells them.
+constexpr char NoDatabase[] = "26";
+constexpr char Misuse[] = "21"; ///< the driver's own: more than one statement
+
 [[noreturn]] void refuse(const QString& what)
 {
     throw RunTimeError(ErrorNumber::InvalidCall, toText(what));
+}
+
+/// Refuses what the database refused, in its words.
+[[noreturn]] void refuse(const QSqlError& error)
+{
+    if (error.nativeErrorCode() == QLatin1String(Misuse))
+        refuse(QStringLiteral("give one statement only"));
+    refuse(error.databaseText());
+}
+
+bool isReading(const QString& statement)
+{
+    static const QRegularExpression firstWord(
+        QStringLiteral("\\A(?:\\s+|--[^\\n]*\\n|/\\*.*?\\*/|\\()*+([a-z]+)"),
+        QRegularExpression::CaseInsensitiveOption | QRegularExpression::DotMatchesEverythingOption);
+    const QString word = firstWord.match(statement).captured(1);
+    return std::ranges::any_of(ReadingWords, [&](const char* reading) {
+        return word.compare(QLatin1String(reading), Qt::CaseInsensitive) == 0;
+    });
 }
 
 /// A connection of its own to a database file, for reading only.
@@ -54,15 +83,18 @@ private:
     QSqlDatabase database_;
 };
 
-/// Tables and views in their order; a file that is no database has none and an error.
-QStringList tablesOf(const QSqlDatabase& database, const std::filesystem::path& path)
+/// Tables and views in their order.
+QStringList tablesOf(const QSqlDatabase& database)
 {
     QSqlQuery query(database);
     const QString statement = QStringLiteral("SELECT name FROM sqlite_master WHERE type IN "
                                              "('table', 'view') AND name NOT LIKE 'sqlite\\_%' "
                                              "ESCAPE '\\' ORDER BY name");
-    if (!query.exec(statement))
-        throw RunTimeError(ErrorNumber::FileNotFound, pathText(path) + u" is no SQLite database");
+    if (!query.exec(statement)) {
+        if (query.lastError().nativeErrorCode() == QLatin1String(NoDatabase))
+            refuse(QStringLiteral("this is no SQLite database"));
+        refuse(query.lastError());
+    }
     QStringList names;
     while (query.next())
         names.append(query.value(0).toString());
@@ -71,8 +103,9 @@ QStringList tablesOf(const QSqlDatabase& database, const std::filesystem::path& 
 
 QString chosenTable(const SqliteSource& source, const QStringList& tables)
 {
-    const QString list
-        = tables.isEmpty() ? QStringLiteral("none") : tables.join(QStringLiteral(", "));
+    if (tables.isEmpty())
+        refuse(QStringLiteral("the database has no table"));
+    const QString list = tables.join(QStringLiteral(", "));
     if (source.table.isEmpty()) {
         if (tables.size() != 1)
             refuse(QStringLiteral("name one of the database's tables: ") + list);
@@ -135,7 +168,7 @@ TableGrid readRows(const SqliteSource& source, QSqlQuery& query)
             throw RunTimeError(ErrorNumber::Cancelled);
     }
     if (query.lastError().isValid())
-        refuse(query.lastError().databaseText());
+        refuse(query.lastError());
     return grid;
 }
 
@@ -147,14 +180,16 @@ TableGrid readSqlite(const SqliteSource& source)
     Connection connection(source.path);
     if (!std::filesystem::is_regular_file(source.path, ignored) || !connection.database().open())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(source.path));
-    const QStringList tables = tablesOf(connection.database(), source.path);
+    const QStringList tables = tablesOf(connection.database());
+    if (!source.query.isEmpty() && !isReading(source.query))
+        refuse(QStringLiteral("the statement is no query; give a SELECT"));
     const QString statement = source.query.isEmpty()
         ? QStringLiteral("SELECT * FROM ") + quoted(chosenTable(source, tables))
         : source.query;
     QSqlQuery query(connection.database());
     query.setForwardOnly(true);
     if (!query.exec(statement))
-        refuse(query.lastError().databaseText());
+        refuse(query.lastError());
     if (!query.isSelect() || query.record().isEmpty())
         refuse(QStringLiteral("the statement answers no rows; give a SELECT"));
     return readRows(source, query);
