@@ -116,7 +116,10 @@ QString describe(const RunTimeError& error)
 void tell(const QString& text)
 {
     QString line = text;
-    line.replace(QLatin1Char('\n'), QLatin1Char(' '));
+    for (QChar& character : line) {
+        if (character.category() == QChar::Other_Control)
+            character = QLatin1Char(' ');
+    }
     std::fputs(("pelloric: " + line.toUtf8() + '\n').constData(), stderr);
 }
 

@@ -166,6 +166,9 @@ int runExport(const Invocation& invocation)
 {
     const CommandLine line(invocation.arguments, { Options, sourceOptions(), reportOptions() }, 1);
     const Order order(line);
+    if (isSameFile(order.file, order.out))
+        throw CommandError(
+            QStringLiteral("%1 is the file that is read; export to another one").arg(order.out));
     const HeadlessApplication application(invocation);
     qt::QtPlatform platform;
     qt::StreamMessages messages;

@@ -3,10 +3,12 @@
 
 #include "interruption.h"
 
+#include "command_line.h"
 #include "platform/qt/qt_services.h"
 
 #include <atomic>
 #include <csignal>
+#include <cstdlib>
 
 namespace pelloric::app {
 
@@ -15,13 +17,17 @@ namespace {
 constexpr int Signals[] = { SIGINT, SIGTERM };
 
 std::atomic<int> received = 0;
+std::atomic<bool> endsAtOnce = false;
 std::atomic<qt::QtMessageLoop*> loopToEnd = nullptr;
 static_assert(std::atomic<int>::is_always_lock_free);
+static_assert(std::atomic<bool>::is_always_lock_free);
 static_assert(std::atomic<qt::QtMessageLoop*>::is_always_lock_free);
 
 extern "C" void endWork(int signal)
 {
     received = signal;
+    if (endsAtOnce)
+        std::_Exit(SignalBase + signal);
     if (qt::QtMessageLoop* const loop = loopToEnd)
         loop->cancel();
 }
@@ -43,5 +49,9 @@ Interruption::~Interruption()
 }
 
 int Interruption::signal() { return received; }
+
+Interruption::AtOnce::AtOnce() { endsAtOnce = true; }
+
+Interruption::AtOnce::~AtOnce() { endsAtOnce = false; }
 
 } // namespace pelloric::app

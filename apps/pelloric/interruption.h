@@ -24,6 +24,16 @@ public:
     static int signal();
 
     static bool mayGoOn() { return signal() == 0; }
+
+    /// As long as it lives, Ctrl+C ends the program at once: for work that cannot be asked to end,
+    /// such as waiting for a pipe or a long query, and that leaves nothing behind.
+    class AtOnce {
+    public:
+        AtOnce();
+        ~AtOnce();
+        AtOnce(const AtOnce&) = delete;
+        AtOnce& operator=(const AtOnce&) = delete;
+    };
 };
 
 } // namespace pelloric::app

@@ -86,9 +86,16 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
                 .arg(QString::fromLatin1(option)),
             WrongUsage);
     SavedDocument saved;
-    if (readOstl(platform.codec, pathOf(file), saved.document, saved.setup)
-        == OstlResult::BadHeader)
-        throw CommandError(QStringLiteral("%1 is no document file").arg(file));
+    try {
+        if (readOstl(platform.codec, pathOf(file), saved.document, saved.setup)
+            == OstlResult::BadHeader)
+            throw CommandError(QStringLiteral("%1 is no document file").arg(file));
+    } catch (const RunTimeError& error) {
+        if (error.number() != ErrorNumber::Overflow)
+            throw;
+        throw CommandError(
+            QStringLiteral("%1 is damaged: it holds a number that is out of range").arg(file));
+    }
     return saved;
 }
 

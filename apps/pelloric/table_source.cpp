@@ -57,6 +57,10 @@ void checkReadable(const QString& name)
         throw CommandError(QStringLiteral("%1: there is no such file").arg(name));
     if (info.isDir())
         throw CommandError(QStringLiteral("%1 is a folder; name a file in it").arg(name));
+    std::error_code ignored;
+    const auto type = std::filesystem::status(pathOf(name), ignored).type();
+    if (type == std::filesystem::file_type::character || type == std::filesystem::file_type::block)
+        throw CommandError(QStringLiteral("%1 is a device; name a file").arg(name));
     if (!info.isReadable())
         throw CommandError(QStringLiteral("%1: you may not read this file").arg(name));
 }
@@ -101,6 +105,12 @@ bool isDocumentName(const QString& name)
     return name.endsWith(QLatin1String(".ostl"), Qt::CaseInsensitive);
 }
 
+bool isSameFile(const QString& file, const QString& other)
+{
+    std::error_code error;
+    return std::filesystem::equivalent(pathOf(splitName(file).file), pathOf(other), error);
+}
+
 QString plainName(const QString& name)
 {
     return QFileInfo(splitName(name).file).completeBaseName();
@@ -108,6 +118,7 @@ QString plainName(const QString& name)
 
 TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& progress)
 {
+    const Interruption::AtOnce atOnce;
     const DatabaseName name = splitName(file);
     checkReadable(name.file);
     const bool isFromDatabase = isDatabase(name.file);

@@ -21,6 +21,9 @@ std::filesystem::path pathOf(const QString& name);
 /// Whether a name is that of a document file.
 bool isDocumentName(const QString& name);
 
+/// Whether a command's file, which may be a database with a table, is another file that exists.
+bool isSameFile(const QString& file, const QString& other);
+
 /// What a name says without its folder and extension.
 QString plainName(const QString& name);
 

@@ -176,6 +176,10 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
     folder_.write("empty.csv", "");
     folder_.write("broken.ostl", "nothing");
     folder_.write("kept.pdf", "old");
+    folder_.write("table.svg", "a\n1\n");
+    folder_.write("large.ostl",
+        "##Release2004-10-23\n##Release2004-10-23PageWidth=1e12\n"
+        "##Release2004-10-23PageHeight=1\n");
     const ErrorCase cases[] = {
         { "", 2, "pelloric help" },
         { "dance", 2, "no command dance" },
@@ -197,6 +201,10 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
         { "export t.csv -o kept.pdf --widths 0", 1, "--widths" },
         { "export t.csv -o kept.pdf --query x", 1, "t.csv is none" },
         { "export t.csv -o missing/t.pdf", 1, "missing/t.pdf; check that the folder exists" },
+        { "export table.svg -o table.svg", 1, "table.svg is the file that is read" },
+        { "export table.svg -o ./table.svg", 1, "export to another one" },
+        { "export /dev/zero -o kept.pdf", 1, "/dev/zero is a device" },
+        { "export large.ostl -o kept.pdf", 1, "large.ostl is damaged" },
         { "export broken.ostl -o kept.pdf", 1, "broken.ostl is no document file" },
         { "settings --bogus", 2, "bogus" },
         { "help dance", 2, "no command dance" },
@@ -210,7 +218,8 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
         EXPECT_EQ(ended.output, "") << row.arguments;
     }
     EXPECT_EQ(folder_.read("kept.pdf"), "old");
-    EXPECT_EQ(folder_.names().size(), 7U); // the files above and the settings
+    EXPECT_EQ(folder_.read("table.svg"), "a\n1\n");
+    EXPECT_EQ(folder_.names().size(), 9U); // the files above and the settings
 }
 
 TEST_F(Program, SaysWhatADocumentFileCannotHold)
@@ -245,6 +254,35 @@ TEST_F(Program, EndsCleanlyWhenInterrupted)
     EXPECT_EQ(ended.errors, "");
     EXPECT_EQ(folder_.read("long.pdf"), "old");
     EXPECT_EQ(folder_.names().size(), 3U); // the table, the old file and the settings
+}
+
+TEST_F(Program, EndsAtOnceDuringAQueryWithoutEnd)
+{
+    QFile::copy(QStringLiteral(PELLORIC_TESTS_DIR "/../samples/samples.sqlite"),
+        QString::fromStdString(folder_.file("s.sqlite").string()));
+    QProcess process;
+    start(process,
+        { QStringLiteral("export"), QStringLiteral("s.sqlite"), QStringLiteral("--query"),
+            QStringLiteral("WITH RECURSIVE c(x) AS (SELECT 1 UNION ALL SELECT x + 1 FROM c) "
+                           "SELECT count(*) FROM c"),
+            QStringLiteral("-o"), QStringLiteral("c.pdf") });
+    ASSERT_FALSE(process.waitForFinished(1500));
+    kill(static_cast<pid_t>(process.processId()), SIGINT);
+    const Ended ended = finish(process);
+    EXPECT_EQ(ended.status, 130);
+    EXPECT_EQ(ended.errors, "");
+    EXPECT_EQ(folder_.names().size(), 1U);
+}
+
+TEST_F(Program, SaysInOneLineThatAPictureCannotBeWritten)
+{
+    folder_.write("t.csv", "a\n1\n");
+    std::filesystem::create_symlink("/dev/full", folder_.file("full.png"));
+    const Ended ended = run(words("export t.csv -o full.png"));
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_EQ(ended.errors,
+        "pelloric: The file cannot be written: full.png; check that the folder exists, can be "
+        "written and has room\n");
 }
 
 #endif

@@ -14,6 +14,7 @@
 #include "view/qt/exact_page_device.h"
 #include "view/qt/pending_files.h"
 
+#include <QBuffer>
 #include <QImage>
 #include <QImageWriter>
 #include <QPageLayout>
@@ -206,7 +207,10 @@ std::vector<std::filesystem::path> exportPngs(const PageDocument& document, cons
         QPainter painter(&image);
         pagePainter.paint(page, painter, options.dpi, true);
         painter.end();
-        return QImageWriter(&file, "png").write(image);
+        // The image library itself tells the world when it cannot write.
+        QBuffer bytes;
+        return QImageWriter(&bytes, "png").write(image)
+            && file.write(bytes.data()) == bytes.data().size();
     });
 }
 
