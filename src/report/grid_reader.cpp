@@ -11,6 +11,7 @@
 #include "report/table_row_set.h"
 
 #include <algorithm>
+#include <limits>
 #include <utility>
 
 namespace pelloric {
@@ -46,6 +47,8 @@ constexpr double DefaultWidthMarker = -1; ///< a flex grid's column of no defini
 constexpr double DefinedWidth = 2000; ///< twips; what such a column gets
 constexpr double WidenedWidth = 216; ///< twips; what a hidden column of a data grid gets
 
+constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max(); ///< that are printed
+
 bool isPrinted(double width) { return width > CellPadding; }
 
 /// A column of the grid that is printed.
@@ -53,6 +56,13 @@ struct PrintedColumn {
     int position = 0; ///< in the grid, from 0
     double width = 0; ///< twips
 };
+
+void addColumn(std::vector<PrintedColumn>& columns, const PrintedColumn& column)
+{
+    if (columns.size() == MostColumns)
+        throw RunTimeError(ErrorNumber::Overflow, u"more than 32767 columns");
+    columns.push_back(column);
+}
 
 std::int32_t wholeNumber(const Value& value) { return roundToInt32(value.toNumber()); }
 
@@ -139,7 +149,7 @@ GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
     for (int column = 0; column < grid.columns(); ++column) {
         const double width = grid.width(column);
         if (isPrinted(width))
-            columns.push_back({ column, width });
+            addColumn(columns, { column, width });
     }
     GridTable result;
     if (columns.empty())
@@ -202,7 +212,7 @@ std::vector<PrintedColumn> readHeaders(
             continue;
         const Value title = header.get(textMember.of(header), {});
         appendTitle(table, displayText(title, decimalSeparator, buffer), position);
-        columns.push_back({ position, width });
+        addColumn(columns, { position, width });
     }
     return columns;
 }

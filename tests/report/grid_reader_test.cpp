@@ -116,6 +116,13 @@ TEST(FlexGridReader, MakesNoRowSetWithoutAPrintedColumn)
     EXPECT_EQ(readAs(PrintObjKind::MSHFlexGrid, none).rows, nullptr);
 }
 
+TEST(FlexGridReader, RefusesMoreColumnsThanABandCanNumber)
+{
+    const std::vector<TableColumn> columns(32768, TableColumn { .title = {}, .width = 200 });
+    TableGrid grid(columns);
+    EXPECT_EQ(errorOf([&] { readAs(PrintObjKind::MSFlexGrid, grid); }), ErrorNumber::Overflow);
+}
+
 TEST(GridReader, KeepsTheWidthsOfAnEarlierBuild)
 {
     TableGrid grid = gridOf({ { u"A", 6000 }, { u"B", 6000 } }, {});
