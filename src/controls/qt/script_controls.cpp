@@ -19,8 +19,16 @@ void savePicture(QWidget& control, const QString& path)
         engine->throwError(QStringLiteral("grab: cannot write ") + path);
 }
 
+constexpr int LongestSide = 8192; ///< pixels of a control whose picture still fits in memory
+
 void showInSize(QWidget& control, int width, int height)
 {
+    const auto fits = [](int side) { return side >= 0 && side <= LongestSide; };
+    if (!fits(width) || !fits(height)) {
+        if (QJSEngine* const engine = qjsEngine(&control))
+            engine->throwError(QStringLiteral("resize: a side takes 0 to 8192 pixels"));
+        return;
+    }
     control.QWidget::resize(width, height);
     control.show();
     QCoreApplication::processEvents();

@@ -40,6 +40,11 @@ QJSValue toScript(const Value& value)
     throw RunTimeError(ErrorNumber::TypeMismatch);
 }
 
+bool isPlain(const QJSValue& value)
+{
+    return value.isBool() || value.isNumber() || value.isString() || value.isVariant();
+}
+
 /// An error of the script's own function goes on as one of the object's.
 const QJSValue& checked(const QJSValue& result)
 {
@@ -128,8 +133,10 @@ Value ScriptObject::answer(Member& member, const QJSValue& result)
         return {};
     if (result.isDate())
         return member.held.hold(result.toDateTime());
-    if (!result.isObject())
+    if (isPlain(result))
         return member.held.hold(result.toVariant());
+    if (!result.isObject())
+        throw RunTimeError(ErrorNumber::TypeMismatch, u"a symbol is no value");
     member.answer = objectOfScript(result, countsFromOne(member.name) ? 1 : 0);
     return Value::ofObject(*member.answer);
 }

@@ -311,6 +311,9 @@ TEST(PublishedMembers, AreErrorsOfAScriptThatUsesThem)
     EXPECT_EQ(numberOf("s.OpenFile('/nowhere/at/all.ostl')"), 53);
     EXPECT_EQ(numberOf("s.Minimum()"), 91);
     EXPECT_EQ(numberOf("s.doPreview(1)"), 13);
+    EXPECT_EQ(numberOf("s.doPreview({ Cols: 1, Rows: 2, ColWidth: () => 1000,"
+                       " TextMatrix: () => Symbol('no text') })"),
+        13);
     EXPECT_EQ(numberOf("s.VerticalDir"), 438);
     EXPECT_EQ(numberOf("s.VerticalDir = false"), 0);
     EXPECT_EQ(engine.evaluate("s.myWidth").toInt(), 16840);
