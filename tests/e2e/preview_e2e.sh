@@ -28,6 +28,7 @@ needTool Xvfb xvfb
 needTool openbox openbox
 needTool xdotool xdotool
 needTool import imagemagick
+needTool lpadmin cups-client
 
 rm -rf "$Folder"
 mkdir -p "$Folder/config"
@@ -41,6 +42,7 @@ finish() {
         kill "$process" 2> /dev/null || true
     done
     wait 2> /dev/null || true
+    [ -z "${Cups:-}" ] || rm -rf "$Cups"
 }
 trap finish EXIT
 
@@ -58,6 +60,20 @@ unset QT_SCALE_FACTOR QT_FONT_DPI WAYLAND_DISPLAY
 
 openbox --sm-disable > "$Folder/openbox.log" 2>&1 &
 Processes+=($!)
+
+# A print scheduler of its own, with one queue that keeps its jobs.
+Tests=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
+Cups=$(mktemp -d)
+"$Tests/support/private_cups.sh" "$Cups" > "$Folder/cups.log" 2>&1 &
+Processes+=($!)
+export CUPS_SERVER=$Cups/cups.sock
+for ((look = 0; look < Patience; look++)); do
+    ! lpstat -r 2> /dev/null | grep -q 'is running' || break
+    sleep 0.05
+done
+lpadmin -p E2E -E -v file:/dev/null -P "$Tests/data/forms.ppd" 2> "$Folder/lpadmin.log" ||
+    fail "no print queue: $(cat "$Folder/cups.log" "$Folder/lpadmin.log")"
+lpadmin -d E2E
 "$Program" demo --log "$Log" > "$Folder/program.log" 2>&1 &
 Demo=$!
 Processes+=("$Demo")
@@ -109,6 +125,18 @@ clickTool() {
     shoot "$1-$2"
 }
 
+# needEnd: until the program has ended, with nothing to say.
+needEnd() {
+    local look
+    for ((look = 0; look < Patience; look++)); do
+        kill -0 "$Demo" 2> /dev/null || break
+        sleep 0.05
+    done
+    ! kill -0 "$Demo" 2> /dev/null || fail "the program does not end"
+    wait "$Demo" || fail "the program ended with status $?"
+    [ ! -s "$Folder/program.log" ] || fail "the program said: $(head -n 1 "$Folder/program.log")"
+}
+
 toWindow '^Pelloric Demonstration'
 shoot demo
 xdotool key alt+p
@@ -147,6 +175,16 @@ done
 [ "$(valueOf y)" -lt "$Before" ] || fail "dragging did not move the page"
 shoot dragged
 
+# The vertical bar, at its trough below the handle: the pages go up.
+Before=$(valueOf y)
+read -r Width Height <<< "$(valueOf size | tr 'x' ' ')"
+xdotool mousemove --window "$Window" $((Width - 8)) $((Height - 60)) click 1
+for ((look = 0; look < Patience; look++)); do
+    [ "$(valueOf y)" = "$Before" ] || break
+    sleep 0.05
+done
+[ "$(valueOf y)" -lt "$Before" ] || fail "the scroll bar did not move the page"
+
 xdotool key ctrl+s
 waitFor 'top=QFileDialog'
 sleep 0.3
@@ -175,15 +213,36 @@ xdotool key Return
 waitFor "total=$Total current=1 .*top=-"
 shoot reopened
 
+# Every page is a job of its own, named after the file it was opened from.
+xdotool key ctrl+p
+waitFor 'top=pelloric::qt::PrintOptionsDialog'
+sleep 0.3
+shoot print-options
+xdotool key Return
+waitFor 'top=-'
+for ((look = 0; look < Patience; look++)); do
+    [ "$(lpstat -W completed -o | wc -l)" -lt "$Total" ] || break
+    sleep 0.05
+done
+Jobs=$(lpstat -W completed -o | wc -l)
+[ "$Jobs" -eq "$Total" ] || fail "$Jobs jobs of $Total pages"
+grep -q "title=saved . page 1\$" "$Cups/log/page_log" || fail "no job is named saved – page 1"
+
 pointAt toolExit 17
 xdotool click 1
 waitFor 'state closed'
 toWindow '^Pelloric Demonstration'
 xdotool key alt+F4
-for ((look = 0; look < Patience; look++)); do
-    kill -0 "$Demo" 2> /dev/null || break
-    sleep 0.05
-done
-wait "$Demo" || fail "the program ended with status $?"
-[ ! -s "$Folder/program.log" ] || fail "the program said: $(head -n 1 "$Folder/program.log")"
+needEnd
+
+# A preview of its own keeps its title whatever the report's is, and its exit ends the program.
+printf 'town,people\nUlm,126000\n' > "$Folder/towns.csv"
+"$Program" preview "$Folder/towns.csv" --title Towns > "$Folder/program.log" 2>&1 &
+Demo=$!
+Processes+=("$Demo")
+toWindow '.'
+Title=$(xdotool getwindowname "$Window")
+[ "$Title" = 'Print Preview ' ] || fail "the preview's title is \"$Title\""
+xdotool key ctrl+w
+needEnd
 printf 'preview_e2e: %s pages, every step as expected\n' "$Total"

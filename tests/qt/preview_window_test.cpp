@@ -165,6 +165,17 @@ protected:
         return QString::fromStdString(folder_.file(name).string());
     }
 
+    /// Whether the program ends by itself before long.
+    static bool programEnds()
+    {
+        constexpr int TooLate = 3;
+        QTimer patience;
+        patience.setSingleShot(true);
+        QObject::connect(&patience, &QTimer::timeout, [] { QCoreApplication::exit(TooLate); });
+        patience.start(20000);
+        return QApplication::exec() == 0;
+    }
+
     TempFolder folder_;
     FakeMessages messages_;
     FakePrinter printer_;
@@ -505,6 +516,23 @@ TEST_F(PreviewWindowTest, ClosesAndIsMadeAnewAfterExit)
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     EXPECT_TRUE(first.isNull());
     EXPECT_GE(canvas().Totalpages(), 5);
+}
+
+TEST_F(PreviewWindowTest, ExitOfTheLastWindowEndsTheProgram)
+{
+    preview(3);
+    QTimer::singleShot(0, button(17), [&] { click(17); });
+    EXPECT_TRUE(programEnds());
+}
+
+TEST_F(PreviewWindowTest, TheLastWindowEndsTheProgramThoughItWasClosedDuringABuild)
+{
+    const QPointer<PreviewWindow> window = &preview(3);
+    QTimer::singleShot(0, window, [&] {
+        QTimer::singleShot(0, window, [&] { window->close(); });
+        opener_.openPreview(gridOf(400));
+    });
+    EXPECT_TRUE(programEnds());
 }
 
 TEST_F(PreviewWindowTest, ClosesByEscapeWhenNothingIsBuilt)

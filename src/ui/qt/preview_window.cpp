@@ -22,6 +22,8 @@
 #include <QCloseEvent>
 #include <QContextMenuEvent>
 #include <QCursor>
+#include <QEventLoopLocker>
+#include <QGuiApplication>
 #include <QMenu>
 #include <QPointer>
 #include <QScreen>
@@ -222,6 +224,10 @@ void PreviewWindow::closeEvent(QCloseEvent* event)
         savePlace();
         isClosed_ = true;
         canvas_->canvas().clear();
+        // A hidden window counts for nothing: one that was the last leaves the program running.
+        std::optional<QEventLoopLocker> lastWindow;
+        if (!isVisible() && QGuiApplication::quitOnLastWindowClosed())
+            lastWindow.emplace();
         return QMainWindow::closeEvent(event);
     }
     closesAfterwards_ = true;
@@ -237,7 +243,8 @@ void PreviewWindow::closeEvent(QCloseEvent* event)
     hide();
 }
 
-void PreviewWindow::unload() { close(); }
+/// The window is still shown when the command that unloads it ends, and then closes like any other.
+void PreviewWindow::unload() { closesAfterwards_ = true; }
 
 void PreviewWindow::navigationChanged()
 {
