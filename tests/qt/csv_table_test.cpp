@@ -211,7 +211,8 @@ TEST_F(SqliteTable, SaysWhichTablesThereAre)
 TEST_F(SqliteTable, NeverChangesTheDatabase)
 {
     const std::string before = TempFolder::bytesOf(path());
-    EXPECT_NE(read({}, QStringLiteral("DELETE FROM t")).find("readonly"), std::string::npos);
+    EXPECT_NE(read({}, QStringLiteral("WITH x AS (SELECT 1) DELETE FROM t")).find("readonly"),
+        std::string::npos);
     EXPECT_EQ(TempFolder::bytesOf(path()), before);
 }
 
@@ -220,7 +221,7 @@ TEST_F(SqliteTable, RefusesEveryStatementThatIsNoQuery)
     const std::filesystem::path copy = path().parent_path() / "copy.db";
     const QString target = QString::fromStdString(copy.string());
     for (const char* statement : { "VACUUM INTO '%1'", " /* SELECT */ vacuum into '%1'",
-             "-- SELECT\nVACUUM INTO '%1'", "ATTACH DATABASE '%1' AS other", "" })
+             "-- SELECT\nVACUUM INTO '%1'", "ATTACH DATABASE '%1' AS other" })
         read({}, QString::fromLatin1(statement).arg(target));
     EXPECT_FALSE(std::filesystem::exists(copy));
     EXPECT_EQ(read({}, QStringLiteral("BEGIN")),
