@@ -27,7 +27,8 @@ QString overview()
             + QStringLiteral("  ") + QString::fromUtf8(command.summary) + QLatin1Char('\n');
     }
     return text
-        + QStringLiteral("\n\"pelloric help COMMAND\" says more, \"pelloric --version\" the version.\n");
+        + QStringLiteral(
+            "\n\"pelloric help COMMAND\" says more, \"pelloric --version\" the version.\n");
 }
 
 QString detailsOf(const QString& name)

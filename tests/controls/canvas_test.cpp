@@ -467,7 +467,7 @@ TEST_F(CanvasTest, HidesTheProgressBarWhenThePrinterFails)
 TEST_F(CanvasTest, TellsItsObserverOfWhatAFailedMemberLeft)
 {
     addPages(canvas.document(), 9999);
-    canvas.setDispScale(0.01F);
+    canvas.setDispScale(1);
     observer.divisor = 0;
     // The scroll range of so many pages is too long, but the pages are placed by then.
     EXPECT_EQ(errorOf([&] { canvas.showAllPage(); }), ErrorNumber::Overflow);

@@ -4,6 +4,7 @@
 #include "print/qt/qt_printer_system.h"
 
 #include "platform/qt/qt_text.h"
+#include "print/paper_names.h"
 #include "print/qt/paper_sizes.h"
 #include "print/qt/spooler.h"
 
@@ -47,7 +48,7 @@ QString QtPrinterSystem::refusal(TextView name) const { return refusalOf(toQStri
 std::vector<PaperForm> QtPrinterSystem::forms() const
 {
     const Text name = currentPrinter();
-    return name.empty() ? std::vector<PaperForm>()
+    return name.empty() ? standardPaperForms()
                         : formsOf(QPrinterInfo::printerInfo(toQString(name)));
 }
 

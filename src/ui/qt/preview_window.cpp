@@ -10,7 +10,6 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
-#include "settings/settings_file.h"
 #include "ui/qt/choice_box.h"
 #include "ui/qt/grid_style_dialog.h"
 #include "ui/qt/icon_set.h"
@@ -255,27 +254,13 @@ void PreviewWindow::navigationChanged()
 DialogEnd PreviewWindow::showGridStyle()
 {
     GridStyleDialog dialog(platform_, this);
-    const int result = dialog.exec();
-    return endOf(result, dialog.saved());
+    return dialog.exec() == QDialog::Accepted ? DialogEnd::Accepted : DialogEnd::Cancelled;
 }
 
 DialogEnd PreviewWindow::showPageSetup()
 {
     PageSetupDialog dialog(platform_, this);
-    const int result = dialog.exec();
-    return endOf(result, dialog.saved());
-}
-
-/// A file that could not be written would leave the user wondering why nothing has changed.
-DialogEnd PreviewWindow::endOf(int result, std::optional<SaveOutcome> saved)
-{
-    if (result != QDialog::Accepted)
-        return DialogEnd::Cancelled;
-    if (saved == SaveOutcome::WriteFailed) {
-        const Text path = settingsPath(platform_).u16string();
-        platform_.messages.show(messageOf(RunTimeError(ErrorNumber::WriteFailed, path)));
-    }
-    return DialogEnd::Accepted;
+    return dialog.exec() == QDialog::Accepted ? DialogEnd::Accepted : DialogEnd::Cancelled;
 }
 
 void PreviewWindow::showPrintOptions()

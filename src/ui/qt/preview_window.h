@@ -14,10 +14,6 @@
 
 class QMenu;
 
-namespace pelloric {
-enum class SaveOutcome;
-}
-
 namespace pelloric::qt {
 
 class PreviewToolbar;
@@ -92,7 +88,6 @@ private:
     void leave();
     void showContextMenu(QPoint at);
     bool turnsPage(int key);
-    DialogEnd endOf(int result, std::optional<SaveOutcome> saved);
     std::filesystem::path choose(const FileQuestion& question);
     void restorePlace();
     void savePlace() const;
