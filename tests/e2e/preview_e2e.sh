@@ -175,7 +175,7 @@ done
 [ "$(valueOf y)" -lt "$Before" ] || fail "dragging did not move the page"
 shoot dragged
 
-# The vertical bar, at its trough below the handle: the pages go up.
+# The vertical bar, clicked below its handle: the pages go up.
 Before=$(valueOf y)
 read -r Width Height <<< "$(valueOf size | tr 'x' ' ')"
 xdotool mousemove --window "$Window" $((Width - 8)) $((Height - 60)) click 1
