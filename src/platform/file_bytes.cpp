@@ -38,7 +38,7 @@ std::string readFileBytes(const std::filesystem::path& path)
 {
     std::ifstream stream(path, std::ios::binary);
     std::string bytes;
-    std::array<char, 1U << 14U> chunk;
+    std::array<char, 1U << 14U> chunk {};
     while (stream) {
         stream.read(chunk.data(), chunk.size());
         bytes.append(chunk.data(), static_cast<std::size_t>(stream.gcount()));

@@ -46,10 +46,11 @@ public:
     std::size_t memoryBytes() const { return cells_.capacity() * sizeof(Cell); }
 
 private:
+    // A union has one first value. NOLINTNEXTLINE(cppcoreguidelines-pro-type-member-init)
     struct Cell {
         union {
             double number = 0;
-            const char16_t* units;
+            const char16_t* units; ///< of a text, which `length` belongs to
         };
         std::uint32_t length = 0;
         ValueKind kind = ValueKind::Null;

@@ -22,6 +22,7 @@ Text lengthText(double millimetres) { return twoDecimals(millimetres) + u" mm"; 
 std::vector<PaperRow> paperRows(const std::vector<PaperForm>& forms)
 {
     std::vector<PaperRow> rows;
+    rows.reserve(forms.size());
     for (const PaperForm& form : forms)
         rows.push_back({ .name = form.name,
             .cx = lengthText(form.widthMm),

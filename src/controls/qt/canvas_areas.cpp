@@ -50,7 +50,7 @@ Twips wholeTwips(double twips)
 
 int wholePixel(double position)
 {
-    constexpr double Reach = std::numeric_limits<int>::max() / 4;
+    constexpr double Reach = std::numeric_limits<int>::max() / 4.0;
     return static_cast<int>(std::nearbyint(std::clamp(position, -Reach, Reach)));
 }
 

@@ -109,7 +109,7 @@ QByteArray encodingOfMark(const QByteArray& start)
 QByteArray encodingOf(QIODevice& file, const QString& asked)
 {
     if (!asked.isEmpty()) {
-        const QByteArray encoding = asked.toLatin1();
+        QByteArray encoding = asked.toLatin1();
         if (!QStringDecoder(encoding.constData()).isValid())
             refuse(u"unknown encoding " + toText(asked)
                 + u"; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others");
@@ -117,7 +117,7 @@ QByteArray encodingOf(QIODevice& file, const QString& asked)
             refuseBytes(badLine(file, encoding), u"bytes that are no " + named(encoding));
         return encoding;
     }
-    const QByteArray marked = encodingOfMark(file.peek(4));
+    QByteArray marked = encodingOfMark(file.peek(4));
     if (!marked.isEmpty())
         return marked;
     if (isAll(file, Utf8))

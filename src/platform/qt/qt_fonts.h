@@ -19,6 +19,7 @@ struct FaceKey {
     bool bold = false;
     bool italic = false;
 
+    // The analyser takes the 0 of a comparison for a null. NOLINTNEXTLINE(modernize-use-nullptr)
     auto operator<=>(const FaceKey&) const = default;
 };
 

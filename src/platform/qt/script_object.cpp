@@ -85,33 +85,33 @@ std::optional<MemberId> ScriptObject::findMember(TextView name)
     return static_cast<MemberId>(members_.size() - 1);
 }
 
-Value ScriptObject::get(MemberId id, std::span<const Value> arguments)
+Value ScriptObject::get(MemberId member, std::span<const Value> arguments)
 {
-    Member& member = *members_.at(static_cast<std::size_t>(id));
-    if (value_.isArray() && !value_.hasProperty(member.name))
-        return arrayMember(member, arguments);
-    if (member.function.isCallable())
-        return answer(member, call(member, arguments, nullptr));
-    QJSValue result = value_.property(member.name);
+    Member& named = *members_.at(static_cast<std::size_t>(member));
+    if (value_.isArray() && !value_.hasProperty(named.name))
+        return arrayMember(named, arguments);
+    if (named.function.isCallable())
+        return answer(named, call(named, arguments, nullptr));
+    QJSValue result = value_.property(named.name);
     if (!arguments.empty())
-        result = itemAt(result, arguments.front(), countsFromOne(member.name) ? 1 : 0);
+        result = itemAt(result, arguments.front(), countsFromOne(named.name) ? 1 : 0);
     for (const Value& index : arguments.subspan(arguments.empty() ? 0 : 1))
         result = itemAt(result, index, 0);
-    return answer(member, result);
+    return answer(named, result);
 }
 
-void ScriptObject::put(MemberId id, std::span<const Value> arguments, const Value& value)
+void ScriptObject::put(MemberId member, std::span<const Value> arguments, const Value& value)
 {
-    const Member& member = *members_.at(static_cast<std::size_t>(id));
-    if (member.function.isCallable()) {
-        checked(call(member, arguments, &value));
+    const Member& named = *members_.at(static_cast<std::size_t>(member));
+    if (named.function.isCallable()) {
+        checked(call(named, arguments, &value));
         return;
     }
     if (arguments.empty()) {
-        value_.setProperty(member.name, toScript(value));
+        value_.setProperty(named.name, toScript(value));
         return;
     }
-    QJSValue array = value_.property(member.name);
+    QJSValue array = value_.property(named.name);
     itemAt(array, arguments.front(), 0);
     array.setProperty(
         static_cast<quint32>(roundToInt32(arguments.front().toNumber())), toScript(value));

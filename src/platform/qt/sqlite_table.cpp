@@ -125,6 +125,7 @@ QString quoted(QString name)
 TableGrid gridOf(const QSqlRecord& record)
 {
     std::vector<TableColumn> columns;
+    columns.reserve(static_cast<std::size_t>(record.count()));
     for (int field = 0; field < record.count(); ++field)
         columns.push_back({ .title = toText(record.fieldName(field)), .width = -1 });
     return TableGrid(std::move(columns));

@@ -34,7 +34,7 @@ class FontChooser final : public QDialog {
     Q_OBJECT
 
 public:
-    FontChooser(const ColoredFont& present, QWidget* parent = nullptr);
+    explicit FontChooser(const ColoredFont& present, QWidget* parent = nullptr);
 
     /// What the controls show; the face is empty when its box is.
     ColoredFont chosen() const;

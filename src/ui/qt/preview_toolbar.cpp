@@ -232,6 +232,7 @@ void PreviewToolbar::showNavigation(const NavigationState& state, int currentPag
 std::vector<QAction*> PreviewToolbar::contextActions() const
 {
     std::vector<QAction*> actions;
+    actions.reserve(ContextMenuTools.size());
     for (const int id : ContextMenuTools)
         actions.push_back(actions_.at(id));
     return actions;
