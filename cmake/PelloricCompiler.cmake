@@ -36,8 +36,4 @@ endif()
 add_library(pelloric_warnings INTERFACE)
 if(CMAKE_CXX_COMPILER_ID MATCHES "GNU|Clang")
     target_compile_options(pelloric_warnings INTERFACE -Wall -Wextra -Wconversion -Werror)
-    # g++ 12 sees overlapping copies in std::string where there are none.
-    if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
-        target_compile_options(pelloric_warnings INTERFACE -Wno-restrict)
-    endif()
 endif()
