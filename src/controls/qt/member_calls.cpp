@@ -4,40 +4,16 @@
 #include "controls/qt/member_calls.h"
 
 #include "controls/messages.h"
+#include "controls/qt/script_caller.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 
-#include <QJSEngine>
 #include <QObject>
 #include <QPointer>
 
 namespace pelloric::qt {
-
-namespace {
-
-QJSValue::ErrorType scriptError(ErrorNumber number)
-{
-    switch (number) {
-    case ErrorNumber::Overflow:
-    case ErrorNumber::SubscriptOutOfRange:
-        return QJSValue::RangeError;
-    case ErrorNumber::TypeMismatch:
-        return QJSValue::TypeError;
-    default:
-        return QJSValue::GenericError;
-    }
-}
-
-void throwInScript(QJSEngine& engine, const RunTimeError& error)
-{
-    QJSValue thrown = engine.newErrorObject(scriptError(error.number()), toQString(error.text()));
-    thrown.setProperty(QStringLiteral("number"), static_cast<int>(error.number()));
-    engine.throwError(thrown);
-}
-
-} // namespace
 
 MemberCalls::MemberCalls(QObject& control, Platform& platform, std::function<void()> restore)
     : control_(control)
@@ -72,16 +48,15 @@ void MemberCalls::endQuietly(const std::function<void()>& step)
 
 void MemberCalls::refuseRead(const char* name)
 {
-    if (QJSEngine* const engine = qjsEngine(&control_))
-        throwInScript(*engine, RunTimeError(ErrorNumber::NoSuchMember, fromUtf8(name)));
+    if (const ScriptCaller* const caller = scriptCaller())
+        caller->raise(control_, RunTimeError(ErrorNumber::NoSuchMember, fromUtf8(name)));
 }
 
 void MemberCalls::report(const RunTimeError& error)
 {
     restore_();
-    if (QJSEngine* const engine = qjsEngine(&control_))
-        throwInScript(*engine, error);
-    else
+    const ScriptCaller* const caller = scriptCaller();
+    if (caller == nullptr || !caller->raise(control_, error))
         platform_.messages.show(messageOf(error));
 }
 

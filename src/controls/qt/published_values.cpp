@@ -3,14 +3,13 @@
 
 #include "controls/qt/published_values.h"
 
+#include "controls/qt/script_caller.h"
 #include "platform/numbers.h"
 #include "platform/qt/grid_for.h"
 #include "platform/qt/held_value.h"
 #include "platform/qt/qt_text.h"
-#include "platform/qt/script_object.h"
 #include "platform/run_time_error.h"
 
-#include <QJSValue>
 #include <QObject>
 
 #include <cmath>
@@ -24,13 +23,13 @@ namespace {
 
 bool isScriptValue(const QVariant& argument)
 {
-    return argument.metaType() == QMetaType::fromType<QJSValue>();
+    return scriptCaller() != nullptr && scriptCaller()->isScriptValue(argument);
 }
 
 /// What a script handed over, as a plain variant.
 QVariant plain(const QVariant& argument)
 {
-    return isScriptValue(argument) ? argument.value<QJSValue>().toVariant() : argument;
+    return isScriptValue(argument) ? scriptCaller()->plainValue(argument) : argument;
 }
 
 /// Numbers, truth values and texts; an object, a list or nothing at all is refused.
@@ -103,11 +102,8 @@ QString toPlainText(const QVariant& argument)
 
 std::unique_ptr<AutomationObject> toGrid(const QVariant& argument)
 {
-    if (isScriptValue(argument)) {
-        const auto value = argument.value<QJSValue>();
-        if (!value.isQObject())
-            return objectOfScript(value);
-    }
+    if (isScriptValue(argument))
+        return scriptCaller()->object(argument);
     const QVariant value = plain(argument);
     if (value.typeId() == QMetaType::Nullptr)
         throw RunTimeError(ErrorNumber::ObjectMissing);

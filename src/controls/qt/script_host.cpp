@@ -9,6 +9,7 @@
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "script/qt/script_engine_caller.h"
 
 #include <QCoreApplication>
 #include <QDeadlineTimer>
@@ -167,6 +168,7 @@ ScriptHost::ScriptHost(QtPlatform& platform, ScriptTables& tables)
     , tables_(tables)
     , messages_(std::make_unique<ScriptMessages>())
 {
+    letScriptsCall();
     platform_.useMessages(*messages_);
 }
 

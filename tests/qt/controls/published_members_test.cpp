@@ -6,6 +6,7 @@
 #include "controls/qt/kestrane.h"
 #include "platform/qt/qt_text.h"
 #include "qt/controls/sorvane_world.h"
+#include "script/qt/script_engine_caller.h"
 #include "settings/settings_file.h"
 #include "support/errors.h"
 
@@ -295,6 +296,7 @@ TEST(PublishedMembers, ReadTheScaleAsTheDivisor)
 TEST(PublishedMembers, AreErrorsOfAScriptThatUsesThem)
 {
     SorvaneWorld world;
+    letScriptsCall();
     QJSEngine engine;
     QJSEngine::setObjectOwnership(&world.sorvane, QJSEngine::CppOwnership);
     engine.globalObject().setProperty("s", engine.newQObject(&world.sorvane));
@@ -324,6 +326,7 @@ TEST(PublishedMembers, AreErrorsOfAScriptThatUsesThem)
 TEST(PublishedMembers, LetAScriptMakeAControlAndPreviewAnObjectOfItsOwn)
 {
     SorvaneWorld world;
+    letScriptsCall();
     QJSEngine engine;
     QJSEngine::setObjectOwnership(&world.sorvane, QJSEngine::CppOwnership);
     engine.globalObject().setProperty("s", engine.newQObject(&world.sorvane));
