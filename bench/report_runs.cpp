@@ -9,11 +9,11 @@
 #include "controls/canvas.h"
 #include "document/ostl_reader.h"
 #include "document/ostl_writer.h"
+#include "export/qt/page_export.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/services.h"
 #include "report/layout_engine.h"
 #include "settings/default_settings.h"
-#include "view/qt/page_export.h"
 
 #include <QApplication>
 #include <QPdfWriter>

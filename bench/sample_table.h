@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "platform/table_grid.h"
+#include "grids/table_grid.h"
 
 namespace pelloric::bench {
 

@@ -12,7 +12,7 @@ install(DIRECTORY "${PROJECT_SOURCE_DIR}/src/" DESTINATION "${CMAKE_INSTALL_INCL
 
 if(TARGET pelloric)
     install(TARGETS pelloric EXPORT PelloricTargets)
-    foreach(room IN ITEMS platform view print controls ui)
+    foreach(room IN ITEMS platform grids tables print export controls ui script)
         install(DIRECTORY "${PROJECT_SOURCE_DIR}/src/${room}/qt/"
             DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/pelloric/${room}/qt"
             FILES_MATCHING PATTERN "*.h")

@@ -5,8 +5,8 @@
 
 #include "fuzz_platform.h"
 
-#include "platform/qt/csv_table.h"
 #include "platform/run_time_error.h"
+#include "tables/qt/csv_table.h"
 
 using namespace pelloric;
 

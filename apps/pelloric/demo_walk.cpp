@@ -6,12 +6,12 @@
 #include "command_line.h"
 #include "controls/qt/sorvane.h"
 #include "demo_window.h"
+#include "export/qt/page_export.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "table_source.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
-#include "view/qt/page_export.h"
 
 #include <QAbstractButton>
 #include <QAction>

@@ -5,11 +5,11 @@
 
 #include "command_line.h"
 #include "controls/qt/kestrane.h"
-#include "platform/qt/csv_table.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "table_source.h"
+#include "tables/qt/csv_table.h"
 #include "ui/qt/icon_set.h"
 
 #include <QCheckBox>

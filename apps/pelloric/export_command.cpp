@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "document/ostl_format.h"
 #include "document/ostl_writer.h"
+#include "export/qt/page_export.h"
 #include "headless.h"
 #include "interruption.h"
 #include "platform/platform.h"
@@ -16,7 +17,6 @@
 #include "report_builder.h"
 #include "report_options.h"
 #include "table_source.h"
-#include "view/qt/page_export.h"
 
 #include <QFileInfo>
 

@@ -5,11 +5,11 @@
 
 #include "controls/canvas.h"
 #include "document/ostl_reader.h"
+#include "grids/table_grid.h"
 #include "platform/automation_object.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
-#include "platform/table_grid.h"
 #include "platform/text_metrics.h"
 #include "print/page_list.h"
 #include "progress_line.h"

@@ -3,18 +3,18 @@
 
 #include "command_line.h"
 #include "commands.h"
-#include "controls/qt/script_host.h"
+#include "grids/qt/held_grid.h"
 #include "headless.h"
 #include "platform/platform.h"
-#include "platform/qt/csv_table.h"
-#include "platform/qt/held_grid.h"
 #include "platform/qt/qt_platform.h"
-#include "platform/qt/sqlite_table.h"
 #include "platform/text_metrics.h"
 #include "print/qt/qt_printing.h"
 #include "report/content_widths.h"
+#include "script/qt/script_host.h"
 #include "settings/default_settings.h"
 #include "table_source.h"
+#include "tables/qt/csv_table.h"
+#include "tables/qt/sqlite_table.h"
 
 #include <memory>
 

@@ -3,6 +3,7 @@
 
 #include "command_line.h"
 #include "commands.h"
+#include "export/qt/pending_files.h"
 #include "headless.h"
 #include "platform/file_bytes.h"
 #include "platform/platform.h"
@@ -11,7 +12,6 @@
 #include "platform/text_codec.h"
 #include "settings/default_settings.h"
 #include "settings/settings_file.h"
-#include "view/qt/pending_files.h"
 
 #include <QFile>
 

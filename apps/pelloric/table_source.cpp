@@ -4,11 +4,11 @@
 #include "table_source.h"
 
 #include "interruption.h"
-#include "platform/qt/csv_table.h"
 #include "platform/qt/qt_text.h"
-#include "platform/qt/sqlite_table.h"
 #include "platform/run_time_error.h"
 #include "progress_line.h"
+#include "tables/qt/csv_table.h"
+#include "tables/qt/sqlite_table.h"
 
 #include <QFile>
 #include <QFileInfo>

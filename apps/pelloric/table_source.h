@@ -4,7 +4,7 @@
 #pragma once
 
 #include "command_line.h"
-#include "platform/table_grid.h"
+#include "grids/table_grid.h"
 
 #include <filesystem>
 

@@ -4,8 +4,8 @@
 #include "report/content_widths.h"
 
 #include "document/cell_lines.h"
+#include "grids/table_grid.h"
 #include "platform/numbers.h"
-#include "platform/table_grid.h"
 #include "platform/text_metrics.h"
 
 #include <algorithm>

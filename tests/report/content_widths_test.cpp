@@ -4,7 +4,7 @@
 #include "report/content_widths.h"
 
 #include "fakes/fake_metrics.h"
-#include "platform/table_grid.h"
+#include "grids/table_grid.h"
 
 #include <gtest/gtest.h>
 

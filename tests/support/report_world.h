@@ -5,7 +5,7 @@
 
 #include "controls/canvas.h"
 #include "fakes/fake_platform.h"
-#include "platform/table_grid.h"
+#include "grids/table_grid.h"
 #include "settings/default_settings.h"
 
 #include <initializer_list>

@@ -6,7 +6,7 @@
 #include "controls/canvas.h"
 #include "controls/messages.h"
 #include "fakes/fake_platform.h"
-#include "platform/table_grid.h"
+#include "grids/table_grid.h"
 #include "settings/default_settings.h"
 #include "support/errors.h"
 

@@ -5,7 +5,7 @@
 
 #include "controls/qt/default_platform.h"
 #include "controls/qt/published_values.h"
-#include "platform/qt/grid_for.h"
+#include "grids/qt/grid_for.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 

@@ -4,9 +4,9 @@
 #include "controls/qt/published_values.h"
 
 #include "controls/qt/script_caller.h"
+#include "grids/qt/grid_for.h"
+#include "grids/qt/held_value.h"
 #include "platform/numbers.h"
-#include "platform/qt/grid_for.h"
-#include "platform/qt/held_value.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 

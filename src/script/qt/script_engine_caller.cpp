@@ -5,8 +5,8 @@
 
 #include "controls/qt/script_caller.h"
 #include "platform/qt/qt_text.h"
-#include "platform/qt/script_object.h"
 #include "platform/run_time_error.h"
+#include "script/qt/script_object.h"
 
 #include <QJSEngine>
 #include <QJSValue>

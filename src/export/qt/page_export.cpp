@@ -1,0 +1,247 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "export/qt/page_export.h"
+
+#include "document/ostl_writer.h"
+#include "document/page_document.h"
+#include "export/qt/exact_page_device.h"
+#include "export/qt/pending_files.h"
+#include "platform/numbers.h"
+#include "platform/qt/qt_drawing_surface.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "view/joined_lines.h"
+#include "view/page_renderer.h"
+
+#include <QBuffer>
+#include <QImage>
+#include <QImageWriter>
+#include <QPageLayout>
+#include <QPainter>
+#include <QPdfWriter>
+#include <QSvgGenerator>
+
+#include <algorithm>
+#include <numeric>
+#include <string>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr double TwipsPerInch = 1440;
+constexpr double InchesPerMetre = 1 / 0.0254;
+
+/// A cosmetic line of a PDF is one pixel of this resolution wide: fine, and seen everywhere.
+constexpr int PdfResolution = 600;
+
+/// Pixels per inch that SVG files count in.
+constexpr int SvgResolution = 96;
+
+constexpr Twips LargestPaper = 288000; ///< 200 inches, which is all that a PDF page can measure
+constexpr double MostPixels = 1U << 28U;
+
+constexpr std::size_t FewestDigits = 3; ///< of the page number in a file's name
+
+void checkPaper(const PageSetup& setup)
+{
+    const auto fits = [](Twips length) { return length > 0 && length <= LargestPaper; };
+    if (!fits(setup.myWidth) || !fits(setup.myHeight))
+        throw RunTimeError(ErrorNumber::Overflow, u"the paper is no size that can be written");
+}
+
+/// The pages to put out, all of which exist.
+std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& options)
+{
+    std::vector<int> pages = options.pages;
+    if (pages.empty()) {
+        pages.resize(static_cast<std::size_t>(
+            std::clamp<int>(document.Totalpages, 0, document.pageCount())));
+        std::iota(pages.begin(), pages.end(), 0);
+    }
+    const auto isMissing = [&](int page) { return !document.hasPage(page); };
+    if (pages.empty() || std::ranges::any_of(pages, isMissing))
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"there is no such page");
+    return pages;
+}
+
+/// The same, each page once.
+std::vector<int> differentPagesOf(const PageDocument& document, const ExportOptions& options)
+{
+    std::vector<int> pages;
+    std::vector<bool> isTaken(static_cast<std::size_t>(document.pageCount()));
+    for (const int page : pagesOf(document, options)) {
+        if (!isTaken[static_cast<std::size_t>(page)])
+            pages.push_back(page);
+        isTaken[static_cast<std::size_t>(page)] = true;
+    }
+    return pages;
+}
+
+void tell(const ExportOptions& options, std::size_t done, std::size_t total)
+{
+    if (options.progress && !options.progress(static_cast<int>(done), static_cast<int>(total)))
+        throw RunTimeError(ErrorNumber::Cancelled);
+}
+
+/// Draws pages of a document on painters.
+class PagePainter {
+public:
+    PagePainter(const PageDocument& document, const PageSetup& setup, QtFonts& fonts)
+        : renderer_(document)
+        , paper_(0, 0, setup.myWidth, setup.myHeight)
+        , fonts_(fonts)
+    {
+    }
+
+    /// @param resolution  of the device: pixels per inch
+    /// @param isWhite     whether the paper is painted white first
+    void paint(int page, QPainter& painter, double resolution, bool isWhite) const
+    {
+        painter.save();
+        painter.scale(resolution / TwipsPerInch, resolution / TwipsPerInch);
+        QtDrawingSurface surface(painter, fonts_, { .page = isWhite ? paper_ : QRectF() });
+        JoinedLines joined(surface);
+        renderer_.replay(page, {}, joined);
+        joined.finish();
+        painter.restore();
+    }
+
+private:
+    PageRenderer renderer_;
+    QRectF paper_;
+    QtFonts& fonts_;
+};
+
+void setUpPdf(QPdfWriter& writer, const PageSetup& setup, const Text& title)
+{
+    const QSizeF points(
+        ExactPageDevice::wholePoints(setup.myWidth), ExactPageDevice::wholePoints(setup.myHeight));
+    const QPageSize size(points, QPageSize::Point, QStringLiteral("Paper"), QPageSize::ExactMatch);
+    writer.setResolution(PdfResolution);
+    writer.setPageLayout(QPageLayout(size, QPageLayout::Portrait, QMarginsF()));
+    writer.setTitle(toQString(title));
+    writer.setCreator(QStringLiteral("Pelloric"));
+}
+
+std::filesystem::path numberedPath(
+    const std::filesystem::path& path, int page, const PageDocument& document)
+{
+    const std::size_t digits = std::max(FewestDigits, std::to_string(document.pageCount()).size());
+    const std::string number = std::to_string(page + 1);
+    std::filesystem::path name = path.stem();
+    name += "-" + std::string(digits - number.size(), '0') + number;
+    name += path.extension();
+    return path.parent_path() / name;
+}
+
+using FileWriter = std::function<bool(int page, QFile& file)>;
+
+/// Writes a file for each page and puts all into place at the end.
+std::vector<std::filesystem::path> exportEach(const PageDocument& document,
+    const ExportOptions& options, const std::filesystem::path& path, const FileWriter& write)
+{
+    const std::vector<int> pages = differentPagesOf(document, options);
+    std::vector<std::filesystem::path> paths;
+    PendingFiles files;
+    for (const int page : pages) {
+        tell(options, paths.size(), pages.size());
+        paths.push_back(pages.size() == 1 ? path : numberedPath(path, page, document));
+        files.write(paths.back(), [&](QFile& file) { return write(page, file); });
+    }
+    tell(options, pages.size(), pages.size());
+    files.putInPlace();
+    return paths;
+}
+
+QSize pixelsOf(const PageSetup& setup, int dpi)
+{
+    const double width = roundHalfEven(setup.myWidth / TwipsPerInch * dpi);
+    const double height = roundHalfEven(setup.myHeight / TwipsPerInch * dpi);
+    if (dpi < 1 || width < 1 || height < 1 || width * height > MostPixels)
+        throw RunTimeError(ErrorNumber::Overflow, u"no image can be made at this resolution");
+    return QSize(roundToInt32(width), roundToInt32(height));
+}
+
+} // namespace
+
+void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fonts,
+    const ExportOptions& options, const std::filesystem::path& path)
+{
+    checkPaper(setup);
+    const std::vector<int> pages = pagesOf(document, options);
+    const PagePainter pagePainter(document, setup, fonts);
+    PendingFiles files;
+    files.write(path, [&](QFile& file) {
+        ExactPageDevice device(file, setup.myWidth, setup.myHeight);
+        QPdfWriter writer(&device);
+        setUpPdf(writer, setup, options.title);
+        QPainter painter;
+        for (std::size_t done = 0; done < pages.size(); ++done) {
+            tell(options, done, pages.size());
+            const bool isReady = done == 0 ? painter.begin(&writer) : writer.newPage();
+            if (!isReady || file.error() != QFileDevice::NoError)
+                return false;
+            pagePainter.paint(pages[done], painter, PdfResolution, false);
+        }
+        tell(options, pages.size(), pages.size());
+        return painter.end();
+    });
+    files.putInPlace();
+}
+
+std::vector<std::filesystem::path> exportPngs(const PageDocument& document, const PageSetup& setup,
+    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path)
+{
+    checkPaper(setup);
+    const PagePainter pagePainter(document, setup, fonts);
+    QImage image(pixelsOf(setup, options.dpi), QImage::Format_RGB32);
+    if (image.isNull())
+        throw RunTimeError(ErrorNumber::Overflow, u"there is no memory for an image this large");
+    const int dotsPerMetre = roundToInt32(options.dpi * InchesPerMetre);
+    image.setDotsPerMeterX(dotsPerMetre);
+    image.setDotsPerMeterY(dotsPerMetre);
+    return exportEach(document, options, path, [&](int page, QFile& file) {
+        image.fill(Qt::white);
+        QPainter painter(&image);
+        pagePainter.paint(page, painter, options.dpi, true);
+        painter.end();
+        // The image library itself tells the world when it cannot write.
+        QBuffer bytes;
+        return QImageWriter(&bytes, "png").write(image)
+            && file.write(bytes.data()) == bytes.data().size();
+    });
+}
+
+std::vector<std::filesystem::path> exportSvg(const PageDocument& document, const PageSetup& setup,
+    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path)
+{
+    checkPaper(setup);
+    const PagePainter pagePainter(document, setup, fonts);
+    const QSizeF size = QSizeF(setup.myWidth, setup.myHeight) * SvgResolution / TwipsPerInch;
+    return exportEach(document, options, path, [&](int page, QFile& file) {
+        QSvgGenerator generator;
+        generator.setOutputDevice(&file);
+        generator.setResolution(SvgResolution);
+        generator.setSize(QSize(roundToInt32(size.width()), roundToInt32(size.height())));
+        generator.setViewBox(QRectF(QPointF(), size));
+        generator.setTitle(toQString(options.title));
+        QPainter painter;
+        if (!painter.begin(&generator))
+            return false;
+        pagePainter.paint(page, painter, SvgResolution, true);
+        return painter.end();
+    });
+}
+
+void exportOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
+    const ExportOptions& options, const std::filesystem::path& path)
+{
+    const auto step = [&](int page, int last) {
+        tell(options, static_cast<std::size_t>(page), static_cast<std::size_t>(last) + 1);
+    };
+    writeOstl(document, setup, encoding, step, path);
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,202 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "grids/qt/sql_view_grid.h"
+
+#include "platform/member_names.h"
+#include "platform/numbers.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+
+#include <QAbstractProxyModel>
+#include <QHeaderView>
+#include <QItemSelectionModel>
+#include <QSqlQueryModel>
+#include <QTableView>
+
+namespace pelloric::qt {
+
+namespace {
+
+enum Member { DataSource, ColumnsMember, Col };
+
+constexpr TextView Names[] = { u"DataSource", u"Columns", u"col" };
+
+enum CollectionMember { Count, Item };
+
+constexpr TextView CollectionNames[] = { u"Count", u"Item" };
+
+enum ColumnMember { Width, Caption };
+
+constexpr TextView ColumnNames[] = { u"Width", u"Caption" };
+
+QTableView& alive(const QPointer<QTableView>& view)
+{
+    if (!view || !view->model())
+        throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid is gone");
+    return *view;
+}
+
+/// One column, pointed at by the collection.
+class Column final : public AutomationObject {
+public:
+    explicit Column(const QPointer<QTableView>& view)
+        : view_(view)
+    {
+    }
+
+    void pointAt(int logical) { logical_ = logical; }
+
+    std::optional<MemberId> findMember(TextView name) override
+    {
+        return findMemberName(ColumnNames, name);
+    }
+
+    const void* memberTable() const override { return ColumnNames; }
+
+    Value get(MemberId member, std::span<const Value>) override
+    {
+        const QTableView& table = alive(view_);
+        if (member == Width)
+            return Value::ofNumber(sectionWidth(*table.horizontalHeader(), logical_));
+        if (member != Caption)
+            refuseMember(ColumnNames, member);
+        title_ = columnTitle(*table.model(), logical_);
+        return Value::ofText(viewOf(title_));
+    }
+
+    void put(MemberId member, std::span<const Value>, const Value& value) override
+    {
+        if (member != Width)
+            refuseMember(ColumnNames, member);
+        const Twips width = roundToInt32(value.toNumber());
+        setSectionWidth(*alive(view_).horizontalHeader(), logical_, width);
+    }
+
+private:
+    const QPointer<QTableView>& view_;
+    int logical_ = 0;
+    QString title_;
+};
+
+} // namespace
+
+/// The columns in the order in which they are seen, counted from 0.
+class SqlViewGrid::Columns final : public AutomationObject {
+public:
+    explicit Columns(const QPointer<QTableView>& view)
+        : view_(view)
+        , column_(view)
+    {
+        take();
+    }
+
+    void take() { map_ = SectionMap::all(*alive(view_).horizontalHeader()); }
+
+    const SectionMap& map() const { return map_; }
+
+    std::optional<MemberId> findMember(TextView name) override
+    {
+        return findMemberName(CollectionNames, name);
+    }
+
+    const void* memberTable() const override { return CollectionNames; }
+
+    Value get(MemberId member, std::span<const Value> arguments) override
+    {
+        if (member == Count)
+            return Value::ofNumber(map_.count());
+        if (member != Item)
+            refuseMember(CollectionNames, member);
+        column_.pointAt(map_.logical(indexArgument(arguments, 0, 0, map_.count() - 1)));
+        return Value::ofObject(column_);
+    }
+
+    void put(MemberId member, std::span<const Value>, const Value&) override
+    {
+        refuseMember(CollectionNames, member);
+    }
+
+private:
+    const QPointer<QTableView>& view_;
+    SectionMap map_;
+    Column column_;
+};
+
+SqlViewGrid::SqlViewGrid(QTableView& view)
+    : view_(&view)
+    , columns_(std::make_unique<Columns>(view_))
+{
+}
+
+SqlViewGrid::~SqlViewGrid() = default;
+
+bool SqlViewGrid::isSqlView(const QTableView& view)
+{
+    const QAbstractItemModel* model = view.model();
+    while (const auto* proxy = qobject_cast<const QAbstractProxyModel*>(model))
+        model = proxy->sourceModel();
+    return qobject_cast<const QSqlQueryModel*>(model) != nullptr;
+}
+
+std::optional<MemberId> SqlViewGrid::findMember(TextView name)
+{
+    return findMemberName(Names, name);
+}
+
+const void* SqlViewGrid::memberTable() const { return Names; }
+
+Value SqlViewGrid::get(MemberId member, std::span<const Value> arguments)
+{
+    switch (member) {
+    case DataSource:
+        return Value::ofRows(takeRows());
+    case ColumnsMember:
+        columns_->take();
+        return arguments.empty() ? Value::ofObject(*columns_) : columns_->get(Item, arguments);
+    case Col:
+        return Value::ofNumber(column());
+    default:
+        refuseMember(Names, member);
+    }
+}
+
+void SqlViewGrid::put(MemberId member, std::span<const Value>, const Value& value)
+{
+    if (member != Col)
+        refuseMember(Names, member);
+    const Value index[] = { value };
+    setColumn(indexArgument(index, 0, 0, columns_->map().count() - 1));
+}
+
+QTableView& SqlViewGrid::view() const { return alive(view_); }
+
+RowSet& SqlViewGrid::takeRows()
+{
+    QTableView& table = view();
+    fetchAll(*table.model(), table.rootIndex());
+    columns_->take();
+    rows_.take(*table.model(), table.rootIndex(), SectionMap::shown(*table.verticalHeader()),
+        columns_->map());
+    return rows_;
+}
+
+int SqlViewGrid::column() const
+{
+    const QModelIndex current = view().currentIndex();
+    return current.isValid() ? view().horizontalHeader()->visualIndex(current.column()) : column_;
+}
+
+/// Moves the current cell within its row and selects nothing.
+void SqlViewGrid::setColumn(int column)
+{
+    QTableView& table = view();
+    column_ = column;
+    const QModelIndex current = table.currentIndex();
+    const QModelIndex next = table.model()->index(
+        current.isValid() ? current.row() : 0, columns_->map().logical(column), table.rootIndex());
+    if (next.isValid())
+        table.selectionModel()->setCurrentIndex(next, QItemSelectionModel::NoUpdate);
+}
+
+} // namespace pelloric::qt

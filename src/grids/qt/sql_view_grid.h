@@ -1,0 +1,51 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "grids/qt/model_row_set.h"
+#include "platform/automation_object.h"
+
+#include <QPointer>
+
+#include <memory>
+
+class QTableView;
+
+namespace pelloric::qt {
+
+/// A table view on an SQL model as a data grid: `DataSource`, `Columns`, `col`.
+///
+/// The record set is the view's model walked in place, in the order and with the filter that the
+/// view shows; its hidden rows are left out. Reading `DataSource` lets the model fetch all its rows
+/// and takes order and rows anew. `Columns` counts from 0, in the order in which columns are seen;
+/// a hidden one has width 0 and is shown when it is given a width.
+class SqlViewGrid final : public AutomationObject {
+public:
+    /// @param view  borrowed; once it is gone, its members are the object-missing error
+    explicit SqlViewGrid(QTableView& view);
+    ~SqlViewGrid() override;
+
+    /// Whether the view's model is an SQL model, or proxies of one.
+    static bool isSqlView(const QTableView& view);
+
+    std::optional<MemberId> findMember(TextView name) override;
+    const void* memberTable() const override;
+    Value get(MemberId member, std::span<const Value> arguments) override;
+    void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
+
+private:
+    class Columns;
+
+    QTableView& view() const;
+    RowSet& takeRows();
+    int column() const;
+    void setColumn(int column);
+
+    QPointer<QTableView> view_;
+    std::unique_ptr<Columns> columns_;
+    ModelRowSet rows_;
+    int column_ = 0; ///< what `col` was set to
+};
+
+} // namespace pelloric::qt

@@ -1,0 +1,101 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "grids/qt/table_view_grid.h"
+
+#include "platform/member_names.h"
+#include "platform/numbers.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+
+#include <QHeaderView>
+#include <QTableView>
+
+namespace pelloric::qt {
+
+namespace {
+
+enum Member { Cols, Rows, ColWidth, TextMatrix };
+
+constexpr TextView Names[] = { u"Cols", u"Rows", u"ColWidth", u"TextMatrix" };
+
+} // namespace
+
+TableViewGrid::TableViewGrid(QTableView& view)
+    : view_(&view)
+{
+    takeMaps();
+}
+
+std::optional<MemberId> TableViewGrid::findMember(TextView name)
+{
+    return findMemberName(Names, name);
+}
+
+const void* TableViewGrid::memberTable() const { return Names; }
+
+Value TableViewGrid::get(MemberId member, std::span<const Value> arguments)
+{
+    switch (member) {
+    case Cols:
+        takeMaps();
+        return Value::ofNumber(columns_.count());
+    case Rows:
+        return Value::ofNumber(rows_.count() + 1);
+    case ColWidth:
+        return Value::ofNumber(sectionWidth(*view().horizontalHeader(), columnOf(arguments, 0)));
+    case TextMatrix: {
+        const int row = indexArgument(arguments, 0, 0, rows_.count());
+        return Value::ofText(cell(row, columnOf(arguments, 1)));
+    }
+    default:
+        refuseMember(Names, member);
+    }
+}
+
+void TableViewGrid::put(MemberId member, std::span<const Value> arguments, const Value& value)
+{
+    if (member != ColWidth)
+        refuseMember(Names, member);
+    const int column = columnOf(arguments, 0);
+    setSectionWidth(*view().horizontalHeader(), column, roundToInt32(value.toNumber()));
+}
+
+QTableView& TableViewGrid::view() const
+{
+    if (!view_ || !view_->model())
+        throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid is gone");
+    return *view_;
+}
+
+void TableViewGrid::takeMaps()
+{
+    QTableView& table = view();
+    fetchAll(*table.model(), table.rootIndex());
+    rows_ = SectionMap::shown(*table.verticalHeader());
+    columns_ = SectionMap::all(*table.horizontalHeader());
+}
+
+int TableViewGrid::columnOf(std::span<const Value> arguments, std::size_t position) const
+{
+    return columns_.logical(indexArgument(arguments, position, 0, columns_.count() - 1));
+}
+
+/// @param row     0 the titles
+/// @param column  the model's
+TextView TableViewGrid::cell(int row, int column)
+{
+    QTableView& table = view();
+    const QAbstractItemModel& model = *table.model();
+    if (row == 0) {
+        title_ = columnTitle(model, column);
+        return viewOf(title_);
+    }
+    const int modelRow = rows_.logical(row - 1);
+    const QModelIndex root = table.rootIndex();
+    if (modelRow >= model.rowCount(root) || column >= model.columnCount(root))
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the grid has lost rows");
+    return text_.of(table, model.index(modelRow, column, root));
+}
+
+} // namespace pelloric::qt

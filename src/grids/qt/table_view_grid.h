@@ -1,0 +1,44 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "grids/qt/cell_text.h"
+#include "grids/qt/view_sections.h"
+#include "platform/automation_object.h"
+
+#include <QPointer>
+
+class QTableView;
+
+namespace pelloric::qt {
+
+/// A table view as a flex grid: `Cols`, `Rows`, `ColWidth`, `TextMatrix`.
+///
+/// Row 0 holds the titles of the horizontal header. Columns stand in the order in which they are
+/// seen, hidden ones with width 0; hidden rows are left out. Reading `Cols` lets the model fetch
+/// all its rows and takes order and rows anew; until then they stay as they were.
+class TableViewGrid final : public AutomationObject {
+public:
+    /// @param view  borrowed; once it is gone, its members are the object-missing error
+    explicit TableViewGrid(QTableView& view);
+
+    std::optional<MemberId> findMember(TextView name) override;
+    const void* memberTable() const override;
+    Value get(MemberId member, std::span<const Value> arguments) override;
+    void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
+
+private:
+    QTableView& view() const;
+    void takeMaps();
+    int columnOf(std::span<const Value> arguments, std::size_t position) const;
+    TextView cell(int row, int column);
+
+    QPointer<QTableView> view_;
+    SectionMap rows_;
+    SectionMap columns_;
+    CellText text_;
+    QString title_;
+};
+
+} // namespace pelloric::qt

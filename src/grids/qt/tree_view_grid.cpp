@@ -1,0 +1,385 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "grids/qt/tree_view_grid.h"
+
+#include "grids/qt/cell_text.h"
+#include "grids/qt/view_sections.h"
+#include "platform/member_names.h"
+#include "platform/numbers.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+
+#include <QHeaderView>
+#include <QListView>
+#include <QPointer>
+#include <QTreeView>
+
+#include <functional>
+#include <vector>
+
+namespace pelloric::qt {
+
+namespace {
+
+enum GridMember { ColumnHeaders, ListItems };
+
+constexpr TextView GridNames[] = { u"ColumnHeaders", u"ListItems" };
+
+enum CollectionMember { Count, Item };
+
+constexpr TextView CollectionNames[] = { u"Count", u"Item" };
+
+enum HeaderMember { HeaderWidth, HeaderText };
+
+constexpr TextView HeaderNames[] = { u"Width", u"Text" };
+
+enum ItemMember { ItemText, SubItems };
+
+constexpr TextView ItemNames[] = { u"Text", u"SubItems" };
+
+/// Tells that the rows of a model are no longer those that were listed.
+class ModelWatch {
+public:
+    /// Watches this model and no other, from now on.
+    void watch(QAbstractItemModel& model)
+    {
+        context_ = std::make_unique<QObject>();
+        isChanged_ = false;
+        const auto change = [this] { isChanged_ = true; };
+        QObject* const context = context_.get();
+        QObject::connect(&model, &QAbstractItemModel::rowsInserted, context, change);
+        QObject::connect(&model, &QAbstractItemModel::rowsRemoved, context, change);
+        QObject::connect(&model, &QAbstractItemModel::rowsMoved, context, change);
+        QObject::connect(&model, &QAbstractItemModel::columnsInserted, context, change);
+        QObject::connect(&model, &QAbstractItemModel::columnsRemoved, context, change);
+        QObject::connect(&model, &QAbstractItemModel::columnsMoved, context, change);
+        QObject::connect(&model, &QAbstractItemModel::layoutChanged, context, change);
+        QObject::connect(&model, &QAbstractItemModel::modelReset, context, change);
+        QObject::connect(&model, &QObject::destroyed, context, change);
+    }
+
+    bool isChanged() const { return isChanged_; }
+
+private:
+    std::unique_ptr<QObject> context_;
+    bool isChanged_ = true;
+};
+
+} // namespace
+
+/// The view, and what was listed of it.
+struct TreeViewGrid::Source {
+    QPointer<QTreeView> tree; ///< null for a list
+    QPointer<QListView> list; ///< null for a tree
+    Twips listWidth = -1; ///< what was put; below 0: the view's own
+    SectionMap columns;
+    std::vector<QModelIndex> rows; ///< the first column of each row
+    ModelWatch watch;
+
+    QAbstractItemView& view() const
+    {
+        QAbstractItemView* const view = tree ? static_cast<QAbstractItemView*>(tree.data()) : list;
+        if (!view || !view->model())
+            throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid is gone");
+        return *view;
+    }
+
+    void takeColumns()
+    {
+        view();
+        columns = tree ? SectionMap::all(*tree->header()) : SectionMap(1);
+    }
+
+    /// The model's number of a column.
+    int logical(int place) const { return tree ? columns.logical(place) : list->modelColumn(); }
+
+    Twips width(int place) const
+    {
+        const QAbstractItemView& shown = view();
+        if (tree)
+            return sectionWidth(*tree->header(), logical(place));
+        return listWidth >= 0 ? listWidth
+                              : twipsOfPixels(shown.viewport()->width(), shown.logicalDpiX());
+    }
+
+    void setWidth(int place, Twips width)
+    {
+        view();
+        if (tree)
+            setSectionWidth(*tree->header(), logical(place), width);
+        else
+            listWidth = width;
+    }
+
+    /// Fetching may move rows, so that all of it is done before the first row is listed.
+    void takeRows()
+    {
+        QAbstractItemView& shown = view();
+        QAbstractItemModel& model = *shown.model();
+        listBelow(shown.rootIndex(), [&](const QModelIndex& parent) { fetchAll(model, parent); });
+        listBelow(shown.rootIndex(), [](const QModelIndex&) {});
+        watch.watch(model);
+    }
+
+    bool isHidden(int row, const QModelIndex& parent) const
+    {
+        return tree ? tree->isRowHidden(row, parent) : list->isRowHidden(row);
+    }
+
+    /// Walks the open branches; a branch that was never opened is never asked for its rows.
+    void listBelow(
+        const QModelIndex& root, const std::function<void(const QModelIndex&)>& beforeBranch)
+    {
+        struct Branch {
+            QPersistentModelIndex parent;
+            int next;
+            int count;
+        };
+        const QAbstractItemModel& model = *view().model();
+        std::vector<Branch> open;
+        const auto enter = [&](const QModelIndex& parent) {
+            beforeBranch(parent);
+            open.push_back({ parent, 0, model.rowCount(parent) });
+        };
+        rows.clear();
+        enter(root);
+        while (!open.empty()) {
+            Branch& branch = open.back();
+            if (branch.next == branch.count) {
+                open.pop_back();
+                continue;
+            }
+            const int row = branch.next++;
+            const QModelIndex index = model.index(row, 0, branch.parent);
+            if (!index.isValid() || isHidden(row, branch.parent))
+                continue;
+            rows.push_back(index);
+            if (tree && tree->isExpanded(index) && model.hasChildren(index))
+                enter(index);
+        }
+    }
+
+    const QModelIndex& row(int place) const
+    {
+        const auto at = static_cast<std::size_t>(place);
+        if (watch.isChanged() || at >= rows.size())
+            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the list has changed");
+        return rows[at];
+    }
+};
+
+/// One column header, pointed at by the collection.
+class TreeViewGrid::Header final : public AutomationObject {
+public:
+    explicit Header(Source& source)
+        : source_(source)
+    {
+    }
+
+    void pointAt(int place) { place_ = place; }
+
+    std::optional<MemberId> findMember(TextView name) override
+    {
+        return findMemberName(HeaderNames, name);
+    }
+
+    const void* memberTable() const override { return HeaderNames; }
+
+    Value get(MemberId member, std::span<const Value>) override
+    {
+        if (member == HeaderWidth)
+            return Value::ofNumber(source_.width(place_));
+        if (member != HeaderText)
+            refuseMember(HeaderNames, member);
+        title_ = columnTitle(*source_.view().model(), source_.logical(place_));
+        return Value::ofText(viewOf(title_));
+    }
+
+    void put(MemberId member, std::span<const Value>, const Value& value) override
+    {
+        if (member != HeaderWidth)
+            refuseMember(HeaderNames, member);
+        source_.setWidth(place_, roundToInt32(value.toNumber()));
+    }
+
+private:
+    Source& source_;
+    int place_ = 0;
+    QString title_;
+};
+
+/// The column headers, counted from 1.
+class TreeViewGrid::Headers final : public AutomationObject {
+public:
+    explicit Headers(Source& source)
+        : source_(source)
+        , header_(source)
+    {
+    }
+
+    std::optional<MemberId> findMember(TextView name) override
+    {
+        return findMemberName(CollectionNames, name);
+    }
+
+    const void* memberTable() const override { return CollectionNames; }
+
+    Value get(MemberId member, std::span<const Value> arguments) override
+    {
+        if (member == Count)
+            return Value::ofNumber(source_.columns.count());
+        if (member != Item)
+            refuseMember(CollectionNames, member);
+        header_.pointAt(indexArgument(arguments, 0, 1, source_.columns.count()) - 1);
+        return Value::ofObject(header_);
+    }
+
+    void put(MemberId member, std::span<const Value>, const Value&) override
+    {
+        refuseMember(CollectionNames, member);
+    }
+
+private:
+    Source& source_;
+    Header header_;
+};
+
+/// One row, pointed at by the collection.
+class TreeViewGrid::ListItem final : public AutomationObject {
+public:
+    explicit ListItem(Source& source)
+        : source_(source)
+    {
+    }
+
+    void pointAt(int place) { place_ = place; }
+
+    std::optional<MemberId> findMember(TextView name) override
+    {
+        return findMemberName(ItemNames, name);
+    }
+
+    const void* memberTable() const override { return ItemNames; }
+
+    Value get(MemberId member, std::span<const Value> arguments) override
+    {
+        if (member == ItemText)
+            return Value::ofText(cell(0));
+        if (member != SubItems)
+            refuseMember(ItemNames, member);
+        return Value::ofText(cell(indexArgument(arguments, 0, 1, source_.columns.count() - 1)));
+    }
+
+    void put(MemberId member, std::span<const Value>, const Value&) override
+    {
+        refuseMember(ItemNames, member);
+    }
+
+private:
+    TextView cell(int column)
+    {
+        const QAbstractItemView& view = source_.view();
+        const QModelIndex& row = source_.row(place_);
+        return text_.of(view, row.siblingAtColumn(source_.logical(column)));
+    }
+
+    Source& source_;
+    int place_ = 0;
+    CellText text_;
+};
+
+/// The rows, counted from 1.
+class TreeViewGrid::Items final : public AutomationObject {
+public:
+    explicit Items(Source& source)
+        : source_(source)
+        , item_(source)
+    {
+    }
+
+    std::optional<MemberId> findMember(TextView name) override
+    {
+        return findMemberName(CollectionNames, name);
+    }
+
+    const void* memberTable() const override { return CollectionNames; }
+
+    Value get(MemberId member, std::span<const Value> arguments) override
+    {
+        const auto count = static_cast<int>(source_.rows.size());
+        if (member == Count)
+            return Value::ofNumber(count);
+        if (member != Item)
+            refuseMember(CollectionNames, member);
+        item_.pointAt(indexArgument(arguments, 0, 1, count) - 1);
+        return Value::ofObject(item_);
+    }
+
+    void put(MemberId member, std::span<const Value>, const Value&) override
+    {
+        refuseMember(CollectionNames, member);
+    }
+
+private:
+    Source& source_;
+    ListItem item_;
+};
+
+TreeViewGrid::TreeViewGrid(QTreeView& view)
+    : TreeViewGrid(std::make_unique<Source>())
+{
+    source_->tree = &view;
+    source_->takeColumns();
+}
+
+TreeViewGrid::TreeViewGrid(QListView& view)
+    : TreeViewGrid(std::make_unique<Source>())
+{
+    source_->list = &view;
+    source_->takeColumns();
+}
+
+TreeViewGrid::TreeViewGrid(std::unique_ptr<Source> source)
+    : source_(std::move(source))
+    , headers_(std::make_unique<Headers>(*source_))
+    , items_(std::make_unique<Items>(*source_))
+{
+}
+
+TreeViewGrid::~TreeViewGrid() = default;
+
+std::optional<MemberId> TreeViewGrid::findMember(TextView name)
+{
+    return findMemberName(GridNames, name);
+}
+
+const void* TreeViewGrid::memberTable() const { return GridNames; }
+
+Value TreeViewGrid::get(MemberId member, std::span<const Value> arguments)
+{
+    switch (member) {
+    case ColumnHeaders:
+        if (!arguments.empty())
+            return headers_->get(Item, arguments);
+        source_->takeColumns();
+        return Value::ofObject(*headers_);
+    case ListItems:
+        if (!arguments.empty()) {
+            if (source_->watch.isChanged())
+                source_->takeRows();
+            return items_->get(Item, arguments);
+        }
+        source_->takeRows();
+        return Value::ofObject(*items_);
+    default:
+        refuseMember(GridNames, member);
+    }
+}
+
+void TreeViewGrid::put(MemberId member, std::span<const Value>, const Value&)
+{
+    refuseMember(GridNames, member);
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,104 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "grids/table_grid.h"
+
+#include "platform/member_names.h"
+#include "platform/numbers.h"
+#include "platform/run_time_error.h"
+
+#include <limits>
+
+namespace pelloric {
+
+namespace {
+
+enum Member { Cols, Rows, ColWidth, TextMatrix };
+
+constexpr TextView Names[] = { u"Cols", u"Rows", u"ColWidth", u"TextMatrix" };
+
+} // namespace
+
+TableGrid::TableGrid(std::vector<TableColumn> columns)
+    : columns_(std::move(columns))
+{
+}
+
+void TableGrid::reserve(std::size_t rows, std::size_t units)
+{
+    store_.reserve(units);
+    rowStarts_.reserve(rows);
+    cellEnds_.reserve(rows * columns_.size());
+}
+
+void TableGrid::addRow(std::span<const TextView> cells)
+{
+    if (cells.size() > columns_.size())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"more cells than columns");
+    std::uint64_t length = 0;
+    for (const TextView cell : cells)
+        length += cell.size();
+    if (length > std::numeric_limits<std::uint32_t>::max())
+        throw RunTimeError(ErrorNumber::Overflow, u"a row is too long");
+
+    rowStarts_.push_back(store_.size());
+    std::uint32_t end = 0;
+    for (const TextView cell : cells) {
+        store_.append(cell);
+        end += static_cast<std::uint32_t>(cell.size());
+        cellEnds_.push_back(end);
+    }
+    cellEnds_.resize(rowStarts_.size() * columns_.size(), end);
+}
+
+const TableColumn& TableGrid::column(int column) const
+{
+    if (column < 0 || column >= columnCount())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    return columns_[static_cast<std::size_t>(column)];
+}
+
+TextView TableGrid::cell(std::int64_t row, int column) const
+{
+    if (row < 0 || row >= rowCount() || column < 0 || column >= columnCount())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    const auto at = static_cast<std::size_t>(row);
+    const std::size_t first = at * columns_.size();
+    const std::size_t cell = first + static_cast<std::size_t>(column);
+    const std::size_t begin = cell == first ? 0 : cellEnds_[cell - 1];
+    return TextView(store_.data() + rowStarts_[at] + begin, cellEnds_[cell] - begin);
+}
+
+std::optional<MemberId> TableGrid::findMember(TextView name) { return findMemberName(Names, name); }
+
+const void* TableGrid::memberTable() const { return Names; }
+
+Value TableGrid::get(MemberId member, std::span<const Value> arguments)
+{
+    const auto rows = static_cast<int>(rowCount());
+    switch (member) {
+    case Cols:
+        return Value::ofNumber(columnCount());
+    case Rows:
+        return Value::ofNumber(rows + 1);
+    case ColWidth:
+        return Value::ofNumber(column(indexArgument(arguments, 0, 0, columnCount() - 1)).width);
+    case TextMatrix: {
+        const int row = indexArgument(arguments, 0, 0, rows);
+        const int at = indexArgument(arguments, 1, 0, columnCount() - 1);
+        return Value::ofText(row == 0 ? TextView(column(at).title) : cell(row - 1, at));
+    }
+    default:
+        refuseMember(Names, member);
+    }
+}
+
+void TableGrid::put(MemberId member, std::span<const Value> arguments, const Value& value)
+{
+    if (member != ColWidth)
+        refuseMember(Names, member);
+    const int at = indexArgument(arguments, 0, 0, columnCount() - 1);
+    columns_[static_cast<std::size_t>(at)].width = roundToInt32(value.toNumber());
+}
+
+} // namespace pelloric

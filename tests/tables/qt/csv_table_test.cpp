@@ -1,0 +1,258 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "tables/qt/csv_table.h"
+
+#include "fakes/temp_folder.h"
+#include "platform/run_time_error.h"
+#include "tables/qt/sqlite_table.h"
+
+#include <QSqlDatabase>
+#include <QSqlQuery>
+
+#include <gtest/gtest.h>
+
+namespace pelloric::qt {
+
+namespace {
+
+/// Titles and cells in one text: cells end in "|", rows in "/".
+Text dump(const TableGrid& grid)
+{
+    Text text;
+    for (int column = 0; column < grid.columnCount(); ++column)
+        text.append(grid.column(column).title).append(u"|");
+    for (std::int64_t row = 0; row < grid.rowCount(); ++row) {
+        text.append(u"/");
+        for (int column = 0; column < grid.columnCount(); ++column)
+            text.append(grid.cell(row, column)).append(u"|");
+    }
+    return text;
+}
+
+/// What reading the bytes as a file of that name gives: the dump, or the error's text.
+std::string read(std::string_view name, std::string_view bytes, const QString& encoding = {})
+{
+    const TempFolder folder;
+    try {
+        return toUtf8(dump(readCsv(folder.write(name, bytes), { .encoding = encoding })));
+    } catch (const RunTimeError& error) {
+        return toUtf8(error.text());
+    }
+}
+
+struct ReadCase {
+    std::string_view name;
+    std::string_view bytes;
+    std::string_view result;
+};
+
+} // namespace
+
+TEST(CsvTable, ReadsTitlesAndCells)
+{
+    const ReadCase cases[] = {
+        { "a.csv", "a,b\n1,2\n", "a|b|/1|2|" },
+        { "no_line_end.csv", "a,b\n1,2", "a|b|/1|2|" },
+        { "crlf.csv", "a,b\r\n1,2\r\n", "a|b|/1|2|" },
+        { "cr.csv", "a,b\r1,2\r", "a|b|/1|2|" },
+        { "quotes.csv", "a,b\n\"x,y\",\"say \"\"hi\"\"\"\n", "a|b|/x,y|say \"hi\"|" },
+        { "line_break.csv", "a,b\n\"x\ny\",2\n", "a|b|/x\ny|2|" },
+        { "empty_lines.csv", "a,b\n\n1,2\n\n\n3,4\n", "a|b|/1|2|/3|4|" },
+        { "short_row.csv", "a,b,c\n1\n", "a|b|c|/1|||" },
+        { "long_row.csv", "a\n1,2,3\n4\n", "a|||/1|2|3|/4|||" },
+        { "titles.csv", "a,b\n", "a|b|" },
+        { "mark.csv",
+            "\xEF\xBB\xBF"
+            "a,b\n1,2\n",
+            "a|b|/1|2|" },
+        { "gb.csv", "\xB3\xC7\xCA\xD0\n\xB1\xB1\xBE\xA9\n", "城市|/北京|" },
+        { "utf8.csv", "城市\n北京\n", "城市|/北京|" },
+        { "tabs.tsv", "a\tb,c\n1\t2\n", "a|b,c|/1|2|" },
+        { "sniffed_tabs.csv", "a\tb\n1\t2\n", "a|b|/1|2|" },
+        { "sniffed_semicolons.csv", "a;b;\"c,d,e,f\"\n1;2,5;3\n", "a|b|c,d,e,f|/1|2,5|3|" },
+        { "empty_cells.tsv", "a\tb\tc\n\t\t3\n", "a|b|c|/||3|" },
+    };
+    for (const ReadCase& row : cases)
+        EXPECT_EQ(read(row.name, row.bytes), row.result) << row.name;
+}
+
+TEST(CsvTable, ReadsUtf16ByItsByteOrderMark)
+{
+    const std::string_view bytes("\xFF\xFE"
+                                 "a\0,\0b\0\n\0\x17\x53\x2C\0"
+                                 "2\0",
+        16);
+    EXPECT_EQ(read("utf16.csv", bytes), "a|b|/北|2|");
+}
+
+TEST(CsvTable, ReadsAnEncodingThatIsAskedFor)
+{
+    EXPECT_EQ(read("latin.csv", "a\n\xE9\n", QStringLiteral("ISO-8859-1")), "a|/é|");
+}
+
+TEST(CsvTable, NamesTheLineOfWhatItCannotRead)
+{
+    const ReadCase cases[] = {
+        { "open_quote.csv", "a,b\n1,2\n3,\"x\ny,4\n",
+            "Type mismatch: line 3: a quoted value that never ends" },
+        { "bad_bytes.csv", "a\n1\n\xFF\xFF\n",
+            "Type mismatch: line 3: bytes that are neither UTF-8 nor GB18030 text; name the "
+            "encoding" },
+        { "cut_gb.csv", "\xB3\xC7\n\xB1\xB1\n\xBE",
+            "Type mismatch: line 3: bytes that are neither UTF-8 nor GB18030 text; name the "
+            "encoding" },
+        { "zero.csv", std::string_view("a\n\"x\ny\"\n\0\n", 10),
+            "Type mismatch: line 4: a zero byte; this is no text file" },
+        { "empty.csv", "", "Type mismatch: the file is empty" },
+        { "blank.csv", "\n\n", "Type mismatch: the file is empty" },
+    };
+    for (const ReadCase& row : cases)
+        EXPECT_EQ(read(row.name, row.bytes), row.result) << row.name;
+    EXPECT_EQ(read("a.csv", "a\n\xE9\n", QStringLiteral("UTF-8")),
+        "Type mismatch: line 2: bytes that are no UTF-8");
+}
+
+TEST(CsvTable, RefusesAnUnknownEncodingAndAMissingFile)
+{
+    EXPECT_EQ(read("a.csv", "a\n", QStringLiteral("no-such")).substr(0, 40),
+        "Type mismatch: unknown encoding no-such;");
+    EXPECT_THROW(readCsv("no_such_file.csv", {}), RunTimeError);
+}
+
+TEST(CsvTable, EndsWhenTheProgressSaysSo)
+{
+    const TempFolder folder;
+    const CsvOptions options { .encoding = {}, .progress = [](double) { return false; } };
+    try {
+        readCsv(folder.write("a.csv", "a\n1\n"), options);
+        FAIL() << "it was read all the same";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(error.number(), ErrorNumber::Cancelled);
+    }
+}
+
+TEST(CsvTable, ReadsEveryRowOfALargeFile)
+{
+    std::string bytes = "n,城市\n";
+    for (int row = 0; row < 50000; ++row)
+        bytes += std::to_string(row) + ",\"北京\"\r\n";
+    const TempFolder folder;
+    const TableGrid grid = readCsv(folder.write("large.csv", bytes), {});
+    ASSERT_EQ(grid.rowCount(), 50000);
+    for (int row = 0; row < 50000; ++row) {
+        ASSERT_EQ(grid.cell(row, 0), TextView(decimal(row)));
+        ASSERT_EQ(grid.cell(row, 1), u"北京");
+    }
+}
+
+namespace {
+
+/// A database with the tables "two words" and "t".
+class SqliteTable : public testing::Test {
+protected:
+    void SetUp() override
+    {
+        {
+            QSqlDatabase database = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), Name);
+            database.setDatabaseName(QString::fromStdString(path().string()));
+            ASSERT_TRUE(database.open());
+            QSqlQuery query(database);
+            for (const char* statement : { "CREATE TABLE t (n INTEGER, x REAL, s TEXT)",
+                     "INSERT INTO t VALUES (9007199254740993, 0.5, '007')",
+                     "INSERT INTO t VALUES (-1, 1e20, NULL)", "CREATE TABLE \"two words\" (a)" })
+                ASSERT_TRUE(query.exec(QString::fromLatin1(statement)));
+        }
+        QSqlDatabase::removeDatabase(Name);
+    }
+
+    std::filesystem::path path() const { return folder_.file("a.db"); }
+
+    std::string read(const QString& table, const QString& query = {}) const
+    {
+        SqliteSource source;
+        source.path = path();
+        source.table = table;
+        source.query = query;
+        try {
+            return toUtf8(dump(readSqlite(source)));
+        } catch (const RunTimeError& error) {
+            return toUtf8(error.text());
+        }
+    }
+
+private:
+    inline static const QString Name = QStringLiteral("making");
+    TempFolder folder_;
+};
+
+} // namespace
+
+TEST_F(SqliteTable, KeepsNumbersAsTheDatabaseGivesThem)
+{
+    EXPECT_EQ(read(QStringLiteral("t")), "n|x|s|/9007199254740993|0.5|007|/-1|1E+20||");
+}
+
+TEST_F(SqliteTable, ReadsTablesWithAnyNameAndQueries)
+{
+    EXPECT_EQ(read(QStringLiteral("two words")), "a|");
+    EXPECT_EQ(read({}, QStringLiteral("SELECT s AS 名称, n + 1 FROM t WHERE n > 0")),
+        "名称|n + 1|/007|9007199254740994|");
+}
+
+TEST_F(SqliteTable, SaysWhichTablesThereAre)
+{
+    EXPECT_EQ(read(QStringLiteral("u")),
+        "Invalid procedure call or argument: no table u; the database has: t, two words");
+    EXPECT_EQ(read({}),
+        "Invalid procedure call or argument: name one of the database's tables: t, two words");
+}
+
+TEST_F(SqliteTable, NeverChangesTheDatabase)
+{
+    const std::string before = TempFolder::bytesOf(path());
+    EXPECT_NE(read({}, QStringLiteral("WITH x AS (SELECT 1) DELETE FROM t")).find("readonly"),
+        std::string::npos);
+    EXPECT_EQ(TempFolder::bytesOf(path()), before);
+}
+
+TEST_F(SqliteTable, RefusesEveryStatementThatIsNoQuery)
+{
+    const std::filesystem::path copy = path().parent_path() / "copy.db";
+    const QString target = QString::fromStdString(copy.string());
+    for (const char* statement : { "VACUUM INTO '%1'", " /* SELECT */ vacuum into '%1'",
+             "-- SELECT\nVACUUM INTO '%1'", "ATTACH DATABASE '%1' AS other" })
+        read({}, QString::fromLatin1(statement).arg(target));
+    EXPECT_FALSE(std::filesystem::exists(copy));
+    EXPECT_EQ(read({}, QStringLiteral("BEGIN")),
+        "Invalid procedure call or argument: the statement is no query; give a SELECT");
+    EXPECT_EQ(read({}, QStringLiteral("SELECT 1; SELECT 2")),
+        "Invalid procedure call or argument: give one statement only");
+    EXPECT_EQ(read({}, QStringLiteral("-- one\n/* two */ values (1)")), "column1|/1|");
+}
+
+TEST_F(SqliteTable, TellsALockedDatabaseFromNone)
+{
+    const QString other = QStringLiteral("other");
+    {
+        QSqlDatabase database = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), other);
+        database.setDatabaseName(QString::fromStdString(path().string()));
+        ASSERT_TRUE(database.open());
+        QSqlQuery query(database);
+        ASSERT_TRUE(query.exec(QStringLiteral("BEGIN EXCLUSIVE")));
+        EXPECT_EQ(
+            read(QStringLiteral("t")), "Invalid procedure call or argument: database is locked");
+    }
+    QSqlDatabase::removeDatabase(other);
+    TempFolder folder;
+    const auto broken = folder.write("b.db", "SQLite format 3" + std::string(2000, 'x'));
+    try {
+        readSqlite({ .path = broken, .table = {}, .query = {} });
+        FAIL() << "it was read all the same";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(
+            toUtf8(error.text()), "Invalid procedure call or argument: this is no SQLite database");
+    }
+}
+
+} // namespace pelloric::qt
