@@ -7,16 +7,18 @@ set(CMAKE_CXX_STANDARD 20)
 set(CMAKE_CXX_STANDARD_REQUIRED ON)
 set(CMAKE_CXX_EXTENSIONS OFF)
 set(CMAKE_POSITION_INDEPENDENT_CODE ON)
-set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
 
-if(NOT CMAKE_BUILD_TYPE AND NOT CMAKE_CONFIGURATION_TYPES)
-    set(CMAKE_BUILD_TYPE RelWithDebInfo CACHE STRING "The kind of build" FORCE)
-endif()
-
-if(NOT CMAKE_CXX_COMPILER_LAUNCHER)
-    find_program(PELLORIC_CCACHE ccache)
-    if(PELLORIC_CCACHE)
-        set(CMAKE_CXX_COMPILER_LAUNCHER "${PELLORIC_CCACHE}")
+# An embedding project chooses these itself.
+if(PROJECT_IS_TOP_LEVEL)
+    set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+    if(NOT CMAKE_BUILD_TYPE AND NOT CMAKE_CONFIGURATION_TYPES)
+        set(CMAKE_BUILD_TYPE RelWithDebInfo CACHE STRING "The kind of build" FORCE)
+    endif()
+    if(NOT CMAKE_CXX_COMPILER_LAUNCHER)
+        find_program(PELLORIC_CCACHE ccache)
+        if(PELLORIC_CCACHE)
+            set(CMAKE_CXX_COMPILER_LAUNCHER "${PELLORIC_CCACHE}")
+        endif()
     endif()
 endif()
 
@@ -32,8 +34,13 @@ if(PELLORIC_BUILD_FUZZERS)
     add_compile_options(-fsanitize=fuzzer-no-link)
 endif()
 
-# Warnings are errors for our own targets only, never for a project that embeds them.
+# Warnings are told to those who work on this project, and are errors in its presets only.
 add_library(pelloric_warnings INTERFACE)
-if(CMAKE_CXX_COMPILER_ID MATCHES "GNU|Clang")
-    target_compile_options(pelloric_warnings INTERFACE -Wall -Wextra -Wconversion -Werror)
+if(PROJECT_IS_TOP_LEVEL AND CMAKE_CXX_COMPILER_ID MATCHES "GNU|Clang")
+    target_compile_options(pelloric_warnings INTERFACE -Wall -Wextra -Wconversion
+        $<$<BOOL:${PELLORIC_WARNINGS_AS_ERRORS}>:-Werror>)
+    # g++ 12 warns at -O3 of copies within a text that overlap, where a text is put before another.
+    if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU" AND CMAKE_CXX_COMPILER_VERSION VERSION_LESS 13)
+        target_compile_options(pelloric_warnings INTERFACE -Wno-restrict)
+    endif()
 endif()
