@@ -7,6 +7,7 @@
 #include "platform/numbers.h"
 #include "platform/row_set.h"
 #include "platform/run_time_error.h"
+#include "platform/text_runs.h"
 
 #include <algorithm>
 
@@ -93,10 +94,19 @@ void Recorder::lineTo(Tpoint end)
 
 void Recorder::printText(TextView text, bool newLine)
 {
-    const Tpoint after = newLine ? Tpoint { 0, sum(point_.y, measured_.lineHeight) }
-                                 : Tpoint { sum(point_.x, textWidth(text)), point_.y };
+    const std::size_t lastLine = text.rfind(u'\n') + 1; // 0 without a line feed
+    const double breaks = static_cast<double>(lineCount(text)) - 1;
+    const Twips lastTop = roundToInt32(point_.y + breaks * measured_.lineHeight);
+    const Tpoint after = newLine
+        ? Tpoint { 0, sum(lastTop, measured_.lineHeight) }
+        : Tpoint { sum(point_.x, measured_.width(text.substr(lastLine))), lastTop };
     record(document_.store().add(text));
     moveTo(after);
+}
+
+Twips Recorder::textWidth(TextView text) const
+{
+    return pelloric::textWidth(longestLineAdvance(text, *measured_.face), measured_.size);
 }
 
 void Recorder::printCentred(TextView text, double x, double width, Twips y)

@@ -52,10 +52,11 @@ public:
     /// @throws RunTimeError SubscriptOutOfRange: the current page does not exist
     void lineTo(Tpoint end);
 
-    /// Records a text at the current point.
+    /// Records a text at the current point; one that holds line feeds is drawn on as many lines,
+    /// each of which begins at the text's x.
     ///
     /// @param newLine  true: the point goes to the start (x 0) of the next line; false: it stays
-    ///                 at the end of the text
+    ///                 at the end of the text's last line
     /// @throws RunTimeError SubscriptOutOfRange: the current page does not exist; Overflow
     void printText(TextView text, bool newLine);
 
@@ -88,8 +89,8 @@ public:
     /// Prints one line whose text lives in the document's store.
     void printStored(const CellLine& line, Tpoint point);
 
-    /// Width of a text in the current font: twips.
-    Twips textWidth(TextView text) const { return measured_.width(text); }
+    /// Width of a text, of its longest line, in the current font: twips.
+    Twips textWidth(TextView text) const;
     /// Height of any text in the current font: twips.
     Twips textHeight() const { return measured_.lineHeight; }
     /// The current font, ready to measure with.

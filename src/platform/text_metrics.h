@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "platform/characters.h"
 #include "platform/text.h"
 #include "platform/units.h"
 
@@ -32,6 +33,22 @@ public:
         return advance >= 0 ? static_cast<double>(advance) : learnAdvance(unit);
     }
 
+    /// Advance of a character, at size 1: twips.
+    double advance(char32_t codePoint)
+    {
+        return codePoint < 0x10000 ? unitAdvance(static_cast<char16_t>(codePoint))
+                                   : pairOf(codePoint).advance;
+    }
+
+    /// What is drawn for a character; `Missing`: no installed face has a glyph for it.
+    CharacterKind kindOf(char32_t codePoint)
+    {
+        if (codePoint >= 0x10000)
+            return pairOf(codePoint).kind;
+        const std::uint8_t kind = (*kinds_)[codePoint];
+        return kind != UnknownKind ? static_cast<CharacterKind>(kind) : learnKind(codePoint);
+    }
+
     /// Advance of the character at `position`, at size 1: twips; moves behind it.
     double nextAdvance(TextView text, std::size_t& position);
 
@@ -46,13 +63,44 @@ protected:
     /// @return  twips at size 1, 0 or more
     virtual double measureAdvance(char32_t codePoint) = 0;
 
+    /// Asks the platform whether the face, or one that fills in for it, has a glyph.
+    virtual bool hasGlyph(char32_t) { return true; }
+
+    /// The kind of a character, found out anew.
+    CharacterKind askKind(char32_t codePoint);
+
 private:
+    /// A character past the first 65536.
+    struct Pair {
+        float advance = 0;
+        CharacterKind kind = CharacterKind::Plain;
+    };
+
+    static constexpr std::uint8_t UnknownKind = 0xFF;
+
     double learnAdvance(char16_t unit);
-    double pairAdvance(char32_t codePoint);
+    CharacterKind learnKind(char32_t codePoint);
+    const Pair& pairOf(char32_t codePoint);
 
     std::unique_ptr<std::array<float, 65536>> advances_; ///< below 0: not asked for yet
-    std::unordered_map<char32_t, float> pairs_;
+    std::unique_ptr<std::array<std::uint8_t, 65536>> kinds_; ///< `UnknownKind`: not asked for yet
+    std::unordered_map<char32_t, Pair> pairs_;
     double lineHeight_;
+};
+
+/// The measures of a face that is really installed, where the kind of a character decides: a tab is
+/// as wide as four blanks, other control characters have no width, and a character that no face has
+/// is as wide as the box that is drawn for it.
+class InstalledFace : public FaceMetrics {
+public:
+    using FaceMetrics::FaceMetrics;
+
+protected:
+    double measureAdvance(char32_t codePoint) final;
+
+    /// Asks the platform for the advance of a glyph.
+    /// @return  twips at size 1; of a missing glyph: of what the face has in its place
+    virtual double glyphAdvance(char32_t codePoint) = 0;
 };
 
 /// Hands out the measures of faces.

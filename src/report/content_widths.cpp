@@ -7,6 +7,7 @@
 #include "grids/table_grid.h"
 #include "platform/numbers.h"
 #include "platform/text_metrics.h"
+#include "platform/text_runs.h"
 
 #include <algorithm>
 #include <cmath>
@@ -23,16 +24,10 @@ constexpr Twips Clearance = 100;
 /// A column narrower than this is not narrowed further to make a table fit: twips.
 constexpr Twips ReadableWidth = 1200;
 
-/// The advance of the longest line of a text at size 1.
-double longestLine(TextView text, FaceMetrics& face)
+/// The advance of the longest line that is printed of a text at size 1.
+double widestLine(TextView text, FaceMetrics& face)
 {
-    double longest = 0;
-    while (!text.empty()) {
-        const TextView line = text.substr(0, text.find(u'\n'));
-        longest = std::max(longest, face.advanceOf(trimmed(line)));
-        text.remove_prefix(std::min(text.size(), line.size() + 1));
-    }
-    return longest;
+    return longestLineAdvance(trimmed(text), face);
 }
 
 /// The row whose text in a column has the most code units.
@@ -52,13 +47,13 @@ std::int64_t longestRow(const TableGrid& grid, int column)
 
 double longestAdvance(const TableGrid& grid, int column, FaceMetrics& face)
 {
-    double longest = longestLine(grid.column(column).title, face);
+    double longest = widestLine(grid.column(column).title, face);
     const std::int64_t rows = grid.rowCount();
     const std::int64_t step = std::max<std::int64_t>(1, (rows + MeasuredRows - 1) / MeasuredRows);
     for (std::int64_t row = 0; row < rows; row += step)
-        longest = std::max(longest, longestLine(grid.cell(row, column), face));
+        longest = std::max(longest, widestLine(grid.cell(row, column), face));
     if (step > 1)
-        longest = std::max(longest, longestLine(grid.cell(longestRow(grid, column), column), face));
+        longest = std::max(longest, widestLine(grid.cell(longestRow(grid, column), column), face));
     return longest;
 }
 

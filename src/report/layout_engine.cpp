@@ -50,7 +50,8 @@ void LayoutEngine::build(ProgressListener& progress)
     const std::int64_t records = source_.rows.recordCount();
     const auto bands = static_cast<std::int64_t>(source_.bands.size());
     for (std::size_t field = 0; field < source_.widths.size(); ++field)
-        titles_.push_back(document_.store().add(source_.rows.fieldName(static_cast<int>(field))));
+        titles_.push_back(document_.store().add(
+            withoutCarriageReturns(source_.rows.fieldName(static_cast<int>(field)))));
     recorder_.setLineAttributes(gridPen(source_.style));
     startBand(0);
     drawHeader();
@@ -127,6 +128,8 @@ void LayoutEngine::drawColumnTitles()
     recorder_.setCurrentY(bottom);
 }
 
+/// A title breaks as a cell does: a typed separator makes it taller, and breaks it only when it
+/// holds a line feed as well.
 void LayoutEngine::drawTitleTexts(Twips top)
 {
     for (const BandColumn& column : columns_) {
@@ -135,12 +138,15 @@ void LayoutEngine::drawTitleTexts(Twips top)
         const TextView title = titles_[static_cast<std::size_t>(column.field)];
         const double left = column.left + Padding;
         const double room = column.width - CellPadding;
-        const Twips width = recorder_.textWidth(title);
+        const MeasuredFont& font = recorder_.measured();
+        const Twips width = font.width(title);
         rowLines_.clear();
-        if (width <= room)
+        if (title.find(u'\n') != TextView::npos)
+            breakText(title, room, font, rowLines_);
+        else if (width <= room)
             rowLines_.push_back({ title, width, true });
         else
-            wrapText(title, room, recorder_.measured(), rowLines_);
+            wrapText(title, room, font, rowLines_);
         recorder_.moveTo({ roundToInt32(left), below(top, Padding) });
         recorder_.printLines(rowLines_, left, column.width);
     }

@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/drawing_surface.h"
+#include "platform/text_runs.h"
 
 #include <algorithm>
 #include <cmath>
@@ -36,14 +37,12 @@ bool mayShow(const TextRecord& text, float size, const ReplayOptions& options)
     if (!options.visible)
         return true;
     const double line = std::abs(size) * LineHeightPerPoint;
-    const TextView units = text.text();
     if (text.pt.y - line > options.visible->bottom)
         return false;
     if (text.pt.y + line >= options.visible->top)
         return true;
-    const auto breaks
-        = static_cast<double>(std::ranges::count(units, u'\n') + std::ranges::count(units, u'\r'));
-    return text.pt.y + line * (breaks + 1) >= options.visible->top;
+    const auto lines = static_cast<double>(lineCount(text.text()));
+    return text.pt.y + line * lines >= options.visible->top;
 }
 
 void drawPicture(const MapLocation& place, DrawingSurface& surface)

@@ -66,6 +66,17 @@ TEST_F(RecorderTest, LeavesThePointAtTheEndOfATextOrAtTheStartOfTheNextLine)
     EXPECT_EQ(recorder.point(), (Tpoint { 90, 266 }));
 }
 
+TEST_F(RecorderTest, LeavesThePointBehindTheLastLineOfATextWithLineFeeds)
+{
+    recorder.moveTo({ 100, 50 });
+    recorder.printText(u"abcd\ne", false);
+    EXPECT_EQ(text(0).Str, u"abcd\ne");
+    EXPECT_EQ(recorder.point(), (Tpoint { 190, 266 }));
+    recorder.printText(u"f\n\ng", true);
+    EXPECT_EQ(recorder.point(), (Tpoint { 0, 266 + 3 * 216 }));
+    EXPECT_EQ(recorder.textWidth(u"ab\ncde"), 3 * 90);
+}
+
 TEST_F(RecorderTest, GivesEveryTextTheFontAndColourOfItsMoment)
 {
     recorder.setTextFont({ u"A", 10, true, false, true, true }, 5);

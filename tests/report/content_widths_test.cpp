@@ -36,6 +36,9 @@ TEST(ContentWidths, FollowTheLongestLineOfTitleOrCells)
     EXPECT_EQ(widthOf(oneColumn(u"12345678", { u"1" })), 8 * CharacterWidth + Spare);
     EXPECT_EQ(widthOf(oneColumn(u"1", { u"12", u"1234567890" })), 10 * CharacterWidth + Spare);
     EXPECT_EQ(widthOf(oneColumn(u"1", { u"12345678\n123" })), 8 * CharacterWidth + Spare);
+    EXPECT_EQ(widthOf(oneColumn(u"Unit\nprice/pc", { u"1" })), 8 * CharacterWidth + Spare);
+    EXPECT_EQ(widthOf(oneColumn(u"1", { u"123\n  12345678" })), 10 * CharacterWidth + Spare)
+        << "blanks inside a cell are printed";
     EXPECT_EQ(widthOf(oneColumn(u"1", { u"汉字汉字" })), 8 * CharacterWidth + Spare);
 }
 

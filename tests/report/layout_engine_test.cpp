@@ -289,6 +289,13 @@ TEST(LayoutEngine, WrapsATitleThatIsTooWideAndCentresOneThatFits)
     EXPECT_EQ(shown, golden("report/titles.txt", shown));
 }
 
+TEST(LayoutEngine, PrintsATitleWithLineFeedsLineByLineAsACellIs)
+{
+    LayoutWorld world;
+    const PageDocument& document = world.build({ { u"Unit\r\nprice", 2000 } }, { { u"1\r\n2" } });
+    EXPECT_EQ(textsOf(document, 0), "Unit|price|1|2");
+}
+
 TEST(LayoutEngine, RemembersWhereTheTitlesWereAskedForUnderAPageHeader)
 {
     LayoutWorld plain;

@@ -9,6 +9,7 @@
 #include <QFontMetricsF>
 #include <QPaintEngine>
 #include <QPainter>
+#include <QPainterPath>
 
 #include <algorithm>
 #include <array>
@@ -62,15 +63,6 @@ bool keepsTexts(const QPainter& painter)
     const QPaintEngine* const engine = painter.paintEngine();
     const auto type = engine ? engine->type() : QPaintEngine::Raster;
     return type == QPaintEngine::Pdf || type == QPaintEngine::SVG || type == QPaintEngine::Picture;
-}
-
-/// Whether a character may be joined to its neighbours or placed on them.
-bool needsShaping(char16_t unit)
-{
-    return (unit >= 0x0300 && unit < 0x0370) || (unit >= 0x0590 && unit < 0x10A0)
-        || (unit >= 0x1780 && unit < 0x18B0) || (unit >= 0x1900 && unit < 0x1CD0)
-        || (unit >= 0x200B && unit < 0x2010) || (unit >= 0xA800 && unit < 0xAC00)
-        || (unit >= 0xD800 && unit < 0xE000) || (unit >= 0xFB1D && unit < 0xFE30);
 }
 
 } // namespace
@@ -182,9 +174,17 @@ bool QtDrawingSurface::printGreeked(TextView text)
     const double em = emOfSize();
     if (!greeked_ || !greeked_->takes(em))
         return false;
-    if (!text.empty() && em > 0)
-        greeked_->add(pointOf(current_), em, text, foreColor_);
-    current_ = { 0, static_cast<Twips>(std::nearbyint(current_.y + em)) };
+    QPointF corner = pointOf(current_);
+    while (true) {
+        const TextView line = text.substr(0, text.find(u'\n'));
+        if (!line.empty() && em > 0)
+            greeked_->add(corner, em, line, foreColor_);
+        corner.ry() += em;
+        if (line.size() == text.size())
+            break;
+        text.remove_prefix(line.size() + 1);
+    }
+    moveBelow(corner.y());
     return true;
 }
 
@@ -193,16 +193,21 @@ void QtDrawingSurface::print(TextView text)
     if (printGreeked(text))
         return;
     takeFont();
-    const double height = face_->lineHeight() / TwipsPerPoint * em_;
-    const double left = current_.x;
+    const double bottom = current_.y + lineHeight() * static_cast<double>(lineCount(text));
     const QRectF& visible = options_.visible;
     const bool isOutside = !visible.isEmpty()
-        && (current_.y > visible.bottom() || current_.y + height < visible.top()
-            || left > visible.right());
+        && (current_.y > visible.bottom() || bottom < visible.top()
+            || current_.x > visible.right());
     if (!isOutside && !text.empty() && em_ > 0)
         drawText(text);
+    moveBelow(bottom);
+}
+
+/// The current point after a text.
+void QtDrawingSurface::moveBelow(double y)
+{
     constexpr double Lowest = std::numeric_limits<Twips>::max();
-    current_ = { 0, static_cast<Twips>(std::min(std::nearbyint(current_.y + height), Lowest)) };
+    current_ = { 0, static_cast<Twips>(std::min(std::nearbyint(y), Lowest)) };
 }
 
 void QtDrawingSurface::picture(TextView filePath, Tpoint topLeft, Tpoint size)
@@ -237,32 +242,40 @@ void QtDrawingSurface::takeFont()
 
 void QtDrawingSurface::drawText(TextView text)
 {
-    const bool isShaped = std::any_of(text.begin(), text.end(), needsShaping);
-    const bool isMeasured = isShaped || !isFontTransparent_;
-    const double width = isMeasured ? face_->advanceOf(text) / TwipsPerPoint * em_ : 0;
+    cutIntoRuns(text, *face_, runs_);
     if (!isFontTransparent_) {
-        const double height = face_->lineHeight() / TwipsPerPoint * em_;
+        const double width = toTwips(longestLineAdvance(text, *face_));
+        const double height = lineHeight() * static_cast<double>(lineCount(text));
         painter_.fillRect(QRectF(current_.x, current_.y, width, height), Qt::white);
     }
-    QFont font = font_;
-    if (isShaped)
-        font.setStyleStrategy(QFont::PreferAntialias);
     setPen(colorOf(foreColor_));
-    painter_.setFont(font);
-    drawRun(text, isShaped ? width : -1);
+    for (const TextRun& run : runs_)
+        drawRun(run);
 }
 
-/// Draws with the top-left corner at the current point.
-/// @param width  what a shaped text has to keep within: twips; below 0: it needs no shaping
-void QtDrawingSurface::drawRun(TextView text, double width)
+void QtDrawingSurface::drawRun(const TextRun& run)
 {
-    const QString string = borrowedString(text);
+    const double top = current_.y + lineHeight() * static_cast<double>(run.line);
+    const QPointF baseline(current_.x + toTwips(run.left), top + toTwips(face_->ascent()));
+    if (run.kind == RunKind::Box)
+        drawBox(run, baseline);
+    else
+        drawGlyphs(run, baseline);
+}
+
+/// A shaped run is squeezed where it would leave its measured width.
+void QtDrawingSurface::drawGlyphs(const TextRun& run, QPointF baseline)
+{
+    const QString string = borrowedString(run.text);
     double squeeze = 1;
-    if (width > 0) {
-        const double shaped = QFontMetricsF(painter_.font()).horizontalAdvance(string) * fontScale_;
-        squeeze = shaped > width ? width / shaped : 1;
+    QFont font = font_;
+    if (run.kind == RunKind::Shaped) {
+        font.setStyleStrategy(QFont::PreferAntialias);
+        const double width = toTwips(run.advance);
+        const double shaped = QFontMetricsF(font).horizontalAdvance(string) * fontScale_;
+        squeeze = shaped > width && width > 0 ? width / shaped : 1;
     }
-    const QPointF baseline(current_.x, current_.y + face_->ascent() / TwipsPerPoint * em_);
+    painter_.setFont(font);
     const bool isScaled = fontScale_ != 1 || squeeze != 1;
     const QTransform before = isScaled ? painter_.transform() : QTransform();
     if (isScaled) {
@@ -276,6 +289,25 @@ void QtDrawingSurface::drawRun(TextView text, double width)
     if (isScaled)
         painter_.setTransform(before);
 }
+
+void QtDrawingSurface::drawBox(const TextRun& run, QPointF baseline)
+{
+    const HollowBox box = hollowBox(toTwips(run.advance), em_);
+    const QRectF outer(QPointF(box.left, box.top), QPointF(box.right, box.bottom));
+    const double stroke = box.stroke;
+    QPainterPath path;
+    path.addRect(outer.translated(baseline));
+    path.addRect(outer.adjusted(stroke, stroke, -stroke, -stroke).translated(baseline));
+    painter_.setRenderHint(QPainter::Antialiasing, true);
+    painter_.fillPath(path, colorOf(foreColor_));
+    painter_.setRenderHint(QPainter::Antialiasing, false);
+}
+
+/// @param advance  at size 1
+double QtDrawingSurface::toTwips(double advance) const { return advance / TwipsPerPoint * em_; }
+
+/// Whole twips, as the current point moves where texts are recorded.
+double QtDrawingSurface::lineHeight() const { return std::nearbyint(toTwips(face_->lineHeight())); }
 
 void QtDrawingSurface::setPen(const QPen& pen)
 {

@@ -5,6 +5,7 @@
 
 #include "platform/drawing_surface.h"
 #include "platform/qt/greeked_texts.h"
+#include "platform/text_runs.h"
 
 #include <QFont>
 #include <QImage>
@@ -12,6 +13,7 @@
 #include <QRectF>
 
 #include <optional>
+#include <vector>
 
 class QPainter;
 
@@ -73,10 +75,15 @@ private:
     };
 
     bool printGreeked(TextView text);
+    void moveBelow(double y);
     double emOfSize() const;
     void takeFont();
     void drawText(TextView text);
-    void drawRun(TextView text, double width);
+    void drawRun(const TextRun& run);
+    void drawGlyphs(const TextRun& run, QPointF baseline);
+    void drawBox(const TextRun& run, QPointF baseline);
+    double toTwips(double advance) const;
+    double lineHeight() const;
     void setPen(const QPen& pen);
     void takeLinePen();
     QPen penOf(Color color) const;
@@ -97,6 +104,7 @@ private:
     QFont font_;
     double em_ = 0; ///< twips
     double fontScale_ = 1; ///< from the font's whole pixels to the em
+    std::vector<TextRun> runs_;
 
     bool isFontTransparent_ = true;
     Color foreColor_ = 0;

@@ -75,7 +75,7 @@ QtFace::QtFace(const QString& family, bool bold, bool italic)
 }
 
 QtFace::QtFace(const QString& family, const QFont& reference)
-    : FaceMetrics(lineHeightOf(reference))
+    : InstalledFace(lineHeightOf(reference))
     , family_(family)
     , reference_(reference)
     , metrics_(reference)
@@ -99,13 +99,13 @@ QFont QtFace::installedFont(int pixels) const
     return plain;
 }
 
-double QtFace::measureAdvance(char32_t codePoint)
+double QtFace::glyphAdvance(char32_t codePoint)
 {
-    const bool isHalfPair = codePoint >= 0xD800 && codePoint < 0xE000;
-    const QString character = isHalfPair ? QString(QChar(QChar::ReplacementCharacter))
-                                         : QString::fromUcs4(&codePoint, 1);
+    const QString character = QString::fromUcs4(&codePoint, 1);
     return metrics_.horizontalAdvance(character) / ReferencePixels * TwipsPerPoint;
 }
+
+bool QtFace::hasGlyph(char32_t codePoint) { return metrics_.inFontUcs4(codePoint); }
 
 QtFonts::QtFonts() = default;
 

@@ -26,7 +26,7 @@ struct FaceKey {
 /// An installed face: its measures, and the fonts that paint it as it was measured.
 ///
 /// Fonts are unhinted, unkerned and unshaped, so that painting keeps to the measured width.
-class QtFace final : public FaceMetrics {
+class QtFace final : public InstalledFace {
 public:
     /// @param family  an installed family
     QtFace(const QString& family, bool bold, bool italic);
@@ -46,7 +46,8 @@ public:
     const QString& family() const { return family_; }
 
 protected:
-    double measureAdvance(char32_t codePoint) override;
+    double glyphAdvance(char32_t codePoint) override;
+    bool hasGlyph(char32_t codePoint) override;
 
 private:
     QtFace(const QString& family, const QFont& reference);
