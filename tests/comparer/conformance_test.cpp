@@ -7,6 +7,7 @@
 
 #include "fakes/temp_folder.h"
 #include "platform/qt/qt_text_codec.h"
+#include "support/test_paths.h"
 
 #include <gtest/gtest.h>
 

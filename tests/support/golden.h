@@ -4,6 +4,7 @@
 #pragma once
 
 #include "fakes/temp_folder.h"
+#include "support/test_paths.h"
 
 #include <cstdlib>
 #include <filesystem>

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "fakes/temp_folder.h"
+#include "support/test_paths.h"
 
 #include <QFile>
 #include <QImage>

@@ -7,6 +7,7 @@
 #include "platform/qt/qt_text.h"
 #include "print/qt/print_test.h"
 #include "settings/default_settings.h"
+#include "support/test_paths.h"
 #include "view/page_renderer.h"
 
 #include <QFile>

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "print/qt/print_test.h"
+#include "support/test_paths.h"
 
 namespace pelloric::qt {
 

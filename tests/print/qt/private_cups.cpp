@@ -3,6 +3,8 @@
 
 #include "print/qt/private_cups.h"
 
+#include "support/test_paths.h"
+
 #include <QDir>
 #include <QElapsedTimer>
 #include <QFile>

@@ -9,6 +9,7 @@
 #include "platform/qt/qt_platform.h"
 #include "script/qt/script_controls.h"
 #include "settings/default_settings.h"
+#include "support/test_paths.h"
 #include "tables/qt/csv_table.h"
 
 #include <QApplication>

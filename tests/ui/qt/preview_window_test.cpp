@@ -11,6 +11,7 @@
 #include "platform/qt/qt_platform.h"
 #include "platform/run_time_error.h"
 #include "settings/default_settings.h"
+#include "support/test_paths.h"
 #include "ui/qt/choice_box.h"
 #include "ui/qt/icon_set.h"
 #include "ui/qt/preview_opener.h"
