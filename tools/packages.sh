@@ -84,6 +84,28 @@ asRoot() {
     fi
 }
 
+# How long to wait for another package manager, and between two tries: seconds.
+LongestLock=${LongestLock:-900}
+LockPause=${LockPause:-5}
+
+# aptGet ARGUMENT...: runs apt-get as root; while another package manager is at work, waits for it.
+aptGet() {
+    local errors status end=$((SECONDS + LongestLock)) told=no
+    errors=$(mktemp)
+    while :; do
+        status=0
+        asRoot env LC_ALL=C DEBIAN_FRONTEND=noninteractive apt-get "$@" 2> "$errors" || status=$?
+        [ "$status" -ne 0 ] && grep -q 'Could not get lock\|Unable to lock\|Unable to acquire' "$errors" &&
+            [ "$SECONDS" -lt "$end" ] || break
+        [ "$told" = yes ] || printf 'Another package manager is at work; waiting for it.\n' >&2
+        told=yes
+        sleep "$LockPause"
+    done
+    cat "$errors" >&2
+    rm -f "$errors"
+    return "$status"
+}
+
 # needPackages GROUP...: installs what is missing of the groups build, test, bench and check.
 needPackages() {
     local group list package missing=()
@@ -98,9 +120,9 @@ needPackages() {
     command -v apt-get > /dev/null 2>&1 ||
         fail "no apt-get here; install these Debian packages or their like: ${missing[*]}"
     printf 'Installing: %s\n' "${missing[*]}"
-    asRoot apt-get update -q || fail "apt-get update failed; is the network there?"
-    asRoot env DEBIAN_FRONTEND=noninteractive apt-get install -q -y --no-install-recommends \
-        "${missing[@]}" || fail "apt-get could not install: ${missing[*]}"
+    aptGet update -q || fail "apt-get update failed; is the network there?"
+    aptGet install -q -y --no-install-recommends "${missing[@]}" ||
+        fail "apt-get could not install: ${missing[*]}"
 }
 
 # configureAndBuild PRESET [TARGET...]: configures the preset and builds it, or only the targets.
