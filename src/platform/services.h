@@ -39,6 +39,15 @@ public:
     /// Lets the messages that are pending run once.
     /// @throws RunTimeError Cancelled: the user asked to end the operation that is under way
     virtual void runOnce() = 0;
+
+    /// Lets windows live while a long operation runs, a few times a second: what waits to be
+    /// painted is painted, and the Escape key and closing a window are taken, which end the
+    /// operation. Other input is refused, and timers wait.
+    ///
+    /// To be called at every step of an operation: between two of its passes it costs next to
+    /// nothing.
+    /// @throws RunTimeError Cancelled: the user asked to end the operation that is under way
+    virtual void keepAlive() { }
 };
 
 /// Date and time, as texts in the user's form.

@@ -55,8 +55,16 @@ public:
             throw RunTimeError(ErrorNumber::Cancelled);
     }
 
+    void keepAlive() override
+    {
+        if (++beats == cancelAtBeat)
+            throw RunTimeError(ErrorNumber::Cancelled);
+    }
+
     int runs = 0;
     int cancelAt = 0; ///< the run in which the user ends the operation; 0: never
+    int beats = 0;
+    int cancelAtBeat = 0; ///< the same for the calls of `keepAlive`
 };
 
 /// A clock that stands still.

@@ -7,6 +7,7 @@
 #include "platform/run_time_error.h"
 
 #include <QApplication>
+#include <QKeyEvent>
 #include <QLocale>
 #include <QMessageBox>
 #include <QStandardPaths>
@@ -18,6 +19,57 @@
 namespace pelloric::qt {
 
 namespace {
+
+constexpr qint64 PassMs = 150; ///< between two passes of a long operation: milliseconds
+
+/// Takes the user's input while a long operation runs: Escape ends the operation, the rest is
+/// refused.
+class BusyInput final : public QObject {
+public:
+    explicit BusyInput(QtMessageLoop& loop)
+        : loop_(loop)
+    {
+        QCoreApplication::instance()->installEventFilter(this);
+    }
+
+    bool eventFilter(QObject*, QEvent* event) override
+    {
+        switch (event->type()) {
+        case QEvent::ShortcutOverride: // taken, so that no shortcut is looked for
+            event->accept();
+            return true;
+        case QEvent::KeyPress:
+            if (static_cast<QKeyEvent*>(event)->key() == Qt::Key_Escape)
+                loop_.cancel();
+            return true;
+        case QEvent::KeyRelease:
+        case QEvent::Shortcut:
+        case QEvent::InputMethod:
+        case QEvent::MouseButtonPress:
+        case QEvent::MouseButtonRelease:
+        case QEvent::MouseButtonDblClick:
+        case QEvent::MouseMove:
+        case QEvent::Wheel:
+        case QEvent::ContextMenu:
+        case QEvent::TouchBegin:
+        case QEvent::TouchUpdate:
+        case QEvent::TouchEnd:
+        case QEvent::TabletPress:
+        case QEvent::TabletMove:
+        case QEvent::TabletRelease:
+        case QEvent::DragEnter:
+        case QEvent::DragMove:
+        case QEvent::Drop:
+        case QEvent::Timer:
+            return true;
+        default:
+            return false;
+        }
+    }
+
+private:
+    QtMessageLoop& loop_;
+};
 
 QMessageBox::Icon boxIcon(MessageIcon icon)
 {
@@ -82,7 +134,35 @@ void QtMessageLoop::runOnce()
 {
     if (QCoreApplication::instance())
         QCoreApplication::processEvents();
-    if (isCancelled_.exchange(false))
+    sincePass_.start();
+    endWhenCancelled();
+}
+
+void QtMessageLoop::keepAlive()
+{
+    if (!sincePass_.isValid())
+        sincePass_.start();
+    if (!isInPass_ && sincePass_.elapsed() >= PassMs)
+        livePass();
+    endWhenCancelled();
+}
+
+/// What waits for the sockets and timers of the host stays waiting; what was posted cannot.
+void QtMessageLoop::livePass()
+{
+    if (QCoreApplication::instance()) {
+        isInPass_ = true;
+        const BusyInput refused(*this);
+        QCoreApplication::processEvents(
+            QEventLoop::ExcludeSocketNotifiers | QEventLoop::X11ExcludeTimers);
+        isInPass_ = false;
+    }
+    sincePass_.start();
+}
+
+void QtMessageLoop::endWhenCancelled()
+{
+    if (isCancelled_.load(std::memory_order_relaxed) && isCancelled_.exchange(false))
         throw RunTimeError(ErrorNumber::Cancelled);
 }
 

@@ -6,6 +6,7 @@
 #include "platform/services.h"
 
 #include <QDateTime>
+#include <QElapsedTimer>
 
 #include <atomic>
 #include <cstdio>
@@ -45,9 +46,15 @@ public:
     void forgetCancel() { isCancelled_ = false; }
 
     void runOnce() override;
+    void keepAlive() override;
 
 private:
+    void endWhenCancelled();
+    void livePass();
+
     std::atomic<bool> isCancelled_ = false;
+    bool isInPass_ = false;
+    QElapsedTimer sincePass_;
     static_assert(std::atomic<bool>::is_always_lock_free);
 };
 
