@@ -7,6 +7,7 @@
 #include "platform/automation_object.h"
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
+#include "platform/services.h"
 #include "report/late_bound_rows.h"
 #include "report/table_row_set.h"
 
@@ -66,6 +67,37 @@ void addColumn(std::vector<PrintedColumn>& columns, const PrintedColumn& column)
 
 std::int32_t wholeNumber(const Value& value) { return roundToInt32(value.toNumber()); }
 
+/// The number of a grid's columns, refused where looking at them would not end.
+std::int32_t columnCount(std::int32_t count)
+{
+    if (count > MostGridColumns)
+        throw RunTimeError(ErrorNumber::Overflow,
+            u"the grid has " + decimal(count) + u" columns, at most " + decimal(MostGridColumns)
+                + u" can be read");
+    return count;
+}
+
+/// Keeps the windows of a request alive while cells are read.
+class Pulse {
+public:
+    explicit Pulse(const GridRequest& request)
+        : loop_(request.loop)
+    {
+    }
+
+    /// To be called for every cell or column.
+    void beat()
+    {
+        constexpr unsigned CellsBetween = 64;
+        if (loop_ != nullptr && ++cells_ % CellsBetween == 0)
+            loop_->keepAlive();
+    }
+
+private:
+    MessageLoop* loop_;
+    unsigned cells_ = 0;
+};
+
 /// Names a field after its title; an empty title gets a name of its own, and a name that is there
 /// already gets the column's number behind it.
 void appendTitle(TableRowSet& table, TextView title, int position)
@@ -106,7 +138,7 @@ public:
         : grid_(grid)
         , colWidth_(memberOf(grid, u"ColWidth"))
         , textMatrix_(memberOf(grid, u"TextMatrix"))
-        , columns_(wholeNumber(getMember(grid, u"Cols")))
+        , columns_(columnCount(wholeNumber(getMember(grid, u"Cols"))))
     {
     }
 
@@ -141,12 +173,15 @@ private:
 GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
 {
     const FlexGrid grid(object);
+    Pulse pulse(request);
     std::vector<PrintedColumn> columns;
     for (int column = 0; column < grid.columns(); ++column) {
+        pulse.beat();
         if (grid.width(column) == DefaultWidthMarker)
             grid.setWidth(column, DefinedWidth);
     }
     for (int column = 0; column < grid.columns(); ++column) {
+        pulse.beat();
         const double width = grid.width(column);
         if (isPrinted(width))
             addColumn(columns, { column, width });
@@ -165,8 +200,10 @@ GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
     for (std::int32_t row = request.startRow; row < rows; ++row) {
         table.addRecord();
         int field = 0;
-        for (const PrintedColumn& column : columns)
+        for (const PrintedColumn& column : columns) {
             table.setLast(field++, grid.cell(row, column.position));
+            pulse.beat();
+        }
     }
     setWidths(result, widthsOf(columns), request);
     GridTableParts::finishTable(result);
@@ -198,20 +235,23 @@ private:
 };
 
 std::vector<PrintedColumn> readHeaders(
-    AutomationObject& object, TableRowSet& table, char16_t decimalSeparator)
+    AutomationObject& object, TableRowSet& table, const GridRequest& request)
 {
     const Collection headers(getMember(object, u"ColumnHeaders").toObject());
+    const int count = columnCount(headers.count());
+    Pulse pulse(request);
     MemberOfItems widthMember(u"Width");
     MemberOfItems textMember(u"Text");
     std::vector<PrintedColumn> columns;
     Text buffer;
-    for (int position = 0; position < headers.count(); ++position) {
+    for (int position = 0; position < count; ++position) {
+        pulse.beat();
         AutomationObject& header = headers.item(position + 1);
         const double width = header.get(widthMember.of(header), {}).toNumber();
         if (!isPrinted(width))
             continue;
         const Value title = header.get(textMember.of(header), {});
-        appendTitle(table, displayText(title, decimalSeparator, buffer), position);
+        appendTitle(table, displayText(title, request.decimalSeparator, buffer), position);
         addColumn(columns, { position, width });
     }
     return columns;
@@ -221,18 +261,20 @@ GridTable readListView(AutomationObject& object, const GridRequest& request)
 {
     GridTable result;
     TableRowSet& table = GridTableParts::newTable(result, request);
-    const auto columns = readHeaders(object, table, request.decimalSeparator);
+    const auto columns = readHeaders(object, table, request);
     if (columns.empty())
         return {};
     const Collection items(getMember(object, u"ListItems").toObject());
     MemberOfItems textMember(u"Text");
     MemberOfItems subItemsMember(u"SubItems");
+    Pulse pulse(request);
     table.reserveRecords(items.count());
     for (int number = 1; number <= items.count(); ++number) {
         AutomationObject& item = items.item(number);
         table.addRecord();
         int field = 0;
         for (const PrintedColumn& column : columns) {
+            pulse.beat();
             const Value position = Value::ofNumber(column.position);
             table.setLast(field++,
                 column.position == 0 ? item.get(textMember.of(item), {})
@@ -245,14 +287,16 @@ GridTable readListView(AutomationObject& object, const GridRequest& request)
 }
 
 /// Selects every column in turn, widens it when it is hidden, and tells its width.
-std::vector<double> readDataColumns(AutomationObject& object)
+std::vector<double> readDataColumns(AutomationObject& object, const GridRequest& request)
 {
     const MemberId columnsMember = memberOf(object, u"Columns");
     const MemberId selected = memberOf(object, u"col");
     MemberOfItems widthMember(u"Width");
     std::vector<double> widths;
-    const int count = Collection(object.get(columnsMember, {}).toObject()).count();
+    Pulse pulse(request);
+    const int count = columnCount(Collection(object.get(columnsMember, {}).toObject()).count());
     for (int position = 0; position < count; ++position) {
+        pulse.beat();
         object.put(selected, {}, Value::ofNumber(position));
         const Collection columns(object.get(columnsMember, {}).toObject());
         AutomationObject& column = columns.item(position);
@@ -267,7 +311,7 @@ std::vector<double> readDataColumns(AutomationObject& object)
 GridTable readDataGrid(AutomationObject& object, const GridRequest& request)
 {
     const MemberId source = memberOf(object, u"DataSource");
-    std::vector<double> widths = readDataColumns(object);
+    std::vector<double> widths = readDataColumns(object, request);
     if (widths.empty())
         return {};
     GridTable result;

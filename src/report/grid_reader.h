@@ -17,6 +17,7 @@ namespace pelloric {
 
 class AutomationObject;
 class LateBoundRows;
+class MessageLoop;
 class TableRowSet;
 
 /// The kinds of grids; decides which members a reader uses.
@@ -26,6 +27,9 @@ enum class PrintObjKind : std::int16_t {
     ListView = 2,
     datagrid = 3
 };
+
+/// A grid of more columns, hidden ones among them, is refused before any of them is looked at.
+inline constexpr std::int32_t MostGridColumns = 1'000'000;
 
 /// What a reader is told.
 struct GridRequest {
@@ -37,6 +41,7 @@ struct GridRequest {
     std::optional<std::span<const double>> keptWidths;
     std::shared_ptr<TextStore> store; ///< where texts are kept that are copied from the grid
     char16_t decimalSeparator = u'.';
+    MessageLoop* loop = nullptr; ///< kept alive while rows are read; null: nothing is
 };
 
 /// What a reader makes of a grid.
@@ -82,7 +87,8 @@ private:
 /// the host's grid.
 /// @throws RunTimeError NoSuchMember: the object is of another kind; SubscriptOutOfRange: kept
 ///         widths for another number of columns, or a data grid with more columns than fields;
-///         Overflow: more than 32767 columns; or the grid's own error
+///         Overflow: more than 32767 printed columns, or more than `MostGridColumns` in all;
+///         Cancelled: by the message loop; or the grid's own error
 GridTable readGrid(AutomationObject& grid, const GridRequest& request);
 
 } // namespace pelloric

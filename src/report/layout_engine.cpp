@@ -40,14 +40,15 @@ LayoutEngine::LayoutEngine(const ReportSource& source, const Platform& platform,
     , document_(document)
     , recorder_(recorder)
     , pageLines_(source.style, source.setup, platform.clock, recorder)
-    , records_(source.rows, source.widths.size(), source.style.GridMerge, platform.decimalSeparator)
+    , records_(source.rows, source.widths.size(), source.bands.size() > 1,
+          platform.decimalSeparator, document.store())
     , cells_(source.widths.size())
 {
 }
 
 void LayoutEngine::build(ProgressListener& progress)
 {
-    const std::int64_t records = source_.rows.recordCount();
+    const std::int64_t records = records_.count();
     const auto bands = static_cast<std::int64_t>(source_.bands.size());
     for (std::size_t field = 0; field < source_.widths.size(); ++field)
         titles_.push_back(document_.store().add(
@@ -57,13 +58,12 @@ void LayoutEngine::build(ProgressListener& progress)
     drawHeader();
     progress.begin(std::max<std::int64_t>(1, records * bands));
     drawColumnTitles();
-    source_.rows.moveFirst();
     platform_.loop.runOnce();
-    while (!source_.rows.isAfterLast()) {
+    for (record_ = 1; record_ <= records; ++record_) {
         progress.advance();
+        platform_.loop.keepAlive();
         ++rowsOnPage_;
         layoutRow();
-        source_.rows.moveNext();
     }
     progress.end();
     const PageSetup& setup = source_.setup;
@@ -166,7 +166,7 @@ void LayoutEngine::layoutRow()
         drawVerticalLines(rowTop, rowBottom);
     if (source_.style.GridHor)
         drawRowLine(rowBottom, pageIsFull);
-    const bool isLastRecord = source_.rows.position() == source_.rows.recordCount();
+    const bool isLastRecord = record_ == records_.count();
     if (pageIsFull)
         breakPage(below(rowBottom, LineGap));
     else if (isLastRecord && band_ + 1 < source_.bands.size())
@@ -179,55 +179,64 @@ void LayoutEngine::layoutRow()
 /// heights of the same rows are known.
 void LayoutEngine::measureRow()
 {
-    records_.readCurrent();
     rowLines_.clear();
     if (band_ > 0 && rowsOnPage_ <= pageRowHeights_.size()) {
-        for (const BandColumn& column : columns_)
-            measureCell(column.field, column.width);
+        measureCells(static_cast<std::size_t>(columns_.front().field), columns_.size());
         rowHeight_ = pageRowHeights_[rowsOnPage_ - 1];
         return;
     }
-    rowHeight_ = 0;
-    for (std::size_t field = 0; field < source_.widths.size(); ++field)
-        rowHeight_
-            = std::max(rowHeight_, measureCell(static_cast<int>(field), source_.widths[field]));
+    rowHeight_ = measureCells(0, source_.widths.size());
     if (source_.bands.size() > 1)
         pageRowHeights_.push_back(rowHeight_);
 }
 
-/// @return  the height that the cell's text needs: twips
-double LayoutEngine::measureCell(int field, double width)
+/// @return  the height that the tallest of the cells needs: twips
+double LayoutEngine::measureCells(std::size_t first, std::size_t count)
 {
+    double tallest = 0;
+    std::size_t field = first;
+    for (RecordCell& cell : records_.read(record_, first, count)) {
+        tallest = std::max(tallest, measureCell(cell, cells_[field], source_.widths[field]));
+        ++field;
+    }
+    return tallest;
+}
+
+/// @return  the height that the cell's text needs: twips
+double LayoutEngine::measureCell(RecordCell& cell, RowCell& row, double width)
+{
+    row.text = cell.text();
+    row.printed = row.text;
+    row.lineCount = 0;
     if (width <= CellPadding)
         return 0;
     const MeasuredFont& font = recorder_.measured();
-    RowCell& cell = cells_[static_cast<std::size_t>(field)];
-    cell.text = readCellText(records_.current(field), font);
-    cell.isStored = records_.isStored(field);
-    cell.lineCount = 0;
-    if (cell.text.hasCarriageReturn) {
-        const Text cleaned = withoutCarriageReturns(cell.text.text);
-        cell.text = readCellText(document_.store().add(cleaned), font);
-        cell.isStored = true;
+    if (!cell.isMeasured) {
+        CellText seen = readCellText(row.text, font);
+        cell.isMeasured = !seen.hasCarriageReturn;
+        if (seen.hasCarriageReturn) {
+            row.printed = document_.store().add(withoutCarriageReturns(row.text));
+            seen = readCellText(row.printed, font);
+        }
+        cell.width = seen.width;
+        cell.hasLineFeed = seen.hasLineFeed;
+        cell.hasSeparator = seen.hasSeparator;
     }
+    row.width = cell.width;
     const double room = width - CellPadding;
-    const bool fits = cell.text.width <= room;
-    if (fits && !cell.text.hasLineFeed && !cell.text.hasSeparator)
+    const bool fits = cell.width <= room;
+    if (fits && !cell.hasLineFeed && !cell.hasSeparator)
         return font.lineHeight;
-    if (!cell.isStored) {
-        cell.text.text = document_.store().add(cell.text.text);
-        cell.isStored = true;
-    }
-    cell.firstLine = rowLines_.size();
-    breakText(cell.text.text, room, font, rowLines_);
-    const auto height = static_cast<double>(rowLines_.size() - cell.firstLine) * font.lineHeight;
-    if (!cell.text.hasLineFeed && cell.text.hasSeparator) {
+    row.firstLine = rowLines_.size();
+    breakText(row.printed, room, font, rowLines_);
+    const auto height = static_cast<double>(rowLines_.size() - row.firstLine) * font.lineHeight;
+    if (!cell.hasLineFeed && cell.hasSeparator) {
         // A typed separator makes the row taller but does not break the printed text.
-        rowLines_.resize(cell.firstLine);
+        rowLines_.resize(row.firstLine);
         if (!fits)
-            wrapText(cell.text.text, room, font, rowLines_);
+            wrapText(row.printed, room, font, rowLines_);
     }
-    cell.lineCount = rowLines_.size() - cell.firstLine;
+    row.lineCount = rowLines_.size() - row.firstLine;
     return height;
 }
 
@@ -250,9 +259,8 @@ void LayoutEngine::printCell(const BandColumn& column, Twips textTop)
         recorder_.printLines(lines.subspan(cell.firstLine, cell.lineCount), left, column.width);
         return;
     }
-    const TextView text = cell.isStored ? cell.text.text : document_.store().add(cell.text.text);
-    const Twips x = roundToInt32(left + (column.width - cell.text.width) / 2);
-    recorder_.printStored({ text, cell.text.width, true }, { x, textTop });
+    const Twips x = roundToInt32(left + (column.width - cell.width) / 2);
+    recorder_.printStored({ cell.printed, cell.width, true }, { x, textTop });
 }
 
 void LayoutEngine::drawVerticalLines(Twips rowTop, Twips rowBottom)
@@ -286,10 +294,12 @@ void LayoutEngine::breakPage(Twips footerTop)
     pageLines_.drawPageFooter(document_.currentPage + 1, footerTop);
     recorder_.newPage();
     startBand((band_ + 1) % source_.bands.size());
-    if (band_ > 0)
-        source_.rows.moveRelative(-static_cast<std::int64_t>(rowsOnPage_));
-    else
+    if (band_ > 0) {
+        record_ -= static_cast<std::int64_t>(rowsOnPage_);
+    } else {
         pageRowHeights_.clear();
+        records_.keepFrom(record_); // the last row of this page stands above the next one
+    }
     rowsOnPage_ = 0;
     drawHeader();
     drawColumnTitles();
@@ -304,19 +314,19 @@ void LayoutEngine::drawLine(Tpoint from, Tpoint to)
 
 /// Whether the cell says the same as the one above or the one to its left; it looks across pages
 /// and bands.
-bool LayoutEngine::isBlankedByMerging(int field) const
+bool LayoutEngine::isBlankedByMerging(int field)
 {
-    return records_.previousEquals(field, records_.current(field)) || equalsLeft(field);
+    return records_.holds(record_ - 1, field, textOf(field)) || equalsLeft(field);
 }
 
-bool LayoutEngine::equalsLeft(int field) const
+bool LayoutEngine::equalsLeft(int field)
 {
-    return field > 0 && records_.current(field - 1) == records_.current(field);
+    return field > 0 && records_.holds(record_, field - 1, textOf(field));
 }
 
-bool LayoutEngine::equalsBelow(int field) const
+bool LayoutEngine::equalsBelow(int field)
 {
-    return records_.nextEquals(field, records_.current(field));
+    return records_.holds(record_ + 1, field, textOf(field));
 }
 
 } // namespace pelloric

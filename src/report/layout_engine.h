@@ -6,7 +6,7 @@
 #include "document/recorder.h"
 #include "report/column_bands.h"
 #include "report/page_fields.h"
-#include "report/record_texts.h"
+#include "report/record_cells.h"
 
 #include <memory>
 #include <span>
@@ -53,7 +53,7 @@ public:
     /// Builds all pages.
     ///
     /// @throws RunTimeError Overflow: more than 32767 pages, or a position past 32 bits; Cancelled:
-    ///         by the message loop's pass before the rows; or an error of the row set
+    ///         by the message loop, before the rows or at any of them; or an error of the row set
     void build(ProgressListener& progress);
 
     /// Where the titles of the last page were asked for, when there is a page header: twips.
@@ -71,10 +71,11 @@ private:
 
     /// A cell of the row that is being placed.
     struct RowCell {
-        CellText text;
+        TextView text; ///< in the document's store
+        TextView printed; ///< without carriage returns
+        Twips width = 0; ///< twips
         std::size_t firstLine = 0; ///< of `rowLines_`
         std::size_t lineCount = 0; ///< 0: a single line that fits
-        bool isStored = false; ///< its text lives in the document's store
     };
 
     void startBand(std::size_t band);
@@ -83,16 +84,18 @@ private:
     void drawTitleTexts(Twips top);
     void layoutRow();
     void measureRow();
-    double measureCell(int field, double width);
+    double measureCells(std::size_t first, std::size_t count);
+    double measureCell(RecordCell& cell, RowCell& row, double width);
     void printRow(Twips rowTop);
     void printCell(const BandColumn& column, Twips textTop);
     void drawVerticalLines(Twips rowTop, Twips rowBottom);
     void drawRowLine(Twips rowBottom, bool pageIsFull);
     void breakPage(Twips footerTop);
     void drawLine(Tpoint from, Tpoint to);
-    bool isBlankedByMerging(int field) const;
-    bool equalsLeft(int field) const;
-    bool equalsBelow(int field) const;
+    TextView textOf(int field) const { return cells_[static_cast<std::size_t>(field)].text; }
+    bool isBlankedByMerging(int field);
+    bool equalsLeft(int field);
+    bool equalsBelow(int field);
 
     ReportSource source_;
     const Platform& platform_;
@@ -109,7 +112,8 @@ private:
     Twips tableLeft_ = 0;
     Twips tableRight_ = 0;
 
-    RecordTexts records_;
+    RecordCells records_;
+    std::int64_t record_ = 1; ///< the one that is being placed, from 1
     std::vector<RowCell> cells_; ///< one per field
     std::vector<CellLine> rowLines_;
     double rowHeight_ = 0; ///< of the texts: twips

@@ -1,72 +1,111 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "report/record_texts.h"
+#include "report/record_cells.h"
+
+#include "document/text_store.h"
+#include "platform/run_time_error.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace pelloric {
 
-RecordTexts::RecordTexts(
-    RowSet& rows, std::size_t fieldCount, bool neighbours, char16_t decimalSeparator)
+namespace {
+
+/// The record that is printed and those beside it never share a slot; a power of two.
+constexpr std::size_t FewestSlots = 4;
+
+} // namespace
+
+RecordCells::RecordCells(RowSet& rows, std::size_t fieldCount, bool keepsPages,
+    char16_t decimalSeparator, TextStore& store, std::size_t mostCells)
     : rows_(rows)
-    , neighbours_(neighbours)
+    , store_(store)
+    , fieldCount_(fieldCount)
+    , mostCells_(mostCells)
+    , count_(rows.recordCount())
+    , keepsPages_(keepsPages)
+    , keepsTexts_(rows.keepsTexts())
     , decimalSeparator_(decimalSeparator)
+    , held_(FewestSlots)
+    , cells_(FewestSlots * fieldCount)
 {
-    for (Record& record : records_) {
-        record.texts.resize(fieldCount);
-        record.stored.resize(fieldCount);
-        record.buffers.resize(fieldCount);
-    }
 }
 
-void RecordTexts::readCurrent()
+std::span<RecordCell> RecordCells::read(std::int64_t position, std::size_t first, std::size_t count)
 {
-    const std::int64_t position = rows_.position();
-    if (!neighbours_) {
-        read(1, position);
-        return;
+    const std::span<RecordCell> cells(cellsOf(position) + first, count);
+    int field = static_cast<int>(first);
+    for (RecordCell& cell : cells) {
+        if (!cell.isRead) {
+            if (rows_.position() != position)
+                rows_.setPosition(position);
+            readCell(cell, field);
+        }
+        ++field;
     }
-    if (at(2).position == position)
-        std::rotate(order_.begin(), order_.begin() + 1, order_.end());
-    for (std::size_t place = 0; place < order_.size(); ++place) {
-        const std::int64_t wanted = position + static_cast<std::int64_t>(place) - 1;
-        if (at(place).position != wanted)
-            read(place, wanted);
-    }
-    rows_.setPosition(position);
+    return cells;
 }
 
-void RecordTexts::read(std::size_t place, std::int64_t position)
+bool RecordCells::holds(std::int64_t position, int field, TextView text)
 {
-    Record& record = records_[order_[place]];
-    record.position = position;
-    if (!exists(position))
-        return;
-    if (neighbours_)
-        rows_.setPosition(position);
-    const bool kept = rows_.keepsTexts();
-    for (std::size_t field = 0; field < record.texts.size(); ++field) {
-        const Value value = rows_.value(static_cast<int>(field));
-        Text& buffer = record.buffers[field];
-        const bool stored = kept && value.kind() == ValueKind::Text;
-        TextView text = displayText(value, decimalSeparator_, buffer);
-        if (!stored && value.kind() == ValueKind::Text)
-            text = buffer.assign(text);
-        record.texts[field] = trimmed(text);
-        record.stored[field] = stored ? 1 : 0;
+    return exists(position)
+        && read(position, static_cast<std::size_t>(field), 1).front().text() == text;
+}
+
+std::size_t RecordCells::slotOf(std::int64_t position) const
+{
+    return static_cast<std::size_t>(position) & (held_.size() - 1);
+}
+
+/// A record that is still wanted gives way only where no more may be kept.
+RecordCell* RecordCells::cellsOf(std::int64_t position)
+{
+    std::size_t slot = slotOf(position);
+    while (held_[slot] != position && keepsPages_ && held_[slot] > 0 && held_[slot] >= keepFrom_
+        && grow())
+        slot = slotOf(position);
+    RecordCell* const cells = cells_.data() + slot * fieldCount_;
+    if (held_[slot] != position) {
+        held_[slot] = position;
+        std::fill_n(cells, fieldCount_, RecordCell {});
     }
+    return cells;
 }
 
-bool RecordTexts::equals(std::size_t place, int field, TextView text) const
+bool RecordCells::grow()
 {
-    const Record& record = at(place);
-    return exists(record.position) && record.texts[static_cast<std::size_t>(field)] == text;
+    const std::size_t slots = held_.size() * 2;
+    if (slots * fieldCount_ > mostCells_)
+        return false;
+    const std::vector<std::int64_t> held = std::exchange(held_, std::vector<std::int64_t>(slots));
+    std::vector<RecordCell> cells(slots * fieldCount_);
+    for (std::size_t slot = 0; slot < held.size(); ++slot) {
+        if (held[slot] == 0)
+            continue;
+        const auto from = cells_.begin() + static_cast<std::ptrdiff_t>(slot * fieldCount_);
+        const std::size_t place = slotOf(held[slot]);
+        held_[place] = held[slot];
+        std::copy_n(
+            from, fieldCount_, cells.begin() + static_cast<std::ptrdiff_t>(place * fieldCount_));
+    }
+    cells_ = std::move(cells);
+    return true;
 }
 
-bool RecordTexts::exists(std::int64_t position) const
+void RecordCells::readCell(RecordCell& cell, int field)
 {
-    return position >= 1 && position <= rows_.recordCount();
+    const Value value = rows_.value(field);
+    const bool isKept = keepsTexts_ && value.kind() == ValueKind::Text;
+    TextView text = trimmed(displayText(value, decimalSeparator_, buffer_));
+    if (!isKept)
+        text = store_.add(text);
+    if (text.size() > 0xFFFFFFFFU)
+        throw RunTimeError(ErrorNumber::Overflow);
+    cell.units = text.data();
+    cell.length = static_cast<std::uint32_t>(text.size());
+    cell.isRead = true;
 }
 
 } // namespace pelloric

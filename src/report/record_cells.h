@@ -5,55 +5,84 @@
 
 #include "platform/row_set.h"
 #include "platform/text.h"
+#include "platform/units.h"
 
-#include <array>
+#include <span>
 #include <vector>
 
 namespace pelloric {
 
-/// The trimmed texts of the record that is being printed, and, where cells are merged, of the
-/// records before and behind it.
-class RecordTexts {
+class TextStore;
+
+/// A cell of a record: its trimmed text, and what a look over it has told.
+struct RecordCell {
+    const char16_t* units = nullptr; ///< in the document's store
+    std::uint32_t length = 0;
+    Twips width = 0; ///< of the whole text, once it is measured: twips
+    bool isRead = false;
+    bool isMeasured = false;
+    bool hasLineFeed = false; ///< once it is measured
+    bool hasSeparator = false; ///< once it is measured: one that somebody typed
+
+    TextView text() const { return { units, length }; }
+};
+
+/// The records around the one that is being printed, each cell of which is read once.
+///
+/// A page of rows that is printed in several bands keeps its records for all of them; how many
+/// cells are kept at most is limited, and those beyond are read again when they are asked for.
+class RecordCells {
 public:
-    /// @param rows        borrowed; its cursor is put back after every look aside
-    /// @param fieldCount  how many fields are read, from the first on
-    /// @param neighbours  whether the records before and behind are read too
-    RecordTexts(RowSet& rows, std::size_t fieldCount, bool neighbours, char16_t decimalSeparator);
+    /// Cells that a page keeps, about 200 MB: pages of 250 rows of 32,767 columns.
+    static constexpr std::size_t MostCells = 8U << 20U;
 
-    /// Reads the record under the row set's cursor; texts handed out before are gone unless the
-    /// row set keeps them.
-    void readCurrent();
+    /// @param rows        borrowed; its cursor goes where something is read
+    /// @param fieldCount  how many fields are printed, from the first on
+    /// @param keepsPages  whether records from `keepFrom` on are kept
+    /// @param store       where texts are kept that the row set only lends; borrowed
+    /// @param mostCells   that are kept
+    RecordCells(RowSet& rows, std::size_t fieldCount, bool keepsPages, char16_t decimalSeparator,
+        TextStore& store, std::size_t mostCells = MostCells);
 
-    /// A trimmed text of the current record; null gives the empty text.
-    TextView current(int field) const { return at(1).texts[static_cast<std::size_t>(field)]; }
+    /// The number of records, as it was at the beginning.
+    std::int64_t count() const { return count_; }
 
-    /// Whether that text lives in the store that row set and document share.
-    bool isStored(int field) const { return at(1).stored[static_cast<std::size_t>(field)] != 0; }
+    /// Whether there is such a record.
+    /// @param position  from 1
+    bool exists(std::int64_t position) const { return position >= 1 && position <= count_; }
 
-    /// Whether the record before exists and holds this text in the field.
-    bool previousEquals(int field, TextView text) const { return equals(0, field, text); }
+    /// The cells of an existing record from one field on, each of them read.
+    ///
+    /// @param first  field from 0
+    /// @param count  of fields
+    /// @return       valid until another record is asked for
+    /// @throws RunTimeError Overflow: a text of 2^32 code units or more; or of the row set
+    std::span<RecordCell> read(std::int64_t position, std::size_t first, std::size_t count);
 
-    /// Whether the record behind exists and holds this text in the field.
-    bool nextEquals(int field, TextView text) const { return equals(2, field, text); }
+    /// Whether a record exists and its cell holds this text; null and the empty text are equal.
+    bool holds(std::int64_t position, int field, TextView text);
+
+    /// Records before this one are not asked for any more.
+    void keepFrom(std::int64_t position) { keepFrom_ = position; }
 
 private:
-    struct Record {
-        std::int64_t position = -1; ///< -1: nothing read
-        std::vector<TextView> texts;
-        std::vector<std::uint8_t> stored;
-        std::vector<Text> buffers; ///< texts of values that the row set does not keep
-    };
-
-    const Record& at(std::size_t place) const { return records_[order_[place]]; }
-    void read(std::size_t place, std::int64_t position);
-    bool equals(std::size_t place, int field, TextView text) const;
-    bool exists(std::int64_t position) const;
+    std::size_t slotOf(std::int64_t position) const;
+    RecordCell* cellsOf(std::int64_t position);
+    bool grow();
+    void readCell(RecordCell& cell, int field);
 
     RowSet& rows_;
-    bool neighbours_;
+    TextStore& store_;
+    std::size_t fieldCount_;
+    std::size_t mostCells_;
+    std::int64_t count_;
+    std::int64_t keepFrom_ = 0;
+    bool keepsPages_;
+    bool keepsTexts_;
     char16_t decimalSeparator_;
-    std::array<Record, 3> records_;
-    std::array<std::size_t, 3> order_ { 0, 1, 2 }; ///< previous, current, next
+    std::vector<std::int64_t> held_; ///< the record in each slot; 0: none
+    std::vector<RecordCell> cells_; ///< slot by slot
+    Text buffer_;
 };
 
 } // namespace pelloric

@@ -9,22 +9,32 @@
 
 namespace pelloric {
 
+namespace {
+
+/// A grid may promise more rows than it has; beyond this room is made as rows come.
+constexpr std::size_t MostReservedCells = 1U << 26U;
+
+} // namespace
+
 TableRowSet::TableRowSet(std::shared_ptr<TextStore> store)
     : store_(std::move(store))
 {
 }
 
-void TableRowSet::appendField(TextView name) { names_.emplace_back(name); }
-
-bool TableRowSet::fieldExists(TextView name) const
+void TableRowSet::appendField(TextView name)
 {
-    return std::find(names_.begin(), names_.end(), name) != names_.end();
+    names_.emplace_back(name);
+    knownNames_.emplace(name);
 }
+
+bool TableRowSet::fieldExists(TextView name) const { return knownNames_.contains(Text(name)); }
 
 void TableRowSet::reserveRecords(std::int64_t records)
 {
-    if (records > 0)
-        cells_.reserve(static_cast<std::size_t>(records) * names_.size());
+    if (records <= 0)
+        return;
+    const std::size_t most = MostReservedCells / std::max<std::size_t>(1, names_.size());
+    cells_.reserve(std::min(static_cast<std::size_t>(records), most) * names_.size());
 }
 
 void TableRowSet::addRecord()

@@ -7,6 +7,7 @@
 #include "platform/row_set.h"
 
 #include <memory>
+#include <unordered_set>
 #include <vector>
 
 namespace pelloric {
@@ -58,6 +59,7 @@ private:
 
     std::shared_ptr<TextStore> store_;
     std::vector<Text> names_;
+    std::unordered_set<Text> knownNames_;
     std::vector<Cell> cells_;
     std::int64_t records_ = 0;
     std::int64_t position_ = 0;

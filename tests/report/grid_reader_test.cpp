@@ -123,6 +123,22 @@ TEST(FlexGridReader, RefusesMoreColumnsThanABandCanNumber)
     EXPECT_EQ(errorOf([&] { readAs(PrintObjKind::MSFlexGrid, grid); }), ErrorNumber::Overflow);
 }
 
+TEST(FlexGridReader, RefusesEndlessColumnsBeforeItLooksAtOne)
+{
+    FakeObject grid;
+    int looks = 0;
+    const auto look = [&](FakeObject::Arguments) {
+        ++looks;
+        return Value::ofNumber(0);
+    };
+    grid.number(u"Cols", 1e9);
+    grid.number(u"Rows", 2);
+    grid.member(u"ColWidth", look);
+    grid.member(u"TextMatrix", look);
+    EXPECT_EQ(errorOf([&] { readGrid(grid, {}); }), ErrorNumber::Overflow);
+    EXPECT_EQ(looks, 0);
+}
+
 TEST(GridReader, KeepsTheWidthsOfAnEarlierBuild)
 {
     TableGrid grid = gridOf({ { u"A", 6000 }, { u"B", 6000 } }, {});

@@ -3,6 +3,8 @@
 
 #include "report/layout_engine.h"
 
+#include "fakes/fake_object.h"
+#include "report/table_row_set.h"
 #include "support/golden.h"
 #include "support/report_world.h"
 #include "support/show_document.h"
@@ -56,7 +58,50 @@ bool hasLine(const PageDocument& document, int page, Tpoint from, Tpoint to)
     return false;
 }
 
+/// Records whose values are counted as they are read.
+class CountedRows : public RowSet {
+public:
+    CountedRows(int fields, std::int64_t records)
+        : names_(static_cast<std::size_t>(fields), u"T")
+        , records_(records)
+    {
+    }
+
+    int fieldCount() const override { return static_cast<int>(names_.size()); }
+    TextView fieldName(int field) const override { return names_[static_cast<std::size_t>(field)]; }
+    std::int64_t recordCount() const override { return records_; }
+    std::int64_t position() const override { return position_; }
+    void setPosition(std::int64_t position) override { position_ = position; }
+    Value value(int field) override
+    {
+        ++reads;
+        text_ = u"r" + decimal(position_) + u"c" + decimal(field);
+        return Value::ofText(text_);
+    }
+
+    std::int64_t reads = 0;
+
+private:
+    std::vector<Text> names_;
+    std::int64_t records_;
+    std::int64_t position_ = 0;
+    Text text_;
+};
+
 } // namespace
+
+TEST(LayoutEngine, ReadsEveryValueOnceHoweverManyBandsThereAre)
+{
+    for (const char16_t* const merge : { u"0", u"1" }) {
+        LayoutWorld world({ { u"GridMerge", merge } });
+        world.canvas.m_PrintObj = PrintObjKind::datagrid;
+        CountedRows rows(40, 200);
+        FakeDataGrid grid(Value::ofRows(rows), std::vector<double>(40, 3000));
+        world.canvas.doPreview(grid);
+        EXPECT_GT(world.canvas.Totalpages(), 40);
+        EXPECT_EQ(rows.reads, 40 * 200);
+    }
+}
 
 TEST(LayoutEngine, CentresATableThatFitsAndRecordsTitlesCellsAndLines)
 {
