@@ -76,6 +76,8 @@ Canvas::Canvas(Platform& platform)
 
 void Canvas::setTotalpages(std::int16_t pages)
 {
+    if (isBusy())
+        return;
     document_.Totalpages = pages;
     notifyView();
 }
@@ -87,6 +89,8 @@ std::int16_t Canvas::Currentpage() const
 
 void Canvas::setCurrentpage(std::int16_t page)
 {
+    if (isBusy())
+        return;
     if (page > document_.Totalpages) {
         platform_.messages.show(messageOf(Notice::NoNextPage));
         return;
@@ -95,9 +99,21 @@ void Canvas::setCurrentpage(std::int16_t page)
     notifyView();
 }
 
+void Canvas::setCurrentX(Twips x)
+{
+    if (!isBusy())
+        recorder_.setCurrentX(x);
+}
+
+void Canvas::setCurrentY(Twips y)
+{
+    if (!isBusy())
+        recorder_.setCurrentY(y);
+}
+
 void Canvas::clear()
 {
-    if (building_)
+    if (isBusy())
         return;
     recorder_.clear();
     endArrangement(view_);
@@ -108,7 +124,7 @@ void Canvas::clear()
 
 void Canvas::newPage()
 {
-    if (building_)
+    if (isBusy())
         return;
     recorder_.newPage();
     unloadSurfaces(view_);
@@ -119,22 +135,23 @@ void Canvas::loadReportStyle() { pelloric::loadReportStyle(style_, page, platfor
 
 void Canvas::doPreview(AutomationObject& grid)
 {
-    if (building_)
+    if (isBusy())
         return;
+    const Shape earlier { page, style_ };
     loadReportStyle();
-    build(grid, true);
+    build(grid, true, earlier);
 }
 
 void Canvas::ReDrawZoom(AutomationObject& grid)
 {
-    if (building_)
+    if (isBusy())
         return;
     if (!table_)
         throw RunTimeError(ErrorNumber::ObjectMissing, u"no report was built yet");
-    build(grid, false);
+    build(grid, false, { page, style_ });
 }
 
-void Canvas::build(AutomationObject& grid, bool takeWidths)
+void Canvas::build(AutomationObject& grid, bool takeWidths, const Shape& earlier)
 {
     const FlagChange building(building_, true);
     bool isBuilt = false;
@@ -142,9 +159,14 @@ void Canvas::build(AutomationObject& grid, bool takeWidths)
         const FlagChange hidden(view_.baseVisible, false);
         notifyView();
         platform_.loop.runOnce();
-        isBuilt = rebuild(grid, takeWidths);
-    } catch (...) {
+        isBuilt = rebuild(grid, takeWidths, earlier);
+    } catch (const RunTimeError& error) {
+        if (error.number() == ErrorNumber::Cancelled)
+            giveBack(earlier);
         notifyView(); // the paper is visible again
+        throw;
+    } catch (...) {
+        notifyView();
         throw;
     }
     if (isBuilt)
@@ -155,7 +177,7 @@ void Canvas::build(AutomationObject& grid, bool takeWidths)
 
 /// Reads the grid and lays it out.
 /// @return  false: no column is printed, and nothing has changed
-bool Canvas::rebuild(AutomationObject& grid, bool takeWidths)
+bool Canvas::rebuild(AutomationObject& grid, bool takeWidths, const Shape& earlier)
 {
     GridRequest request { .kind = m_PrintObj,
         .startRow = platform_.library.MarvenStartRow,
@@ -163,21 +185,24 @@ bool Canvas::rebuild(AutomationObject& grid, bool takeWidths)
         .leftMargin = page.intLeft,
         .keptWidths = {},
         .store = std::make_shared<TextStore>(),
-        .decimalSeparator = platform_.decimalSeparator };
+        .decimalSeparator = platform_.decimalSeparator,
+        .loop = &platform_.loop };
     if (!takeWidths)
         request.keptWidths = table_->ColumnWidths;
     GridTable table = readGrid(grid, request);
     if (table.rows == nullptr)
         return false;
-    PageDocument earlier = std::exchange(document_, document_.cleared());
+    PageDocument earlierDocument = std::exchange(document_, document_.cleared());
     document_.shareStore(request.store);
     const ViewState earlierView = view_;
+    const RecorderState earlierState = recorder_.state();
     try {
         layOut(table);
     } catch (...) {
-        document_ = std::move(earlier);
-        recorder_.documentReplaced();
-        view_ = earlierView;
+        document_ = std::move(earlierDocument);
+        recorder_.restore(earlierState);
+        giveBack(earlier);
+        giveBack(earlierView);
         end();
         throw;
     }
@@ -187,13 +212,30 @@ bool Canvas::rebuild(AutomationObject& grid, bool takeWidths)
     return true;
 }
 
+void Canvas::giveBack(const Shape& shape)
+{
+    page = shape.page;
+    style_ = shape.style;
+}
+
+/// The viewport may have got another size meanwhile.
+void Canvas::giveBack(const ViewState& view)
+{
+    const ViewState present = std::exchange(view_, view);
+    view_.viewportWidth = present.viewportWidth;
+    view_.viewportHeight = present.viewportHeight;
+}
+
+/// Style and paper are those of the beginning, whatever a host writes while messages run.
 void Canvas::layOut(GridTable& table)
 {
+    const ReportStyle style = style_;
+    const PageSetup setup = page;
     const CursorKeeper cursor(*table.rows);
     endArrangement(view_);
     recorder_.moveTo({});
     recorder_.documentReplaced();
-    LayoutEngine engine({ style_, page, *table.rows, table.ColumnWidths, table.ColumnBands },
+    LayoutEngine engine({ style, setup, *table.rows, table.ColumnWidths, table.ColumnBands },
         platform_, document_, recorder_);
     engine.build(*this);
     titleTop_ = engine.titleTop();
@@ -201,19 +243,22 @@ void Canvas::layOut(GridTable& table)
 
 void Canvas::scaleReport(double factor)
 {
-    if (building_)
+    if (isBusy())
         return;
     if (!table_)
         throw RunTimeError(ErrorNumber::ObjectMissing, u"no report was built yet");
+    ColoredFont body = style_.body;
+    body.font.size = static_cast<float>(static_cast<double>(body.font.size) * factor);
+    recorder_.setTextFont(body.font, roundToInt32(body.color));
+    style_.body = std::move(body);
     for (double& width : table_->ColumnWidths)
         width *= factor;
-    float& size = style_.body.font.size;
-    size = static_cast<float>(static_cast<double>(size) * factor);
-    recorder_.setTextFont(style_.body.font, roundToInt32(style_.body.color));
 }
 
 bool Canvas::SaveFile(const std::filesystem::path& path)
 {
+    if (isBusy())
+        return false;
     platform_.loop.runOnce();
     const auto report = [this](int step, int last) {
         progress_ = { true, std::max(1, last), step };
@@ -232,7 +277,7 @@ bool Canvas::SaveFile(const std::filesystem::path& path)
 
 void Canvas::OpenFile(const std::filesystem::path& path)
 {
-    if (building_)
+    if (isBusy())
         return;
     clear();
     openedName_ = pathText(path.stem());
@@ -257,6 +302,9 @@ void Canvas::showFirstPage()
 
 void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrintPageNum)
 {
+    if (isBusy())
+        return;
+    const FlagChange printing(printing_, true);
     PrintJob job { .allPages = bAllPrint,
         .pageList = Text(strPrintRange),
         .copies = nPrintPageNum,
@@ -269,6 +317,8 @@ void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrint
         progress_.value = sent;
         if (observer_ != nullptr)
             observer_->progressChanged();
+        if (sent < progress_.maximum)
+            platform_.loop.keepAlive();
     };
     try {
         pelloric::doPrint(document_, job, recorder_.textFont(), platform_.printer);
@@ -281,11 +331,15 @@ void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrint
 
 void Canvas::printPage(std::int16_t number)
 {
+    if (isBusy())
+        return;
     pelloric::printPage(document_, number - 1, recorder_.textFont(), platform_.printer);
 }
 
 void Canvas::setPaper(TextView name)
 {
+    if (isBusy())
+        return;
     if (!applyPaperName(name, page, view_.portrait)) {
         platform_.messages.show(messageOf(Notice::UnknownPaper));
         return;
@@ -305,12 +359,19 @@ void Canvas::showPage()
 
 void Canvas::showAllPage()
 {
-    changeView([&] { pelloric::showAllPage(view_, facts(), platform_.loop); });
+    changeView([this] {
+        platform_.loop.runOnce();
+        pelloric::showAllPage(view_, facts()); // what there is after the messages
+    });
 }
 
 void Canvas::showMuliPage(std::int16_t nPages)
 {
-    changeView([&] { pelloric::showMuliPage(view_, facts(), nPages, platform_.loop); });
+    changeView([&] {
+        const OrderStyle style = fitMuliPage(view_, facts(), nPages);
+        platform_.loop.runOnce();
+        placeMuliPage(view_, facts(), style); // what there is after the messages
+    });
 }
 
 void Canvas::SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage)
@@ -335,6 +396,8 @@ void Canvas::setDispScale(float scale)
 
 void Canvas::setVerticalDir(bool portrait)
 {
+    if (isBusy())
+        return;
     changeView([&] { pelloric::setVerticalDir(view_, style_, page, facts(), portrait); });
 }
 

@@ -48,7 +48,8 @@ public:
 ///
 /// Members throw `RunTimeError`; the control that publishes them turns it into a message box. What
 /// a member had changed by then stays, and the observer is told of it all the same. While a build
-/// runs, members that would change the document are refused without a word.
+/// or a print job runs, messages may run; members that would change, save or print the document
+/// then are refused without a word.
 class Canvas : private ProgressListener {
 public:
     /// @param platform  outlives the canvas
@@ -76,8 +77,8 @@ public:
 
     Twips CurrentX() const { return recorder_.currentX(); }
     Twips CurrentY() const { return recorder_.currentY(); }
-    void setCurrentX(Twips x) { recorder_.setCurrentX(x); }
-    void setCurrentY(Twips y) { recorder_.setCurrentY(y); }
+    void setCurrentX(Twips x);
+    void setCurrentY(Twips y);
 
     /// Empties the document.
     void clear();
@@ -91,7 +92,8 @@ public:
 
     /// Builds the pages from a grid with the settings as they are now, and shows page 1.
     ///
-    /// A build that ends early leaves the document as it was.
+    /// A build that ends early leaves the document as it was. One that the user ends, or whose
+    /// layout fails, gives paper, margins and style back, too.
     /// @throws RunTimeError of the settings file, the grid, the layout, or Cancelled
     void doPreview(AutomationObject& grid);
 
@@ -101,14 +103,15 @@ public:
     void ReDrawZoom(AutomationObject& grid);
 
     /// Makes column widths and body font a tenth smaller; the caller rebuilds the pages.
-    /// @throws RunTimeError ObjectMissing: nothing was built yet
+    /// @throws RunTimeError ObjectMissing: nothing was built yet; Overflow: as `Maximum`
     void Minimum() { scaleReport(0.9); }
     /// Makes column widths and body font a tenth larger; the caller rebuilds the pages.
-    /// @throws RunTimeError ObjectMissing: nothing was built yet
+    /// @throws RunTimeError ObjectMissing: nothing was built yet; Overflow: a line of the font
+    ///         would be higher than 32 bits of twips, and nothing has changed
     void Maximum() { scaleReport(1.1); }
 
     /// Writes the document to a file; what fails is skipped, and what was there stays then.
-    /// @return  whether the file was written
+    /// @return  whether the file was written; false also while a build or a print job runs
     bool SaveFile(const std::filesystem::path& path);
     /// Replaces the document by a file's content and shows page 1; a file of another form shows a
     /// message and leaves the canvas cleared.
@@ -168,17 +171,28 @@ public:
     const GridTable* table() const { return table_ ? &*table_ : nullptr; }
     PageFacts facts() const { return pageFactsOf(page, document_); }
     bool isBuilding() const { return building_; }
+    bool isPrinting() const { return printing_; }
+    /// Whether the document is being built or printed.
+    bool isBusy() const { return building_ || printing_; }
     /// Where the titles of the last page were asked for under a page header: twips.
     double titleTop() const { return titleTop_; }
     Platform& platform() { return platform_; }
 
 private:
+    /// What shapes a report, as it was before a build.
+    struct Shape {
+        PageSetup page;
+        ReportStyle style;
+    };
+
     void begin(std::int64_t maximum) override;
     void advance() override;
     void end() override;
 
-    void build(AutomationObject& grid, bool takeWidths);
-    bool rebuild(AutomationObject& grid, bool takeWidths);
+    void build(AutomationObject& grid, bool takeWidths, const Shape& earlier);
+    bool rebuild(AutomationObject& grid, bool takeWidths, const Shape& earlier);
+    void giveBack(const Shape& shape);
+    void giveBack(const ViewState& view);
     void layOut(GridTable& table);
     void showFirstPage();
     void scaleReport(double factor);
@@ -199,6 +213,7 @@ private:
     Text openedName_; ///< of the file that the document was opened from
     double titleTop_ = 0;
     bool building_ = false;
+    bool printing_ = false;
 };
 
 } // namespace pelloric

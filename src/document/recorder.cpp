@@ -10,6 +10,7 @@
 #include "platform/text_runs.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace pelloric {
 
@@ -50,6 +51,14 @@ void Recorder::documentReplaced()
     setTextFont(style_.font, style_.color);
 }
 
+void Recorder::restore(const RecorderState& state)
+{
+    pen_ = state.pen;
+    style_ = state.style;
+    documentReplaced();
+    moveTo(state.point);
+}
+
 void Recorder::newPage()
 {
     document_.newPage();
@@ -67,10 +76,12 @@ void Recorder::setLineAttributes(const LinePen& pen)
 
 void Recorder::setTextFont(const Font& font, Color color)
 {
-    style_ = { font, color };
-    styleNumber_ = document_.styleNumber(style_);
     FaceMetrics& face = metrics_.face(font.name, font.bold, font.italic);
-    measured_ = { &face, font.size, pelloric::textHeight(face, font.size) };
+    const MeasuredFont measured { &face, font.size, pelloric::textHeight(face, font.size) };
+    TextStyle style { font, color };
+    styleNumber_ = document_.styleNumber(style);
+    style_ = std::move(style);
+    measured_ = measured;
     applyTextFont();
 }
 

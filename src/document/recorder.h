@@ -12,6 +12,13 @@ class DrawingSurface;
 class RowSet;
 class TextMetrics;
 
+/// What a recorder draws with and where: an operation that fails gives it back.
+struct RecorderState {
+    LinePen pen;
+    TextStyle style;
+    Tpoint point; ///< twips
+};
+
 /// Draws on the page that is being built: every operation appends a record to the current page
 /// and moves the current point, which holds whole twips.
 ///
@@ -32,11 +39,18 @@ public:
     /// To be called when the document was replaced as a whole.
     void documentReplaced();
 
+    /// Pen, font, colour and current point.
+    RecorderState state() const { return { pen_, style_, point_ }; }
+    /// Takes them back, also after the document was replaced as a whole.
+    void restore(const RecorderState& state);
+
     /// Adds a page; the current point goes to (0, 0).
     /// @throws RunTimeError Overflow: more than 32767 pages
     void newPage();
 
     void setLineAttributes(const LinePen& pen);
+    /// @throws RunTimeError Overflow: a line of that size is higher than 32 bits of twips; nothing
+    ///         has changed
     void setTextFont(const Font& font, Color color);
     const Font& textFont() const { return style_.font; }
     Color textColor() const { return style_.color; }

@@ -5,7 +5,6 @@
 
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
-#include "platform/services.h"
 #include "report/report_style.h"
 
 #include <algorithm>
@@ -208,9 +207,8 @@ void showPage(ViewState& view, const PageFacts& facts)
     placeSurfaces(view, facts);
 }
 
-void showAllPage(ViewState& view, const PageFacts& facts, MessageLoop& loop)
+void showAllPage(ViewState& view, const PageFacts& facts)
 {
-    loop.runOnce();
     view.style = OrderStyle::Multiple;
     takeGrid(view, facts);
     fitGrid(view, facts);
@@ -220,14 +218,19 @@ void showAllPage(ViewState& view, const PageFacts& facts, MessageLoop& loop)
     layOutAgain(view, facts);
 }
 
-void showMuliPage(ViewState& view, const PageFacts& facts, std::int16_t pages, MessageLoop& loop)
+OrderStyle fitMuliPage(ViewState& view, const PageFacts& facts, std::int16_t pages)
 {
     view.style = styleOf(pages, view.style);
     takeGrid(view, facts);
     fitGrid(view, facts);
-    const OrderStyle style = view.style;
-    loop.runOnce();
-    view.style = style; // a paint meanwhile goes through `showPage`, which ends the mode
+    return view.style;
+}
+
+void placeMuliPage(ViewState& view, const PageFacts& facts, OrderStyle style)
+{
+    view.style = style;
+    takeInnerSize(view);
+    takeGrid(view, facts);
     loadSurfaces(view, facts, view.window.nPages);
     layOutAgain(view, facts);
 }

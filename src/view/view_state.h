@@ -11,7 +11,6 @@
 
 namespace pelloric {
 
-class MessageLoop;
 struct ReportStyle;
 
 /// A scroll bar; its minimum is always 0 and one step is 100 page twips.
@@ -88,16 +87,22 @@ void showWholePage(ViewState& view, const PageFacts& facts);
 void showPage(ViewState& view, const PageFacts& facts);
 
 /// Shows all pages, as many beside each other as fit across.
-/// @param loop  runs once, first
-/// @throws RunTimeError as `fittingDivisor` and `layOutAgain`, and what the loop throws
-void showAllPage(ViewState& view, const PageFacts& facts, MessageLoop& loop);
+/// @throws RunTimeError as `fittingDivisor` and `layOutAgain`
+void showAllPage(ViewState& view, const PageFacts& facts);
 
-/// Shows the page window.
+/// Takes the mode of a page window and fits its grid into the viewport; `placeMuliPage` follows,
+/// and messages may run in between.
 /// @param pages  2, 4 or 6; any other number keeps the mode in force. How many surfaces there are
 ///               is the window's affair.
-/// @param loop   runs once, after fitting
-/// @throws RunTimeError as `fittingDivisor` and `layOutAgain`, and what the loop throws
-void showMuliPage(ViewState& view, const PageFacts& facts, std::int16_t pages, MessageLoop& loop);
+/// @return       the mode, for `placeMuliPage`
+/// @throws RunTimeError as `fittingDivisor`
+OrderStyle fitMuliPage(ViewState& view, const PageFacts& facts, std::int16_t pages);
+
+/// Shows the page window at the scale in force.
+/// @param facts  as they are now
+/// @param style  the mode; a paint since `fitMuliPage` has ended it
+/// @throws RunTimeError as `layOutAgain`
+void placeMuliPage(ViewState& view, const PageFacts& facts, OrderStyle style);
 
 /// Stores the page window as it is given; shows nothing by itself.
 void setShowStyle(

@@ -76,6 +76,20 @@ public:
 };
 
 struct CanvasTest : ::testing::Test, ReportWorld {
+    /// A canvas of its own whose message-loop passes a host uses.
+    struct Busy {
+        explicit Busy(FakePlatform& world)
+            : platform { world.metrics, world.codec, world.messages, loop, world.clock,
+                world.folders, world.printer, world.printers, world.library }
+            , canvas(platform)
+        {
+        }
+
+        BusyLoop loop;
+        Platform platform;
+        Canvas canvas;
+    };
+
     TableGrid small() { return gridOf({ { u"A", 1000 }, { u"B", 1000 } }, numberedRows(3, 2)); }
 
     Observer observer { canvas };
@@ -398,6 +412,235 @@ TEST_F(CanvasTest, KeepsTheDocumentOfABuildFromItsHostWhileItRuns)
     other.doPreview(grid);
     EXPECT_EQ(textsOf(other.document(), 0), "title|row");
     EXPECT_EQ(other.Totalpages(), 1);
+}
+
+TEST_F(CanvasTest, IsNeitherSavedNorPrintedWhileItBuilds)
+{
+    Busy busy(*this);
+    TableGrid grid = gridOf({ { u"title", 1000 } }, { { u"row" } });
+    const auto path = folder.file("half.ostl");
+    int passes = 0;
+    busy.loop.action = [&] {
+        ++passes;
+        EXPECT_FALSE(busy.canvas.SaveFile(path));
+        busy.canvas.doPrint(true, u"", 1);
+        busy.canvas.printPage(1);
+    };
+    busy.canvas.doPreview(grid);
+    EXPECT_EQ(passes, 2);
+    EXPECT_FALSE(std::filesystem::exists(path));
+    EXPECT_EQ(printer.log(), "");
+    busy.loop.action = nullptr;
+    EXPECT_TRUE(busy.canvas.SaveFile(path));
+}
+
+TEST_F(CanvasTest, LaysOutWithThePaperOfTheBeginningWhateverTheHostWritesMeanwhile)
+{
+    Busy busy(*this);
+    TableGrid grid = gridOf({ { u"A", 1000 } }, numberedRows(200, 1));
+    busy.canvas.doPreview(grid);
+    const std::string before = showDocument(busy.canvas.document());
+    int pass = 0;
+    busy.loop.action = [&] {
+        if (++pass < 2)
+            return;
+        busy.canvas.page.myHeight = 3000;
+        busy.canvas.setVerticalDir(false);
+        busy.canvas.setTotalpages(9);
+        busy.canvas.setCurrentpage(0);
+        busy.canvas.setCurrentX(1);
+        busy.canvas.setCurrentY(1);
+        busy.canvas.setPaper(u"A3");
+    };
+    busy.canvas.doPreview(grid);
+    EXPECT_EQ(pass, 2);
+    EXPECT_EQ(showDocument(busy.canvas.document()), before);
+    EXPECT_TRUE(busy.canvas.view().portrait);
+}
+
+TEST_F(CanvasTest, ShowsAllPagesThatThereAreAfterTheMessages)
+{
+    Busy busy(*this);
+    busy.canvas.setViewport(6000, 6000);
+    addPages(busy.canvas.document(), 6);
+    busy.loop.action = [&] {
+        addPages(busy.canvas.document(), 62);
+        busy.canvas.setVerticalDir(false);
+    };
+    busy.canvas.showAllPage();
+    const ViewState& view = busy.canvas.view();
+    ASSERT_EQ(view.surfaces.size(), 69U);
+    EXPECT_EQ(view.surfaces[1].y - view.surfaces[0].y, 11907 + 200);
+}
+
+TEST_F(CanvasTest, PlacesTheWindowOfPagesByWhatThereIsAfterTheMessages)
+{
+    Busy busy(*this);
+    addPages(busy.canvas.document(), 6);
+    busy.canvas.SetShowStyle(2, 0, 1);
+    busy.loop.action = [&] {
+        busy.canvas.setVerticalDir(false);
+        busy.canvas.SetShowStyle(4, 0, 3);
+    };
+    busy.canvas.showMuliPage(4);
+    const ViewState& view = busy.canvas.view();
+    ASSERT_EQ(view.surfaces.size(), 4U);
+    EXPECT_EQ(view.surfaces[1].x - view.surfaces[0].x, 16840 + 200);
+    EXPECT_EQ(view.surfaces[2].y - view.surfaces[0].y, 11907 + 200);
+    // The scale is that of the fit before the messages, for two columns of portrait pages.
+    EXPECT_FLOAT_EQ(view.divisor, 1 / std::max((15000.F - 200) / (2 * 11907), 8800.F / 33680));
+}
+
+TEST_F(CanvasTest, GoesOnAfterAFontThatIsTooLarge)
+{
+    TableGrid grid = small();
+    for (const char16_t* const key : { u"FontSize", u"HeaderFontSize", u"FooterFontSize" }) {
+        set({});
+        canvas.doPreview(grid);
+        const std::string before = showDocument(canvas.document());
+        set({ { key, u"200000000" }, { u"PagerWidth", u"100" } });
+        const Font font = canvas.recorder().textFont();
+        EXPECT_EQ(errorOf([&] { canvas.doPreview(grid); }), ErrorNumber::Overflow);
+        EXPECT_EQ(showDocument(canvas.document()), before);
+        EXPECT_EQ(canvas.recorder().textFont(), font);
+        EXPECT_EQ(canvas.page.myWidth, 11907);
+        EXPECT_EQ(canvas.style().body.font.size, 9);
+        set({});
+        canvas.doPreview(grid);
+        EXPECT_EQ(showDocument(canvas.document()), before);
+        ASSERT_TRUE(canvas.SaveFile(folder.file("report.ostl")));
+        EXPECT_EQ(errorOf([&] { canvas.clear(); }), std::nullopt);
+        EXPECT_EQ(errorOf([&] { canvas.OpenFile(folder.file("report.ostl")); }), std::nullopt);
+    }
+}
+
+TEST_F(CanvasTest, LeavesWidthsAndFontAloneWhenTheyCannotBeMadeLarger)
+{
+    TableGrid grid = small();
+    canvas.doPreview(grid);
+    std::optional<ErrorNumber> error;
+    std::vector<double> widths;
+    float size = 0;
+    for (int step = 0; step < 300 && !error; ++step) {
+        widths = canvas.table()->ColumnWidths;
+        size = canvas.style().body.font.size;
+        error = errorOf([&] { canvas.Maximum(); });
+    }
+    EXPECT_EQ(error, ErrorNumber::Overflow);
+    EXPECT_EQ(canvas.table()->ColumnWidths, widths);
+    EXPECT_EQ(canvas.style().body.font.size, size);
+    EXPECT_EQ(canvas.recorder().textFont().size, size);
+    canvas.doPreview(grid);
+    EXPECT_EQ(canvas.style().body.font.size, 9);
+    EXPECT_EQ(textsOf(canvas.document(), 0).substr(0, 3), "A|B");
+}
+
+TEST_F(CanvasTest, GivesPaperAndStyleBackWhenTheUserCancels)
+{
+    TableGrid grid = small();
+    canvas.doPreview(grid);
+    const PageSetup page = canvas.page;
+    const ReportStyle style = canvas.style();
+    set({ { u"PagerHeight", u"100" }, { u"Top", u"20" }, { u"FontSize", u"20" } });
+    for (const int pass : { 1, 2 }) {
+        loop.runs = 0;
+        loop.cancelAt = pass;
+        EXPECT_EQ(errorOf([&] { canvas.doPreview(grid); }), ErrorNumber::Cancelled);
+        EXPECT_EQ(canvas.page, page);
+        EXPECT_EQ(canvas.style(), style);
+    }
+}
+
+TEST_F(CanvasTest, EndsAtTheRowAtWhichTheUserCancels)
+{
+    TableGrid grid = small();
+    canvas.doPreview(grid);
+    const std::string before = showDocument(canvas.document());
+    const PageSetup page = canvas.page;
+    set({ { u"PagerHeight", u"100" } });
+    TableGrid other = gridOf({ { u"X", 2000 } }, numberedRows(500, 1));
+    loop.beats = 0;
+    canvas.doPreview(grid);
+    const int beatsOfThreeRows = loop.beats;
+    EXPECT_GE(beatsOfThreeRows, 3);
+    EXPECT_LT(beatsOfThreeRows, 20);
+    canvas.doPreview(grid);
+    for (const int beat : { 1, 20, 500 }) {
+        set({ { u"PagerHeight", u"200" } });
+        canvas.doPreview(grid);
+        const std::string now = showDocument(canvas.document());
+        const PageSetup held = canvas.page;
+        set({ { u"PagerHeight", u"100" } });
+        loop.beats = 0;
+        loop.cancelAtBeat = beat;
+        EXPECT_EQ(errorOf([&] { canvas.doPreview(other); }), ErrorNumber::Cancelled);
+        loop.cancelAtBeat = 0;
+        EXPECT_EQ(showDocument(canvas.document()), now) << beat;
+        EXPECT_EQ(canvas.page, held);
+        EXPECT_FALSE(canvas.progress().visible);
+        EXPECT_FALSE(canvas.isBusy());
+    }
+    EXPECT_NE(page.myHeight, canvas.page.myHeight);
+}
+
+TEST_F(CanvasTest, EndsAPrintJobBetweenTwoPagesWhenTheUserCancels)
+{
+    addPages(canvas.document(), 4);
+    loop.beats = 0;
+    loop.cancelAtBeat = 2;
+    EXPECT_EQ(errorOf([&] { canvas.doPrint(true, u"", 1); }), ErrorNumber::Cancelled);
+    EXPECT_NE(printer.log().find("title page 2"), std::string::npos);
+    EXPECT_EQ(printer.log().find("title page 3"), std::string::npos);
+    EXPECT_FALSE(canvas.progress().visible);
+    EXPECT_FALSE(canvas.isPrinting());
+    printer.forget();
+    loop.cancelAtBeat = 0;
+    loop.beats = 0;
+    canvas.doPrint(true, u"", 1);
+    EXPECT_EQ(loop.beats, 4); // between the five pages
+}
+
+TEST_F(CanvasTest, RefusesMembersThatChangeTheDocumentWhileItPrints)
+{
+    class PrintingLoop : public MessageLoop {
+    public:
+        void runOnce() override { }
+        void keepAlive() override { action(); }
+        std::function<void()> action;
+    };
+    PrintingLoop printing;
+    Platform platform { metrics, codec, messages, printing, clock, folders, printer, printers,
+        library };
+    Canvas other(platform);
+    addPages(other.document(), 2);
+    TableGrid grid = small();
+    int beats = 0;
+    printing.action = [&] {
+        ++beats;
+        EXPECT_TRUE(other.isPrinting());
+        other.clear();
+        other.newPage();
+        other.doPreview(grid);
+        other.doPrint(true, u"", 1);
+        other.setCurrentpage(1);
+        EXPECT_FALSE(other.SaveFile(folder.file("x.ostl")));
+    };
+    other.doPrint(true, u"", 1);
+    EXPECT_EQ(beats, 2);
+    EXPECT_EQ(other.Totalpages(), 3);
+    EXPECT_EQ(other.Currentpage(), 3);
+}
+
+TEST_F(CanvasTest, KeepsTheSizeThatTheViewportGotDuringAFailedBuild)
+{
+    Busy busy(*this);
+    TableGrid grid = small();
+    busy.canvas.doPreview(grid);
+    busy.loop.action = [&] { busy.canvas.setViewport(7000, 5000); };
+    set({ { u"FontSize", u"200000000" } });
+    EXPECT_EQ(errorOf([&] { busy.canvas.doPreview(grid); }), ErrorNumber::Overflow);
+    EXPECT_EQ(busy.canvas.view().viewportWidth, 7000);
+    EXPECT_EQ(busy.canvas.view().viewportHeight, 5000);
 }
 
 TEST_F(CanvasTest, SavesAndOpensADocumentAndShowsItsFirstPage)

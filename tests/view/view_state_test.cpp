@@ -3,7 +3,6 @@
 
 #include "view/view_state.h"
 
-#include "fakes/fake_services.h"
 #include "report/report_style.h"
 #include "support/errors.h"
 
@@ -34,6 +33,11 @@ protected:
         view.viewportHeight = height;
     }
 
+    void showMuliPage(std::int16_t nPages)
+    {
+        placeMuliPage(view, facts, fitMuliPage(view, facts, nPages));
+    }
+
     Pages pages() const
     {
         Pages shown;
@@ -46,7 +50,6 @@ protected:
     PageFacts facts { 11907, 16840, 1, 0, 1 };
     PageSetup setup;
     ReportStyle style;
-    FakeMessageLoop loop;
 };
 
 } // namespace
@@ -68,7 +71,7 @@ TEST_F(ViewTest, PutsAllPagesInAsManyColumnsAsFit)
 {
     addPages(6);
     setDispScale(view, facts, 0.4F);
-    showAllPage(view, facts, loop);
+    showAllPage(view, facts);
     EXPECT_FLOAT_EQ(view.divisor, 2.413581132888794F);
     EXPECT_EQ(view.grid, (PageGrid { 3, 3 }));
     EXPECT_EQ(view.Vbar, (ScrollBar { true, 300, 0, 126, 13 }));
@@ -78,7 +81,6 @@ TEST_F(ViewTest, PutsAllPagesInAsManyColumnsAsFit)
             { 24314, 17140 }, { 100, 34180 } }));
     EXPECT_EQ(pages(), (Pages { 0, 1, 2, 3, 4, 5, 6 }));
     EXPECT_FALSE(showsPageWindow(view));
-    EXPECT_EQ(loop.runs, 1);
 }
 
 TEST_F(ViewTest, PutsTwoLandscapePagesOneAboveTheOther)
@@ -87,21 +89,20 @@ TEST_F(ViewTest, PutsTwoLandscapePagesOneAboveTheOther)
     facts.myHeight = 11907;
     addPages(4);
     setShowStyle(view, 2, 2, 3);
-    showMuliPage(view, facts, 2, loop);
+    showMuliPage(2);
     EXPECT_FLOAT_EQ(view.divisor, 1.1378378868103027F);
     EXPECT_EQ(view.grid, (PageGrid { 1, 2 }));
     EXPECT_EQ(view.Vbar, (ScrollBar { true, 144, 0, 60, 6 }));
     EXPECT_EQ(view.surfaces, (Surfaces { { 100, 100 }, { 100, 12207 } }));
     EXPECT_EQ(pages(), (Pages { 2, 3 }));
     EXPECT_TRUE(showsPageWindow(view));
-    EXPECT_EQ(loop.runs, 1);
 }
 
 TEST_F(ViewTest, LoadsSurfacesPastTheLastPageAndLeavesThemBlank)
 {
     addPages(1);
     setShowStyle(view, 4, 1, 4);
-    showMuliPage(view, facts, 4, loop);
+    showMuliPage(4);
     EXPECT_EQ(view.style, OrderStyle::Four);
     EXPECT_EQ(view.Vbar, (ScrollBar { true, 200, 0, 84, 8 }));
     EXPECT_EQ(pages(), (Pages { 1, std::nullopt, std::nullopt, std::nullopt }));
@@ -111,7 +112,7 @@ TEST_F(ViewTest, BeginsAWindowAtTheFirstPageAtLeast)
 {
     addPages(4);
     setShowStyle(view, 2, -3, -2);
-    showMuliPage(view, facts, 2, loop);
+    showMuliPage(2);
     EXPECT_EQ(view.window, (MuliPageType { 2, -3, -2 }));
     EXPECT_EQ(pages(), (Pages { 0, 1 }));
 }
@@ -120,7 +121,7 @@ TEST_F(ViewTest, PlacesAsManySurfacesAsTheWindowSaysWhateverTheArgument)
 {
     addPages(9);
     setShowStyle(view, 3, 0, 2);
-    showMuliPage(view, facts, 6, loop);
+    showMuliPage(6);
     EXPECT_EQ(view.style, OrderStyle::Six);
     EXPECT_EQ(view.surfaces.size(), 3U);
 }
@@ -129,8 +130,8 @@ TEST_F(ViewTest, KeepsTheModeForAnyOtherNumberOfPages)
 {
     addPages(9);
     setShowStyle(view, 2, 0, 1);
-    showMuliPage(view, facts, 4, loop);
-    showMuliPage(view, facts, 3, loop);
+    showMuliPage(4);
+    showMuliPage(3);
     EXPECT_EQ(view.style, OrderStyle::Four);
     EXPECT_EQ(view.grid, (PageGrid { 2, 2 }));
     EXPECT_EQ(view.surfaces.size(), 2U);
@@ -141,7 +142,7 @@ TEST_F(ViewTest, ShowsTheCurrentPageAfterAWindowWasTakenAway)
     addPages(4);
     facts.currentPage = 2;
     setShowStyle(view, 2, 2, 3);
-    showMuliPage(view, facts, 2, loop);
+    showMuliPage(2);
     setShowStyle(view, 0, 0, 0);
     showWholePage(view, facts);
     EXPECT_TRUE(view.multiPage);
@@ -153,7 +154,7 @@ TEST_F(ViewTest, ClearingEndsAnArrangementButKeepsWindowModeAndBars)
 {
     addPages(4);
     setShowStyle(view, 2, 0, 1);
-    showMuliPage(view, facts, 2, loop);
+    showMuliPage(2);
     endArrangement(view);
     EXPECT_FALSE(view.multiPage);
     EXPECT_EQ(view.surfaces.size(), 1U);
@@ -181,7 +182,7 @@ TEST_F(ViewTest, ShowPageLaysOutAgainOnlyWhenItLeavesAnotherGrid)
     EXPECT_FALSE(view.Hbar.enabled);
     addPages(3);
     setShowStyle(view, 4, 0, 3);
-    showMuliPage(view, facts, 4, loop);
+    showMuliPage(4);
     EXPECT_TRUE(view.Vbar.enabled);
     showPage(view, facts);
     EXPECT_EQ(view.grid, PageGrid {});
@@ -208,7 +209,7 @@ TEST_F(ViewTest, ANewDocumentStartsWithoutAWindow)
 {
     addPages(4);
     setShowStyle(view, 4, 1, 4);
-    showMuliPage(view, facts, 4, loop);
+    showMuliPage(4);
     showNewDocument(view, facts);
     EXPECT_EQ(view.window, (MuliPageType { 0, 0, 4 }));
     EXPECT_EQ(view.style, OrderStyle::One);
@@ -280,7 +281,7 @@ TEST_F(ViewTest, StepsOfAShortBarAreAtLeastOne)
 TEST_F(ViewTest, AScrollRangePastSixteenBitsIsAnError)
 {
     addPages(300);
-    EXPECT_EQ(errorOf([&] { showAllPage(view, facts, loop); }), ErrorNumber::Overflow);
+    EXPECT_EQ(errorOf([&] { showAllPage(view, facts); }), ErrorNumber::Overflow);
     EXPECT_EQ(view.surfaces.size(), 301U);
     EXPECT_EQ(errorOf([&] { setHbar(view, facts, 32768); }), ErrorNumber::Overflow);
     EXPECT_EQ(view.previousHbar, 0);
@@ -391,7 +392,7 @@ TEST_F(ViewTest, KnowsWhichOfManySurfacesAreSeen)
     addPages(32766);
     facts.myWidth = 100;
     facts.myHeight = 100;
-    EXPECT_EQ(errorOf([&] { showAllPage(view, facts, loop); }), std::nullopt);
+    EXPECT_EQ(errorOf([&] { showAllPage(view, facts); }), std::nullopt);
     EXPECT_EQ(view.surfaces.size(), 32767U);
     const std::vector<int> seen = surfacesInView(view, facts);
     EXPECT_FALSE(seen.empty());
