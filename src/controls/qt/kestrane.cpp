@@ -6,6 +6,8 @@
 #include "controls/qt/default_platform.h"
 #include "controls/qt/published_values.h"
 #include "grids/qt/grid_for.h"
+#include "platform/platform.h"
+#include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -23,7 +25,33 @@ static_assert(Kestrane::LocLeft == static_cast<int>(Slot::LocLeft)
     && Kestrane::LocCenter == static_cast<int>(Slot::LocCenter)
     && Kestrane::LocRight == static_cast<int>(Slot::LocRight));
 
+/// Hands on to whoever opens the window at the moment.
+struct CurrentOpener final : PreviewOpener {
+    void openPreview(std::unique_ptr<AutomationObject> grid) override
+    {
+        PreviewOpener* const opener = own ? own : defaultOpener;
+        if (!opener)
+            throw RunTimeError(ErrorNumber::InvalidCall, u"nobody opens the preview window");
+        opener->openPreview(std::move(grid));
+    }
+
+    PreviewOpener* own = nullptr; ///< null: the default one
+};
+
 } // namespace
+
+/// What works without the window.
+struct Kestrane::Parts {
+    explicit Parts(QtPlatform& services)
+        : platform(services.record())
+        , facade(platform, opener)
+    {
+    }
+
+    Platform platform;
+    CurrentOpener opener;
+    Facade facade;
+};
 
 Kestrane::Kestrane(QWidget* parent)
     : Kestrane(defaultPlatform(), parent)
@@ -32,9 +60,9 @@ Kestrane::Kestrane(QWidget* parent)
 
 Kestrane::Kestrane(QtPlatform& platform, QWidget* parent)
     : QWidget(parent)
-    , platform_(platform.record())
-    , facade_(platform_, opener_)
-    , calls_(*this, platform_, [] {})
+    , parts_(std::make_shared<Parts>(platform))
+    , facade_(parts_->facade)
+    , calls_(*this, parts_, parts_->platform, [] {})
 {
     setObjectName(QStringLiteral("Kestrane"));
     setAccessibleName(tr("Print preview"));
@@ -44,13 +72,13 @@ Kestrane::~Kestrane() = default;
 
 void Kestrane::setDefaultPreviewOpener(PreviewOpener* opener) { defaultOpener = opener; }
 
-void Kestrane::Opener::openPreview(std::unique_ptr<AutomationObject> grid)
-{
-    PreviewOpener* const opener = own ? own : defaultOpener;
-    if (!opener)
-        throw RunTimeError(ErrorNumber::InvalidCall, u"nobody opens the preview window");
-    opener->openPreview(std::move(grid));
-}
+void Kestrane::setPreviewOpener(PreviewOpener* opener) { parts_->opener.own = opener; }
+
+bool Kestrane::ShowHeader() const { return facade_.ShowHeader(); }
+
+std::int32_t Kestrane::MarvenStartRow() const { return facade_.MarvenStartRow(); }
+
+bool Kestrane::MergeGrid() const { return facade_.MergeGrid(); }
 
 void Kestrane::doPreview(std::unique_ptr<AutomationObject> PrintObj)
 {

@@ -5,10 +5,11 @@
 
 #include "controls/facade.h"
 #include "controls/qt/member_calls.h"
-#include "platform/platform.h"
 
 #include <QVariant>
 #include <QWidget>
+
+#include <memory>
 
 namespace pelloric::qt {
 
@@ -41,7 +42,7 @@ public:
 
     /// Who opens the preview window of this control.
     /// @param opener  borrowed; null: the default one
-    void setPreviewOpener(PreviewOpener* opener) { opener_.own = opener; }
+    void setPreviewOpener(PreviewOpener* opener);
 
     /// Who opens the preview window of every control that was given nobody else.
     /// @param opener  borrowed, or null
@@ -54,11 +55,11 @@ public:
     void doPreview(QObject* PrintObj);
     void AddHeader(const QString& strHeader, pelloric::AlignmentType Location);
     void AddFooter(const QString& strFooter, pelloric::AlignmentType Location);
-    bool ShowHeader() const { return facade_.ShowHeader(); }
+    bool ShowHeader() const;
     void setShowHeader(bool show);
-    std::int32_t MarvenStartRow() const { return facade_.MarvenStartRow(); }
+    std::int32_t MarvenStartRow() const;
     void setMarvenStartRow(std::int32_t row);
-    bool MergeGrid() const { return facade_.MergeGrid(); }
+    bool MergeGrid() const;
     void setMergeGrid(bool merge);
 
     Q_INVOKABLE void doPreview(const QVariant& PrintObj);
@@ -71,23 +72,17 @@ protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
-    /// Hands on to whoever opens the window at the moment.
-    struct Opener final : PreviewOpener {
-        void openPreview(std::unique_ptr<AutomationObject> grid) override;
+    struct Parts;
 
-        PreviewOpener* own = nullptr; ///< null: the default one
-    };
-
-    QVariant getShowHeader() const { return facade_.ShowHeader(); }
-    QVariant getMarvenStartRow() const { return facade_.MarvenStartRow(); }
-    QVariant getMergeGrid() const { return facade_.MergeGrid(); }
+    QVariant getShowHeader() const { return ShowHeader(); }
+    QVariant getMarvenStartRow() const { return MarvenStartRow(); }
+    QVariant getMergeGrid() const { return MergeGrid(); }
     void putShowHeader(const QVariant& value);
     void putMarvenStartRow(const QVariant& value);
     void putMergeGrid(const QVariant& value);
 
-    Platform platform_;
-    Opener opener_;
-    Facade facade_;
+    std::shared_ptr<Parts> parts_; ///< shared with the members that run
+    Facade& facade_; ///< one of the parts
     MemberCalls calls_;
 };
 

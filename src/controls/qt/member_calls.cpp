@@ -15,16 +15,19 @@
 
 namespace pelloric::qt {
 
-MemberCalls::MemberCalls(QObject& control, Platform& platform, std::function<void()> restore)
+MemberCalls::MemberCalls(QObject& control, std::shared_ptr<void> parts, Platform& platform,
+    std::function<void()> restore)
     : control_(control)
+    , parts_(std::move(parts))
     , platform_(platform)
     , restore_(std::move(restore))
 {
 }
 
-/// A host may delete the control while its member lets messages run: nobody is told then.
+/// Of a control that was deleted meanwhile nobody is told.
 void MemberCalls::run(const std::function<void()>& member)
 {
+    const std::shared_ptr<void> alive = parts_;
     const QPointer<QObject> control(&control_);
     try {
         member();
@@ -56,7 +59,9 @@ void MemberCalls::report(const RunTimeError& error)
 {
     restore_();
     const ScriptCaller* const caller = scriptCaller();
-    if (caller == nullptr || !caller->raise(control_, error))
+    if (caller != nullptr && caller->raise(control_, error))
+        return;
+    if (error.number() != ErrorNumber::Cancelled)
         platform_.messages.show(messageOf(error));
 }
 

@@ -75,7 +75,7 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
     : QWidget(parent)
     , parts_(std::make_shared<Parts>(platform))
     , canvas_(parts_->canvas)
-    , calls_(*this, parts_->platform, [this] { areas_->viewChanged(); })
+    , calls_(*this, parts_, parts_->platform, [this] { areas_->viewChanged(); })
     , areas_(std::make_unique<CanvasAreas>(*this, canvas_, platform.fonts(),
           CanvasAreas::RightButton { [this] { emit Click(RightButtonNumber); },
               [this] { emit MouseUp(RightButtonNumber); } }))
@@ -88,14 +88,6 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
 }
 
 Sorvane::~Sorvane() = default;
-
-/// Some members let messages run, in which a host may delete the control: what they work on stays
-/// until they are through.
-void Sorvane::run(const std::function<void()>& member)
-{
-    const std::shared_ptr<Parts> alive = parts_;
-    calls_.run(member);
-}
 
 std::int16_t Sorvane::Currentpage()
 {
@@ -167,7 +159,7 @@ void Sorvane::ReDrawZoom(QObject* PrintObj)
 /// A build that is asked for while another runs is refused, and must not touch the other's grid.
 void Sorvane::preview(std::unique_ptr<AutomationObject> grid)
 {
-    if (canvas_.isBuilding())
+    if (canvas_.isBusy())
         return;
     parts_->grid = std::move(grid);
     canvas_.doPreview(*parts_->grid);
@@ -175,7 +167,7 @@ void Sorvane::preview(std::unique_ptr<AutomationObject> grid)
 
 void Sorvane::redraw(std::unique_ptr<AutomationObject> grid)
 {
-    if (canvas_.isBuilding())
+    if (canvas_.isBusy())
         return;
     parts_->grid = std::move(grid);
     canvas_.ReDrawZoom(*parts_->grid);

@@ -176,7 +176,7 @@ private:
 
     struct Parts;
 
-    void run(const std::function<void()>& member);
+    void run(const std::function<void()>& member) { calls_.run(member); }
 
     std::shared_ptr<Parts> parts_; ///< shared with the members that run
     Canvas& canvas_; ///< one of the parts
