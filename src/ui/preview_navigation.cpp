@@ -68,7 +68,7 @@ PreviewSession::PreviewSession(Canvas& canvas, PreviewHost& host)
 
 void PreviewSession::open(AutomationObject& grid)
 {
-    if (canvas_.isBuilding())
+    if (canvas_.isBusy())
         return;
     grid_ = &grid;
     canvas_.m_PrintObj = gridKindOf(grid);
@@ -77,7 +77,7 @@ void PreviewSession::open(AutomationObject& grid)
 
 void PreviewSession::quietly(const std::function<void()>& command)
 {
-    if (canvas_.isBuilding())
+    if (canvas_.isBusy())
         return;
     try {
         command();

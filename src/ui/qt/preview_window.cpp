@@ -145,7 +145,7 @@ void PreviewWindow::setPrompts(PreviewPrompts prompts)
         prompts_.showAbout = standard.showAbout;
 }
 
-bool PreviewWindow::isBusy() const { return running_ > 0 || canvas_->canvas().isBuilding(); }
+bool PreviewWindow::isBusy() const { return running_ > 0 || canvas_->canvas().isBusy(); }
 
 void PreviewWindow::preview(std::unique_ptr<AutomationObject> grid)
 {
@@ -198,7 +198,8 @@ void PreviewWindow::print(bool allPages, TextView pageList, std::int16_t copies)
     try {
         session_->print(allPages, pageList, copies);
     } catch (const RunTimeError& error) {
-        platform_.messages.show(messageOf(error));
+        if (error.number() != ErrorNumber::Cancelled)
+            platform_.messages.show(messageOf(error));
     }
 }
 
@@ -208,10 +209,10 @@ void PreviewWindow::click(int id)
     session_->click(id);
 }
 
-/// Ends a build that runs, or else the preview.
+/// Ends the build or the print job that runs, or else the preview.
 void PreviewWindow::leave()
 {
-    if (canvas_->canvas().isBuilding())
+    if (canvas_->canvas().isBusy())
         services_.loop().cancel();
     else if (!isBusy())
         click(ExitTool);
@@ -230,7 +231,7 @@ void PreviewWindow::closeEvent(QCloseEvent* event)
         return QMainWindow::closeEvent(event);
     }
     closesAfterwards_ = true;
-    if (canvas_->canvas().isBuilding())
+    if (canvas_->canvas().isBusy())
         services_.loop().cancel();
     for (QDialog* const dialog : findChildren<QDialog*>())
         dialog->reject();
