@@ -39,6 +39,9 @@ namespace fs = std::filesystem;
 
 constexpr std::int64_t UsualRoadRows = 10'000; ///< the toolkit's table takes minutes beyond that
 constexpr int LastSavedPage = 130;
+constexpr int WideRows = 1000;
+constexpr int FewColumns = 1000;
+constexpr int ManyColumns = 4000;
 constexpr std::int64_t PdfRows = 100'000; ///< of the PDF export, 2,400 pages
 
 double heapBytes()
@@ -180,9 +183,34 @@ public:
         Canvas(*record_).doPreview(warmUp);
         for (std::int64_t rows = 1000; rows <= mostRows_; rows *= 10)
             report(rows);
+        wide();
     }
 
 private:
+    /// Time must grow with rows x columns, not with the square of the columns.
+    void wide()
+    {
+        std::printf("\n%d rows of many columns\n", WideRows);
+        const double narrow = wideSeconds(FewColumns);
+        const double wide = wideSeconds(ManyColumns);
+        std::printf("    preview: %d columns %.3f s, %d columns %.3f s\n", FewColumns, narrow,
+            ManyColumns, wide);
+        judge("preview, 4,000 columns / 1,000 columns", wide / narrow, 5, true);
+    }
+
+    double wideSeconds(int columns)
+    {
+        TableGrid table = bench::wideTable(WideRows, columns);
+        double best = 1e9;
+        for (int repeat = 0; repeat < 3; ++repeat) {
+            Canvas canvas(*record_);
+            const StopWatch watch;
+            canvas.doPreview(table);
+            best = std::min(best, watch.seconds());
+        }
+        return best;
+    }
+
     void report(std::int64_t rows)
     {
         std::printf("\n%lld rows x 8 columns\n", static_cast<long long>(rows));

@@ -38,6 +38,21 @@ TableGrid sampleTable(std::int64_t rows)
     return table;
 }
 
+TableGrid wideTable(std::int64_t rows, int columns)
+{
+    std::vector<TableColumn> titles;
+    for (int column = 1; column <= columns; ++column)
+        titles.push_back({ u"Column " + decimal(column), 1200 });
+    TableGrid table(std::move(titles));
+    std::vector<Text> texts(static_cast<std::size_t>(columns));
+    for (std::int64_t row = 1; row <= rows; ++row) {
+        for (int column = 0; column < columns; ++column)
+            texts[static_cast<std::size_t>(column)] = decimal(row) + u"." + decimal(column + 1);
+        table.addRow(std::vector<TextView>(texts.begin(), texts.end()));
+    }
+    return table;
+}
+
 std::int64_t textBytes(const TableGrid& table)
 {
     std::int64_t units = 0;
