@@ -8,14 +8,58 @@
 #include "support/errors.h"
 
 #include <QApplication>
+#include <QKeyEvent>
+#include <QLineEdit>
 #include <QLocale>
 #include <QMessageBox>
 #include <QTemporaryDir>
+#include <QTest>
 #include <QTimer>
+#include <QWindow>
 
 #include <gtest/gtest.h>
 
 namespace pelloric::qt {
+
+namespace {
+
+/// Has a long operation go on for some time.
+std::optional<ErrorNumber> workFor(QtMessageLoop& loop, int milliseconds)
+{
+    QElapsedTimer timer;
+    timer.start();
+    std::optional<ErrorNumber> error;
+    while (!error && timer.elapsed() < milliseconds)
+        error = errorOf([&] { loop.keepAlive(); });
+    return error;
+}
+
+void postKey(QWidget& widget, int key, const QString& text = {})
+{
+    QCoreApplication::postEvent(&widget, new QKeyEvent(QEvent::KeyPress, key, {}, text));
+}
+
+/// Counts the passes in which it is told to go on.
+class PassCounter : public QObject {
+public:
+    PassCounter() { post(); }
+
+    bool event(QEvent* event) override
+    {
+        if (event->type() != QEvent::User)
+            return QObject::event(event);
+        ++passes;
+        post();
+        return true;
+    }
+
+    int passes = 0;
+
+private:
+    void post() { QCoreApplication::postEvent(this, new QEvent(QEvent::User)); }
+};
+
+} // namespace
 
 TEST(QtClock, TellsTheDateOneWayAndTheTimeAsTheLocaleDoes)
 {
@@ -55,6 +99,77 @@ TEST(QtMessageLoop, EndsACancelledOperationOnce)
     loop.cancel();
     loop.forgetCancel();
     EXPECT_EQ(errorOf([&] { loop.runOnce(); }), std::nullopt);
+}
+
+TEST(QtMessageLoop, LivesAFewTimesASecondHoweverOftenItIsAsked)
+{
+    QtMessageLoop loop;
+    loop.runOnce();
+    const PassCounter counter;
+    QElapsedTimer timer;
+    timer.start();
+    EXPECT_EQ(workFor(loop, 1000), std::nullopt);
+    EXPECT_GE(counter.passes, 2);
+    EXPECT_LE(counter.passes, timer.elapsed() / 100);
+}
+
+TEST(QtMessageLoop, TakesEscapeAndRefusesOtherInputWhileAnOperationRuns)
+{
+    QtMessageLoop loop;
+    QLineEdit edit;
+    edit.show();
+    QCoreApplication::processEvents();
+    postKey(edit, Qt::Key_A, QStringLiteral("a"));
+    EXPECT_EQ(workFor(loop, 400), std::nullopt);
+    EXPECT_EQ(edit.text(), QString());
+    postKey(edit, Qt::Key_Escape);
+    EXPECT_EQ(workFor(loop, 5000), ErrorNumber::Cancelled);
+    EXPECT_EQ(workFor(loop, 400), std::nullopt);
+    QTest::keyClicks(&edit, QStringLiteral("b"));
+    EXPECT_EQ(edit.text(), QStringLiteral("b"));
+}
+
+TEST(QtMessageLoop, PaintsAndClosesWindowsWhileAnOperationRuns)
+{
+    class Painted : public QWidget {
+    public:
+        void paintEvent(QPaintEvent*) override { ++paints; }
+        int paints = 0;
+    };
+    QtMessageLoop loop;
+    Painted window;
+    window.show();
+    ASSERT_TRUE(QTest::qWaitForWindowExposed(&window));
+    const int paints = window.paints;
+    window.update();
+    EXPECT_EQ(workFor(loop, 400), std::nullopt);
+    EXPECT_GT(window.paints, paints);
+    QCoreApplication::postEvent(window.windowHandle(), new QCloseEvent);
+    EXPECT_EQ(workFor(loop, 400), std::nullopt);
+    EXPECT_FALSE(window.isVisible());
+}
+
+TEST(QtMessageLoop, LetsTimersWaitWhileAnOperationRuns)
+{
+    QtMessageLoop loop;
+    int fired = 0;
+    QTimer timer;
+    QObject::connect(&timer, &QTimer::timeout, [&] { ++fired; });
+    timer.setSingleShot(true);
+    timer.start(1);
+    EXPECT_EQ(workFor(loop, 400), std::nullopt);
+    EXPECT_EQ(fired, 0);
+    loop.runOnce();
+    EXPECT_EQ(fired, 1);
+}
+
+TEST(QtMessageLoop, EndsACancelledOperationAtItsNextStep)
+{
+    QtMessageLoop loop;
+    loop.runOnce();
+    loop.cancel();
+    EXPECT_EQ(errorOf([&] { loop.keepAlive(); }), ErrorNumber::Cancelled);
+    EXPECT_EQ(errorOf([&] { loop.keepAlive(); }), std::nullopt);
 }
 
 TEST(BoxMessages, ShowsTextTitleAndIcon)

@@ -37,6 +37,8 @@
 #include <gmock/gmock.h>
 
 #include <array>
+#include <chrono>
+#include <thread>
 
 namespace pelloric::qt {
 
@@ -111,6 +113,15 @@ protected:
             const Text square = decimal(row * row);
             grid->addRow(std::array<TextView, 2> { number, square });
         }
+        return grid;
+    }
+
+    /// A million rows.
+    static std::unique_ptr<AutomationObject> longGrid()
+    {
+        auto grid = std::make_unique<TableGrid>(std::vector<TableColumn> { { u"A", 3000 } });
+        for (int row = 0; row < 1'000'000; ++row)
+            grid->addRow(std::array<TextView, 1> { u"a text" });
         return grid;
     }
 
@@ -583,6 +594,48 @@ TEST_F(PreviewWindowTest, GoesAfterABuildThatAHostHasBegunOnTheCanvas)
     QTimer::singleShot(0, window, [&] { window->close(); });
     EXPECT_THROW(canvas().doPreview(*grid), RunTimeError); // ended by the user
     EXPECT_TRUE(QTest::qWaitFor([&] { return window.isNull(); }));
+}
+
+/// Posts an event to a window from outside, some time from now.
+class LateEvent {
+public:
+    LateEvent(QObject& receiver, QEvent* event)
+        : thread_([&receiver, event] {
+            std::this_thread::sleep_for(std::chrono::milliseconds(300));
+            QCoreApplication::postEvent(&receiver, event);
+        })
+    {
+    }
+
+    ~LateEvent() { thread_.join(); }
+    LateEvent(const LateEvent&) = delete;
+    LateEvent& operator=(const LateEvent&) = delete;
+
+private:
+    std::thread thread_;
+};
+
+TEST_F(PreviewWindowTest, KeepsTheEarlierPagesWhenEscapeIsPressedWhileRowsGoBy)
+{
+    PreviewWindow& window = preview(400);
+    const int total = canvas().Totalpages();
+    auto grid = longGrid();
+    const LateEvent escape(
+        window.canvas(), new QKeyEvent(QEvent::KeyPress, Qt::Key_Escape, Qt::NoModifier));
+    opener_.openPreview(std::move(grid));
+    ASSERT_EQ(opener_.window(), &window);
+    EXPECT_TRUE(window.isVisible());
+    EXPECT_EQ(canvas().Totalpages(), total);
+    EXPECT_FALSE(canvas().progress().visible);
+}
+
+TEST_F(PreviewWindowTest, ClosesWhileRowsGoBy)
+{
+    PreviewWindow& window = preview(3);
+    auto grid = longGrid();
+    const LateEvent close(window, new QCloseEvent);
+    opener_.openPreview(std::move(grid));
+    EXPECT_EQ(opener_.window(), nullptr);
 }
 
 TEST_F(PreviewWindowTest, RefusesAGridWithoutAWordWhileItBuilds)
