@@ -6,28 +6,117 @@
 #include "platform/qt/qt_text.h"
 
 #include <QAbstractItemView>
-#include <QStyledItemDelegate>
+#include <QItemDelegate>
 
+#include <array>
+#include <limits>
 #include <typeinfo>
 
 namespace pelloric::qt {
 
+namespace {
+
+constexpr int EndlessRoom = 32767; ///< pixels; no delegate has to elide in a cell of that size
+
+/// The members through which a view asks its delegate are protected; a derived type may name them.
+struct OptionOfView : QAbstractItemView {
+    static constexpr auto init = &OptionOfView::initViewItemOption;
+};
+
+struct OptionOfDelegate : QStyledItemDelegate {
+    static constexpr auto init = &OptionOfDelegate::initStyleOption;
+};
+
+QChar boxOf(Qt::CheckState state)
+{
+    switch (state) {
+    case Qt::Unchecked:
+        return QChar(u'☐');
+    case Qt::PartiallyChecked:
+        return QChar(u'▣');
+    case Qt::Checked:
+        break;
+    }
+    return QChar(u'☑');
+}
+
+} // namespace
+
+void CellText::take(const QAbstractItemView& view)
+{
+    option_ = QStyleOptionViewItem();
+    (view.*OptionOfView::init)(&option_);
+    option_.rect = QRect(0, 0, EndlessRoom, EndlessRoom);
+    lastDelegate_ = nullptr;
+    lastKind_ = DelegateKind::Painter;
+}
+
 TextView CellText::of(const QAbstractItemView& view, const QModelIndex& index)
 {
-    const QVariant shown = index.data(Qt::DisplayRole);
-    const auto* delegate
-        = qobject_cast<const QStyledItemDelegate*>(view.itemDelegateForIndex(index));
-    const bool isPlain = !delegate || typeid(*delegate) == typeid(QStyledItemDelegate);
-    const bool isText = shown.typeId() == QMetaType::QString;
-    if (!delegate || (isPlain && isText)) {
-        text_ = shown.toString();
-    } else if (shown.isNull() && isPlain) {
-        text_.clear();
-    } else {
-        text_ = delegate->displayText(shown, view.locale());
-        text_.replace(QChar(QChar::LineSeparator), QLatin1Char('\n')); // as delegates write it
-    }
+    const QAbstractItemDelegate* const delegate = view.itemDelegateForIndex(index);
+    const DelegateKind kind = kindOf(delegate);
+    if (kind == DelegateKind::Styled)
+        readStyled(static_cast<const QStyledItemDelegate&>(*delegate), index);
+    else
+        readPlain(index, kind);
     return viewOf(text_);
+}
+
+CellText::DelegateKind CellText::kindOf(const QAbstractItemDelegate* delegate)
+{
+    if (delegate == lastDelegate_)
+        return lastKind_;
+    lastDelegate_ = delegate;
+    if (qobject_cast<const QStyledItemDelegate*>(delegate))
+        lastKind_ = typeid(*delegate) == typeid(QStyledItemDelegate) ? DelegateKind::Plain
+                                                                     : DelegateKind::Styled;
+    else if (qobject_cast<const QItemDelegate*>(delegate))
+        lastKind_ = DelegateKind::Numbers;
+    else
+        lastKind_ = DelegateKind::Painter;
+    return lastKind_;
+}
+
+/// What a delegate does that changes nothing, without its fonts, colours and icons.
+void CellText::readPlain(const QModelIndex& index, DelegateKind kind)
+{
+    std::array<QModelRoleData, 2> roles { QModelRoleData(Qt::DisplayRole),
+        QModelRoleData(Qt::CheckStateRole) };
+    index.multiData(roles);
+    setText(shown(roles[0].data(), kind), roles[1].data());
+}
+
+void CellText::readStyled(const QStyledItemDelegate& delegate, const QModelIndex& index)
+{
+    QStyleOptionViewItem option = option_;
+    option.index = index;
+    (delegate.*OptionOfDelegate::init)(&option, index);
+    const bool hasBox = option.features.testFlag(QStyleOptionViewItem::HasCheckIndicator);
+    setText(option.features.testFlag(QStyleOptionViewItem::HasDisplay) ? option.text : QString(),
+        hasBox ? QVariant(static_cast<int>(option.checkState)) : QVariant());
+}
+
+QString CellText::shown(const QVariant& value, DelegateKind kind) const
+{
+    if (value.isNull())
+        return {};
+    if (value.typeId() == QMetaType::QString)
+        return value.toString();
+    if (kind == DelegateKind::Numbers && value.typeId() == QMetaType::Double)
+        return option_.locale.toString(
+            value.toDouble(), 'g', std::numeric_limits<double>::digits10);
+    return plain_.displayText(value, option_.locale);
+}
+
+void CellText::setText(QString text, const QVariant& checkState)
+{
+    text_ = std::move(text);
+    text_.replace(QChar(QChar::LineSeparator), QLatin1Char('\n')); // as delegates write line feeds
+    if (checkState.isNull())
+        return;
+    if (!text_.isEmpty())
+        text_.prepend(QLatin1Char(' '));
+    text_.prepend(boxOf(static_cast<Qt::CheckState>(checkState.toInt())));
 }
 
 } // namespace pelloric::qt

@@ -5,7 +5,6 @@
 
 #include "grids/qt/held_grid.h"
 #include "grids/qt/object_grid.h"
-#include "grids/qt/sql_view_grid.h"
 #include "grids/qt/table_view_grid.h"
 #include "grids/qt/tree_view_grid.h"
 
@@ -38,11 +37,8 @@ std::unique_ptr<AutomationObject> gridFor(QObject& object)
         return held->share();
     if (isGridItself(object))
         return std::make_unique<ObjectGrid>(object);
-    if (auto* const table = qobject_cast<QTableView*>(&object)) {
-        if (SqlViewGrid::isSqlView(*table))
-            return std::make_unique<SqlViewGrid>(*table);
+    if (auto* const table = qobject_cast<QTableView*>(&object))
         return std::make_unique<TableViewGrid>(*table);
-    }
     if (auto* const tree = qobject_cast<QTreeView*>(&object))
         return std::make_unique<TreeViewGrid>(*tree);
     if (auto* const list = qobject_cast<QListView*>(&object))

@@ -14,8 +14,9 @@ namespace pelloric::qt {
 /// The grid that an object is.
 ///
 /// A `HeldGrid` is the grid that it carries. An object that publishes the members of a grid itself
-/// is taken by them. A table view is a data grid when its model is an SQL model and else a flex
-/// grid, a tree or a list is a list view; any other object is taken by the members that it has.
+/// is taken by them. A table view is a flex grid, whatever its model, and answers a data grid's
+/// members besides; a tree or a list is a list view; any other object is taken by the members that
+/// it has.
 /// @param object  borrowed
 /// @throws RunTimeError ObjectMissing: a view without a model
 std::unique_ptr<AutomationObject> gridFor(QObject& object);

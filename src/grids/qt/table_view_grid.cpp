@@ -3,6 +3,7 @@
 
 #include "grids/qt/table_view_grid.h"
 
+#include "grids/qt/data_view_grid.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_text.h"
@@ -11,13 +12,16 @@
 #include <QHeaderView>
 #include <QTableView>
 
+#include <iterator>
+
 namespace pelloric::qt {
 
 namespace {
 
-enum Member { Cols, Rows, ColWidth, TextMatrix };
+enum Member { Cols, Rows, ColWidth, TextMatrix, MemberCount };
 
 constexpr TextView Names[] = { u"Cols", u"Rows", u"ColWidth", u"TextMatrix" };
+static_assert(std::size(Names) == MemberCount);
 
 } // namespace
 
@@ -27,9 +31,15 @@ TableViewGrid::TableViewGrid(QTableView& view)
     takeMaps();
 }
 
+TableViewGrid::~TableViewGrid() = default;
+
+/// The members of the data grid follow its own.
 std::optional<MemberId> TableViewGrid::findMember(TextView name)
 {
-    return findMemberName(Names, name);
+    if (const auto own = findMemberName(Names, name))
+        return own;
+    const auto ofDataGrid = dataGrid().findMember(name);
+    return ofDataGrid ? std::optional<MemberId>(MemberCount + *ofDataGrid) : std::nullopt;
 }
 
 const void* TableViewGrid::memberTable() const { return Names; }
@@ -49,12 +59,16 @@ Value TableViewGrid::get(MemberId member, std::span<const Value> arguments)
         return Value::ofText(cell(row, columnOf(arguments, 1)));
     }
     default:
-        refuseMember(Names, member);
+        return dataGrid().get(member - MemberCount, arguments);
     }
 }
 
 void TableViewGrid::put(MemberId member, std::span<const Value> arguments, const Value& value)
 {
+    if (member >= MemberCount) {
+        dataGrid().put(member - MemberCount, arguments, value);
+        return;
+    }
     if (member != ColWidth)
         refuseMember(Names, member);
     const int column = columnOf(arguments, 0);
@@ -74,6 +88,15 @@ void TableViewGrid::takeMaps()
     fetchAll(*table.model(), table.rootIndex());
     rows_ = SectionMap::shown(*table.verticalHeader());
     columns_ = SectionMap::all(*table.horizontalHeader());
+    spans_ = CellSpans(table, rows_, columns_);
+    text_.take(table);
+}
+
+DataViewGrid& TableViewGrid::dataGrid()
+{
+    if (!dataGrid_)
+        dataGrid_ = std::make_unique<DataViewGrid>(view());
+    return *dataGrid_;
 }
 
 int TableViewGrid::columnOf(std::span<const Value> arguments, std::size_t position) const
@@ -95,7 +118,13 @@ TextView TableViewGrid::cell(int row, int column)
     const QModelIndex root = table.rootIndex();
     if (modelRow >= model.rowCount(root) || column >= model.columnCount(root))
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the grid has lost rows");
-    return text_.of(table, model.index(modelRow, column, root));
+    ModelCell shown { modelRow, column };
+    if (const CellSpan* const span = spans_.at(shown)) {
+        if (span->shown != shown)
+            return {};
+        shown = span->first;
+    }
+    return text_.of(table, model.index(shown.row, shown.column, root));
 }
 
 } // namespace pelloric::qt

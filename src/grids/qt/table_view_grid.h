@@ -3,25 +3,34 @@
 
 #pragma once
 
+#include "grids/qt/cell_spans.h"
 #include "grids/qt/cell_text.h"
 #include "grids/qt/view_sections.h"
 #include "platform/automation_object.h"
 
 #include <QPointer>
 
+#include <memory>
+
 class QTableView;
 
 namespace pelloric::qt {
 
-/// A table view as a flex grid: `Cols`, `Rows`, `ColWidth`, `TextMatrix`.
+class DataViewGrid;
+
+/// A table view as the flex grid that it looks like: `Cols`, `Rows`, `ColWidth`, `TextMatrix`.
 ///
 /// Row 0 holds the titles of the horizontal header. Columns stand in the order in which they are
-/// seen, hidden ones with width 0; hidden rows are left out. Reading `Cols` lets the model fetch
-/// all its rows and takes order and rows anew; until then they stay as they were.
+/// seen, hidden ones with width 0; hidden rows are left out. A cell that another one spans is
+/// empty. Reading `Cols` lets the model fetch all its rows and takes order and rows anew; until
+/// then they stay as they were.
+///
+/// It answers a data grid's members as `DataViewGrid` does, too, for a host that asks for those.
 class TableViewGrid final : public AutomationObject {
 public:
     /// @param view  borrowed; once it is gone, its members are the object-missing error
     explicit TableViewGrid(QTableView& view);
+    ~TableViewGrid() override;
 
     std::optional<MemberId> findMember(TextView name) override;
     const void* memberTable() const override;
@@ -33,10 +42,13 @@ private:
     void takeMaps();
     int columnOf(std::span<const Value> arguments, std::size_t position) const;
     TextView cell(int row, int column);
+    DataViewGrid& dataGrid();
 
     QPointer<QTableView> view_;
     SectionMap rows_;
     SectionMap columns_;
+    CellSpans spans_;
+    std::unique_ptr<DataViewGrid> dataGrid_; ///< null: nobody asked for its members yet
     CellText text_;
     QString title_;
 };

@@ -75,6 +75,7 @@ struct TreeViewGrid::Source {
     Twips listWidth = -1; ///< what was put; below 0: the view's own
     SectionMap columns;
     std::vector<QModelIndex> rows; ///< the first column of each row
+    CellText text;
     ModelWatch watch;
 
     QAbstractItemView& view() const
@@ -93,6 +94,21 @@ struct TreeViewGrid::Source {
 
     /// The model's number of a column.
     int logical(int place) const { return tree ? columns.logical(place) : list->modelColumn(); }
+
+    /// A single column without a header has one blank as its title.
+    QString title(int place) const
+    {
+        const QAbstractItemView& shown = view();
+        if (columns.count() == 1 && (!tree || tree->isHeaderHidden()))
+            return QStringLiteral(" ");
+        return columnTitle(*shown.model(), logical(place));
+    }
+
+    /// Whether the first column of a row reaches over all the others.
+    bool isSpanned(const QModelIndex& row) const
+    {
+        return tree && tree->isFirstColumnSpanned(row.row(), row.parent());
+    }
 
     Twips width(int place) const
     {
@@ -119,6 +135,7 @@ struct TreeViewGrid::Source {
         QAbstractItemModel& model = *shown.model();
         listBelow(shown.rootIndex(), [&](const QModelIndex& parent) { fetchAll(model, parent); });
         listBelow(shown.rootIndex(), [](const QModelIndex&) {});
+        text.take(shown);
         watch.watch(model);
     }
 
@@ -192,7 +209,7 @@ public:
             return Value::ofNumber(source_.width(place_));
         if (member != HeaderText)
             refuseMember(HeaderNames, member);
-        title_ = columnTitle(*source_.view().model(), source_.logical(place_));
+        title_ = source_.title(place_);
         return Value::ofText(viewOf(title_));
     }
 
@@ -281,12 +298,14 @@ private:
     {
         const QAbstractItemView& view = source_.view();
         const QModelIndex& row = source_.row(place_);
-        return text_.of(view, row.siblingAtColumn(source_.logical(column)));
+        const int logical = source_.logical(column);
+        if (logical > 0 && source_.isSpanned(row))
+            return {};
+        return source_.text.of(view, row.siblingAtColumn(logical));
     }
 
     Source& source_;
     int place_ = 0;
-    CellText text_;
 };
 
 /// The rows, counted from 1.

@@ -18,13 +18,15 @@ namespace pelloric::qt {
 /// `ColumnHeaders` (each with `Width` and `Text`) are the columns in the order in which they are
 /// seen, hidden ones with width 0. `ListItems` (each with `Text`, the first column, and
 /// `SubItems(p)`, the others from 1) are the rows from top to bottom, whether scrolled into sight
-/// or not: those of branches that are open, without hidden rows. Both count from 1. Reading
-/// `ColumnHeaders` takes the columns anew, reading `ListItems` the rows.
+/// or not: those of branches that are open, without hidden rows; what the first column of a row
+/// spans is empty. Both count from 1. Reading `ColumnHeaders` takes the columns anew, reading
+/// `ListItems` the rows.
 class TreeViewGrid final : public AutomationObject {
 public:
     /// @param view  borrowed; once it is gone, its members are the object-missing error
     explicit TreeViewGrid(QTreeView& view);
-    /// A list is one column as wide as the view; the width that is put is kept here.
+    /// A list is one column as wide as the view, with a blank as title; the width that is put is
+    /// kept here.
     explicit TreeViewGrid(QListView& view);
     ~TreeViewGrid() override;
 

@@ -5,6 +5,7 @@
 
 #include "grids/qt/grid_for.h"
 #include "grids/qt/late_bound.h"
+#include "platform/row_set.h"
 #include "support/errors.h"
 
 #include <QDate>
@@ -30,6 +31,22 @@ protected:
         }
         for (int column = 0; column < 4; ++column)
             table_.setColumnWidth(column, 96 + column);
+    }
+
+    /// All rows but the titles: cells between blanks, "-" for an empty one, "/" behind each row.
+    static Text textsOf(QTableView& view)
+    {
+        TableViewGrid object(view);
+        LateBound grid(object);
+        Text texts;
+        for (int row = 1; row < grid.get(u"Rows").number(); ++row) {
+            for (int column = 0; column < grid.get(u"Cols").number(); ++column) {
+                const Text text = grid.text(u"TextMatrix", row, column);
+                texts += (text.empty() ? Text(u"-") : text) + u" ";
+            }
+            texts += u"/ ";
+        }
+        return texts;
     }
 
     QTableWidget table_ { 3, 4 };
@@ -106,6 +123,57 @@ TEST_F(TableViewGridTest, CellsReadAsTheDelegateShowsThem)
         table_.locale().toString(QDate(2004, 10, 23), QLocale::ShortFormat).toStdU16String());
     EXPECT_EQ(grid.text(u"TextMatrix", 1, 2), u"two\nlines");
     EXPECT_EQ(grid.text(u"TextMatrix", 1, 3), u"");
+}
+
+TEST_F(TableViewGridTest, CheckBoxesStandBeforeTheText)
+{
+    table_.item(0, 0)->setCheckState(Qt::Checked);
+    table_.item(0, 1)->setCheckState(Qt::Unchecked);
+    table_.item(0, 2)->setCheckState(Qt::PartiallyChecked);
+    table_.item(0, 3)->setCheckState(Qt::Checked);
+    table_.item(0, 3)->setText({});
+    TableViewGrid object(table_);
+    LateBound grid(object);
+    EXPECT_EQ(grid.text(u"TextMatrix", 1, 0), u"☑ 00");
+    EXPECT_EQ(grid.text(u"TextMatrix", 1, 1), u"☐ 01");
+    EXPECT_EQ(grid.text(u"TextMatrix", 1, 2), u"▣ 02");
+    EXPECT_EQ(grid.text(u"TextMatrix", 1, 3), u"☑");
+}
+
+TEST_F(TableViewGridTest, CellsThatASpanCoversAreEmpty)
+{
+    table_.setSpan(0, 1, 2, 2);
+    table_.setSpan(2, 1, 1, 2); // as wide and right below
+    table_.setSpan(0, 3, 2, 1); // as high and right beside
+    EXPECT_EQ(textsOf(table_), u"00 01 - 03 / 10 - - - / 20 21 - 23 / ");
+}
+
+TEST_F(TableViewGridTest, NeighbouringSpansOfOneSizeAreToldApart)
+{
+    table_.setSpan(0, 0, 1, 2);
+    table_.setSpan(0, 2, 1, 2);
+    table_.setSpan(1, 0, 2, 1);
+    table_.setSpan(1, 1, 2, 1);
+    EXPECT_EQ(textsOf(table_), u"00 - 02 - / 10 11 12 13 / - - 22 23 / ");
+}
+
+TEST_F(TableViewGridTest, ASpanIsReadInItsFirstCellThatIsNotHidden)
+{
+    table_.setSpan(0, 0, 2, 2);
+    table_.setRowHidden(0, true);
+    table_.setColumnHidden(0, true);
+    EXPECT_EQ(textsOf(table_), u"- 00 12 13 / 20 21 22 23 / ");
+}
+
+TEST_F(TableViewGridTest, AnswersADataGridsMembersToAHostThatAsks)
+{
+    TableViewGrid object(table_);
+    RowSet& rows = LateBound(object).get(u"DataSource").toRows();
+    rows.setPosition(3);
+    EXPECT_EQ(rows.value(1).text(), u"21");
+    EXPECT_EQ(LateBound(object).child(u"Columns").get(u"Count").number(), 4);
+    LateBound(object).put(u"col", Value::ofNumber(2));
+    EXPECT_EQ(LateBound(object).get(u"col").number(), 2);
 }
 
 TEST_F(TableViewGridTest, RefusesIndexesOutsideTheTable)

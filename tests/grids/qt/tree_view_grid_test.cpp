@@ -141,4 +141,43 @@ TEST(TreeViewGrid, AListIsOneColumnAsWideAsTheView)
     EXPECT_EQ(items.item(2).get(u"Text").text(), u"三");
 }
 
+TEST(TreeViewGrid, AListHasABlankAsItsTitle)
+{
+    QListWidget list;
+    const auto object = gridFor(list);
+    EXPECT_EQ(LateBound(*object).child(u"ColumnHeaders").item(1).get(u"Text").text(), u" ");
+}
+
+TEST(TreeViewGrid, ASingleColumnWhoseHeaderIsHiddenHasABlankAsItsTitle)
+{
+    QTreeWidget tree;
+    tree.setHeaderLabel(QStringLiteral("Name"));
+    const auto object = gridFor(tree);
+    LateBound header = LateBound(*object).child(u"ColumnHeaders").item(1);
+    EXPECT_EQ(header.get(u"Text").text(), u"Name");
+    tree.setHeaderHidden(true);
+    EXPECT_EQ(header.get(u"Text").text(), u" ");
+}
+
+TEST_F(TreeViewGridTest, WhatTheFirstColumnSpansIsEmpty)
+{
+    tree_.topLevelItem(1)->setFirstColumnSpanned(true);
+    TreeViewGrid object(tree_);
+    LateBound items = LateBound(object).child(u"ListItems");
+    LateBound spanned = items.item(2);
+    EXPECT_EQ(spanned.get(u"Text").text(), u"b");
+    EXPECT_EQ(spanned.get(u"SubItems", 1).text(), u"");
+    EXPECT_EQ(items.item(1).get(u"SubItems", 1).text(), u"a1");
+}
+
+TEST_F(TreeViewGridTest, CheckBoxesStandBeforeTheText)
+{
+    tree_.topLevelItem(0)->setCheckState(1, Qt::Checked);
+    tree_.topLevelItem(2)->setCheckState(0, Qt::Unchecked);
+    TreeViewGrid object(tree_);
+    EXPECT_EQ(rowsOf(object), u"a b b-x b-y ☐ c ");
+    LateBound items = LateBound(object).child(u"ListItems");
+    EXPECT_EQ(items.item(1).get(u"SubItems", 1).text(), u"☑ a1");
+}
+
 } // namespace pelloric::qt

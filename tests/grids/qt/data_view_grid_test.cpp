@@ -1,11 +1,12 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "grids/qt/sql_view_grid.h"
+#include "grids/qt/data_view_grid.h"
 
 #include "grids/qt/grid_for.h"
 #include "grids/qt/late_bound.h"
 #include "platform/row_set.h"
+#include "report/grid_reader.h"
 #include "support/errors.h"
 
 #include <QHeaderView>
@@ -13,6 +14,7 @@
 #include <QSqlDatabase>
 #include <QSqlQuery>
 #include <QSqlTableModel>
+#include <QStyledItemDelegate>
 #include <QTableView>
 
 #include <gtest/gtest.h>
@@ -23,7 +25,15 @@ namespace {
 
 constexpr int RecordCount = 600; // more than an SQL model fetches at first
 
-class SqlViewGridTest : public testing::Test {
+class Euros : public QStyledItemDelegate {
+public:
+    QString displayText(const QVariant& value, const QLocale& locale) const override
+    {
+        return locale.toString(value.toDouble(), 'f', 2) + QStringLiteral(" €");
+    }
+};
+
+class DataViewGridTest : public testing::Test {
 protected:
     void SetUp() override
     {
@@ -52,7 +62,7 @@ protected:
         QSqlDatabase::removeDatabase(Connection);
     }
 
-    const QString Connection = QStringLiteral("sql-view-grid");
+    const QString Connection = QStringLiteral("data-view-grid");
     QSqlDatabase database_;
     std::unique_ptr<QSqlTableModel> model_;
     QSortFilterProxyModel proxy_;
@@ -61,7 +71,7 @@ protected:
 
 } // namespace
 
-TEST_F(SqlViewGridTest, TheRecordSetHoldsAllRows)
+TEST_F(DataViewGridTest, TheRecordSetHoldsAllRows)
 {
     ASSERT_LT(model_->rowCount(), RecordCount);
     const auto object = gridFor(view_);
@@ -75,9 +85,9 @@ TEST_F(SqlViewGridTest, TheRecordSetHoldsAllRows)
     EXPECT_EQ(rows.value(2).number(), RecordCount / 2.0);
 }
 
-TEST_F(SqlViewGridTest, ValuesKeepTheirKinds)
+TEST_F(DataViewGridTest, ValuesKeepTheirKinds)
 {
-    SqlViewGrid object(view_);
+    DataViewGrid object(view_);
     RowSet& rows = LateBound(object).get(u"DataSource").toRows();
     rows.setPosition(2);
     EXPECT_EQ(rows.value(0).kind(), ValueKind::Number);
@@ -86,9 +96,9 @@ TEST_F(SqlViewGridTest, ValuesKeepTheirKinds)
     EXPECT_EQ(rows.value(0).text(), u"123456789012345678") << "a double would lose digits";
 }
 
-TEST_F(SqlViewGridTest, TheCursorStopsBesideTheRecords)
+TEST_F(DataViewGridTest, TheCursorStopsBesideTheRecords)
 {
-    SqlViewGrid object(view_);
+    DataViewGrid object(view_);
     RowSet& rows = LateBound(object).get(u"DataSource").toRows();
     EXPECT_TRUE(rows.isBeforeFirst());
     EXPECT_EQ(errorOf([&] { rows.value(0); }), ErrorNumber::SubscriptOutOfRange);
@@ -101,7 +111,7 @@ TEST_F(SqlViewGridTest, TheCursorStopsBesideTheRecords)
     EXPECT_EQ(errorOf([&] { rows.value(3); }), ErrorNumber::SubscriptOutOfRange);
 }
 
-TEST_F(SqlViewGridTest, FieldsAndRecordsStandAsTheyAreSeen)
+TEST_F(DataViewGridTest, FieldsAndRecordsStandAsTheyAreSeen)
 {
     proxy_.setSourceModel(model_.get());
     proxy_.sort(2, Qt::DescendingOrder);
@@ -116,7 +126,7 @@ TEST_F(SqlViewGridTest, FieldsAndRecordsStandAsTheyAreSeen)
     EXPECT_EQ(rows.value(0).number(), 0.5);
 }
 
-TEST_F(SqlViewGridTest, AFilterThatHidesWholeFetchesStillFetchesAll)
+TEST_F(DataViewGridTest, AFilterThatHidesWholeFetchesStillFetchesAll)
 {
     proxy_.setSourceModel(model_.get());
     proxy_.setFilterKeyColumn(1);
@@ -129,10 +139,10 @@ TEST_F(SqlViewGridTest, AFilterThatHidesWholeFetchesStillFetchesAll)
     EXPECT_EQ(rows.value(0).number(), 600);
 }
 
-TEST_F(SqlViewGridTest, HiddenColumnsAreShownWhenTheyGetAWidth)
+TEST_F(DataViewGridTest, HiddenColumnsAreShownWhenTheyGetAWidth)
 {
     view_.setColumnHidden(1, true);
-    SqlViewGrid object(view_);
+    DataViewGrid object(view_);
     LateBound columns = LateBound(object).child(u"Columns");
     EXPECT_EQ(columns.get(u"Count").number(), 3);
     LateBound column = columns.item(1);
@@ -143,10 +153,10 @@ TEST_F(SqlViewGridTest, HiddenColumnsAreShownWhenTheyGetAWidth)
     EXPECT_EQ(errorOf([&] { columns.item(3); }), ErrorNumber::SubscriptOutOfRange);
 }
 
-TEST_F(SqlViewGridTest, ColMovesTheCurrentCell)
+TEST_F(DataViewGridTest, ColMovesTheCurrentCell)
 {
     view_.horizontalHeader()->moveSection(2, 0);
-    SqlViewGrid object(view_);
+    DataViewGrid object(view_);
     LateBound grid(object);
     view_.setCurrentIndex(model_->index(4, 0));
     grid.put(u"col", Value::ofNumber(0));
@@ -157,18 +167,56 @@ TEST_F(SqlViewGridTest, ColMovesTheCurrentCell)
         errorOf([&] { grid.put(u"col", Value::ofNumber(3)); }), ErrorNumber::SubscriptOutOfRange);
 }
 
-TEST_F(SqlViewGridTest, TheRecordSetStaysWhereItIsWhenItIsTakenAgain)
+TEST_F(DataViewGridTest, TheRecordSetStaysWhereItIsWhenItIsTakenAgain)
 {
-    SqlViewGrid object(view_);
+    DataViewGrid object(view_);
     RowSet& rows = LateBound(object).get(u"DataSource").toRows();
     rows.setPosition(7);
     EXPECT_EQ(&LateBound(object).get(u"DataSource").toRows(), &rows);
     EXPECT_EQ(rows.position(), 7);
 }
 
-TEST_F(SqlViewGridTest, RefusesMembersThatItDoesNotHave)
+TEST_F(DataViewGridTest, AViewOnAnSqlModelIsReadAsTheFlexGridThatItLooksLike)
 {
-    SqlViewGrid object(view_);
+    view_.setColumnHidden(1, true);
+    const auto object = gridFor(view_);
+    const GridTable table = readGrid(*object,
+        { .kind = PrintObjKind::MSHFlexGrid,
+            .paperWidth = 11907,
+            .keptWidths = {},
+            .store = std::make_shared<TextStore>() });
+    EXPECT_TRUE(view_.isColumnHidden(1));
+    EXPECT_EQ(table.fieldNames, (std::vector<Text> { u"id", u"price" }));
+    EXPECT_EQ(table.rows->recordCount(), RecordCount);
+}
+
+TEST_F(DataViewGridTest, AHostThatSaysDataGridGetsHiddenColumnsWidenedAndPrinted)
+{
+    view_.setColumnHidden(1, true);
+    const auto object = gridFor(view_);
+    const GridTable table = readGrid(*object,
+        { .kind = PrintObjKind::datagrid,
+            .paperWidth = 11907,
+            .keptWidths = {},
+            .store = std::make_shared<TextStore>() });
+    EXPECT_FALSE(view_.isColumnHidden(1));
+    EXPECT_EQ(table.fieldNames, (std::vector<Text> { u"id", u"name", u"price" }));
+}
+
+TEST_F(DataViewGridTest, DelegatesOfAnSqlViewAreAsked)
+{
+    Euros euros;
+    view_.setItemDelegateForColumn(2, &euros);
+    const auto object = gridFor(view_);
+    LateBound grid(*object);
+    EXPECT_EQ(grid.get(u"Cols").number(), 3);
+    EXPECT_EQ(grid.text(u"TextMatrix", 3, 2), u"1.50 €");
+    view_.setItemDelegateForColumn(2, nullptr);
+}
+
+TEST_F(DataViewGridTest, RefusesMembersThatItDoesNotHave)
+{
+    DataViewGrid object(view_);
     EXPECT_EQ(errorOf([&] { LateBound(object).get(u"TextMatrix"); }), ErrorNumber::NoSuchMember);
     EXPECT_EQ(
         errorOf([&] { LateBound(object).put(u"DataSource", {}); }), ErrorNumber::NoSuchMember);

@@ -14,20 +14,18 @@ class QTableView;
 
 namespace pelloric::qt {
 
-/// A table view on an SQL model as a data grid: `DataSource`, `Columns`, `col`.
+/// A table view as a data grid: `DataSource`, `Columns`, `col`; for a host that wants the data
+/// grid's reader, which prints hidden columns too.
 ///
 /// The record set is the view's model walked in place, in the order and with the filter that the
 /// view shows; its hidden rows are left out. Reading `DataSource` lets the model fetch all its rows
 /// and takes order and rows anew. `Columns` counts from 0, in the order in which columns are seen;
 /// a hidden one has width 0 and is shown when it is given a width.
-class SqlViewGrid final : public AutomationObject {
+class DataViewGrid final : public AutomationObject {
 public:
     /// @param view  borrowed; once it is gone, its members are the object-missing error
-    explicit SqlViewGrid(QTableView& view);
-    ~SqlViewGrid() override;
-
-    /// Whether the view's model is an SQL model, or proxies of one.
-    static bool isSqlView(const QTableView& view);
+    explicit DataViewGrid(QTableView& view);
+    ~DataViewGrid() override;
 
     std::optional<MemberId> findMember(TextView name) override;
     const void* memberTable() const override;

@@ -1,17 +1,16 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "grids/qt/sql_view_grid.h"
+#include "grids/qt/data_view_grid.h"
 
 #include "platform/member_names.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
-#include <QAbstractProxyModel>
+#include <QAbstractItemModel>
 #include <QHeaderView>
 #include <QItemSelectionModel>
-#include <QSqlQueryModel>
 #include <QTableView>
 
 namespace pelloric::qt {
@@ -82,7 +81,7 @@ private:
 } // namespace
 
 /// The columns in the order in which they are seen, counted from 0.
-class SqlViewGrid::Columns final : public AutomationObject {
+class DataViewGrid::Columns final : public AutomationObject {
 public:
     explicit Columns(const QPointer<QTableView>& view)
         : view_(view)
@@ -123,30 +122,22 @@ private:
     Column column_;
 };
 
-SqlViewGrid::SqlViewGrid(QTableView& view)
+DataViewGrid::DataViewGrid(QTableView& view)
     : view_(&view)
     , columns_(std::make_unique<Columns>(view_))
 {
 }
 
-SqlViewGrid::~SqlViewGrid() = default;
+DataViewGrid::~DataViewGrid() = default;
 
-bool SqlViewGrid::isSqlView(const QTableView& view)
-{
-    const QAbstractItemModel* model = view.model();
-    while (const auto* proxy = qobject_cast<const QAbstractProxyModel*>(model))
-        model = proxy->sourceModel();
-    return qobject_cast<const QSqlQueryModel*>(model) != nullptr;
-}
-
-std::optional<MemberId> SqlViewGrid::findMember(TextView name)
+std::optional<MemberId> DataViewGrid::findMember(TextView name)
 {
     return findMemberName(Names, name);
 }
 
-const void* SqlViewGrid::memberTable() const { return Names; }
+const void* DataViewGrid::memberTable() const { return Names; }
 
-Value SqlViewGrid::get(MemberId member, std::span<const Value> arguments)
+Value DataViewGrid::get(MemberId member, std::span<const Value> arguments)
 {
     switch (member) {
     case DataSource:
@@ -161,7 +152,7 @@ Value SqlViewGrid::get(MemberId member, std::span<const Value> arguments)
     }
 }
 
-void SqlViewGrid::put(MemberId member, std::span<const Value>, const Value& value)
+void DataViewGrid::put(MemberId member, std::span<const Value>, const Value& value)
 {
     if (member != Col)
         refuseMember(Names, member);
@@ -169,9 +160,9 @@ void SqlViewGrid::put(MemberId member, std::span<const Value>, const Value& valu
     setColumn(indexArgument(index, 0, 0, columns_->map().count() - 1));
 }
 
-QTableView& SqlViewGrid::view() const { return alive(view_); }
+QTableView& DataViewGrid::view() const { return alive(view_); }
 
-RowSet& SqlViewGrid::takeRows()
+RowSet& DataViewGrid::takeRows()
 {
     QTableView& table = view();
     fetchAll(*table.model(), table.rootIndex());
@@ -181,14 +172,14 @@ RowSet& SqlViewGrid::takeRows()
     return rows_;
 }
 
-int SqlViewGrid::column() const
+int DataViewGrid::column() const
 {
     const QModelIndex current = view().currentIndex();
     return current.isValid() ? view().horizontalHeader()->visualIndex(current.column()) : column_;
 }
 
 /// Moves the current cell within its row and selects nothing.
-void SqlViewGrid::setColumn(int column)
+void DataViewGrid::setColumn(int column)
 {
     QTableView& table = view();
     column_ = column;
