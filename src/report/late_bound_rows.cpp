@@ -7,6 +7,8 @@
 #include "platform/run_time_error.h"
 
 #include <algorithm>
+#include <cstdlib>
+#include <iterator>
 
 namespace pelloric {
 
@@ -27,17 +29,64 @@ AutomationObject& itemOf(AutomationObject& collection, int index)
 
 LateBoundRows::LateBoundRows(AutomationObject& object)
     : object_(object)
-    , positionMember_(memberOf(object, u"AbsolutePosition"))
+    , positionMember_(object.findMember(u"AbsolutePosition"))
+    , steps_(findSteps())
     , fieldsMember_(memberOf(object, u"Fields"))
-    , records_(wholeMember(object, u"RecordCount"))
+    , records_(std::max(0, wholeMember(object, u"RecordCount")))
 {
-    position_ = roundToInt32(object_.get(positionMember_, {}).toNumber());
+    start_ = startPosition();
+    position_ = start_;
     AutomationObject& fields = object_.get(fieldsMember_, {}).toObject();
     const int count = wholeMember(fields, u"Count");
     Text buffer;
     for (int field = 0; field < count; ++field)
         names_.emplace_back(displayText(getMember(itemOf(fields, field), u"Name"), u'.', buffer));
 }
+
+/// @return  nothing: a member is missing, but there is `AbsolutePosition`
+/// @throws RunTimeError NoSuchMember: a member is missing, and so is `AbsolutePosition`
+std::optional<LateBoundRows::Steps> LateBoundRows::findSteps()
+{
+    constexpr TextView Needed[] = { u"MoveFirst", u"MoveNext", u"MovePrevious", u"BOF", u"EOF" };
+    const auto isThere = [&](TextView name) { return object_.findMember(name).has_value(); };
+    if (positionMember_ && !std::all_of(std::begin(Needed), std::end(Needed), isThere))
+        return std::nullopt;
+    return Steps { memberOf(object_, u"MoveFirst"), memberOf(object_, u"MoveNext"),
+        memberOf(object_, u"MovePrevious"), object_.findMember(u"Move"), memberOf(object_, u"BOF"),
+        memberOf(object_, u"EOF") };
+}
+
+std::int64_t LateBoundRows::startPosition()
+{
+    if (positionMember_)
+        startMark_ = object_.get(*positionMember_, {}).toNumber();
+    if (records_ == 0)
+        return 0;
+    if (steps_ && isTrue(steps_->isBeforeFirst))
+        return 0;
+    if (steps_ && isTrue(steps_->isAfterLast))
+        return records_ + 1;
+    if (!positionMember_)
+        return countedPosition();
+    return std::clamp<std::int64_t>(roundToInt32(startMark_), 0, records_ + 1);
+}
+
+/// Counts the records back to the first one, and stands where the cursor was again.
+std::int64_t LateBoundRows::countedPosition()
+{
+    std::int64_t position = 0;
+    while (!isTrue(steps_->isBeforeFirst)) {
+        if (position == records_)
+            throw RunTimeError(
+                ErrorNumber::InvalidCall, u"the data source never comes to its first record");
+        call(steps_->previous);
+        ++position;
+    }
+    walk(0, position);
+    return position;
+}
+
+bool LateBoundRows::isTrue(MemberId member) { return object_.get(member, {}).toNumber() != 0; }
 
 TextView LateBoundRows::fieldName(int field) const
 {
@@ -48,9 +97,63 @@ TextView LateBoundRows::fieldName(int field) const
 
 void LateBoundRows::setPosition(std::int64_t position)
 {
+    const std::int64_t from = position_;
     position_ = std::clamp<std::int64_t>(position, 0, records_ + 1);
-    if (!isBeforeFirst() && !isAfterLast())
-        object_.put(positionMember_, {}, Value::ofNumber(static_cast<double>(position_)));
+    if (records_ == 0)
+        return;
+    if (!positionMember_) {
+        walk(from, position_);
+        return;
+    }
+    const bool isBeside = isBeforeFirst() || isAfterLast();
+    if (isBeside && !steps_) {
+        returnBeside();
+        return;
+    }
+    writePosition(static_cast<double>(std::clamp<std::int64_t>(position_, 1, records_)));
+    if (isBeside)
+        call(isBeforeFirst() ? steps_->previous : steps_->next);
+}
+
+void LateBoundRows::writePosition(double position)
+{
+    object_.put(*positionMember_, {}, Value::ofNumber(position));
+}
+
+/// A cursor that is only a number gets beside the records no other way than by the number that it
+/// answered there.
+void LateBoundRows::returnBeside()
+{
+    if (position_ != start_)
+        return;
+    try {
+        writePosition(startMark_);
+    } catch (const RunTimeError&) {
+        // The object does not take back what it answered.
+    }
+}
+
+/// Moves the object's cursor step by step, or in one leap where it can leap.
+void LateBoundRows::walk(std::int64_t from, std::int64_t to)
+{
+    if (to == from)
+        return;
+    if (to == 0 || to == 1 || from == 0 || from > records_) {
+        call(steps_->first);
+        from = 1;
+        if (to == 0)
+            call(steps_->previous);
+    }
+    if (to == 0)
+        return;
+    const std::int64_t distance = to - from;
+    if (std::abs(distance) > 1 && steps_->relative) {
+        const Value records = Value::ofNumber(static_cast<double>(distance));
+        object_.get(*steps_->relative, { &records, 1 });
+        return;
+    }
+    for (std::int64_t step = 0; step < std::abs(distance); ++step)
+        call(distance > 0 ? steps_->next : steps_->previous);
 }
 
 Value LateBoundRows::value(int field)

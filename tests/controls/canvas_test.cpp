@@ -373,6 +373,36 @@ TEST_F(CanvasTest, PutsTheCursorOfALateBoundRowSetBack)
     EXPECT_EQ(canvas.table()->rows, nullptr);
 }
 
+TEST_F(CanvasTest, PutsEveryKindOfLateBoundCursorBackWhereverItStood)
+{
+    canvas.m_PrintObj = PrintObjKind::datagrid;
+    using Cursor = FakeRecords::Cursor;
+    for (const Cursor cursor :
+        { Cursor::Position, Cursor::Steps, Cursor::StepsWithoutMove, Cursor::Both }) {
+        FakeRecords records({ u"A" }, { { u"1" }, { u"2" }, { u"3" }, { u"4" } }, cursor);
+        FakeDataGrid grid(Value::ofObject(records), { 1000 });
+        for (const int position : { 0, 1, 3, 4, 5 }) {
+            records.position = position;
+            canvas.doPreview(grid);
+            EXPECT_EQ(textsOf(canvas.document(), 0), "A|1|2|3|4");
+            EXPECT_EQ(records.position, position) << static_cast<int>(cursor);
+        }
+    }
+}
+
+TEST_F(CanvasTest, PrintsALateBoundRowSetInBandsAndMergedByItsStepsAlone)
+{
+    canvas.m_PrintObj = PrintObjKind::datagrid;
+    set({ { u"GridMerge", u"1" } });
+    FakeRecords records({ u"A", u"B" }, { { u"1", u"x" }, { u"1", u"y" }, { u"2", u"y" } },
+        FakeRecords::Cursor::Steps);
+    FakeDataGrid grid(Value::ofObject(records), { 8000, 8000 });
+    canvas.doPreview(grid);
+    EXPECT_EQ(textsOf(canvas.document(), 0), "A|1|2");
+    EXPECT_EQ(textsOf(canvas.document(), 1), "B|x|y");
+    EXPECT_EQ(records.position, 1);
+}
+
 TEST_F(CanvasTest, RefusesANestedBuildWithoutAWord)
 {
     BusyLoop busy;

@@ -148,12 +148,17 @@ public:
     std::vector<int> selected; ///< every column that was selected
 };
 
-/// A row set that is a late-bound object: records of texts.
+/// A row set that is a late-bound object: records of texts, and a cursor by one of its ways.
 class FakeRecords : public FakeObject {
 public:
-    FakeRecords(std::vector<Text> names, std::vector<std::vector<Text>> records)
+    enum class Cursor { Position, Steps, StepsWithoutMove, Both };
+
+    FakeRecords(std::vector<Text> names, std::vector<std::vector<Text>> records,
+        Cursor cursor = Cursor::Position)
         : rows(std::move(records))
     {
+        if (cursor != Cursor::Position)
+            addSteps(cursor != Cursor::StepsWithoutMove);
         for (std::size_t field = 0; field < names.size(); ++field) {
             FakeObject& item = fields.add();
             item.text(u"Name", names[field]);
@@ -162,16 +167,50 @@ public:
             });
         }
         number(u"RecordCount", static_cast<double>(rows.size()));
-        member(
-            u"AbsolutePosition",
-            [this](Arguments) { return Value::ofNumber(static_cast<double>(position)); },
-            [this](Arguments, const Value& value) { position = static_cast<int>(value.number()); });
+        if (cursor == Cursor::Position || cursor == Cursor::Both)
+            addPosition();
         member(u"Fields", [this](Arguments) { return Value::ofObject(fields); });
     }
 
     std::vector<std::vector<Text>> rows;
     FakeCollection fields { 0 };
-    int position = 1;
+    int position = 1; ///< 0 before the first, one more than there are behind the last
+    int moves = 0; ///< how often the cursor was moved
+
+private:
+    void addPosition()
+    {
+        member(
+            u"AbsolutePosition",
+            [this](Arguments) { return Value::ofNumber(static_cast<double>(position)); },
+            [this](Arguments, const Value& value) { position = static_cast<int>(value.number()); });
+    }
+
+    void addSteps(bool withMove)
+    {
+        const auto last = [this] { return static_cast<int>(rows.size()); };
+        const auto move = [this, last](int records) {
+            const int target = position + records;
+            if ((records < 0 && position == 0) || (records > 0 && position > last()))
+                throw RunTimeError(ErrorNumber::InvalidCall, u"moved past an end");
+            position = target < 0 ? 0 : target > last() ? last() + 1 : target;
+            ++moves;
+            return Value();
+        };
+        member(u"BOF", [this](Arguments) { return Value::ofTruth(position == 0); });
+        member(u"EOF", [this, last](Arguments) { return Value::ofTruth(position > last()); });
+        member(u"MoveFirst", [this](Arguments) {
+            position = 1;
+            ++moves;
+            return Value();
+        });
+        member(u"MoveNext", [move](Arguments) { return move(1); });
+        member(u"MovePrevious", [move](Arguments) { return move(-1); });
+        if (withMove)
+            member(u"Move", [move](Arguments arguments) {
+                return move(static_cast<int>(arguments[0].number()));
+            });
+    }
 };
 
 } // namespace pelloric
