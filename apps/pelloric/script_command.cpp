@@ -15,8 +15,15 @@
 #include "table_source.h"
 #include "tables/qt/csv_table.h"
 #include "tables/qt/sqlite_table.h"
+#include "windows.h"
 
+#include <algorithm>
 #include <memory>
+#include <optional>
+
+#ifdef Q_OS_UNIX
+#include <sys/resource.h>
+#endif
 
 namespace pelloric::app {
 
@@ -60,6 +67,20 @@ private:
     TextMetrics& metrics_;
 };
 
+/// Deeply nested expressions of a script are read by recursion; the stack grows as far as the
+/// address space that every process keeps free for it allows.
+void raiseStackLimit()
+{
+#ifdef Q_OS_UNIX
+    constexpr rlim_t StackBytes = 120U << 20U;
+    rlimit limit {};
+    if (getrlimit(RLIMIT_STACK, &limit) != 0 || limit.rlim_cur >= StackBytes)
+        return;
+    limit.rlim_cur = std::min(limit.rlim_max, StackBytes);
+    setrlimit(RLIMIT_STACK, &limit);
+#endif
+}
+
 } // namespace
 
 int runScript(const Invocation& invocation)
@@ -68,14 +89,26 @@ int runScript(const Invocation& invocation)
         throw CommandError(
             QStringLiteral("say which script to run, for example \"pelloric run report.js\""),
             WrongUsage);
-    const HeadlessWidgets application(invocation);
+    raiseStackLimit();
+    QStringList arguments = invocation.arguments;
+    const bool isWindowed = arguments.front() == QLatin1String("--window");
+    if (isWindowed)
+        arguments.removeFirst();
+    if (arguments.isEmpty())
+        throw CommandError(QStringLiteral("say which script to run"), WrongUsage);
+    std::optional<WindowedApplication> windowed;
+    std::optional<HeadlessWidgets> headless;
+    if (isWindowed)
+        windowed.emplace(invocation);
+    else
+        headless.emplace(invocation);
     qt::QtPlatform platform;
     const qt::QtPrinting printing(platform);
     const Platform record = platform.record();
     deployDefaultSettings(record);
     Tables tables(record.metrics);
-    qt::ScriptHost host(platform, tables);
-    QStringList arguments = invocation.arguments;
+    qt::ScriptHost host(
+        platform, tables, isWindowed ? qt::ScriptWindows::Shown : qt::ScriptWindows::Hidden);
     const QString script = arguments.takeFirst();
     return host.run(script, arguments);
 }
@@ -87,6 +120,11 @@ QString scriptDetails()
         "args, messages, print(...), exit(status), csv(path), sqlite(path, tableOrQuery),\n"
         "lines(canvas, page), texts(canvas, page), placePicture(canvas, page, picture) and\n"
         "wait(milliseconds). A control also has grab(path) and resize(width, height).\n"
+        "Kestrane.doPreview builds in the preview window, whose canvas previewCanvas() is. "
+        "Nothing\n"
+        "is shown, unless --window stands before SCRIPT: then the program goes on until the "
+        "window\n"
+        "is closed.\n"
         "An exception that it does not catch ends the program with status 1.\n");
 }
 

@@ -59,11 +59,12 @@ Kestrane::Kestrane(QWidget* parent)
 }
 
 Kestrane::Kestrane(QtPlatform& platform, QWidget* parent)
-    : QWidget(parent)
+    : KestraneCalls(parent)
     , parts_(std::make_shared<Parts>(platform))
     , facade_(parts_->facade)
     , calls_(*this, parts_, parts_->platform, [] {})
 {
+    registerRecords();
     setObjectName(QStringLiteral("Kestrane"));
     setAccessibleName(tr("Print preview"));
 }
@@ -125,7 +126,7 @@ void Kestrane::setMergeGrid(bool merge)
 
 void Kestrane::doPreview(const QVariant& PrintObj)
 {
-    calls_.run([&] { facade_.doPreview(toGrid(PrintObj)); });
+    calls_.run([&] { facade_.doPreview(toGrid(PrintObj, *this)); });
 }
 
 void Kestrane::AddHeader(const QVariant& strHeader, const QVariant& Location)

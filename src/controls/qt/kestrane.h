@@ -5,9 +5,9 @@
 
 #include "controls/facade.h"
 #include "controls/qt/member_calls.h"
+#include "controls/qt/plain_calls.h"
 
 #include <QVariant>
-#include <QWidget>
 
 #include <memory>
 
@@ -20,7 +20,7 @@ class QtPlatform;
 /// Every member is published by its name, too, and takes and answers variants there. No error
 /// leaves a member: it becomes an error of the script that the control belongs to, or a message
 /// box.
-class Kestrane : public QWidget {
+class Kestrane : public KestraneCalls {
     Q_OBJECT
     Q_PROPERTY(
         QVariant ShowHeader READ getShowHeader WRITE putShowHeader DESIGNABLE false STORED false)

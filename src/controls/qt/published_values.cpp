@@ -100,10 +100,10 @@ QString toPlainText(const QVariant& argument)
     return toQString(displayText(simple(argument, held), u'.', buffer));
 }
 
-std::unique_ptr<AutomationObject> toGrid(const QVariant& argument)
+std::unique_ptr<AutomationObject> toGrid(const QVariant& argument, const QObject& control)
 {
     if (isScriptValue(argument))
-        return scriptCaller()->object(argument);
+        return scriptCaller()->object(argument, control);
     const QVariant value = plain(argument);
     if (value.typeId() == QMetaType::Nullptr)
         throw RunTimeError(ErrorNumber::ObjectMissing);

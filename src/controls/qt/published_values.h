@@ -10,6 +10,8 @@
 
 #include <memory>
 
+class QObject;
+
 namespace pelloric::qt {
 
 /// An argument as 16 bits, rounded half to even; a text must be a number as a whole.
@@ -32,7 +34,9 @@ bool toTruth(const QVariant& argument);
 QString toPlainText(const QVariant& argument);
 
 /// The grid that an argument is: an object of the program or of a script.
+///
+/// @param control  whose member it was handed to
 /// @throws RunTimeError TypeMismatch: no object; ObjectMissing: an object that is gone or null
-std::unique_ptr<AutomationObject> toGrid(const QVariant& argument);
+std::unique_ptr<AutomationObject> toGrid(const QVariant& argument, const QObject& control);
 
 } // namespace pelloric::qt

@@ -33,8 +33,10 @@ public:
     virtual QVariant plainValue(const QVariant& argument) const = 0;
 
     /// The object that a script's value is.
+    /// @param control  whose member it was handed to
     /// @throws RunTimeError ObjectMissing: the value is no object, or one that is gone
-    virtual std::unique_ptr<AutomationObject> object(const QVariant& argument) const = 0;
+    virtual std::unique_ptr<AutomationObject> object(
+        const QVariant& argument, const QObject& control) const = 0;
 
     /// Throws an error into the script that called a control.
     /// @return  false: the control belongs to no script, nothing has been done

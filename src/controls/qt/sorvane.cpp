@@ -72,7 +72,7 @@ Sorvane::Sorvane(QWidget* parent)
 }
 
 Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
-    : QWidget(parent)
+    : SorvaneCalls(parent)
     , parts_(std::make_shared<Parts>(platform))
     , canvas_(parts_->canvas)
     , calls_(*this, parts_, parts_->platform, [this] { areas_->viewChanged(); })
@@ -80,6 +80,7 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
           CanvasAreas::RightButton { [this] { emit Click(RightButtonNumber); },
               [this] { emit MouseUp(RightButtonNumber); } }))
 {
+    registerRecords();
     canvas_.documentName = toText(QGuiApplication::applicationDisplayName());
     setObjectName(QStringLiteral("Sorvane"));
     setAccessibleName(tr("Page preview"));
@@ -239,7 +240,7 @@ void Sorvane::doPrint(
 
 void Sorvane::doPreview(const QVariant& PrintObj)
 {
-    run([&] { preview(toGrid(PrintObj)); });
+    run([&] { preview(toGrid(PrintObj, *this)); });
 }
 
 void Sorvane::SetShowStyle(
@@ -273,7 +274,7 @@ void Sorvane::OpenFile(const QVariant& FilePath)
 
 void Sorvane::ReDrawZoom(const QVariant& PrintObj)
 {
-    run([&] { redraw(toGrid(PrintObj)); });
+    run([&] { redraw(toGrid(PrintObj, *this)); });
 }
 
 QVariant Sorvane::getPrintObj() const { return static_cast<int>(canvas_.m_PrintObj); }

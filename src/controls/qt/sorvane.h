@@ -6,9 +6,9 @@
 #include "controls/canvas.h"
 #include "controls/facade.h"
 #include "controls/qt/member_calls.h"
+#include "controls/qt/plain_calls.h"
 
 #include <QVariant>
-#include <QWidget>
 
 #include <functional>
 #include <memory>
@@ -24,7 +24,7 @@ class QtPlatform;
 /// does not fit is the overflow error, a value of another kind the type mismatch. No error leaves a
 /// member: it becomes an error of the script that the control belongs to, or a message box.
 /// Code that wants the errors themselves calls `canvas()`; the control shows what that does.
-class Sorvane : public QWidget {
+class Sorvane : public SorvaneCalls {
     Q_OBJECT
     Q_PROPERTY(QVariant intTop READ getIntTop WRITE putIntTop DESIGNABLE false STORED false)
     Q_PROPERTY(

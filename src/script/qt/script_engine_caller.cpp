@@ -40,12 +40,13 @@ public:
         return argument.value<QJSValue>().toVariant();
     }
 
-    std::unique_ptr<AutomationObject> object(const QVariant& argument) const override
+    std::unique_ptr<AutomationObject> object(
+        const QVariant& argument, const QObject& control) const override
     {
         const auto value = argument.value<QJSValue>();
         if (value.isQObject() && value.toQObject() == nullptr)
             throw RunTimeError(ErrorNumber::ObjectMissing);
-        return objectOfScript(value);
+        return objectOfScript(value, qjsEngine(&control));
     }
 
     bool raise(const QObject& control, const RunTimeError& error) const override

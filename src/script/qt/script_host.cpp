@@ -4,21 +4,27 @@
 #include "script/qt/script_host.h"
 
 #include "controls/canvas.h"
+#include "controls/member_table.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "script/qt/script_controls.h"
 #include "script/qt/script_engine_caller.h"
+#include "script/qt/script_prelude.h"
+#include "ui/qt/preview_window.h"
 
 #include <QCoreApplication>
 #include <QDeadlineTimer>
 #include <QEventLoop>
 #include <QFile>
+#include <QMap>
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
 #include <cstdio>
+#include <cstring>
 #include <functional>
 
 namespace pelloric::qt {
@@ -36,51 +42,30 @@ namespace {
 constexpr int LongestWait = 10'000; ///< milliseconds
 constexpr auto ExitMark = "pelloric: the script asked to end";
 
-/// What the script finds besides the language itself.
-constexpr auto Prelude = R"js(
-(function (global, host, argumentList) {
-    const enumerations = {
-        OrderStyle: { Whole: 0, One: 1, Two: 2, Four: 3, Multiple: 4, UserCustom: 5, Six: 6 },
-        PrintObjKind: { MSHFlexGrid: 0, MSFlexGrid: 1, ListView: 2, datagrid: 3 },
-        AlignmentType: { LocLeft: 0, LocCenter: 1, LocRight: 2 },
-    };
-    const records = {
-        Tpoint: { x: 0, y: 0 },
-        Lineobj: { pt1: null, pt2: null, LineStyle: 0, LineColor: 0, LineWidth: 1, FillStyle: 1,
-            FillColor: 0 },
-        Textobj: { pt: null, Str: "", prnFont: null, ForeColor: 0 },
-        MapLocation: { nLeft: 0, nTop: 0, nWidth: 0, nHeight: 0, nFJBH: "", strFilePath: "" },
-        ColPos: { StartCol: 0, EndCol: 0 },
-        MuliPageType: { nPages: 0, MinPage: 0, MaxPage: 0 },
-    };
-    const define = (name, value) => Object.defineProperty(global, name, { value });
-    const control = (make, constants) => {
-        const constructor = function () {
-            return Object.preventExtensions(make());
-        };
-        return Object.assign(constructor, constants);
-    };
-    for (const name in enumerations)
-        define(name, Object.freeze(enumerations[name]));
-    for (const name in records)
-        define(name, function (values) { return Object.assign(this, records[name], values); });
-    define("Sorvane", control(() => host.newSorvane(), enumerations.OrderStyle));
-    define("Kestrane", control(() => host.newKestrane(), enumerations.AlignmentType));
-    define("args", Object.freeze(argumentList));
-    define("print", (...values) => host.print(values.map(String).join(" ")));
-    define("exit", (status = 0) => host.exit(status));
-    define("csv", (path) => host.csv(path));
-    define("sqlite", (path, source) => host.sqlite(path, source));
-    define("wait", (milliseconds) => host.wait(milliseconds));
-    define("lines", (canvas, page) => host.lines(canvas, page));
-    define("texts", (canvas, page) => host.texts(canvas, page));
-    define("placePicture", (canvas, page, picture) => host.placePicture(canvas, page, picture));
-    const messages = [];
-    Object.defineProperty(global, "messages", {
-        get: () => { messages.push(...host.takeMessages()); return messages; },
-    });
-})
-)js";
+constexpr const char* OwnMembers[] = { "grab", "resize" }; ///< of a control that a script made
+
+/// How a script may use a member of a control.
+struct MemberUse {
+    bool reads = false;
+    bool writes = false;
+    bool calls = false; ///< an event is used as a member that is called, too
+};
+
+void addUse(MemberUse& use, MemberKind kind)
+{
+    use.reads = use.reads || kind == MemberKind::Field || kind == MemberKind::PropertyGet;
+    use.writes = use.writes || kind == MemberKind::Field || kind == MemberKind::PropertyPut;
+    use.calls = use.calls || kind == MemberKind::Method || kind == MemberKind::Event;
+}
+
+/// By name; a property that is read and written is one member.
+QMap<QString, MemberUse> usesOf(std::span<const MemberRow> table)
+{
+    QMap<QString, MemberUse> uses;
+    for (const MemberRow& row : table)
+        addUse(uses[QString::fromLatin1(row.name.data(), std::ssize(row.name))], row.kind);
+    return uses;
+}
 
 QString iconName(MessageIcon icon)
 {
@@ -163,13 +148,16 @@ Canvas& canvasOf(QObject* object)
 
 } // namespace
 
-ScriptHost::ScriptHost(QtPlatform& platform, ScriptTables& tables)
+ScriptHost::ScriptHost(QtPlatform& platform, ScriptTables& tables, ScriptWindows windows)
     : platform_(platform)
     , tables_(tables)
+    , windows_(windows)
+    , opener_(platform)
     , messages_(std::make_unique<ScriptMessages>())
 {
     letScriptsCall();
     platform_.useMessages(*messages_);
+    opener_.setShowing(windows == ScriptWindows::Shown);
 }
 
 ScriptHost::~ScriptHost() = default;
@@ -188,37 +176,76 @@ int ScriptHost::run(const QString& path, const QStringList& arguments)
 int ScriptHost::runText(const QString& text, const QString& name, const QStringList& arguments)
 {
     exitStatus_.reset();
+    isOutputLost_ = false;
     engine_ = std::make_unique<QJSEngine>();
     engine_->installExtensions(QJSEngine::ConsoleExtension);
     QJSValue result = evaluatePrelude(arguments);
     QStringList trace; // a script may throw what is no error, a text for example
-    if (!result.isError())
+    if (!result.isError()) {
+        const QJSValue promises = result;
         result = engine_->evaluate(text, name, 1, &trace);
-    const bool isThrown = result.isError() || !trace.isEmpty();
-    const int status = exitStatus_ ? *exitStatus_ : isThrown ? report(result, name) : 0;
+        if (!exitStatus_)
+            status_ = result.isError() || !trace.isEmpty() ? report(result, name) : 0;
+        if (!exitStatus_)
+            status_ = std::max(status_, reportRejections(promises, name));
+        if (!exitStatus_ && status_ == 0)
+            waitForWindows();
+    } else {
+        status_ = report(result, name);
+    }
+    const int status = exitStatus_.value_or(status_);
     engine_.reset();
-    return status;
+    return isOutputLost_ ? std::max(status, 1) : status;
 }
 
+/// @return  a function that tells about promises
 QJSValue ScriptHost::evaluatePrelude(const QStringList& arguments)
 {
     QJSValue list = engine_->newArray(static_cast<uint>(arguments.size()));
     for (qsizetype index = 0; index < arguments.size(); ++index)
         list.setProperty(static_cast<quint32>(index), arguments[index]);
     QJSEngine::setObjectOwnership(this, QJSEngine::CppOwnership);
-    const QJSValue prelude = engine_->evaluate(QString::fromUtf8(Prelude));
+    const QJSValue prelude = engine_->evaluate(
+        QString::fromUtf8(ScriptPrelude), QString::fromLatin1(ScriptPreludeName));
     return prelude.isError()
         ? prelude
         : prelude.call({ engine_->globalObject(), engine_->newQObject(this), list });
 }
 
-int ScriptHost::report(const QJSValue& error, const QString& name)
+/// Lets promises settle until none does any more, then reports those that were rejected and that
+/// nobody looked after.
+int ScriptHost::reportRejections(const QJSValue& promises, const QString& name)
+{
+    QJSValue outcome = promises.call();
+    for (int settled = -1; !exitStatus_;) {
+        const int now = outcome.property(QStringLiteral("settled")).toInt();
+        if (now == settled)
+            break;
+        settled = now;
+        QCoreApplication::sendPostedEvents();
+        outcome = promises.call();
+    }
+    const QJSValue reasons = outcome.property(QStringLiteral("reasons"));
+    const int count = reasons.property(QStringLiteral("length")).toInt();
+    for (int at = 0; at < count; ++at)
+        report(reasons.property(static_cast<quint32>(at)), name, "a promise was rejected: ");
+    return count > 0 ? 1 : 0;
+}
+
+/// Until the person in front of it has closed the preview window.
+void ScriptHost::waitForWindows()
+{
+    while (windows_ == ScriptWindows::Shown && opener_.window() != nullptr && !exitStatus_)
+        QCoreApplication::processEvents(QEventLoop::AllEvents | QEventLoop::WaitForMoreEvents);
+}
+
+int ScriptHost::report(const QJSValue& error, const QString& name, const char* what)
 {
     const QJSValue number = error.property(QStringLiteral("number"));
     const QString kind
         = number.isNumber() ? QStringLiteral(" (error %1)").arg(number.toInt()) : QString();
-    std::fprintf(stderr, "%s:%d: %s%s\n", qPrintable(name),
-        error.property(QStringLiteral("lineNumber")).toInt(), qPrintable(error.toString()),
+    std::fprintf(stderr, "%s:%d: %s%s%s\n", qPrintable(name),
+        error.property(QStringLiteral("lineNumber")).toInt(), what, qPrintable(error.toString()),
         qPrintable(kind));
     return 1;
 }
@@ -238,9 +265,19 @@ QJSValue ScriptHost::answer(const std::function<QJSValue()>& call)
 
 void ScriptHost::print(const QString& line)
 {
-    const QByteArray bytes = line.toUtf8();
-    std::printf("%s\n", bytes.constData());
-    std::fflush(stdout);
+    const QByteArray bytes = line.toUtf8() + '\n';
+    errno = 0;
+    const bool isWritten
+        = std::fwrite(bytes.constData(), 1, static_cast<std::size_t>(bytes.size()), stdout)
+            == static_cast<std::size_t>(bytes.size())
+        && std::fflush(stdout) == 0;
+    if (isWritten)
+        return;
+    const QString reason = QString::fromLocal8Bit(std::strerror(errno));
+    if (!isOutputLost_)
+        std::fprintf(stderr, "pelloric: what the script prints is lost: %s\n", qPrintable(reason));
+    isOutputLost_ = true;
+    engine_->throwError(QStringLiteral("print: cannot write: ") + reason);
 }
 
 void ScriptHost::exit(int status)
@@ -260,9 +297,50 @@ QJSValue ScriptHost::sqlite(const QString& path, const QString& tableOrQuery)
     return answer([&] { return engine_->newQObject(tables_.sqlite(path, tableOrQuery)); });
 }
 
-QJSValue ScriptHost::newSorvane() { return engine_->newQObject(new ScriptSorvane(platform_)); }
+QJSValue ScriptHost::newControl(const QString& kind)
+{
+    if (kind == QLatin1String("Sorvane"))
+        return engine_->newQObject(new ScriptSorvane(platform_));
+    auto* const facade = new ScriptKestrane(platform_);
+    facade->setPreviewOpener(&opener_);
+    return engine_->newQObject(facade);
+}
 
-QJSValue ScriptHost::newKestrane() { return engine_->newQObject(new ScriptKestrane(platform_)); }
+QJSValue ScriptHost::members(const QString& kind)
+{
+    const bool isFacade = kind == QLatin1String("Kestrane");
+    QMap<QString, MemberUse> uses = isFacade ? usesOf(KestraneMembers) : usesOf(SorvaneMembers);
+    if (kind != QLatin1String("PreviewCanvas")) {
+        for (const char* const name : OwnMembers)
+            uses[QString::fromLatin1(name)].calls = true;
+    }
+    QJSValue list = engine_->newArray(static_cast<uint>(uses.size()));
+    quint32 index = 0;
+    for (auto use = uses.begin(); use != uses.end(); ++use) {
+        QJSValue entry = engine_->newObject();
+        entry.setProperty(QStringLiteral("name"), use.key());
+        entry.setProperty(QStringLiteral("reads"), use->reads);
+        entry.setProperty(QStringLiteral("writes"), use->writes);
+        entry.setProperty(QStringLiteral("calls"), use->calls);
+        list.setProperty(index++, entry);
+    }
+    return list;
+}
+
+QString ScriptHost::refusal(const QString& name)
+{
+    return toQString(RunTimeError(ErrorNumber::NoSuchMember, viewOf(name)).text());
+}
+
+QJSValue ScriptHost::previewCanvas()
+{
+    PreviewWindow* const window = opener_.window();
+    if (window == nullptr)
+        return QJSValue(QJSValue::NullValue);
+    Sorvane& canvas = window->canvas();
+    QJSEngine::setObjectOwnership(&canvas, QJSEngine::CppOwnership);
+    return engine_->newQObject(&canvas);
+}
 
 void ScriptHost::wait(int milliseconds)
 {

@@ -9,6 +9,7 @@
 #include "platform/run_time_error.h"
 
 #include <QDateTime>
+#include <QJSManagedValue>
 #include <QJSValueList>
 
 namespace pelloric::qt {
@@ -45,20 +46,28 @@ bool isPlain(const QJSValue& value)
     return value.isBool() || value.isNumber() || value.isString() || value.isVariant();
 }
 
-/// An error of the script's own function goes on as one of the object's.
+/// What a script's own function threw goes on as an error of the object's.
+[[noreturn]] void refuse(const QJSValue& thrown)
+{
+    QString text = thrown.toString();
+    if (thrown.isError())
+        text += QStringLiteral(" (line %1)")
+                    .arg(thrown.property(QStringLiteral("lineNumber")).toString());
+    throw RunTimeError(ErrorNumber::InvalidCall, toText(text));
+}
+
 const QJSValue& checked(const QJSValue& result)
 {
-    if (!result.isError())
-        return result;
-    const QString line = result.property(QStringLiteral("lineNumber")).toString();
-    const QString text = result.toString() + QStringLiteral(" (line ") + line + QLatin1Char(')');
-    throw RunTimeError(ErrorNumber::InvalidCall, toText(text));
+    if (result.isError())
+        refuse(result);
+    return result;
 }
 
 } // namespace
 
-ScriptObject::ScriptObject(QJSValue value, int firstItem)
+ScriptObject::ScriptObject(QJSValue value, QJSEngine* engine, int firstItem)
     : value_(std::move(value))
+    , engine_(engine)
     , firstItem_(firstItem)
 {
 }
@@ -78,7 +87,7 @@ std::optional<MemberId> ScriptObject::findMember(TextView name)
         return std::nullopt;
     auto member = std::make_unique<Member>();
     member->name = wanted;
-    const QJSValue property = value_.property(wanted);
+    const QJSValue property = propertyOf(*member);
     if (property.isCallable())
         member->function = property;
     members_.push_back(std::move(member));
@@ -92,7 +101,7 @@ Value ScriptObject::get(MemberId member, std::span<const Value> arguments)
         return arrayMember(named, arguments);
     if (named.function.isCallable())
         return answer(named, call(named, arguments, nullptr));
-    QJSValue result = value_.property(named.name);
+    QJSValue result = propertyOf(named);
     if (!arguments.empty())
         result = itemAt(result, arguments.front(), countsFromOne(named.name) ? 1 : 0);
     for (const Value& index : arguments.subspan(arguments.empty() ? 0 : 1))
@@ -137,7 +146,7 @@ Value ScriptObject::answer(Member& member, const QJSValue& result)
         return member.held.hold(result.toVariant());
     if (!result.isObject())
         throw RunTimeError(ErrorNumber::TypeMismatch, u"a symbol is no value");
-    member.answer = objectOfScript(result, countsFromOne(member.name) ? 1 : 0);
+    member.answer = objectOfScript(result, engine_, countsFromOne(member.name) ? 1 : 0);
     return Value::ofObject(*member.answer);
 }
 
@@ -149,7 +158,29 @@ QJSValue ScriptObject::call(
         list.append(toScript(argument));
     if (value != nullptr)
         list.append(toScript(*value));
-    return member.function.callWithInstance(value_, list);
+    if (!engine_)
+        return member.function.callWithInstance(value_, list);
+    const QJSValue result
+        = QJSManagedValue(member.function, engine_).callWithInstance(value_, list);
+    checkThrown();
+    return result;
+}
+
+/// A property may be read by a function of the script.
+QJSValue ScriptObject::propertyOf(const Member& member) const
+{
+    if (!engine_)
+        return value_.property(member.name);
+    const QJSValue result = QJSManagedValue(value_, engine_).property(member.name);
+    checkThrown();
+    return result;
+}
+
+/// Anything at all may have been thrown, a text or null for example.
+void ScriptObject::checkThrown() const
+{
+    if (engine_->hasError())
+        refuse(engine_->catchError());
 }
 
 QJSValue ScriptObject::itemAt(const QJSValue& array, const Value& index, int first) const
@@ -162,13 +193,14 @@ QJSValue ScriptObject::itemAt(const QJSValue& array, const Value& index, int fir
     return array.property(static_cast<quint32>(position));
 }
 
-std::unique_ptr<AutomationObject> objectOfScript(const QJSValue& value, int firstItem)
+std::unique_ptr<AutomationObject> objectOfScript(
+    const QJSValue& value, QJSEngine* engine, int firstItem)
 {
     if (value.isQObject() && value.toQObject() != nullptr)
         return gridFor(*value.toQObject());
     if (!value.isObject())
         throw RunTimeError(ErrorNumber::ObjectMissing, u"an object was expected");
-    return std::make_unique<ScriptObject>(value, firstItem);
+    return std::make_unique<ScriptObject>(value, engine, firstItem);
 }
 
 } // namespace pelloric::qt

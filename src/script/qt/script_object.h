@@ -6,7 +6,9 @@
 #include "grids/qt/held_value.h"
 #include "platform/automation_object.h"
 
+#include <QJSEngine>
 #include <QJSValue>
+#include <QPointer>
 
 #include <map>
 #include <memory>
@@ -23,8 +25,10 @@ namespace pelloric::qt {
 class ScriptObject final : public AutomationObject {
 public:
     /// @param value      an object; it is kept alive
+    /// @param engine     its engine, through which all that the object's functions throw is told
+    ///                   from what they answer; null: only errors are
     /// @param firstItem  what the items of an array count from
-    explicit ScriptObject(QJSValue value, int firstItem = 0);
+    explicit ScriptObject(QJSValue value, QJSEngine* engine = nullptr, int firstItem = 0);
     ~ScriptObject() override;
 
     std::optional<MemberId> findMember(TextView name) override;
@@ -45,8 +49,11 @@ private:
     Value answer(Member& member, const QJSValue& result);
     QJSValue call(const Member& member, std::span<const Value> arguments, const Value* value);
     QJSValue itemAt(const QJSValue& array, const Value& index, int first) const;
+    QJSValue propertyOf(const Member& member) const;
+    void checkThrown() const;
 
     QJSValue value_;
+    QPointer<QJSEngine> engine_;
     int firstItem_;
     std::vector<std::unique_ptr<Member>> members_; ///< by id
 };
@@ -54,6 +61,7 @@ private:
 /// The object that a value of a script stands for: the host's object itself, or the script's own.
 ///
 /// @throws RunTimeError ObjectMissing: the value is no object
-std::unique_ptr<AutomationObject> objectOfScript(const QJSValue& value, int firstItem = 0);
+std::unique_ptr<AutomationObject> objectOfScript(
+    const QJSValue& value, QJSEngine* engine = nullptr, int firstItem = 0);
 
 } // namespace pelloric::qt

@@ -57,6 +57,8 @@ PreviewWindow& QtPreviewOpener::showWindow()
         window_ = new PreviewWindow(platform_);
         window_->setPrompts(prompts_);
     }
+    if (!showing_)
+        return *window_;
     window_->setWindowState(window_->windowState() & ~Qt::WindowMinimized);
     window_->show();
     window_->raise();

@@ -26,6 +26,9 @@ public:
     /// What windows that are made from now on ask people.
     void setPrompts(PreviewPrompts prompts) { prompts_ = std::move(prompts); }
 
+    /// Whether windows come to the screen, as they do at first; else pages are built unseen.
+    void setShowing(bool showing) { showing_ = showing; }
+
     /// Shows the window, then has it preview the grid.
     /// @throws RunTimeError as `PreviewWindow::preview`
     void openPreview(std::unique_ptr<AutomationObject> grid) override;
@@ -39,6 +42,7 @@ public:
 private:
     QtPlatform& platform_;
     PreviewPrompts prompts_;
+    bool showing_ = true;
     QPointer<PreviewWindow> window_;
 };
 

@@ -424,4 +424,81 @@ TEST(Kestrane, ShowsARectangleThatCoversIt)
     }
 }
 
+TEST(PlainCalls, MembersTakePlainTypesByName)
+{
+    SorvaneWorld world;
+    Sorvane& canvas = world.sorvane;
+    EXPECT_TRUE(QMetaObject::invokeMethod(
+        &canvas, "SetShowStyle", Q_ARG(short, 6), Q_ARG(short, 0), Q_ARG(short, 5)));
+    EXPECT_EQ(canvas.WindowPages().toInt(), 6);
+    EXPECT_TRUE(QMetaObject::invokeMethod(
+        &canvas, "SetShowStyle", Q_ARG(int, 4), Q_ARG(int, 0), Q_ARG(int, 3)));
+    EXPECT_EQ(canvas.WindowPages().toInt(), 4);
+    world.makePages(4);
+    EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "showMuliPage", Q_ARG(short, 4)));
+    EXPECT_EQ(canvas.WindowOrderStyle().toInt(), Sorvane::Four);
+    const QString file = QString::fromStdString(world.platform.folder.file("a.ostl").string());
+    EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "SaveFile", Q_ARG(QString, file)));
+    canvas.clear();
+    EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "OpenFile", Q_ARG(QString, file)));
+    EXPECT_EQ(world.canvas.Totalpages(), 4);
+    QTableWidget grid(1, 1);
+    canvas.setProperty("m_PrintObj", Sorvane::MSFlexGrid);
+    EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "doPreview", Q_ARG(QObject*, &grid)));
+    EXPECT_EQ(world.canvas.Totalpages(), 1);
+    EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "ReDrawZoom", Q_ARG(QObject*, &grid)));
+
+    Kestrane facade(world.platform);
+    FakeOpener opener;
+    facade.setPreviewOpener(&opener);
+    EXPECT_TRUE(QMetaObject::invokeMethod(&facade, "doPreview", Q_ARG(QObject*, &grid)));
+    EXPECT_EQ(opener.grids.size(), 1U);
+    EXPECT_TRUE(QMetaObject::invokeMethod(&facade, "AddHeader",
+        Q_ARG(QString, QStringLiteral("plain")), Q_ARG(short, Kestrane::LocRight)));
+    EXPECT_TRUE(QMetaObject::invokeMethod(
+        &facade, "AddFooter", Q_ARG(QString, QStringLiteral("foot")), Q_ARG(int, 0)));
+    const Platform platform = world.platform.record();
+    EXPECT_EQ(readSetting(platform, u"HeaderRight"), u"plain");
+    EXPECT_EQ(readSetting(platform, u"FooterLeft"), u"foot");
+}
+
+TEST(PlainCalls, AreCheckedAndNeverWrapANumberOfAScript)
+{
+    SorvaneWorld world;
+    Sorvane& canvas = world.sorvane;
+    EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "showMuliPage", Q_ARG(int, 70000)));
+    expectOneBox(world.platform.messages, u"Overflow", "showMuliPage");
+    EXPECT_TRUE(QMetaObject::invokeMethod(
+        &canvas, "doPrint", Q_ARG(bool, true), Q_ARG(QString, QString()), Q_ARG(int, 70000)));
+    expectOneBox(world.platform.messages, u"Overflow", "doPrint");
+    letScriptsCall();
+    QJSEngine engine;
+    QJSEngine::setObjectOwnership(&canvas, QJSEngine::CppOwnership);
+    engine.globalObject().setProperty("s", engine.newQObject(&canvas));
+    for (const char* const call : { "s.showMuliPage(70000)", "s.SetShowStyle(70000, 0, 1)",
+             "s.SetShowStyle(1, 0, -40000)", "s.doPrint(true, '', 70000)" }) {
+        const QString script
+            = QStringLiteral("(() => { try { %1; return 0; } catch (e) { return e.number; } })()")
+                  .arg(QLatin1String(call));
+        EXPECT_EQ(engine.evaluate(script).toInt(), 6) << call;
+    }
+}
+
+TEST(PublishedRecordTypes, AreKnownToTheMetaTypeSystemByName)
+{
+    const SorvaneWorld world;
+    const std::pair<const char*, QMetaType> types[] = {
+        { "Tpoint", QMetaType::fromType<Tpoint>() },
+        { "Lineobj", QMetaType::fromType<Lineobj>() },
+        { "Textobj", QMetaType::fromType<Textobj>() },
+        { "MapLocation", QMetaType::fromType<MapLocation>() },
+        { "ColPos", QMetaType::fromType<ColPos>() },
+        { "MuliPageType", QMetaType::fromType<MuliPageType>() },
+    };
+    for (const auto& [name, type] : types) {
+        EXPECT_EQ(QMetaType::fromName(name), type) << name;
+        EXPECT_EQ(QMetaType::fromName(QByteArray("pelloric::") + name), type) << name;
+    }
+}
+
 } // namespace pelloric::qt

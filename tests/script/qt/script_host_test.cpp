@@ -153,6 +153,126 @@ TEST_F(ScriptHostTest, RefusesMembersThatAreNotThere)
     EXPECT_FALSE(errors.empty());
 }
 
+TEST_F(ScriptHostTest, RefusesEveryUnknownMemberWithError438)
+{
+    const char* const attempts[] = { "c.curentpage = 3", "c.curentpage", "c.noSuchMethod()",
+        "c.VerticalDir", "c.clear = 1", "'use strict'; c.intBottom = 1", "c.windowTitle",
+        "c.deleteLater()", "k.Cols", "k.doPreview = 1", "k.intTop" };
+    for (const char* const attempt : attempts) {
+        EXPECT_EQ(run(QStringLiteral("const c = new Sorvane(), k = new Kestrane();\n"
+                                     "try { (() => { %1; })(); print('nothing'); }\n"
+                                     "catch (e) { print(e.number, e.lineNumber); }")
+                          .arg(QLatin1String(attempt))),
+            0)
+            << errors;
+        EXPECT_EQ(output, "438 2\n") << attempt;
+    }
+}
+
+TEST_F(ScriptHostTest, TakesPublishedMembersInAnyLetterCase)
+{
+    EXPECT_EQ(
+        run(QStringLiteral(
+            "const c = new Sorvane(); c.INTLEFT = 7; c.pageheader = 'x'; const left = c.intLeft;"
+            "c.M_PRINTOBJ = PrintObjKind.MSFlexGrid; c.DOPREVIEW(csv('a'));"
+            "print(left, c.PageHeader, c.currentPage, c.totalPAGES, 'dispscale' in c);"
+            "const k = new Kestrane(); k.marvenstartrow = 3; print(k.MarvenStartRow);")),
+        0)
+        << errors;
+    EXPECT_EQ(output, "7 x 1 1 true\n3\n");
+}
+
+TEST_F(ScriptHostTest, MembersOfHostObjectsNeedTheirExactName)
+{
+    EXPECT_EQ(run(QStringLiteral("const c = new Sorvane(); c.m_PrintObj = PrintObjKind.MSFlexGrid;"
+                                 "try { c.doPreview({ cols: 1, Rows: 1, ColWidth: () => 900,"
+                                 "    TextMatrix: () => 'A' }); }"
+                                 "catch (e) { print(e.number, e.message.indexOf('Cols') >= 0); }")),
+        0)
+        << errors;
+    EXPECT_EQ(output, "438 true\n");
+}
+
+TEST_F(ScriptHostTest, ListsAndWritesAControlsProperties)
+{
+    EXPECT_EQ(run(QStringLiteral(
+                  "const c = new Sorvane(); const keys = Object.keys(c);"
+                  "print(keys.indexOf('Currentpage') >= 0, keys.indexOf('VerticalDir') >= 0);"
+                  "const read = JSON.parse(JSON.stringify(c));"
+                  "print(read.Currentpage, read.myWidth, Object.keys(read).length === keys.length);"
+                  "print(JSON.stringify(new Kestrane()));"
+                  "print(c instanceof Sorvane, c instanceof Kestrane);")),
+        0)
+        << errors;
+    EXPECT_EQ(output,
+        "true false\n1 11907 true\n"
+        "{\"MarvenStartRow\":1,\"MergeGrid\":false,\"ShowHeader\":false}\n"
+        "true false\n");
+}
+
+TEST_F(ScriptHostTest, PreviewsInTheWindowWithoutShowingIt)
+{
+    EXPECT_EQ(run(QStringLiteral(
+                  "print(previewCanvas());"
+                  "const k = new Kestrane(); k.AddHeader('Page [Page #]', Kestrane.LocRight);"
+                  "k.doPreview(csv('a'));"
+                  "const c = previewCanvas();"
+                  "print(c.Totalpages, c.strSCliectRect, c.m_PrintObj === PrintObjKind.MSHFlexGrid,"
+                  "    texts(c, 0).map(t => t.Str).join());"
+                  "k.doPreview({ Cols: 1, Rows: 1, ColWidth: () => 900,"
+                  "    TextMatrix: () => 'B' });"
+                  "print(texts(c, 0).map(t => t.Str).join());")),
+        0)
+        << errors;
+    EXPECT_EQ(output,
+        "null\n1 full true Page 1,Name,Number,Anna,17,1 of [Pages]\n"
+        "Page 1,B,1 of [Pages]\n");
+    for (const QWidget* const window : QApplication::topLevelWidgets())
+        EXPECT_FALSE(window->isVisible()) << window->objectName().toStdString();
+}
+
+TEST_F(ScriptHostTest, WhateverACellFunctionThrowsIsAnError)
+{
+    for (const char* const thrown : { "'a text'", "null", "undefined", "7", "new Error('e')" }) {
+        for (const char* const cell : { "TextMatrix() { throw %1; }",
+                 "get Rows() { throw %1; },"
+                 "TextMatrix: () => ''" }) {
+            const QString members = QString::fromLatin1(cell).arg(QLatin1String(thrown));
+            EXPECT_EQ(run(QStringLiteral(
+                          "const c = new Sorvane(); c.m_PrintObj = PrintObjKind.MSFlexGrid;"
+                          "try { c.doPreview({ Cols: 1, Rows: 2, ColWidth: () => 900, %1 });"
+                          "    print('nothing', c.Totalpages); }"
+                          "catch (e) { print(e.number); }")
+                              .arg(members)),
+                0)
+                << errors;
+            EXPECT_EQ(output, "5\n") << thrown << " " << cell;
+        }
+    }
+}
+
+TEST_F(ScriptHostTest, ReportsPromisesThatWereRejectedAndThatNobodyLooksAfter)
+{
+    EXPECT_EQ(run(QStringLiteral("Promise.reject(new Error('lost'));")), 1);
+    EXPECT_NE(errors.find("lost"), std::string::npos) << errors;
+    EXPECT_EQ(run(QStringLiteral("Promise.resolve(1).then(() => { throw 'later'; });")), 1);
+    EXPECT_NE(errors.find("later"), std::string::npos) << errors;
+    EXPECT_EQ(run(QStringLiteral("new Promise((_, reject) => reject('a'))"
+                                 "    .catch(reason => print('caught', reason))"
+                                 "    .then(() => print('after'));"
+                                 "Promise.all([Promise.reject(1)]).then(null, () => 0);")),
+        0)
+        << errors;
+    EXPECT_EQ(output, "caught a\nafter\n");
+}
+
+TEST_F(ScriptHostTest, AThrownNothingIsToldAndFails)
+{
+    EXPECT_EQ(run(QStringLiteral("throw null;")), 1);
+    EXPECT_EQ(run(QStringLiteral("throw undefined;")), 1);
+    EXPECT_FALSE(errors.empty());
+}
+
 TEST_F(ScriptHostTest, RaisesEvents)
 {
     QTimer::singleShot(200, [] {
@@ -218,6 +338,34 @@ protected:
     QByteArray errors;
     TempFolder folder_;
 };
+
+TEST_F(ScriptProgram, FailsWhenNobodyCanReadWhatItPrints)
+{
+    QFile script(path("print.js"));
+    ASSERT_TRUE(script.open(QIODevice::WriteOnly));
+    script.write("try { print('lost'); } catch (e) { } exit(0);\n");
+    script.close();
+    QProcess process;
+    process.setStandardOutputFile(QStringLiteral("/dev/full"));
+    process.start(QStringLiteral(PELLORIC_PROGRAM), { QStringLiteral("run"), path("print.js") });
+    ASSERT_TRUE(process.waitForFinished(LongestRun));
+    EXPECT_EQ(process.exitCode(), 1);
+    EXPECT_NE(process.readAllStandardError().indexOf("No space left"), -1);
+}
+
+TEST_F(ScriptProgram, ReadsDeeplyNestedExpressions)
+{
+    QFile script(path("nested.js"));
+    ASSERT_TRUE(script.open(QIODevice::WriteOnly));
+    script.write("const nested = '('.repeat(Number(args[0])) + ')'.repeat(Number(args[0]));\n"
+                 "try { print(new RegExp(nested).test('x')); } catch (e) { print(e.name); }\n");
+    script.close();
+    EXPECT_EQ(run({ path("nested.js"), QStringLiteral("50000") }), 0) << errors.toStdString();
+    EXPECT_EQ(output, "true\n");
+    EXPECT_EQ(run({ path("nested.js"), QStringLiteral("300000") }), 0) << errors.toStdString();
+    EXPECT_EQ(run({ path("nested.js"), QStringLiteral("2000000") }), 0) << errors.toStdString();
+    EXPECT_EQ(output, "SyntaxError\n");
+}
 
 TEST_F(ScriptProgram, RunsTheExamples)
 {
