@@ -33,7 +33,8 @@ bool isDatabase(const QString& name)
         && file.read(sizeof DatabaseMark - 1) == DatabaseMark;
 }
 
-/// A database file and one of its tables; no table when the name is all file.
+/// A database file and one of its tables; no table when the name is all file. Both may hold colons:
+/// the longest name of a file that there is counts.
 struct DatabaseName {
     QString file;
     QString table;
@@ -43,10 +44,12 @@ DatabaseName splitName(const QString& name)
 {
     if (QFileInfo::exists(name))
         return { name, {} };
-    const auto colon = name.lastIndexOf(QLatin1Char(':'));
-    const QString file = name.left(colon);
-    if (colon > 0 && QFileInfo(file).isFile())
-        return { file, name.mid(colon + 1) };
+    for (auto colon = name.lastIndexOf(QLatin1Char(':')); colon > 0;
+         colon = name.lastIndexOf(QLatin1Char(':'), colon - 1)) {
+        const QString file = name.left(colon);
+        if (QFileInfo(file).isFile())
+            return { file, name.mid(colon + 1) };
+    }
     return { name, {} };
 }
 

@@ -14,9 +14,13 @@
 #include <QSqlQuery>
 #include <QSqlRecord>
 #include <QStringList>
+#include <QTemporaryDir>
 #include <QUuid>
 
 #include <algorithm>
+#include <filesystem>
+#include <fstream>
+#include <optional>
 
 namespace pelloric::qt {
 
@@ -55,6 +59,64 @@ bool isReading(const QString& statement)
     });
 }
 
+/// How a database file is read without a trace beside it.
+struct Opening {
+    std::filesystem::path path;
+    const char* parameters = "mode=ro"; ///< of the address of the file
+};
+
+std::filesystem::path beside(const std::filesystem::path& path, const char* suffix)
+{
+    std::filesystem::path other = path;
+    other += suffix;
+    return other;
+}
+
+/// Whether changes of the database go through a log beside it.
+bool hasLog(const std::filesystem::path& path)
+{
+    constexpr std::streamoff ReadVersion = 19; ///< where the file says how it is read
+    constexpr int ByLog = 2;
+    std::ifstream file(path, std::ios::binary);
+    file.seekg(ReadVersion);
+    return file.get() == ByLog;
+}
+
+/// A database without a log of its own is read as it is, where others would write files to read it.
+/// A log that nobody has open can be read only where its index may be written: in a copy.
+Opening openingOf(const std::filesystem::path& path, std::optional<QTemporaryDir>& copies)
+{
+    std::error_code none;
+    if (!hasLog(path))
+        return { path };
+    const std::filesystem::path log = beside(path, "-wal");
+    const auto logBytes = std::filesystem::file_size(log, none);
+    if (none || logBytes == 0)
+        return { path, "mode=ro&immutable=1" };
+    if (std::filesystem::exists(beside(path, "-shm"), none))
+        return { path, "mode=ro&readonly_shm=1" };
+    const std::filesystem::path copy
+        = std::filesystem::path(toText(copies.emplace().path())) / "database.sqlite";
+    std::filesystem::copy_file(path, copy, none);
+    if (!none)
+        std::filesystem::copy_file(log, beside(copy, "-wal"), none);
+    if (none)
+        refuse(QStringLiteral("the database cannot be copied to read its log: ")
+            + QString::fromStdString(none.message()));
+    return { copy };
+}
+
+/// The file as an address, in which every byte of its name can be written.
+QString addressOf(const Opening& opening)
+{
+    const auto name = std::filesystem::absolute(opening.path).generic_u8string();
+    const QByteArray bytes(reinterpret_cast<const char*>(name.data()), std::ssize(name));
+    const QByteArray encoded = bytes.toPercentEncoding("/:");
+    return QStringLiteral("file:%1%2?%3")
+        .arg(encoded.startsWith('/') ? QString() : QStringLiteral("///"),
+            QString::fromLatin1(encoded), QString::fromLatin1(opening.parameters));
+}
+
 /// A connection of its own to a database file, for reading only.
 class Connection {
 public:
@@ -62,8 +124,8 @@ public:
         : name_(QUuid::createUuid().toString())
         , database_(QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), name_))
     {
-        database_.setConnectOptions(QStringLiteral("QSQLITE_OPEN_READONLY"));
-        database_.setDatabaseName(toQString(pathText(path)));
+        database_.setConnectOptions(QStringLiteral("QSQLITE_OPEN_READONLY;QSQLITE_OPEN_URI"));
+        database_.setDatabaseName(addressOf(openingOf(path, copies_)));
     }
 
     ~Connection()
@@ -79,6 +141,7 @@ public:
     QSqlDatabase& database() { return database_; }
 
 private:
+    std::optional<QTemporaryDir> copies_; ///< gone after the connection
     QString name_;
     QSqlDatabase database_;
 };
@@ -178,8 +241,10 @@ TableGrid readRows(const SqliteSource& source, QSqlQuery& query)
 TableGrid readSqlite(const SqliteSource& source)
 {
     std::error_code ignored;
+    if (!std::filesystem::is_regular_file(source.path, ignored))
+        throw RunTimeError(ErrorNumber::FileNotFound, pathText(source.path));
     Connection connection(source.path);
-    if (!std::filesystem::is_regular_file(source.path, ignored) || !connection.database().open())
+    if (!connection.database().open())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(source.path));
     const QStringList tables = tablesOf(connection.database());
     if (!source.query.isEmpty() && !isReading(source.query))

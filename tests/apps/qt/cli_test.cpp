@@ -8,6 +8,8 @@
 #include <QImage>
 #include <QProcess>
 #include <QProcessEnvironment>
+#include <QSqlDatabase>
+#include <QSqlQuery>
 
 #include <gtest/gtest.h>
 
@@ -157,6 +159,20 @@ TEST_F(Program, ReadsTablesAndQueriesOfADatabase)
     EXPECT_EQ(missing.status, 1);
     EXPECT_EQ(missing.errors,
         "pelloric: s.sqlite: no table nothing; the database has: countries_zh, time_zones, wine\n");
+}
+
+TEST_F(Program, ReadsATableWhoseNameHoldsAColon)
+{
+    {
+        QSqlDatabase database = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"));
+        database.setDatabaseName(QString::fromStdString(folder_.file("s.sqlite").string()));
+        ASSERT_TRUE(database.open());
+        EXPECT_TRUE(database.exec(QStringLiteral("create table \"x:y\" (colons)")).isActive());
+        database.close();
+    }
+    QSqlDatabase::removeDatabase(QLatin1String(QSqlDatabase::defaultConnection));
+    EXPECT_EQ(run(words("export s.sqlite:x:y -o a.pdf")).status, 0);
+    EXPECT_TRUE(has(pdfText("a.pdf"), "colons"));
 }
 
 namespace {
