@@ -5,6 +5,7 @@
 
 #include "command_line.h"
 #include "controls/qt/kestrane.h"
+#include "grids/qt/data_view_grid.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -29,6 +30,7 @@
 
 #include <algorithm>
 #include <initializer_list>
+#include <memory>
 
 namespace pelloric::app {
 
@@ -251,7 +253,11 @@ void DemoWindow::preview(QAbstractItemView* view, const QString& title)
     facade_->AddHeader(title, pelloric::AlignmentType::LocLeft);
     facade_->AddHeader(QStringLiteral("[Date Printed]"), pelloric::AlignmentType::LocRight);
     facade_->AddFooter(footer_->text(), pelloric::AlignmentType::LocCenter);
-    facade_->doPreview(view);
+    auto* const table = qobject_cast<QTableView*>(view);
+    if (table != nullptr && view->objectName() == QLatin1String("DataGrid"))
+        facade_->doPreview(std::make_unique<qt::DataViewGrid>(*table));
+    else
+        facade_->doPreview(view);
 }
 
 } // namespace pelloric::app
