@@ -14,6 +14,7 @@
 #include "platform/services.h"
 #include "print/paper_names.h"
 #include "print/print_job.h"
+#include "report/shaped_report.h"
 
 #include <algorithm>
 #include <utility>
@@ -229,16 +230,23 @@ void Canvas::giveBack(const ViewState& view)
 /// Style and paper are those of the beginning, whatever a host writes while messages run.
 void Canvas::layOut(GridTable& table)
 {
-    const ReportStyle style = style_;
-    const PageSetup setup = page;
+    ReportStyle style = style_;
+    PageSetup setup = page;
+    const ReportOptions wanted = options;
     const CursorKeeper cursor(*table.rows);
     endArrangement(view_);
     recorder_.moveTo({});
     recorder_.documentReplaced();
-    LayoutEngine engine({ style, setup, *table.rows, table.ColumnWidths, table.ColumnBands },
-        platform_, document_, recorder_);
-    engine.build(*this);
-    titleTop_ = engine.titleTop();
+    const ReportOutcome outcome
+        = layOutReport(table, wanted, { style, setup, platform_, document_, recorder_ }, *this);
+    titleTop_ = outcome.titleTop;
+    fit_ = outcome.fit;
+    if (!fit_.isTurned)
+        return;
+    page.myWidth = setup.myWidth;
+    page.myHeight = setup.myHeight;
+    style_.PagerOrientation = style.PagerOrientation;
+    setPrintableTenths(style_, page);
 }
 
 void Canvas::scaleReport(double factor)

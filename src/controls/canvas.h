@@ -7,6 +7,7 @@
 #include "document/recorder.h"
 #include "report/grid_reader.h"
 #include "report/layout_engine.h"
+#include "report/report_options.h"
 #include "report/report_style.h"
 #include "view/view_state.h"
 
@@ -60,6 +61,12 @@ public:
     PrintObjKind m_PrintObj = PrintObjKind::MSHFlexGrid; ///< which reader a build uses
     Text strSCliectRect = u"small"; ///< while it is "small" no page is painted
     Text PageHeader; ///< kept for the host; the layout does not read it
+
+    /// What builds do beyond the plain page; everything is off at first.
+    ReportOptions options;
+
+    /// What the last build did to bring its table onto the sheet.
+    const FitResult& fit() const { return fit_; }
 
     /// @param observer  borrowed, or null
     void observe(CanvasObserver* observer) { observer_ = observer; }
@@ -212,6 +219,7 @@ private:
     CanvasObserver* observer_ = nullptr;
     Text openedName_; ///< of the file that the document was opened from
     double titleTop_ = 0;
+    FitResult fit_;
     bool building_ = false;
     bool printing_ = false;
 };

@@ -5,6 +5,7 @@
 
 #include "document/cell_lines.h"
 #include "platform/automation_object.h"
+#include "platform/cell_look.h"
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
@@ -13,6 +14,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <numeric>
 #include <utility>
 
 namespace pelloric {
@@ -116,6 +118,15 @@ std::vector<double> widthsOf(std::span<const PrintedColumn> columns)
     return widths;
 }
 
+std::vector<int> positionsOf(std::span<const PrintedColumn> columns)
+{
+    std::vector<int> positions;
+    positions.reserve(columns.size());
+    for (const PrintedColumn& column : columns)
+        positions.push_back(column.position);
+    return positions;
+}
+
 void setWidths(GridTable& result, std::vector<double> gridWidths, const GridRequest& request)
 {
     narrowToInt16(static_cast<std::int64_t>(gridWidths.size()));
@@ -206,6 +217,8 @@ GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
         }
     }
     setWidths(result, widthsOf(columns), request);
+    result.gridColumns = positionsOf(columns);
+    result.firstLookRow = request.startRow;
     GridTableParts::finishTable(result);
     return result;
 }
@@ -282,6 +295,7 @@ GridTable readListView(AutomationObject& object, const GridRequest& request)
         }
     }
     setWidths(result, widthsOf(columns), request);
+    result.gridColumns = positionsOf(columns);
     GridTableParts::finishTable(result);
     return result;
 }
@@ -319,6 +333,8 @@ GridTable readDataGrid(AutomationObject& object, const GridRequest& request)
     if (static_cast<std::size_t>(result.rows->fieldCount()) < widths.size())
         throw RunTimeError(
             ErrorNumber::SubscriptOutOfRange, u"the data grid has more columns than fields");
+    result.gridColumns.resize(widths.size());
+    std::iota(result.gridColumns.begin(), result.gridColumns.end(), 0);
     setWidths(result, std::move(widths), request);
     return result;
 }
@@ -345,6 +361,7 @@ GridTable& GridTable::operator=(GridTable&&) noexcept = default;
 void GridTable::dropBorrowedRows()
 {
     lateBound_.reset();
+    looks = nullptr;
     rows = table_.get();
 }
 
@@ -362,6 +379,7 @@ GridTable readGrid(AutomationObject& grid, const GridRequest& request)
         if (row.kind != request.kind)
             continue;
         GridTable table = row.read(grid, request);
+        table.looks = dynamic_cast<CellLooks*>(&grid); // a grid that is a view is both
         for (int field = 0; table.rows != nullptr && field < table.rows->fieldCount(); ++field)
             table.fieldNames.emplace_back(table.rows->fieldName(field));
         return table;

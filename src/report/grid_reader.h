@@ -16,6 +16,7 @@
 namespace pelloric {
 
 class AutomationObject;
+class CellLooks;
 class LateBoundRows;
 class MessageLoop;
 class TableRowSet;
@@ -61,6 +62,10 @@ public:
 
     /// The titles of the row set's fields.
     std::vector<Text> fieldNames;
+
+    CellLooks* looks = nullptr; ///< the grid's own, borrowed; null: it is no view
+    std::vector<int> gridColumns; ///< which of the grid each printed column is, from 0
+    std::int32_t firstLookRow = 1; ///< the row of the looks that the first record shows
 
     /// The number of printed columns.
     std::int16_t fieldCount() const { return static_cast<std::int16_t>(ColumnWidths.size()); }

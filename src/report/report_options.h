@@ -1,0 +1,94 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+#include "platform/units.h"
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <span>
+#include <vector>
+
+namespace pelloric {
+
+/// How a table that is too wide for the sheet is brought onto it.
+struct FitOptions {
+    bool toSheet = false; ///< as it is, else landscape, else shrunk, else in bands
+    int pagesAcross = 0; ///< 1 or more: shrunk so far that so many bands hold all columns
+    float leastSize = 6; ///< points; texts are not shrunk below
+    double leastScale = 0.6; ///< nothing is shrunk further
+
+    bool isAsked() const { return toSheet || pagesAcross > 0; }
+    bool operator==(const FitOptions&) const = default;
+};
+
+/// What was done to bring a table onto the sheet.
+enum class FitRule : std::uint8_t { NotAsked, AsItIs, Landscape, Shrunk, Bands };
+
+/// What was done, and how far it went.
+struct FitResult {
+    FitRule rule = FitRule::NotAsked;
+    double scale = 1; ///< of column widths and body font
+    bool isTurned = false; ///< the sheet lies on its long side for this report
+
+    bool operator==(const FitResult&) const = default;
+};
+
+/// Which rows are printed.
+enum class RowChoice : std::uint8_t { All, Marked, Range };
+
+/// In which order the pages of several bands follow each other.
+enum class PageOrder : std::uint8_t { AcrossThenDown, DownThenAcross };
+
+/// What is made of the numbers of a column.
+enum class AggregateFunction : std::uint8_t { Sum, Count, Mean, Minimum, Maximum };
+
+/// A total of one column: it stands in that column, behind every group and at the end.
+struct Aggregation {
+    Text column; ///< its title
+    AggregateFunction function = AggregateFunction::Sum;
+
+    bool operator==(const Aggregation&) const = default;
+};
+
+/// Decides about a row: its number from 1 and the texts of its printed columns.
+using RowFilter = std::function<bool(std::int64_t row, std::span<const TextView> texts)>;
+
+/// What a report may do beyond the plain page. Everything is off at first, and then every page is
+/// the plain one.
+struct ReportOptions {
+    bool asShown = false; ///< cells look as the view shows them, where the grid is a view
+    FitOptions fit;
+    int keyColumns = 0; ///< so many columns from the left stand at the left of every band
+    std::vector<Text> keyColumnNames; ///< or these
+    std::vector<Text> columns; ///< the titles of those to print, in order; empty: all as they stand
+    RowChoice rows = RowChoice::All;
+    std::int64_t firstRow = 1; ///< of a range, from 1
+    std::int64_t lastRow = 0; ///< of a range
+    RowFilter filter; ///< empty: every row that is chosen
+    Text whereColumn; ///< not empty: only rows that hold `whereText` in the column of this title
+    Text whereText;
+    PageOrder pageOrder = PageOrder::AcrossThenDown;
+    std::vector<Text> groupColumns; ///< rows with equal texts in these make a group
+    bool keepsGroups = false; ///< a group stays on a page where one can hold it
+    std::vector<Aggregation> totals;
+
+    /// Whether rows or columns are left out or moved.
+    bool choosesCells() const
+    {
+        return !columns.empty() || rows != RowChoice::All || static_cast<bool>(filter)
+            || !whereColumn.empty();
+    }
+
+    /// Whether anything but the plain arrangement of rows and bands is asked for.
+    bool shapesPages() const
+    {
+        return asShown || fit.isAsked() || keyColumns > 0 || !keyColumnNames.empty()
+            || pageOrder != PageOrder::AcrossThenDown || keepsGroups || !totals.empty();
+    }
+};
+
+} // namespace pelloric

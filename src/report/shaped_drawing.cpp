@@ -1,0 +1,359 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+// What is drawn of the rows of a page; what they are is decided in shaped_layout.cpp.
+
+#include "platform/numbers.h"
+#include "report/report_style.h"
+#include "report/shaped_layout.h"
+
+#include <algorithm>
+
+namespace pelloric {
+
+namespace {
+
+Twips below(Twips y, double distance) { return roundToInt32(static_cast<double>(y) + distance); }
+
+} // namespace
+
+void ShapedLayout::printRows()
+{
+    tops_.assign(1, top_);
+    for (const Row& row : page_)
+        tops_.push_back(below(tops_.back(), rowHeight(row)));
+    for (std::size_t at = 0; at < page_.size() && source_.looks != nullptr; ++at)
+        fillBackgrounds(at);
+    usePen(gridPen_);
+    for (std::size_t at = 0; at < page_.size(); ++at) {
+        usePen(gridPen_);
+        drawRowLines(at);
+        printCells(at);
+        if (!page_[at].isTotal())
+            progress_->advance();
+    }
+    lastTexts_.clear();
+    if (page_.empty() || page_.back().isTotal())
+        return;
+    for (const Cell& cell : page_.back().cells)
+        lastTexts_.push_back(cell.text);
+    if (source_.looks != nullptr) {
+        const std::int32_t last = lookRow(page_.back().record);
+        std::erase_if(boxes_, [&](const OpenBox& open) {
+            return columns_.back().field == bands_.back().back() && open.box.lastRow <= last;
+        });
+    }
+}
+
+/// Neighbouring cells of one colour get one box.
+void ShapedLayout::fillBackgrounds(std::size_t at)
+{
+    const Row& row = page_[at];
+    if (row.looks.empty())
+        return;
+    const auto colorOf = [&](const BandColumn& column) {
+        const CellLook* look = lookOf(row, column.field);
+        if (const OpenBox* const open = openBox(look))
+            look = &open->look;
+        return look->background;
+    };
+    for (std::size_t first = 0; first < columns_.size();) {
+        const auto color = colorOf(columns_[first]);
+        std::size_t end = first + 1;
+        while (end < columns_.size() && colorOf(columns_[end]) == color)
+            ++end;
+        const double right = end < columns_.size() ? columns_[end].left : tableRight_;
+        if (color)
+            fillBox({ columns_[first].left, right, static_cast<double>(tops_[at]),
+                        static_cast<double>(tops_[at + 1]) },
+                *color);
+        first = end;
+    }
+}
+
+void ShapedLayout::drawRowLines(std::size_t at)
+{
+    const Row& row = page_[at];
+    const Twips top = tops_[at];
+    const Twips bottom = tops_[at + 1];
+    const bool isMerged = source_.style.GridMerge && !row.isTotal();
+    if (drawsVer_) {
+        for (std::size_t place = 0; place < columns_.size(); ++place) {
+            const int field = columns_[place].field;
+            const bool isOpen = place > 0
+                && ((isMerged && equalsLeft(row, field))
+                    || isSameBox(row, columns_[place - 1].field, row, field));
+            if (!isOpen)
+                drawLine({ columns_[place].edge, top }, { columns_[place].edge, bottom });
+        }
+        drawLine({ tableRight_, top }, { tableRight_, bottom });
+    }
+    if (!drawsHor_)
+        return;
+    const Row* const next = at + 1 < page_.size() ? &page_[at + 1] : nullptr;
+    if (next == nullptr || (!isMerged && row.looks.empty())) {
+        drawLine({ tableLeft_, bottom }, { tableRight_, bottom });
+        return;
+    }
+    const auto isOpen = [&](int field) {
+        if (isSameBox(row, field, *next, field))
+            return true;
+        const auto place = static_cast<std::size_t>(field);
+        return isMerged && !next->isTotal() && next->cells[place].text == row.cells[place].text;
+    };
+    for (std::size_t first = 0; first < columns_.size(); ++first) {
+        if (isOpen(columns_[first].field))
+            continue;
+        std::size_t end = first;
+        while (end + 1 < columns_.size() && !isOpen(columns_[end + 1].field))
+            ++end;
+        const Twips right = end + 1 < columns_.size() ? columns_[end + 1].edge : tableRight_;
+        drawLine({ columns_[first].edge, bottom }, { right, bottom });
+        first = end;
+    }
+}
+
+void ShapedLayout::printCells(std::size_t at)
+{
+    const Row& row = page_[at];
+    const ReportStyle& style = source_.style;
+    const Color color = roundToInt32(style.body.color);
+    for (std::size_t place = 0; place < columns_.size(); ++place) {
+        const BandColumn& column = columns_[place];
+        const Cell& cell = row.cells[static_cast<std::size_t>(column.field)];
+        if (!column.isPrinted)
+            continue;
+        const CellLook* const look = lookOf(row, column.field);
+        const std::span<const CellLine> lines = row.lines;
+        const Area area { column.left, column.left + column.width, static_cast<double>(tops_[at]),
+            static_cast<double>(tops_[at + 1]) };
+        if (row.isTotal()) {
+            CellLook total;
+            total.bold = true;
+            total.italic = style.body.font.italic;
+            if (column.field != bands_.front().front())
+                total.alignment = CellAlignment::Right;
+            printShown(total, lines.subspan(cell.firstLine, cell.lineCount), area);
+        } else if (look == nullptr) {
+            if (style.GridMerge && isBlanked(at, column.field))
+                continue;
+            useFont(style.body.font.bold, style.body.font.italic, color);
+            printPlain(column, row, cell, tops_[at]);
+        } else if (look->box) {
+            printBox(at, place);
+        } else {
+            printShown(*look, lines.subspan(cell.firstLine, cell.lineCount), area);
+        }
+    }
+}
+
+void ShapedLayout::printPlain(const BandColumn& column, const Row& row, const Cell& cell, Twips top)
+{
+    const double left = column.left + padding_;
+    const std::span<const CellLine> lines = row.lines;
+    recorder_.moveTo({ roundToInt32(left), below(top, padding_) });
+    recorder_.printLines(lines.subspan(cell.firstLine, cell.lineCount), left, column.width);
+}
+
+void ShapedLayout::printShown(const CellLook& look, std::span<const CellLine> lines, Area area)
+{
+    if (look.isBranch)
+        drawBranches(look, area);
+    if (lines.empty())
+        return;
+    const MeasuredFont& face = font(look.bold, look.italic);
+    area.left += padding_ + look.indent;
+    area.right -= padding_;
+    const double block = static_cast<double>(lines.size()) * face.lineHeight;
+    const double room = area.bottom - area.top;
+    double y = area.top + padding_;
+    if (look.place == CellPlace::Middle)
+        y = area.top + std::max(padding_, (room - block) / 2);
+    else if (look.place == CellPlace::Bottom)
+        y = area.top + std::max(padding_, room - padding_ - block);
+    area.top = y;
+    area.left += printMarks(look, area);
+    useFont(
+        look.bold, look.italic, look.foreground.value_or(roundToInt32(source_.style.body.color)));
+    for (const CellLine& line : lines) {
+        double x = area.left;
+        if (look.alignment == CellAlignment::Right)
+            x = std::max(x, area.right - line.width);
+        else if (look.alignment == CellAlignment::Centre)
+            x = std::max(x, (area.left + area.right - line.width) / 2);
+        const Tpoint at { roundToInt32(x), roundToInt32(y) };
+        if (!line.text.empty())
+            recorder_.printStored(line, at);
+        if (look.underline || look.strikethrough)
+            underline(look, line, at);
+        y += face.lineHeight;
+    }
+}
+
+/// Prints a box at its first row and column on the page.
+void ShapedLayout::printBox(std::size_t at, std::size_t place)
+{
+    const Row& row = page_[at];
+    const int field = columns_[place].field;
+    const bool isBegun = (at > 0 && isSameBox(page_[at - 1], field, row, field))
+        || (place > 0 && isSameBox(row, columns_[place - 1].field, row, field));
+    const OpenBox* const open = openBox(lookOf(row, field));
+    if (isBegun || open == nullptr)
+        return;
+    std::size_t lastRow = at;
+    while (lastRow + 1 < page_.size() && isSameBox(page_[lastRow + 1], field, row, field))
+        ++lastRow;
+    std::size_t lastColumn = place;
+    while (lastColumn + 1 < columns_.size()
+        && isSameBox(row, columns_[lastColumn + 1].field, row, field))
+        ++lastColumn;
+    const OpenBox copy = *open;
+    printShown(copy.look, copy.lines,
+        { columns_[place].left, columns_[lastColumn].left + columns_[lastColumn].width,
+            static_cast<double>(tops_[at]), static_cast<double>(tops_[lastRow + 1]) });
+}
+
+/// Draws the check box. @return  how far the text moves to the right: twips
+double ShapedLayout::printMarks(const CellLook& look, const Area& area)
+{
+    const double side = lineHeight_ * 0.7;
+    if (look.check != CheckMark::None)
+        drawCheckMark(look.check, area.left, area.top + (lineHeight_ - side) / 2, side);
+    return marksWidth(look);
+}
+
+void ShapedLayout::drawCheckMark(CheckMark mark, double left, double top, double side)
+{
+    const auto at = [&](double x, double y) {
+        return Tpoint { roundToInt32(left + x * side), roundToInt32(top + y * side) };
+    };
+    usePen({ .LineColor = 0 });
+    drawLine(at(0, 0), at(1, 0));
+    drawLine(at(1, 0), at(1, 1));
+    drawLine(at(1, 1), at(0, 1));
+    drawLine(at(0, 1), at(0, 0));
+    if (mark == CheckMark::Partly)
+        fillBox(
+            { left + 0.28 * side, left + 0.72 * side, top + 0.28 * side, top + 0.72 * side }, 0);
+    if (mark != CheckMark::On)
+        return;
+    usePen({ .LineColor = 0, .LineWidth = 2 });
+    drawLine(at(0.2, 0.5), at(0.43, 0.76));
+    drawLine(at(0.43, 0.76), at(0.82, 0.22));
+}
+
+/// Draws how a row of a tree hangs below the rows above it.
+void ShapedLayout::drawBranches(const CellLook& look, const Area& area)
+{
+    if (look.level == 0)
+        return;
+    const double step = static_cast<double>(look.indent) / (look.level + 1);
+    const double middle = (area.top + area.bottom) / 2;
+    usePen({ .LineColor = rgb(160, 160, 160) });
+    for (int level = 1; level <= look.level; ++level) {
+        const double x = area.left + padding_ + (level - 0.5) * step;
+        const bool goesOn = level < 64 && ((look.goesOn >> static_cast<unsigned>(level)) & 1U) != 0;
+        const bool isOwn = level == look.level;
+        if (!goesOn && !isOwn)
+            continue;
+        const double end = goesOn ? area.bottom : middle;
+        drawLine(
+            { roundToInt32(x), roundToInt32(area.top) }, { roundToInt32(x), roundToInt32(end) });
+        if (isOwn)
+            drawLine({ roundToInt32(x), roundToInt32(middle) },
+                { roundToInt32(x + 0.8 * step), roundToInt32(middle) });
+    }
+}
+
+/// Strokes in the text's colour, a fifteenth of its height thick.
+void ShapedLayout::underline(const CellLook& look, const CellLine& line, Tpoint at)
+{
+    const MeasuredFont& face = font(look.bold, look.italic);
+    const Color color = look.foreground.value_or(roundToInt32(source_.style.body.color));
+    const double height = face.lineHeight;
+    const auto stroke = [&](double place) {
+        const double top = at.y + place * height;
+        fillBox({ static_cast<double>(at.x), static_cast<double>(at.x) + line.width, top,
+                    top + height / 24 },
+            color);
+    };
+    if (look.underline)
+        stroke(0.88);
+    if (look.strikethrough)
+        stroke(0.55);
+}
+
+void ShapedLayout::useFont(bool bold, bool italic, Color color)
+{
+    const Font& now = recorder_.textFont();
+    const Font& body = source_.style.body.font;
+    const bool isSet = now.bold == bold && now.italic == italic && recorder_.textColor() == color
+        && now.size == body.size && now.name == body.name;
+    if (isSet)
+        return;
+    Font wanted = body;
+    wanted.bold = bold;
+    wanted.italic = italic;
+    recorder_.setTextFont(wanted, color);
+}
+
+void ShapedLayout::usePen(const LinePen& pen)
+{
+    if (pen_ == pen)
+        return;
+    pen_ = pen;
+    recorder_.setLineAttributes(pen);
+}
+
+void ShapedLayout::drawLine(Tpoint from, Tpoint to)
+{
+    recorder_.moveTo(from);
+    recorder_.lineTo(to);
+}
+
+void ShapedLayout::fillBox(const Area& area, Color color)
+{
+    usePen({ .LineColor = color, .FillStyle = SolidFill, .FillColor = color });
+    drawLine({ roundToInt32(area.left), roundToInt32(area.top) },
+        { roundToInt32(area.right), roundToInt32(area.bottom) });
+}
+
+const CellLook* ShapedLayout::lookOf(const Row& row, int field) const
+{
+    return row.looks.empty() ? nullptr : &row.looks[static_cast<std::size_t>(field)];
+}
+
+const ShapedLayout::OpenBox* ShapedLayout::openBox(const CellLook* look) const
+{
+    if (look == nullptr || !look->box)
+        return nullptr;
+    const auto found = std::find_if(
+        boxes_.begin(), boxes_.end(), [&](const OpenBox& open) { return open.box == *look->box; });
+    return found != boxes_.end() ? &*found : nullptr;
+}
+
+bool ShapedLayout::isSameBox(const Row& row, int field, const Row& other, int otherField) const
+{
+    const CellLook* const one = lookOf(row, field);
+    const CellLook* const two = lookOf(other, otherField);
+    return one != nullptr && two != nullptr && one->box && one->box == two->box;
+}
+
+/// Whether merging leaves the cell blank: it says the same as the one above or to its left.
+bool ShapedLayout::isBlanked(std::size_t at, int field) const
+{
+    const auto place = static_cast<std::size_t>(field);
+    const TextView text = page_[at].cells[place].text;
+    if (at > 0 ? !page_[at - 1].isTotal() && page_[at - 1].cells[place].text == text
+               : !lastTexts_.empty() && lastTexts_[place] == text)
+        return true;
+    return equalsLeft(page_[at], field);
+}
+
+bool ShapedLayout::equalsLeft(const Row& row, int field) const
+{
+    const auto place = static_cast<std::size_t>(field);
+    return field > 0 && row.cells[place - 1].text == row.cells[place].text;
+}
+
+} // namespace pelloric
