@@ -29,13 +29,26 @@ std::vector<int> placesOf(const SectionMap& sections, int modelCount)
     return places;
 }
 
-/// The section between two, both included, that is seen first; the first itself if none is seen.
-int firstSeen(const std::vector<int>& places, int first, int last)
+/// The sections between two, both included, that are seen.
+struct SeenRange {
+    int firstSection = 0; ///< the first of all where none is seen
+    int firstPlace = 0;
+    int lastPlace = 0;
+};
+
+SeenRange seenBetween(const std::vector<int>& places, int first, int last)
 {
-    const auto begin = places.begin() + first;
-    const auto end = places.begin() + std::min<std::ptrdiff_t>(std::ssize(places), last + 1);
-    const auto seen = std::min_element(begin, end);
-    return seen == end || *seen == NotSeen ? first : static_cast<int>(seen - places.begin());
+    SeenRange range { first, NotSeen, -1 };
+    const int end = std::min(static_cast<int>(places.size()) - 1, last);
+    for (int section = first; section <= end; ++section) {
+        const int place = places[static_cast<std::size_t>(section)];
+        if (place == NotSeen)
+            continue;
+        if (place < range.firstPlace)
+            range = { section, place, std::max(range.lastPlace, place) };
+        range.lastPlace = std::max(range.lastPlace, place);
+    }
+    return range;
 }
 
 } // namespace
@@ -102,9 +115,13 @@ void CellSpans::findShown(const QTableView& view, const SectionMap& rows, const 
         if (view.isColumnHidden(static_cast<int>(column)))
             columnPlaces[column] = NotSeen;
     }
-    for (CellSpan& span : spans_)
-        span.shown = { firstSeen(rowPlaces, span.first.row, span.last.row),
-            firstSeen(columnPlaces, span.first.column, span.last.column) };
+    for (CellSpan& span : spans_) {
+        const SeenRange ofRows = seenBetween(rowPlaces, span.first.row, span.last.row);
+        const SeenRange ofColumns = seenBetween(columnPlaces, span.first.column, span.last.column);
+        span.shown = { ofRows.firstSection, ofColumns.firstSection };
+        span.firstPlace = { ofRows.firstPlace, ofColumns.firstPlace };
+        span.lastPlace = { ofRows.lastPlace, ofColumns.lastPlace };
+    }
 }
 
 } // namespace pelloric::qt

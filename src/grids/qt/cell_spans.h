@@ -24,6 +24,8 @@ struct CellSpan {
     ModelCell first; ///< the cell whose content is shown
     ModelCell last;
     ModelCell shown; ///< the first cell of the box that is not hidden, as they are seen
+    ModelCell firstPlace; ///< where that cell is seen: from 0
+    ModelCell lastPlace; ///< where the last cell is seen that is not hidden
 };
 
 /// The spans of a table view.

@@ -4,12 +4,15 @@
 #include "grids/qt/table_view_grid.h"
 
 #include "grids/qt/data_view_grid.h"
+#include "platform/drawing_surface.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
 #include <QHeaderView>
+#include <QItemSelectionModel>
+#include <QStyle>
 #include <QTableView>
 
 #include <iterator>
@@ -90,6 +93,7 @@ void TableViewGrid::takeMaps()
     columns_ = SectionMap::all(*table.horizontalHeader());
     spans_ = CellSpans(table, rows_, columns_);
     text_.take(table);
+    looks_.take(table);
 }
 
 DataViewGrid& TableViewGrid::dataGrid()
@@ -125,6 +129,66 @@ TextView TableViewGrid::cell(int row, int column)
         shown = span->first;
     }
     return text_.of(table, model.index(shown.row, shown.column, root));
+}
+
+GridLook TableViewGrid::gridLook()
+{
+    const QTableView& table = view();
+    if (!table.showGrid())
+        return ViewLooks::withoutLines();
+    const int hint = table.style()->styleHint(QStyle::SH_Table_GridLineColor, nullptr, &table);
+    const QColor color = QColor::fromRgb(static_cast<QRgb>(hint));
+    constexpr std::int16_t Styles[] = { 5, 0, 1, 2, 3, 4 }; // in the order of Qt::PenStyle
+    const auto style = static_cast<std::size_t>(table.gridStyle());
+    return { .showsLines = true,
+        .lineStyle = style < std::size(Styles) ? Styles[style] : SolidPen,
+        .lineColor = rgb(color.red(), color.green(), color.blue()) };
+}
+
+void TableViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& look)
+{
+    look = {};
+    if (!hasCell(row, column))
+        return;
+    const ModelCell cell { rows_.logical(row - 1), columns_.logical(column) };
+    const CellSpan* const span = spans_.at(cell);
+    const ModelCell shown = span && span->shown == cell ? span->first : cell;
+    const QTableView& table = view();
+    looks_.read(table, table.model()->index(shown.row, shown.column, table.rootIndex()), look);
+    looks_.alternate(row, look);
+    if (span)
+        look.box = CellBox { span->firstPlace.row + 1, span->lastPlace.row + 1,
+            span->firstPlace.column, span->lastPlace.column };
+}
+
+CellAlignment TableViewGrid::titleAlignment(std::int32_t column)
+{
+    return ViewLooks::titleAlignment(*view().horizontalHeader(), columns_.logical(column));
+}
+
+bool TableViewGrid::isMarked(std::int32_t row)
+{
+    const QTableView& table = view();
+    const QItemSelectionModel* const selection = table.selectionModel();
+    return hasCell(row, 0) && selection
+        && selection->rowIntersectsSelection(rows_.logical(row - 1), table.rootIndex());
+}
+
+std::optional<double> TableViewGrid::number(std::int32_t row, std::int32_t column)
+{
+    return hasCell(row, column) ? ViewLooks::number(indexOf(row, column)) : std::nullopt;
+}
+
+bool TableViewGrid::hasCell(std::int32_t row, std::int32_t column) const
+{
+    return row >= 1 && row <= rows_.count() && column >= 0 && column < columns_.count();
+}
+
+QModelIndex TableViewGrid::indexOf(std::int32_t row, std::int32_t column) const
+{
+    const QTableView& table = view();
+    return table.model()->index(
+        rows_.logical(row - 1), columns_.logical(column), table.rootIndex());
 }
 
 } // namespace pelloric::qt

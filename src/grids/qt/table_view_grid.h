@@ -5,6 +5,7 @@
 
 #include "grids/qt/cell_spans.h"
 #include "grids/qt/cell_text.h"
+#include "grids/qt/view_looks.h"
 #include "grids/qt/view_sections.h"
 #include "platform/automation_object.h"
 
@@ -26,7 +27,7 @@ class DataViewGrid;
 /// then they stay as they were.
 ///
 /// It answers a data grid's members as `DataViewGrid` does, too, for a host that asks for those.
-class TableViewGrid final : public AutomationObject {
+class TableViewGrid final : public AutomationObject, public CellLooks {
 public:
     /// @param view  borrowed; once it is gone, its members are the object-missing error
     explicit TableViewGrid(QTableView& view);
@@ -37,7 +38,15 @@ public:
     Value get(MemberId member, std::span<const Value> arguments) override;
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
 
+    GridLook gridLook() override;
+    void readLook(std::int32_t row, std::int32_t column, CellLook& look) override;
+    CellAlignment titleAlignment(std::int32_t column) override;
+    bool isMarked(std::int32_t row) override;
+    std::optional<double> number(std::int32_t row, std::int32_t column) override;
+
 private:
+    bool hasCell(std::int32_t row, std::int32_t column) const;
+    QModelIndex indexOf(std::int32_t row, std::int32_t column) const;
     QTableView& view() const;
     void takeMaps();
     int columnOf(std::span<const Value> arguments, std::size_t position) const;
@@ -50,6 +59,7 @@ private:
     CellSpans spans_;
     std::unique_ptr<DataViewGrid> dataGrid_; ///< null: nobody asked for its members yet
     CellText text_;
+    ViewLooks looks_;
     QString title_;
 };
 

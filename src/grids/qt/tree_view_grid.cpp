@@ -4,6 +4,7 @@
 #include "grids/qt/tree_view_grid.h"
 
 #include "grids/qt/cell_text.h"
+#include "grids/qt/view_looks.h"
 #include "grids/qt/view_sections.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
@@ -11,6 +12,7 @@
 #include "platform/run_time_error.h"
 
 #include <QHeaderView>
+#include <QItemSelectionModel>
 #include <QListView>
 #include <QPointer>
 #include <QTreeView>
@@ -76,6 +78,7 @@ struct TreeViewGrid::Source {
     SectionMap columns;
     std::vector<QModelIndex> rows; ///< the first column of each row
     CellText text;
+    ViewLooks looks;
     ModelWatch watch;
 
     QAbstractItemView& view() const
@@ -136,6 +139,7 @@ struct TreeViewGrid::Source {
         listBelow(shown.rootIndex(), [&](const QModelIndex& parent) { fetchAll(model, parent); });
         listBelow(shown.rootIndex(), [](const QModelIndex&) {});
         text.take(shown);
+        looks.take(shown);
         watch.watch(model);
     }
 
@@ -175,6 +179,32 @@ struct TreeViewGrid::Source {
             if (tree && tree->isExpanded(index) && model.hasChildren(index))
                 enter(index);
         }
+    }
+
+    /// The column of the branches: the model's number.
+    int branchColumn() const
+    {
+        const int position = tree->treePosition();
+        return position >= 0 ? position : logical(0);
+    }
+
+    void readBranch(const QModelIndex& index, CellLook& look) const
+    {
+        const QAbstractItemModel& model = *tree->model();
+        constexpr int MostLevels = 63;
+        int level = 0;
+        for (QModelIndex at = index.parent(); at.isValid() && at != tree->rootIndex();
+             at = at.parent())
+            ++level;
+        int above = level;
+        for (QModelIndex at = index; above >= 0 && at.isValid(); at = at.parent(), --above) {
+            if (above <= MostLevels && at.row() + 1 < model.rowCount(at.parent()))
+                look.goesOn |= std::uint64_t { 1 } << static_cast<unsigned>(above);
+        }
+        const int steps = level + (tree->rootIsDecorated() ? 1 : 0);
+        look.isBranch = true;
+        look.level = static_cast<std::uint16_t>(level);
+        look.indent = twipsOfPixels(steps * tree->indentation(), tree->logicalDpiX());
     }
 
     const QModelIndex& row(int place) const
@@ -399,6 +429,42 @@ Value TreeViewGrid::get(MemberId member, std::span<const Value> arguments)
 void TreeViewGrid::put(MemberId member, std::span<const Value>, const Value&)
 {
     refuseMember(GridNames, member);
+}
+
+/// Trees and lists draw no lines between cells.
+GridLook TreeViewGrid::gridLook() { return ViewLooks::withoutLines(); }
+
+void TreeViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& look)
+{
+    const QAbstractItemView& view = source_->view();
+    const QModelIndex& index = source_->row(row - 1);
+    const int logical = source_->logical(column);
+    source_->looks.read(view, index.siblingAtColumn(logical), look);
+    source_->looks.alternate(row, look);
+    if (source_->isSpanned(index) && source_->logical(0) == 0)
+        look.box = CellBox { row, row, 0, source_->columns.count() - 1 };
+    if (source_->tree && logical == source_->branchColumn())
+        source_->readBranch(index, look);
+}
+
+CellAlignment TreeViewGrid::titleAlignment(std::int32_t column)
+{
+    source_->view();
+    return source_->tree
+        ? ViewLooks::titleAlignment(*source_->tree->header(), source_->logical(column))
+        : CellAlignment::Left;
+}
+
+bool TreeViewGrid::isMarked(std::int32_t row)
+{
+    const QItemSelectionModel* const selection = source_->view().selectionModel();
+    const QModelIndex& index = source_->row(row - 1);
+    return selection && selection->rowIntersectsSelection(index.row(), index.parent());
+}
+
+std::optional<double> TreeViewGrid::number(std::int32_t row, std::int32_t column)
+{
+    return ViewLooks::number(source_->row(row - 1).siblingAtColumn(source_->logical(column)));
 }
 
 } // namespace pelloric::qt

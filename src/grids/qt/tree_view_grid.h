@@ -4,6 +4,7 @@
 #pragma once
 
 #include "platform/automation_object.h"
+#include "platform/cell_look.h"
 
 #include <memory>
 
@@ -21,7 +22,7 @@ namespace pelloric::qt {
 /// or not: those of branches that are open, without hidden rows; what the first column of a row
 /// spans is empty. Both count from 1. Reading `ColumnHeaders` takes the columns anew, reading
 /// `ListItems` the rows.
-class TreeViewGrid final : public AutomationObject {
+class TreeViewGrid final : public AutomationObject, public CellLooks {
 public:
     /// @param view  borrowed; once it is gone, its members are the object-missing error
     explicit TreeViewGrid(QTreeView& view);
@@ -34,6 +35,12 @@ public:
     const void* memberTable() const override;
     Value get(MemberId member, std::span<const Value> arguments) override;
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
+
+    GridLook gridLook() override;
+    void readLook(std::int32_t row, std::int32_t column, CellLook& look) override;
+    CellAlignment titleAlignment(std::int32_t column) override;
+    bool isMarked(std::int32_t row) override;
+    std::optional<double> number(std::int32_t row, std::int32_t column) override;
 
 private:
     struct Source;

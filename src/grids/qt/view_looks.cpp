@@ -1,0 +1,200 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "grids/qt/view_looks.h"
+
+#include <QAbstractItemView>
+#include <QHeaderView>
+#include <QListView>
+#include <QStyledItemDelegate>
+#include <QTableView>
+#include <QTreeView>
+
+#include <array>
+#include <typeinfo>
+
+namespace pelloric::qt {
+
+namespace {
+
+/// The members through which a view asks its delegate are protected; a derived type may name them.
+struct OptionOfView : QAbstractItemView {
+    static constexpr auto init = &OptionOfView::initViewItemOption;
+};
+
+struct OptionOfDelegate : QStyledItemDelegate {
+    static constexpr auto init = &OptionOfDelegate::initStyleOption;
+};
+
+Color colorOf(const QColor& color) { return rgb(color.red(), color.green(), color.blue()); }
+
+bool wrapsWords(const QAbstractItemView& view)
+{
+    if (const auto* table = qobject_cast<const QTableView*>(&view))
+        return table->wordWrap();
+    if (const auto* tree = qobject_cast<const QTreeView*>(&view))
+        return tree->wordWrap();
+    const auto* list = qobject_cast<const QListView*>(&view);
+    return list && list->wordWrap();
+}
+
+TooWide tooWideOf(const QAbstractItemView& view)
+{
+    if (wrapsWords(view))
+        return TooWide::Wrapped;
+    switch (view.textElideMode()) {
+    case Qt::ElideLeft:
+        return TooWide::CutLeft;
+    case Qt::ElideMiddle:
+        return TooWide::CutMiddle;
+    case Qt::ElideRight:
+    case Qt::ElideNone:
+        break;
+    }
+    return TooWide::CutRight;
+}
+
+void setFont(const QFont& font, CellLook& look)
+{
+    look.bold = font.weight() >= QFont::DemiBold;
+    look.italic = font.italic();
+    look.underline = font.underline();
+    look.strikethrough = font.strikeOut();
+}
+
+void setBackground(const QBrush& brush, CellLook& look)
+{
+    if (brush.style() != Qt::NoBrush && brush.color().alpha() > 0)
+        look.background = colorOf(brush.color());
+}
+
+CheckMark markOf(Qt::CheckState state)
+{
+    switch (state) {
+    case Qt::Unchecked:
+        return CheckMark::Off;
+    case Qt::PartiallyChecked:
+        return CheckMark::Partly;
+    case Qt::Checked:
+        break;
+    }
+    return CheckMark::On;
+}
+
+CellAlignment horizontalOf(Qt::Alignment alignment)
+{
+    if (alignment & Qt::AlignRight)
+        return CellAlignment::Right;
+    return alignment & Qt::AlignHCenter ? CellAlignment::Centre : CellAlignment::Left;
+}
+
+} // namespace
+
+void ViewLooks::take(const QAbstractItemView& view)
+{
+    option_ = QStyleOptionViewItem();
+    (view.*OptionOfView::init)(&option_);
+    tooWide_ = tooWideOf(view);
+    alternates_ = view.alternatingRowColors();
+    alternateColor_ = colorOf(option_.palette.color(QPalette::AlternateBase));
+}
+
+void ViewLooks::read(const QAbstractItemView& view, const QModelIndex& index, CellLook& look)
+{
+    look = {};
+    look.tooWide = tooWide_;
+    const QAbstractItemDelegate* const delegate = view.itemDelegateForIndex(index);
+    const auto* const styled = qobject_cast<const QStyledItemDelegate*>(delegate);
+    if (styled && typeid(*styled) != typeid(QStyledItemDelegate))
+        readStyled(*styled, index, look);
+    else
+        readPlain(index, look);
+}
+
+void ViewLooks::alternate(std::int32_t row, CellLook& look) const
+{
+    if (alternates_ && row % 2 == 0 && !look.background)
+        look.background = alternateColor_;
+}
+
+void ViewLooks::readPlain(const QModelIndex& index, CellLook& look)
+{
+    std::array<QModelRoleData, 5> roles { QModelRoleData(Qt::FontRole),
+        QModelRoleData(Qt::TextAlignmentRole), QModelRoleData(Qt::ForegroundRole),
+        QModelRoleData(Qt::BackgroundRole), QModelRoleData(Qt::CheckStateRole) };
+    index.multiData(roles);
+    if (!roles[0].data().isNull())
+        setFont(roles[0].data().value<QFont>().resolve(option_.font), look);
+    else
+        setFont(option_.font, look);
+    if (!roles[1].data().isNull())
+        setAlignment(Qt::Alignment(roles[1].data().toInt()), look);
+    else
+        setAlignment(option_.displayAlignment, look);
+    if (roles[2].data().canConvert<QBrush>())
+        look.foreground = colorOf(roles[2].data().value<QBrush>().color());
+    if (roles[3].data().canConvert<QBrush>())
+        setBackground(roles[3].data().value<QBrush>(), look);
+    if (!roles[4].data().isNull())
+        look.check = markOf(static_cast<Qt::CheckState>(roles[4].data().toInt()));
+}
+
+void ViewLooks::readStyled(
+    const QAbstractItemDelegate& delegate, const QModelIndex& index, CellLook& look)
+{
+    QStyleOptionViewItem option = option_;
+    option.index = index;
+    (static_cast<const QStyledItemDelegate&>(delegate).*OptionOfDelegate::init)(&option, index);
+    setFont(option.font, look);
+    setAlignment(option.displayAlignment, look);
+    const QColor text = option.palette.color(QPalette::Normal, QPalette::Text);
+    if (text != option_.palette.color(QPalette::Normal, QPalette::Text))
+        look.foreground = colorOf(text);
+    setBackground(option.backgroundBrush, look);
+    if (option.features.testFlag(QStyleOptionViewItem::HasCheckIndicator))
+        look.check = markOf(option.checkState);
+}
+
+/// Where the alignment says nothing, texts stand as the writing runs.
+void ViewLooks::setAlignment(Qt::Alignment alignment, CellLook& look) const
+{
+    look.alignment = horizontalOf(alignment);
+    const bool isMirrored
+        = option_.direction == Qt::RightToLeft && !(alignment & Qt::AlignAbsolute);
+    if (isMirrored && look.alignment != CellAlignment::Centre)
+        look.alignment
+            = look.alignment == CellAlignment::Left ? CellAlignment::Right : CellAlignment::Left;
+    look.place = alignment & Qt::AlignVCenter ? CellPlace::Middle
+        : alignment & Qt::AlignBottom         ? CellPlace::Bottom
+                                              : CellPlace::Top;
+}
+
+GridLook ViewLooks::withoutLines() { return { .showsLines = false }; }
+
+CellAlignment ViewLooks::titleAlignment(const QHeaderView& header, int section)
+{
+    const QVariant own = header.model()->headerData(section, Qt::Horizontal, Qt::TextAlignmentRole);
+    return horizontalOf(own.isNull() ? header.defaultAlignment() : Qt::Alignment(own.toInt()));
+}
+
+std::optional<double> ViewLooks::number(const QModelIndex& index)
+{
+    const QVariant value = index.data(Qt::DisplayRole);
+    switch (value.typeId()) {
+    case QMetaType::Int:
+    case QMetaType::UInt:
+    case QMetaType::Short:
+    case QMetaType::UShort:
+    case QMetaType::Long:
+    case QMetaType::ULong:
+    case QMetaType::LongLong:
+    case QMetaType::ULongLong:
+    case QMetaType::Float:
+    case QMetaType::Double:
+        return value.toDouble();
+    default:
+        return std::nullopt;
+    }
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,53 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/cell_look.h"
+
+#include <QPalette>
+#include <QStyleOptionViewItem>
+
+class QAbstractItemDelegate;
+class QAbstractItemView;
+class QHeaderView;
+class QModelIndex;
+
+namespace pelloric::qt {
+
+/// Reads how a view shows its cells, as its delegates say it.
+class ViewLooks {
+public:
+    /// Takes how the view shows its cells; before the first cell, and anew whenever that may have
+    /// changed.
+    void take(const QAbstractItemView& view);
+
+    /// Overwrites all of `look` but what belongs to rows, trees and boxes.
+    /// @param view  the one that was taken
+    void read(const QAbstractItemView& view, const QModelIndex& index, CellLook& look);
+
+    /// Gives rows a colour in turn, where the view does.
+    /// @param row  from 1, as it is printed
+    void alternate(std::int32_t row, CellLook& look) const;
+
+    /// Lines between cells, for views that draw none.
+    static GridLook withoutLines();
+
+    static CellAlignment titleAlignment(const QHeaderView& header, int section);
+
+    /// The number of a cell, as its model has it.
+    static std::optional<double> number(const QModelIndex& index);
+
+private:
+    void readPlain(const QModelIndex& index, CellLook& look);
+    void readStyled(
+        const QAbstractItemDelegate& delegate, const QModelIndex& index, CellLook& look);
+    void setAlignment(Qt::Alignment alignment, CellLook& look) const;
+
+    QStyleOptionViewItem option_; ///< of every cell of the view that was taken
+    TooWide tooWide_ = TooWide::Wrapped;
+    bool alternates_ = false;
+    Color alternateColor_ = 0;
+};
+
+} // namespace pelloric::qt
