@@ -414,19 +414,19 @@ TEST_F(ShapedReportTest, EveryChosenCellStandsOncePerBandAndNothingOutsideThePap
                 }
             }
         }
-        int onlyOnce = 0;
+        int singles = 0;
         for (int row = 1; row <= printed; ++row) {
             for (int column = 1; column <= columns; ++column, ++cells) {
                 const int count = seen[u"r" + decimal(row) + u"c" + decimal(column)];
                 if (column > keys) {
                     EXPECT_EQ(count, 1) << row << " " << column << " of " << round;
-                    ++onlyOnce;
+                    ++singles;
                 } else {
                     EXPECT_GE(count, 1);
                 }
             }
         }
-        EXPECT_EQ(onlyOnce, printed * std::max(0, columns - keys));
+        EXPECT_EQ(singles, printed * std::max(0, columns - keys));
     }
     std::printf("%d chosen cells looked at\n", cells);
 }

@@ -96,7 +96,7 @@ void CellSpans::findSpans(const QTableView& view, int rowCount, int columnCount)
                 const Stretch* const left = stretchAt({ row, column - 1 });
                 const bool goesOn = left && spans_[left->span].last.column >= column;
                 if (!goesOn)
-                    spans_.push_back({ { row, column }, last, { row, column } });
+                    spans_.push_back({ { row, column }, last, { row, column }, {}, {} });
                 stretches.push_back({ last.row, goesOn ? left->span : spans_.size() - 1 });
             }
             row += height;
