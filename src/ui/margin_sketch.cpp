@@ -103,9 +103,16 @@ bool MarginSketch::isHover(Margin line, double x, double y) const
     return x - length < HoverTolerance;
 }
 
-/// No line is moved past the opposite margin.
+bool MarginSketch::isOnSheet(Margin line, double position) const
+{
+    return position > 0 && position < (isHorizontalLine(line) ? height_ : width_);
+}
+
+/// No line is moved past the opposite margin, nor off the sheet.
 bool MarginSketch::staysInside(Margin line, double position) const
 {
+    if (!isOnSheet(line, position))
+        return false;
     switch (line) {
     case Margin::Top:
         return position < height_ - margin(Margin::Bottom);
@@ -140,7 +147,9 @@ void MarginSketch::mouseDown(Margin line, double x, double y)
         return;
     dragging_ = true;
     dragLine_ = line;
-    positions_[index(line)] += isHorizontalLine(line) ? y : x;
+    const double moved = positions_[index(line)] + (isHorizontalLine(line) ? y : x);
+    if (isOnSheet(line, moved))
+        positions_[index(line)] = moved;
 }
 
 std::optional<Margin> MarginSketch::mouseUp()

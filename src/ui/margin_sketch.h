@@ -79,7 +79,8 @@ public:
     /// Top of a horizontal line, left edge of an upright one, held within what a window can place.
     double linePosition(Margin margin) const;
 
-    /// The pointer moves inside a line's own picture; while a line is dragged it follows.
+    /// The pointer moves inside a line's own picture; while a line is dragged it follows, but
+    /// neither past the opposite margin nor off the sheet.
     void mouseMove(Margin line, double x, double y);
     /// A button goes down on a line: over a line a drag begins.
     void mouseDown(Margin line, double x, double y);
@@ -98,6 +99,7 @@ private:
     static std::size_t index(Margin margin) { return static_cast<std::size_t>(margin); }
     double placeOf(Margin margin) const;
     bool isHover(Margin line, double x, double y) const;
+    bool isOnSheet(Margin line, double position) const;
     bool staysInside(Margin line, double position) const;
 
     std::array<double, 4> margins_ { SketchScale, SketchScale, SketchScale, SketchScale };

@@ -87,6 +87,33 @@ TEST(MarginSketch, StopsEachLineAtTheOppositeMargin)
     }
 }
 
+TEST(MarginSketch, KeepsADraggedLineOnTheSheet)
+{
+    struct Case {
+        Margin line;
+        double step;
+    };
+    const Case cases[] = {
+        { Margin::Top, -100 },
+        { Margin::Left, -100 },
+        { Margin::Right, 100 },
+        { Margin::Bottom, 100 },
+    };
+    for (const Case& row : cases) {
+        MarginSketch sketch = sketchOf(1000, 1000);
+        sketch.mouseMove(row.line, 0, 0);
+        sketch.mouseDown(row.line, 0, 0);
+        for (int move = 0; move < 20; ++move)
+            sketch.mouseMove(row.line, row.step, row.step);
+        EXPECT_EQ(sketch.mouseUp(), row.line);
+        EXPECT_EQ(sketch.margin(row.line), 84) << static_cast<int>(row.line);
+        sketch.mouseMove(row.line, 0, 0);
+        sketch.mouseDown(row.line, row.step, row.step);
+        sketch.mouseUp();
+        EXPECT_EQ(sketch.margin(row.line), 84) << static_cast<int>(row.line);
+    }
+}
+
 TEST(MarginSketch, RulesATableInsideTheMargins)
 {
     const MarginSketch sketch = sketchOf(1000, 800);
