@@ -3,15 +3,16 @@
 
 #include "ui/qt/dialog_parts.h"
 
-#include <QAbstractButton>
+#include "ui/qt/named_boxes.h"
+
+#include <QAbstractSpinBox>
 #include <QBoxLayout>
+#include <QComboBox>
 #include <QDialog>
 #include <QDialogButtonBox>
-#include <QKeySequence>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
-#include <QShortcut>
 
 #include <cmath>
 
@@ -23,7 +24,19 @@ constexpr double Colors = 0x1000000; ///< how many there are
 constexpr double PaleLightness = 0.72; ///< from here a text is hard to read on white; 0 to 1
 constexpr QRgb DarkGround = 0xFF303030;
 
-QKeySequence altAnd(char key) { return QKeySequence(QStringLiteral("Alt+") + QLatin1Char(key)); }
+/// A control's name for assistive technology: its caption without blanks and colon at the ends.
+void nameAfter(QWidget& control, const QString& caption)
+{
+    QString name = caption.trimmed();
+    if (name.endsWith(QLatin1Char(':')))
+        name.chop(1);
+    if (auto* const combo = qobject_cast<QComboBox*>(&control))
+        nameBox(*combo, name);
+    else if (auto* const spin = qobject_cast<QAbstractSpinBox*>(&control))
+        nameBox(*spin, name);
+    else
+        control.setAccessibleName(name);
+}
 
 /// How light a colour looks, 0 to 1.
 double lightnessOf(const QColor& color)
@@ -48,29 +61,27 @@ QLabel* captionFor(
         return label;
     label->setBuddy(buddy);
     if (buddy->accessibleName().isEmpty())
-        buddy->setAccessibleName(text.trimmed());
-    if (key != 0) {
-        auto* shortcut = new QShortcut(altAnd(key), label);
-        QObject::connect(shortcut, &QShortcut::activated, buddy,
-            [buddy] { buddy->setFocus(Qt::ShortcutFocusReason); });
-    }
+        nameAfter(*buddy, text);
+    if (key != 0)
+        setFocusKey(*buddy, key, *label);
     return label;
 }
 
-void setAltKey(QAbstractButton& button, char key) { button.setShortcut(altAnd(key)); }
-
 ClosingButtons addClosingButtons(
-    QDialog& dialog, QBoxLayout& layout, const QString& okText, const QString& cancelText)
+    QDialog& dialog, QBoxLayout& layout, const ClosingButton& ok, const ClosingButton& cancel)
 {
     auto* box = new QDialogButtonBox(&dialog);
-    ClosingButtons buttons { box->addButton(okText, QDialogButtonBox::AcceptRole),
-        box->addButton(cancelText, QDialogButtonBox::RejectRole) };
+    ClosingButtons buttons { box->addButton(ok.text, QDialogButtonBox::AcceptRole),
+        box->addButton(cancel.text, QDialogButtonBox::RejectRole) };
+    setAltKey(*buttons.ok, ok.key);
+    setAltKey(*buttons.cancel, cancel.key);
     buttons.ok->setObjectName(QStringLiteral("cmdOk"));
     buttons.ok->setDefault(true);
     buttons.cancel->setObjectName(QStringLiteral("cmdCancel"));
     buttons.cancel->setAutoDefault(false);
     QObject::connect(box, &QDialogButtonBox::rejected, &dialog, &QDialog::reject);
     layout.addWidget(box);
+    showAltKeys(dialog);
     return buttons;
 }
 

@@ -3,10 +3,11 @@
 
 #pragma once
 
+#include "ui/qt/alt_keys.h"
+
 #include <QColor>
 #include <QString>
 
-class QAbstractButton;
 class QBoxLayout;
 class QDialog;
 class QLabel;
@@ -21,23 +22,29 @@ QString elementName(const char* array, int index);
 
 /// A caption that is shown letter by letter; Alt and a letter of it go to the control it describes.
 ///
-/// The caption itself holds no mark for the letter, so that it reads the same everywhere.
+/// The caption itself holds no mark for the letter, so that it reads the same everywhere. A control
+/// without an accessible name is named after it.
 /// @param key    the letter; 0: none
 /// @param buddy  what the caption describes; may be null
 QLabel* captionFor(
     const QString& text, char key, QWidget* buddy, QWidget* parent, const QString& name = {});
 
-/// Lets Alt and a letter press a button or choose an option.
-void setAltKey(QAbstractButton& button, char key);
+/// A button that closes a dialog, and the letter that presses it with Alt.
+struct ClosingButton {
+    QString text;
+    char key;
+};
 
-/// Puts "OK" (or another caption) and "Cancel" (or another) at the end of a dialog: Enter presses
-/// the first, Escape the second.
+/// The two buttons at the end of a dialog.
 struct ClosingButtons {
     QPushButton* ok;
     QPushButton* cancel;
 };
+
+/// Puts "OK" (or another caption) and "Cancel" (or another) at the end of a dialog: Enter presses
+/// the first, Escape the second. From then on the dialog shows its Alt keys.
 ClosingButtons addClosingButtons(
-    QDialog& dialog, QBoxLayout& layout, const QString& okText, const QString& cancelText);
+    QDialog& dialog, QBoxLayout& layout, const ClosingButton& ok, const ClosingButton& cancel);
 
 /// The colour of a number 0x00BBGGRR; what lies outside 24 bits is left out.
 QColor colorOf(double number);

@@ -55,7 +55,7 @@ FontChooser::FontChooser(const ColoredFont& present, QWidget* parent)
     layout->addWidget(makeFaceGroup());
     layout->addWidget(makeStyleGroup());
     layout->addWidget(makeSample(), 1);
-    ok_ = addClosingButtons(*this, *layout, tr("OK"), tr("Cancel")).ok;
+    ok_ = addClosingButtons(*this, *layout, { tr("OK"), 'O' }, { tr("Cancel"), 'N' }).ok;
     connect(ok_, &QPushButton::clicked, this, &QDialog::accept);
     showFont(present);
     connect(face_, &QComboBox::editTextChanged, this, &FontChooser::showSample);
@@ -101,7 +101,7 @@ QWidget* FontChooser::makeStyleGroup()
     const StyleRow rows[] = {
         { bold_, "chkBold", tr("Bold"), 'B' },
         { italic_, "chkItalic", tr("Italic"), 'I' },
-        { strikeOut_, "chkStrikeOut", tr("Strikeout"), 'K' },
+        { strikeOut_, "chkStrikeOut", tr("Strikeout"), 'T' },
         { underline_, "chkUnderline", tr("Underline"), 'U' },
     };
     int place = 0;

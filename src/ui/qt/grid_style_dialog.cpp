@@ -43,6 +43,18 @@ Qt::CheckState stateOf(std::int16_t value)
     return value == 0 ? Qt::Unchecked : value == 2 ? Qt::PartiallyChecked : Qt::Checked;
 }
 
+/// A box that may stand grey, but that its user only sets and clears.
+class OnOffBox final : public QCheckBox {
+public:
+    using QCheckBox::QCheckBox;
+
+protected:
+    void nextCheckState() override
+    {
+        setCheckState(checkState() == Qt::Checked ? Qt::Unchecked : Qt::Checked);
+    }
+};
+
 } // namespace
 
 GridStyleDialog::GridStyleDialog(const Platform& platform, QWidget* parent)
@@ -57,10 +69,11 @@ GridStyleDialog::GridStyleDialog(const Platform& platform, QWidget* parent)
     tabs->addTab(makeOptionsTab(), toQString(GridStyleTabs[0]));
     tabs->addTab(makeColorsTab(), toQString(GridStyleTabs[1]));
     tabs->addTab(makeFontsTab(), toQString(GridStyleTabs[2]));
+    setTabKeys(*tabs, "OLF");
     auto* layout = new QVBoxLayout(this);
     layout->addWidget(tabs);
-    const ClosingButtons buttons
-        = addClosingButtons(*this, *layout, QStringLiteral("OK"), QStringLiteral("Cancel"));
+    const ClosingButtons buttons = addClosingButtons(
+        *this, *layout, { QStringLiteral("OK"), 'K' }, { QStringLiteral("Cancel"), 'N' });
     connect(buttons.ok, &QPushButton::clicked, this, &GridStyleDialog::save);
 }
 
@@ -96,7 +109,7 @@ QWidget* GridStyleDialog::makeOptionsTab()
 QCheckBox* GridStyleDialog::makeSwitch(
     GridSwitch which, const QString& name, const QString& text, char key)
 {
-    auto* box = new QCheckBox(text, this);
+    auto* box = new OnOffBox(text, this);
     box->setObjectName(name);
     setAltKey(*box, key);
     box->setCheckState(stateOf(state_.value(which)));
@@ -156,6 +169,7 @@ QTreeWidget* GridStyleDialog::makeFontList(QWidget* parent)
     auto* list = new QTreeWidget(parent);
     list->setObjectName(QStringLiteral("ListView1"));
     list->setAccessibleName(tr("Fonts"));
+    setFocusKey(*list, '1', *list);
     list->setRootIsDecorated(false);
     list->setMinimumWidth(list->fontMetrics().averageCharWidth() * ListCharacters);
     list->setAllColumnsShowFocus(true);

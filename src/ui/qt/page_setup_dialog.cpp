@@ -64,10 +64,11 @@ PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent)
     tabs->addTab(makeMarginsTab(), toQString(PageSetupTabs[1]));
     texts_ = new PageTextsTab(state_, this);
     tabs->addTab(texts_, toQString(PageSetupTabs[2]));
+    setTabKeys(*tabs, "GMD");
     auto* layout = new QVBoxLayout(this);
     layout->addWidget(tabs);
-    const ClosingButtons buttons
-        = addClosingButtons(*this, *layout, QStringLiteral("OK"), QStringLiteral("Cancel"));
+    const ClosingButtons buttons = addClosingButtons(
+        *this, *layout, { QStringLiteral("OK"), 'K' }, { QStringLiteral("Cancel"), 'C' });
     connect(buttons.ok, &QPushButton::clicked, this, &PageSetupDialog::save);
     showPaper();
     showMargins();
@@ -117,9 +118,9 @@ QWidget* PageSetupDialog::makePaperList(QWidget* parent)
     header.setStretchLastSection(false);
     header.setSectionResizeMode(QHeaderView::ResizeToContents);
     header.setSectionResizeMode(0, QHeaderView::Stretch);
-    // The arrow keys go on from the paper in force, which is not a choice of the user's yet.
+    // The paper in force stands out, but is no choice of the user's yet: the label still waits.
     if (QTreeWidgetItem* present = papers_->topLevelItem(state_.paper.paperCode - 1)) {
-        papers_->setCurrentItem(present, 0, QItemSelectionModel::NoUpdate);
+        papers_->setCurrentItem(present);
         papers_->scrollToItem(present, QAbstractItemView::PositionAtCenter);
     }
     connect(papers_, &QTreeWidget::itemSelectionChanged, this, &PageSetupDialog::clickPaper);

@@ -9,6 +9,7 @@
 
 #include <QContextMenuEvent>
 #include <QGridLayout>
+#include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
@@ -17,6 +18,8 @@
 #include <QVBoxLayout>
 
 #include <algorithm>
+#include <iterator>
+#include <optional>
 
 namespace pelloric::qt {
 
@@ -26,6 +29,20 @@ constexpr const char* SlotHints[] = { QT_TRANSLATE_NOOP("pelloric::qt::PageTexts
     QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Center"),
     QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Right") };
 
+/// What assistive technology calls the boxes, in their order.
+constexpr const char* BoxNames[] = { QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Header left"),
+    QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Header center"),
+    QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Header right"),
+    QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Footer left"),
+    QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Footer center"),
+    QT_TRANSLATE_NOOP("pelloric::qt::PageTextsTab", "Footer right") };
+static_assert(std::size(BoxNames) == PageSetupState::FormatBoxes);
+
+/// While Alt is held the boxes show their number; the font boxes follow them.
+constexpr char FirstBoxKey = '1';
+constexpr char HeaderFontKey = '7';
+constexpr char FooterFontKey = '8';
+
 /// Wide enough for every field with its caret: pixels.
 int fieldWidth(const QFontMetrics& metrics)
 {
@@ -33,6 +50,18 @@ int fieldWidth(const QFontMetrics& metrics)
     for (const FieldEntry& entry : FieldEntries)
         width = std::max(width, metrics.horizontalAdvance(toQString(entry.field)));
     return width + 2 * metrics.averageCharWidth();
+}
+
+/// Where an event of a box asks for the menu of fields, on the screen; nothing: it does not.
+std::optional<QPoint> menuPlaceOf(const QEvent& event, const QWidget& box)
+{
+    if (event.type() == QEvent::ContextMenu)
+        return static_cast<const QContextMenuEvent&>(event).globalPos();
+    if (event.type() != QEvent::KeyPress)
+        return std::nullopt;
+    const auto& key = static_cast<const QKeyEvent&>(event);
+    const bool asks = key.key() == Qt::Key_Down && key.modifiers() == Qt::AltModifier;
+    return asks ? std::optional(box.mapToGlobal(QPoint(0, box.height()))) : std::nullopt;
 }
 
 } // namespace
@@ -78,7 +107,9 @@ QWidget* PageTextsTab::makeTextsGroup(bool isHeader, QWidget* parent)
     setAltKey(*change, isHeader ? 'N' : 'T');
     connect(change, &QPushButton::clicked, this, [this, isHeader] { askFont(isHeader); });
     description->setAccessibleName(isHeader ? tr("Header font") : tr("Footer font"));
-    change->setAccessibleName(description->accessibleName());
+    setFocusKey(*description, isHeader ? HeaderFontKey : FooterFontKey, *description);
+    change->setAccessibleName(
+        isHeader ? tr("Change the header font") : tr("Change the footer font"));
     grid->addWidget(description, 2, 0, 1, 2);
     grid->addWidget(change, 2, 2, Qt::AlignLeft);
     return frame;
@@ -93,7 +124,9 @@ QWidget* PageTextsTab::makeFormatBox(int box, QWidget* parent)
     formatBoxes_[index] = text;
     text->setObjectName(elementName("txtFormat", box));
     text->setPlaceholderText(hint);
-    text->setAccessibleName(hint);
+    text->setAccessibleName(tr(BoxNames[index]));
+    text->setToolTip(tr("The Menu key or Alt+Down opens the fields"));
+    setFocusKey(*text, static_cast<char>(FirstBoxKey + index), *text);
     text->setMinimumWidth(fieldWidth(text->fontMetrics()));
     text->setCursorPosition(0);
     text->installEventFilter(this);
@@ -134,10 +167,11 @@ bool PageTextsTab::eventFilter(QObject* watched, QEvent* event)
         const int box = static_cast<int>(index) + 1;
         if (event->type() == QEvent::FocusIn)
             state_.focusFormatBox(box);
-        if (event->type() != QEvent::ContextMenu)
-            break;
-        openFieldMenu(box, static_cast<QContextMenuEvent*>(event)->globalPos());
-        return true;
+        if (const std::optional<QPoint> place = menuPlaceOf(*event, *formatBoxes_[index])) {
+            openFieldMenu(box, *place);
+            return true;
+        }
+        break;
     }
     return QWidget::eventFilter(watched, event);
 }

@@ -8,6 +8,7 @@
 #include "ui/preview_navigation.h"
 #include "ui/qt/choice_box.h"
 #include "ui/qt/icon_set.h"
+#include "ui/qt/named_boxes.h"
 #include "ui/tool_table.h"
 
 #include <QAction>
@@ -101,7 +102,7 @@ PreviewToolbar::PreviewToolbar(QWidget* parent)
     setAccessibleName(tr("Tools"));
     setMovable(false);
     setFloatable(false);
-    setContextMenuPolicy(Qt::PreventContextMenu);
+    setContextMenuPolicy(Qt::NoContextMenu);
     setToolButtonStyle(Qt::ToolButtonTextUnderIcon);
     for (const ToolGroup group : GroupOrder) {
         if (group != GroupOrder.front())
@@ -172,7 +173,7 @@ void PreviewToolbar::addCombo(const PreviewTool& tool)
     auto* const box = new ChoiceBox(this);
     const bool isScale = tool.action == ToolAction::ChooseScale;
     describe(*box, tool);
-    box->setAccessibleName(plainCaption(tool));
+    nameBox(*box, plainCaption(tool));
     box->setToolTip(tipOf(tool));
     box->setProperty("caption", toQString(tool.caption));
     box->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);

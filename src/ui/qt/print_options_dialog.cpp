@@ -43,9 +43,8 @@ PrintOptionsDialog::PrintOptionsDialog(const Platform& platform, Print print, QW
     layout->addWidget(makePrinterGroup());
     layout->addWidget(makeRangeGroup());
     layout->addWidget(makeCopiesGroup());
-    const ClosingButtons buttons
-        = addClosingButtons(*this, *layout, QStringLiteral("Print"), QStringLiteral("Close"));
-    setAltKey(*buttons.ok, 'P');
+    const ClosingButtons buttons = addClosingButtons(
+        *this, *layout, { QStringLiteral("Print"), 'P' }, { QStringLiteral("Close"), 'L' });
     connect(buttons.ok, &QPushButton::clicked, this, &PrintOptionsDialog::press);
 }
 
@@ -97,7 +96,8 @@ QWidget* PrintOptionsDialog::makeRangeGroup()
     line->addWidget(range_, 1);
     layout->addLayout(line);
     layout->addWidget(hint);
-    range_->setAccessibleName(some->text());
+    range_->setAccessibleName(tr("Page range"));
+    setFocusKey(*range_, '1', *range_);
     return group;
 }
 

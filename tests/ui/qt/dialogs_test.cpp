@@ -385,6 +385,19 @@ TEST_F(PageSetupDialogTest, ClickingAPaperFillsTheBoxesByOrientation)
     EXPECT_EQ(boxText(dialog, "txtHeight"), "297.00 mm");
 }
 
+TEST_F(PageSetupDialogTest, ThePaperInForceStandsOutAndTheLabelWaitsForAClick)
+{
+    const PageSetupDialog dialog(services());
+    auto& list = child<QTreeWidget>(dialog, "ListView1");
+    ASSERT_EQ(list.selectedItems().size(), 1);
+    EXPECT_EQ(list.indexOfTopLevelItem(list.selectedItems().front()), 8);
+    EXPECT_EQ(child<QLabel>(dialog, "labPagerSize").text(), "PagerSize");
+    EXPECT_EQ(boxText(dialog, "txtWidth"), "210mm");
+    clickRow(list, 8);
+    EXPECT_EQ(child<QLabel>(dialog, "labPagerSize").text(), "PagerSize: A4");
+    EXPECT_EQ(boxText(dialog, "txtWidth"), "210.00 mm");
+}
+
 TEST_F(PageSetupDialogTest, ExchangesTheSizesByTheirTexts)
 {
     PageSetupDialog dialog(services());
@@ -560,6 +573,34 @@ TEST_F(PageSetupDialogTest, NoMarginLinePassesTheOppositeOne)
     EXPECT_GT(line.y(), child<QWidget>(dialog, "PicPreview").height() / 2);
 }
 
+TEST_F(PageSetupDialogTest, NoMarginLineIsDraggedOffTheSheet)
+{
+    PageSetupDialog dialog(services());
+    showTab(dialog, 1);
+    struct Case {
+        const char* line;
+        const char* box;
+        QPoint way;
+    };
+    const Case cases[] = {
+        { "PicTop(0)", "txtTop", { 0, -400 } },
+        { "PicTop(1)", "txtRight", { 400, 0 } },
+        { "PicTop(2)", "txtButtom", { 0, 400 } },
+        { "PicTop(3)", "txtLeft", { -400, 0 } },
+    };
+    for (const Case& row : cases) {
+        auto& line = child<QWidget>(dialog, row.line);
+        const QPoint start = line.rect().center();
+        QTest::mouseMove(&line, start);
+        QTest::mousePress(&line, Qt::LeftButton, {}, start);
+        QTest::mouseMove(&line, start + row.way);
+        QTest::mouseRelease(&line, Qt::LeftButton, {}, start);
+        const std::string text = boxText(dialog, row.box);
+        EXPECT_LT(std::stod(text), 2.0) << row.line;
+        EXPECT_GT(std::stod(text), 0.0) << row.line;
+    }
+}
+
 TEST_F(PageSetupDialogTest, OpensWithoutASettingsFile)
 {
     std::filesystem::remove(settingsPath(services()));
@@ -657,6 +698,24 @@ TEST_F(GridStyleDialogTest, AGreyBoxIsTwoAndReadsBackAsSet)
     EXPECT_EQ(setting(u"GridMerge"), "1");
     const GridStyleDialog again(services());
     EXPECT_EQ(child<QCheckBox>(again, "ChkShow").checkState(), Qt::Checked);
+}
+
+TEST_F(GridStyleDialogTest, ClicksOnHeadersGoOnAndOffAndLeaveAGreyBoxAtTwo)
+{
+    GridStyleDialog dialog(services());
+    dialog.show();
+    auto& headers = child<QCheckBox>(dialog, "ChkShow");
+    EXPECT_EQ(headers.checkState(), Qt::Checked);
+    for (const Qt::CheckState expected : { Qt::Unchecked, Qt::Checked, Qt::Unchecked }) {
+        headers.click();
+        EXPECT_EQ(headers.checkState(), expected);
+    }
+    headers.setCheckState(Qt::PartiallyChecked);
+    QTest::keyClick(&headers, Qt::Key_Space);
+    EXPECT_EQ(headers.checkState(), Qt::Checked);
+    headers.click();
+    press(dialog, "cmdOk");
+    EXPECT_EQ(setting(u"ShowHeaders"), "0");
 }
 
 TEST_F(GridStyleDialogTest, CancelLeavesTheFileAndOkWritesColours)
