@@ -10,16 +10,17 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "print/page_list.h"
+#include "print/paper_fit.h"
 #include "print/print_job.h"
 #include "print/qt/qt_printing.h"
 #include "progress_line.h"
 #include "report_builder.h"
 #include "report_options.h"
+#include "table_selection.h"
 #include "table_source.h"
 
 #include <algorithm>
 #include <array>
-#include <cmath>
 #include <limits>
 #include <memory>
 
@@ -34,9 +35,6 @@ constexpr auto Options = std::to_array<Option>({
 });
 
 constexpr double MostCopies = std::numeric_limits<std::int16_t>::max();
-
-constexpr double TwipsPerMm = TwipsPerCm / 10.0;
-constexpr double SamePaperMm = 2;
 
 /// What the options say, checked before anything is read.
 struct Order {
@@ -72,30 +70,36 @@ void choosePrinter(const CommandLine& line, qt::QtPrinting& printing)
         throw CommandError(system.refusal({}));
 }
 
-bool isSameLength(double mm, Twips twips)
-{
-    return std::abs(mm - twips / TwipsPerMm) < SamePaperMm;
-}
-
-/// Whether a form has the size of the pages, upright or turned.
-bool fits(const PaperForm& form, const PageSetup& setup)
-{
-    const auto [narrow, wide] = std::minmax(form.widthMm, form.heightMm);
-    return isSameLength(narrow, std::min(setup.myWidth, setup.myHeight))
-        && isSameLength(wide, std::max(setup.myWidth, setup.myHeight));
-}
-
-/// The code of the paper that the pages were laid out for.
-/// @param wanted  taken where it fits, and where nothing does
+/// The code of the paper that the pages were laid out for; 0: no form has their size.
+/// @param wanted  taken where it fits
 std::int16_t paperFor(
     const PageSetup& setup, std::int16_t wanted, const std::vector<PaperForm>& forms)
 {
+    const auto fits = [&setup](const PaperForm& form) {
+        return isPaperOf(form, setup.myWidth, setup.myHeight);
+    };
     const auto at = static_cast<std::size_t>(wanted) - 1;
-    if (wanted >= 1 && at < forms.size() && fits(forms[at], setup))
+    if (wanted >= 1 && at < forms.size() && fits(forms[at]))
         return wanted;
-    const auto found = std::find_if(
-        forms.begin(), forms.end(), [&setup](const PaperForm& form) { return fits(form, setup); });
-    return found == forms.end() ? wanted : static_cast<std::int16_t>(found - forms.begin() + 1);
+    const auto found = std::find_if(forms.begin(), forms.end(), fits);
+    return found == forms.end() ? std::int16_t { 0 }
+                                : static_cast<std::int16_t>(found - forms.begin() + 1);
+}
+
+/// Asks for the paper of the pages, and tells where the printer has none of their size.
+void choosePaper(
+    PrintJob& job, const PageSetup& setup, std::int16_t wanted, const qt::QtPrinterSystem& system)
+{
+    job.paperSize = paperFor(setup, wanted, system.forms());
+    job.pageWidth = setup.myWidth;
+    job.pageHeight = setup.myHeight;
+    const PaperRequest pages { .code = job.paperSize,
+        .orientation = job.orientation,
+        .width = job.pageWidth,
+        .height = job.pageHeight };
+    const Text warning = paperWarning(pages, system.sheetFor(pages));
+    if (!warning.empty())
+        tell(qt::toQString(warning));
 }
 
 /// Prints the pages and says how many there were.
@@ -134,8 +138,8 @@ void printDocument(const Order& order, const CommandLine& line, qt::QtPlatform& 
 {
     const SavedDocument saved = readDocument(order.file, line, platform.record());
     PrintJob job;
-    job.paperSize = paperFor(saved.setup, job.paperSize, printing.system().forms());
     job.orientation = saved.setup.myWidth > saved.setup.myHeight ? 2 : 1;
+    choosePaper(job, saved.setup, job.paperSize, printing.system());
     printPages(order, saved.document, job, Font {}, printing, progress);
 }
 
@@ -150,8 +154,8 @@ void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& pla
     grid.reset();
     PrintJob job;
     const ReportStyle& style = canvas.style();
-    job.paperSize = paperFor(canvas.page, style.PagerSizeValue, printing.system().forms());
     job.orientation = style.PagerOrientation;
+    choosePaper(job, canvas.page, style.PagerSizeValue, printing.system());
     printPages(order, canvas.document(), job, canvas.recorder().textFont(), printing, progress);
 }
 
@@ -159,7 +163,7 @@ void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& pla
 
 int runPrint(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, { Options, sourceOptions(), reportOptions() }, 1);
+    const CommandLine line(invocation.arguments, printOptions(), 1);
     const Order order(line);
     const HeadlessApplication application(invocation);
     qt::QtPlatform platform;
@@ -179,10 +183,14 @@ int runPrint(const Invocation& invocation)
 QString printDetails()
 {
     return QStringLiteral(
-               "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
-               "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
-               "Every page is a job of its own, one-sided, on the paper it was laid out for.\n\n")
-        + optionHelp(Options) + optionHelp(sourceOptions()) + optionHelp(reportOptions());
+        "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
+        "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
+        "Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
+}
+
+OptionTables printOptions()
+{
+    return { Options, sourceOptions(), selectionOptions(), reportOptions() };
 }
 
 } // namespace pelloric::app

@@ -318,14 +318,19 @@ void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrint
         .copies = nPrintPageNum,
         .paperSize = style_.PagerSizeValue,
         .orientation = style_.PagerOrientation,
-        .documentName = openedName_.empty() ? documentName : openedName_,
+        .pageWidth = page.myWidth,
+        .pageHeight = page.myHeight,
+        .documentName = documentTitle(),
         .pageSent = {} };
-    progress_ = { true, std::max<std::int64_t>(1, pagesToSend(document_, job)), 0 };
-    job.pageSent = [this](std::int64_t sent) {
+    const std::int64_t wanted = pagesToSend(document_, job);
+    progress_ = { true, std::max<std::int64_t>(1, wanted), 0 };
+    job.pageSent = [this, wanted](std::int64_t sent) {
         progress_.value = sent;
         if (observer_ != nullptr)
             observer_->progressChanged();
-        if (sent < progress_.maximum)
+        if (pageSent)
+            pageSent(sent, wanted);
+        if (sent < wanted)
             platform_.loop.keepAlive();
     };
     try {
@@ -335,6 +340,12 @@ void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrint
         throw;
     }
     end();
+}
+
+void Canvas::keepDocument(const std::function<void()>& work)
+{
+    const FlagChange kept(printing_, true);
+    work();
 }
 
 void Canvas::printPage(std::int16_t number)

@@ -126,12 +126,23 @@ public:
     void OpenFile(const std::filesystem::path& path);
 
     /// Prints all pages or a page list; see `pelloric::doPrint`.
+    ///
+    /// Windows live on between the pages. `progress` says afterwards how many were sent.
+    /// @throws RunTimeError Cancelled: the user ended it; or the printer's
     void doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrintPageNum);
     /// Sends one page to the printer. @param number  from 1
     void printPage(std::int16_t number);
+    /// Called after each page that was sent, with their number and that of all; may be empty.
+    std::function<void(std::int64_t sent, std::int64_t wanted)> pageSent;
     /// What the documents are called in the printer's queue; one that was opened has its file's
     /// name.
     Text documentName;
+    /// What the document is called: its file's name, or else `documentName`.
+    const Text& documentTitle() const { return openedName_.empty() ? documentName : openedName_; }
+
+    /// Does something with the document that lets messages run; what would change it meanwhile is
+    /// refused.
+    void keepDocument(const std::function<void()>& work);
 
     /// Gives the page the size of a named paper; an unknown name shows a message.
     void setPaper(TextView name);

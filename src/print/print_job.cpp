@@ -140,14 +140,19 @@ std::int64_t doPrint(
     const std::int16_t paperSize = printer.paperSize();
     const std::int16_t orientation = printer.orientation();
     std::int64_t sent = 0;
+    const auto restore = [&] {
+        printer.setPageSize(0, 0);
+        applySettings(printer, paperSize, orientation);
+    };
     try {
+        printer.setPageSize(job.pageWidth, job.pageHeight);
         applySettings(printer, job.paperSize, job.orientation);
         sent = printCopies(document, job, defaultFont, printer);
     } catch (...) {
-        applySettings(printer, paperSize, orientation);
+        restore();
         throw;
     }
-    applySettings(printer, paperSize, orientation);
+    restore();
     return sent;
 }
 

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "platform/text.h"
+#include "platform/units.h"
 
 #include <cstdint>
 #include <functional>
@@ -21,6 +22,8 @@ struct PrintJob {
     std::int16_t copies = 1; ///< whole copies one after the other; none below 1
     std::int16_t paperSize = 9; ///< paper-size code of the report
     std::int16_t orientation = 1; ///< 1 portrait, 2 landscape
+    Twips pageWidth = 0; ///< for a paper-size code that names no form; 0: unknown
+    Twips pageHeight = 0; ///< for a paper-size code that names no form; 0: unknown
     Text documentName {}; ///< in the printer's queue; the page number is added
 
     /// Called after each page with the number of pages sent so far; may be empty.
@@ -39,6 +42,7 @@ std::int64_t pagesToSend(const PageDocument& document, const PrintJob& job);
 
 /// Prints: every page is a document of its own, copies follow each other.
 ///
+/// Where the paper-size code names no form, sheets of the pages' size are asked for.
 /// The printer's paper size and orientation are put back in every case. A page number that names
 /// no page makes no document.
 /// @param defaultFont  as in `printPage`

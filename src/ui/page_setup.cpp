@@ -61,8 +61,13 @@ void addSize(SettingChanges& changes, TextView key, TextView box)
 } // namespace
 
 PageSetupState::PageSetupState(const Platform& platform)
+    : PageSetupState(platform, platform.printers.forms())
+{
+}
+
+PageSetupState::PageSetupState(const Platform& platform, const std::vector<PaperForm>& forms)
     : platform_(platform)
-    , rows_(pelloric::paperRows(platform.printers.forms()))
+    , rows_(pelloric::paperRows(forms))
 {
     restoreMargins();
     const LenientSettings settings(platform);
@@ -71,6 +76,11 @@ PageSetupState::PageSetupState(const Platform& platform)
     loadTexts(settings);
     loadPaper(settings);
     loadMargins(settings);
+}
+
+void PageSetupState::setForms(const std::vector<PaperForm>& forms)
+{
+    rows_ = pelloric::paperRows(forms);
 }
 
 void PageSetupState::loadTexts(const LenientSettings& settings)

@@ -45,6 +45,9 @@ public:
     /// @param platform  outlives the dialog
     explicit PageSetupState(const Platform& platform);
 
+    /// As above, with papers that are known already.
+    PageSetupState(const Platform& platform, const std::vector<PaperForm>& forms);
+
     PaperChoice paper;
     ColoredFont headerFont;
     ColoredFont footerFont;
@@ -52,6 +55,8 @@ public:
     std::array<Text, FormatBoxes> formatTexts;
 
     const std::vector<PaperRow>& paperRows() const { return rows_; }
+    /// Puts other papers into the list; what was chosen stays.
+    void setForms(const std::vector<PaperForm>& forms);
 
     MarginSketch& sketch() { return sketch_; }
     const MarginSketch& sketch() const { return sketch_; }

@@ -6,6 +6,7 @@
 #include "controls/messages.h"
 #include "platform/numbers.h"
 #include "platform/printer.h"
+#include "platform/run_time_error.h"
 #include "print/page_list.h"
 #include "ui/numeric_text.h"
 
@@ -24,6 +25,35 @@ std::variant<Message, PrintArguments> pressPrint(
     }
     return PrintArguments { entries.allPages, pageListOf(trimmed(entries.range)),
         copiesOf(entries.copies) };
+}
+
+PrintDoubt rangeDoubt(const PrintEntries& entries, int pages)
+{
+    if (entries.allPages)
+        return PrintDoubt::None;
+    const TextView range = trimmed(entries.range);
+    if (range.empty())
+        return PrintDoubt::EmptyRange;
+    try {
+        const Text list = pageListOf(range);
+        PageNumbers numbers(list);
+        while (const auto number = numbers.next()) {
+            if (*number >= 1 && (pages == 0 || *number <= pages))
+                return PrintDoubt::None;
+        }
+    } catch (const RunTimeError&) {
+        return PrintDoubt::LongRange;
+    }
+    return PrintDoubt::NoPageOfRange;
+}
+
+PrintDoubt copiesDoubt(TextView copies)
+{
+    try {
+        return copiesOf(copies) < 1 ? PrintDoubt::NoCopy : PrintDoubt::None;
+    } catch (const RunTimeError&) {
+        return PrintDoubt::ManyCopies;
+    }
 }
 
 void PrintChoices::chooseAll() { *this = {}; }

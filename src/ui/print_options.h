@@ -34,6 +34,17 @@ struct PrintEntries {
 std::variant<Message, PrintArguments> pressPrint(
     const PrinterSystem& printers, const PrintEntries& entries);
 
+/// What is wrong with a range or a number of copies while it is typed.
+enum class PrintDoubt { None, EmptyRange, NoPageOfRange, LongRange, NoCopy, ManyCopies };
+
+/// Whether a range prints nothing, or more than can be printed.
+/// @param pages  of the document; 0: unknown
+PrintDoubt rangeDoubt(const PrintEntries& entries, int pages);
+
+/// Whether a number of copies prints nothing, or more than can be printed.
+/// @param copies  as typed
+PrintDoubt copiesDoubt(TextView copies);
+
 /// The choices of the print options dialog besides what is typed.
 struct PrintChoices {
     bool allPages = true;

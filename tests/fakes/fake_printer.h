@@ -53,11 +53,13 @@ public:
 
     bool opens(TextView name) const override { return knows(name) && !closed.contains(Text(name)); }
     std::vector<PaperForm> forms() const override { return paperForms; }
+    std::optional<PaperForm> sheetFor(const PaperRequest&) const override { return sheet; }
 
     std::vector<Text> names;
     Text current;
     std::set<Text> closed; ///< printers that do not open
     std::vector<PaperForm> paperForms;
+    std::optional<PaperForm> sheet; ///< on which all pages are put
 
 private:
     bool knows(TextView name) const

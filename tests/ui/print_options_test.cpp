@@ -56,4 +56,33 @@ TEST(PrintOptions, TellsWhyItCannotPrint)
         (PrintArguments { false, u"1,3,5,6,7", 1 }));
 }
 
+TEST(PrintDoubts, AreRaisedByARangeThatNamesNoPage)
+{
+    struct Case {
+        TextView range;
+        PrintDoubt doubt;
+    };
+    const Case cases[] = {
+        { u"", PrintDoubt::EmptyRange },
+        { u"  ", PrintDoubt::EmptyRange },
+        { u"3", PrintDoubt::None },
+        { u"9,3", PrintDoubt::None },
+        { u"6", PrintDoubt::NoPageOfRange },
+        { u"0", PrintDoubt::NoPageOfRange },
+        { u"x,,", PrintDoubt::NoPageOfRange },
+        { u"6-9", PrintDoubt::NoPageOfRange },
+        { u"5-9", PrintDoubt::None },
+    };
+    for (const Case& row : cases)
+        EXPECT_EQ(rangeDoubt({ .allPages = false, .range = Text(row.range) }, 5), row.doubt)
+            << toUtf8(row.range);
+    EXPECT_EQ(rangeDoubt({ .allPages = true, .range = u"6" }, 5), PrintDoubt::None);
+    EXPECT_EQ(rangeDoubt({ .allPages = false, .range = u"30000" }, 0), PrintDoubt::None);
+    EXPECT_EQ(copiesDoubt(u""), PrintDoubt::None);
+    EXPECT_EQ(copiesDoubt(u"2"), PrintDoubt::None);
+    EXPECT_EQ(copiesDoubt(u"0"), PrintDoubt::NoCopy);
+    EXPECT_EQ(copiesDoubt(u"0.4"), PrintDoubt::NoCopy);
+    EXPECT_EQ(copiesDoubt(u"32768"), PrintDoubt::ManyCopies);
+}
+
 } // namespace pelloric

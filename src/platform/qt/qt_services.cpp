@@ -22,6 +22,8 @@ namespace {
 
 constexpr qint64 PassMs = 150; ///< between two passes of a long operation: milliseconds
 
+constexpr char AnsweringProperty[] = "answersWhileBusy";
+
 /// Takes the user's input while a long operation runs: Escape ends the operation, the rest is
 /// refused.
 class BusyInput final : public QObject {
@@ -32,8 +34,11 @@ public:
         QCoreApplication::instance()->installEventFilter(this);
     }
 
-    bool eventFilter(QObject*, QEvent* event) override
+    bool eventFilter(QObject* watched, QEvent* event) override
     {
+        // A window hands on to the widgets in it, which are met again here.
+        if (isOnTheWay(*watched, *event))
+            return false;
         switch (event->type()) {
         case QEvent::ShortcutOverride: // taken, so that no shortcut is looked for
             event->accept();
@@ -68,6 +73,23 @@ public:
     }
 
 private:
+    static bool isOnTheWay(const QObject& watched, const QEvent& event)
+    {
+        switch (event.type()) {
+        case QEvent::MouseButtonPress:
+        case QEvent::MouseButtonRelease:
+        case QEvent::MouseButtonDblClick:
+        case QEvent::MouseMove:
+            return watched.isWindowType() || watched.property(AnsweringProperty).toBool();
+        case QEvent::KeyPress:
+        case QEvent::KeyRelease:
+            return static_cast<const QKeyEvent&>(event).key() == Qt::Key_Space
+                && (watched.isWindowType() || watched.property(AnsweringProperty).toBool());
+        default:
+            return false;
+        }
+    }
+
     QtMessageLoop& loop_;
 };
 
@@ -140,11 +162,16 @@ void QtMessageLoop::runOnce()
 
 void QtMessageLoop::keepAlive()
 {
+    letLive();
+    endWhenCancelled();
+}
+
+void QtMessageLoop::letLive()
+{
     if (!sincePass_.isValid())
         sincePass_.start();
     if (!isInPass_ && sincePass_.elapsed() >= PassMs)
         livePass();
-    endWhenCancelled();
 }
 
 /// What waits for the sockets and timers of the host stays waiting; what was posted cannot.
@@ -165,6 +192,8 @@ void QtMessageLoop::endWhenCancelled()
     if (isCancelled_.load(std::memory_order_relaxed) && isCancelled_.exchange(false))
         throw RunTimeError(ErrorNumber::Cancelled);
 }
+
+void keepAnswering(QObject& widget) { widget.setProperty(AnsweringProperty, true); }
 
 void BoxMessages::show(const Message& message)
 {

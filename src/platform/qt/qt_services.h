@@ -13,6 +13,7 @@
 #include <vector>
 
 class QLocale;
+class QObject;
 
 namespace pelloric::qt {
 
@@ -48,6 +49,9 @@ public:
     void runOnce() override;
     void keepAlive() override;
 
+    /// As `keepAlive`, but the wish to end stays for the operation to meet at its next step.
+    void letLive();
+
 private:
     void endWhenCancelled();
     void livePass();
@@ -57,6 +61,10 @@ private:
     QElapsedTimer sincePass_;
     static_assert(std::atomic<bool>::is_always_lock_free);
 };
+
+/// Lets a widget take keys and clicks while a long operation refuses those of all others: a button
+/// that ends it.
+void keepAnswering(QObject& widget);
 
 /// Shows each message in a box over the active window.
 class BoxMessages final : public MessageService {

@@ -7,12 +7,12 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "print/qt/paper_sizes.h"
+#include "print/qt/qt_printer_system.h"
 #include "print/qt/spooler.h"
 
 #include <QDir>
-#include <QPageLayout>
+#include <QPagedPaintDevice>
 #include <QPainter>
-#include <QPrinter>
 #include <QPrinterInfo>
 #include <QStorageInfo>
 
@@ -23,10 +23,8 @@ namespace pelloric::qt {
 namespace {
 
 constexpr double TwipsPerInch = 1440;
-constexpr std::int16_t Landscape = 2;
-
-/// Fine enough that the thinnest line is 0.12 points wide, and coarse enough that it is seen.
-constexpr int Resolution = 600;
+/// A document is sent over networks, too; its window lives meanwhile.
+constexpr std::chrono::milliseconds HandOverPatience { 30000 };
 
 /// A document waits in the folder of temporary files until it is complete.
 constexpr qint64 RoomForDocument = 8 * 1024 * 1024;
@@ -37,49 +35,44 @@ constexpr qint64 RoomForDocument = 8 * 1024 * 1024;
     throw RunTimeError(ErrorNumber::InvalidCall, toText(text));
 }
 
-/// @throws RunTimeError InvalidCall: the printer takes no document now
-void requireTaker(const QString& printer)
+/// @throws RunTimeError InvalidCall: there is no room where documents wait
+void requireRoom(const QString& printer)
 {
-    const QString refusal = refusalOf(printer);
-    if (!refusal.isEmpty())
-        refuse(printer, refusal);
     const QString folder = QDir::tempPath();
     const QStorageInfo storage(folder);
     if (storage.isValid() && storage.bytesAvailable() < RoomForDocument)
         refuse(printer, QStringLiteral("no room for the document in %1").arg(folder));
 }
 
-void setUp(QPrinter& printer, const QPageSize& paper, std::int16_t orientation)
+/// What a printer says before a document begins.
+struct Welcome {
+    QString refusal {}; ///< empty: it takes the document
+    bool asksForPassword = false;
+    std::optional<Sheet> sheet {}; ///< when it was asked for
+};
+
+Welcome welcomeOf(const QString& printer, const std::optional<PaperRequest>& pages)
 {
-    const QList<int> resolutions = printer.supportedResolutions();
-    if (resolutions.isEmpty() || resolutions.contains(Resolution))
-        printer.setResolution(Resolution);
-    printer.setFullPage(false);
-    if (paper.isValid())
-        printer.setPageSize(paper);
-    printer.setPageOrientation(
-        orientation == Landscape ? QPageLayout::Landscape : QPageLayout::Portrait);
-    const QPageLayout layout = printer.pageLayout();
-    printer.setPageMargins(layout.minimumMargins(), layout.units());
-    printer.setDuplex(QPrinter::DuplexNone);
-    printer.setCopyCount(1);
+    Welcome welcome { .refusal = refusalOf(printer) };
+    if (!welcome.refusal.isEmpty() || !pages)
+        return welcome;
+    welcome.asksForPassword = asksForPassword(printer);
+    welcome.sheet = sheetOf(QPrinterInfo::printerInfo(printer), *pages);
+    return welcome;
 }
 
 } // namespace
 
 /// One job; its parts end in the reverse order.
 struct QtPrinter::Document {
-    explicit Document(const QPrinterInfo& info)
-        : printer(info, QPrinter::HighResolution)
-    {
-    }
-
-    QPrinter printer;
+    std::shared_ptr<SpoolDocument> spool; ///< outlives this where it is handed over late
+    QString printer;
+    bool asksForPassword = false;
     QPainter painter;
     std::optional<QtDrawingSurface> surface;
 };
 
-QtPrinter::QtPrinter(const PrinterSystem& system, QtFonts& fonts)
+QtPrinter::QtPrinter(const QtPrinterSystem& system, QtFonts& fonts)
     : system_(system)
     , fonts_(fonts)
 {
@@ -194,8 +187,11 @@ std::int16_t QtPrinter::paperSize() const
     const Text name = deviceName();
     if (const std::int16_t applied = appliedPaper(name); applied != 0)
         return applied;
-    const QPrinterInfo info = QPrinterInfo::printerInfo(toQString(name));
-    return info.isNull() ? std::int16_t { 0 } : formCodeOf(info, info.defaultPageSize());
+    const auto code = system_.calls().ask<std::int16_t>([printer = toQString(name)] {
+        const QPrinterInfo info = QPrinterInfo::printerInfo(printer);
+        return info.isNull() ? std::int16_t { 0 } : formCodeOf(info, info.defaultPageSize());
+    });
+    return code.value_or(std::int16_t { 0 });
 }
 
 void QtPrinter::applyPaperSize(std::int16_t code)
@@ -204,6 +200,20 @@ void QtPrinter::applyPaperSize(std::int16_t code)
         return;
     paperSize_ = code;
     paperPrinter_ = deviceName();
+    pageSize_ = {};
+    place_.reset();
+}
+
+void QtPrinter::setPageSize(Twips width, Twips height)
+{
+    pageSize_ = { width, height };
+    place_.reset();
+}
+
+void QtPrinter::applyOrientation(std::int16_t code)
+{
+    orientation_ = code;
+    place_.reset();
 }
 
 void QtPrinter::setDocumentTitle(TextView title)
@@ -215,7 +225,7 @@ void QtPrinter::setDocumentTitle(TextView title)
 void QtPrinter::newPage()
 {
     drawing();
-    if (!document_->printer.newPage()) {
+    if (!document_->spool->device().newPage()) {
         document_.reset();
         refuse(toQString(deviceName()), QStringLiteral("the page could not be ended"));
     }
@@ -226,14 +236,24 @@ void QtPrinter::endDoc()
 {
     if (!document_)
         return;
-    const QString name = document_->printer.printerName();
-    const bool isEnded = document_->painter.end();
-    const QString error
-        = isEnded ? handOverError() : QStringLiteral("the document could not be ended");
-    document_.reset();
+    const std::unique_ptr<Document> document = std::move(document_);
     attributes_.current = {};
+    document->surface.reset();
+    if (!document->painter.end() || !document->spool->close())
+        refuse(document->printer, QStringLiteral("the document could not be ended"));
+    const QString error = handOver(*document);
     if (!error.isEmpty())
-        refuse(name, error);
+        refuse(document->printer, error);
+}
+
+/// A person who is asked for a password is asked here, before the screen.
+QString QtPrinter::handOver(const Document& document) const
+{
+    if (document.asksForPassword)
+        return document.spool->handOver();
+    const auto error = system_.calls().ask<QString>(
+        [spool = document.spool] { return spool->handOver(); }, HandOverPatience);
+    return error ? *error : system_.calls().trouble();
 }
 
 /// The surface of the document, which begins here if there is none.
@@ -258,25 +278,48 @@ std::int16_t QtPrinter::appliedPaper(const Text& printer) const
     return printer == paperPrinter_ ? paperSize_ : std::int16_t { 0 };
 }
 
-QPageSize QtPrinter::paperOf(const QPrinterInfo& printer) const
+/// The pages as they are put on paper; a code that was applied goes before their size.
+PaperRequest QtPrinter::pages(const Text& printer) const
 {
-    const QPageSize paper = pageSizeOf(printer, appliedPaper(toText(printer.printerName())));
-    return paper.isValid() ? paper : printer.defaultPageSize();
+    PaperRequest pages { .orientation = orientation_, .width = pageSize_.x, .height = pageSize_.y };
+    if (pages.width <= 0 || pages.height <= 0)
+        pages.code = appliedPaper(printer);
+    return pages;
+}
+
+/// Asks the printer whether it takes a document, and for its sheet where that is not known yet.
+/// @throws RunTimeError InvalidCall: there is no printer, or it takes no document
+void QtPrinter::requireTaker(const Text& name)
+{
+    const QString printer = toQString(name);
+    std::optional<PaperRequest> asked;
+    if (!place_ || place_->printer != name)
+        asked = pages(name);
+    const auto welcome
+        = system_.calls().ask<Welcome>([printer, asked] { return welcomeOf(printer, asked); });
+    if (!welcome)
+        refuse(printer, system_.calls().trouble());
+    if (!welcome->refusal.isEmpty())
+        refuse(printer, welcome->refusal);
+    if (welcome->sheet)
+        place_ = Place { name, *welcome->sheet, welcome->asksForPassword };
 }
 
 /// @throws RunTimeError InvalidCall: there is no printer, or it takes no document
 void QtPrinter::begin()
 {
     isAnnounced_ = false;
-    const QString name = toQString(deviceName());
+    const Text name = deviceName();
+    const QString printer = toQString(name);
     requireTaker(name);
-    const QPrinterInfo info = QPrinterInfo::printerInfo(name);
-    auto document = std::make_unique<Document>(info);
-    document->printer.setDocName(toQString(title_));
-    setUp(document->printer, paperOf(info), orientation_);
-    if (!document->painter.begin(&document->printer))
-        refuse(name, QStringLiteral("the document could not be begun"));
-    const double scale = document->printer.logicalDpiX() / TwipsPerInch;
+    requireRoom(printer);
+    auto document = std::make_unique<Document>();
+    document->printer = printer;
+    document->asksForPassword = place_->asksForPassword;
+    document->spool = newSpoolDocument({ printer, toQString(title_), place_->sheet });
+    if (!document->spool || !document->painter.begin(&document->spool->device()))
+        refuse(printer, QStringLiteral("the document could not be begun"));
+    const double scale = document->spool->device().logicalDpiX() / TwipsPerInch;
     document->painter.scale(scale, scale);
     document->surface.emplace(document->painter, fonts_);
     applyAttributes(*document->surface);

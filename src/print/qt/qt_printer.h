@@ -4,16 +4,16 @@
 #pragma once
 
 #include "platform/printer.h"
+#include "print/qt/sheet.h"
 
 #include <memory>
-
-class QPageSize;
-class QPrinterInfo;
+#include <optional>
 
 namespace pelloric::qt {
 
 class QtDrawingSurface;
 class QtFonts;
+class QtPrinterSystem;
 
 /// The current printer of a printer system.
 ///
@@ -21,12 +21,13 @@ class QtFonts;
 /// that a page without records is sent as a blank page. Each document is a job with settings of its
 /// own: paper, orientation, one-sided, one copy; the printer's defaults are never touched. Before a
 /// document begins the print system is asked whether it takes one, and when it ends, whether it
-/// took it. A document that is open when the object goes is handed over.
+/// took it. A print system that stays silent is an error after a few seconds. A document that is
+/// open when the object goes is dropped.
 class QtPrinter final : public Printer {
 public:
     /// @param system  says which printer is the current one; borrowed
     /// @param fonts   borrowed
-    QtPrinter(const PrinterSystem& system, QtFonts& fonts);
+    QtPrinter(const QtPrinterSystem& system, QtFonts& fonts);
     ~QtPrinter() override;
 
     void clear() override;
@@ -53,7 +54,8 @@ public:
     std::int16_t paperSize() const override;
     std::int16_t orientation() const override { return orientation_; }
     void applyPaperSize(std::int16_t code) override;
-    void applyOrientation(std::int16_t code) override { orientation_ = code; }
+    void setPageSize(Twips width, Twips height) override;
+    void applyOrientation(std::int16_t code) override;
     void setDocumentTitle(TextView title) override;
     void newPage() override;
     void endDoc() override;
@@ -75,14 +77,23 @@ private:
     };
     struct Document;
 
+    /// Where documents go, as long as neither printer nor paper change.
+    struct Place {
+        Text printer;
+        Sheet sheet;
+        bool asksForPassword = false;
+    };
+
     DrawingSurface& drawing();
     DrawingSurface* attributeSurface();
     std::int16_t appliedPaper(const Text& printer) const;
-    QPageSize paperOf(const QPrinterInfo& printer) const;
+    PaperRequest pages(const Text& printer) const;
+    void requireTaker(const Text& name);
     void begin();
+    QString handOver(const Document& document) const;
     void applyAttributes(DrawingSurface& surface) const;
 
-    const PrinterSystem& system_;
+    const QtPrinterSystem& system_;
     QtFonts& fonts_;
     Attributes attributes_;
     Text title_;
@@ -90,6 +101,8 @@ private:
     std::int16_t paperSize_ = 0; ///< 0: the printer's own
     Text paperPrinter_; ///< the printer that it was applied to; another one has its own paper
     std::int16_t orientation_ = 1;
+    Tpoint pageSize_; ///< 0: the paper's
+    std::optional<Place> place_;
     std::unique_ptr<Document> document_; ///< null between documents
 };
 

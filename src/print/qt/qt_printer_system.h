@@ -4,12 +4,15 @@
 #pragma once
 
 #include "platform/printer.h"
+#include "print/qt/print_calls.h"
 
 #include <QString>
 
 namespace pelloric::qt {
 
 /// The printers that the print system knows; needs a QGuiApplication.
+///
+/// A system that does not answer within a few seconds has no printers and the standard papers.
 class QtPrinterSystem final : public PrinterSystem {
 public:
     std::vector<Text> printerNames() const override;
@@ -26,8 +29,14 @@ public:
     QString refusal(TextView name) const;
 
     std::vector<PaperForm> forms() const override;
+    std::optional<PaperForm> sheetFor(const PaperRequest& pages) const override;
+    std::unique_ptr<PrinterInquiry> inquire(const PaperRequest& pages) const override;
+
+    /// All that is asked of the print system goes through here.
+    PrintCalls& calls() const { return calls_; }
 
 private:
+    mutable PrintCalls calls_;
     mutable Text current_; ///< empty: there was no printer yet
 };
 

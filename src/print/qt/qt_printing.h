@@ -16,6 +16,7 @@ public:
         : printer_(system_, platform.fonts())
     {
         platform.usePrinter(printer_, system_);
+        system_.calls().whileWaiting([&loop = platform.loop()] { loop.letLive(); });
     }
     QtPrinting(const QtPrinting&) = delete;
     QtPrinting& operator=(const QtPrinting&) = delete;

@@ -3,9 +3,21 @@
 
 #pragma once
 
+#include "print/qt/sheet.h"
+
 #include <QString>
 
+#include <memory>
+
+class QPagedPaintDevice;
+
 namespace pelloric::qt {
+
+/// Makes the present thread one that may call the print system without a person before it.
+void prepareCallingThread();
+
+/// Why the print system cannot be asked, in plain English; empty: it answers.
+QString silenceOfSystem();
 
 /// Why the print system takes no jobs for a printer, in plain English; empty: it takes them.
 ///
@@ -13,8 +25,37 @@ namespace pelloric::qt {
 ///                 which takes none
 QString refusalOf(const QString& printer);
 
-/// Why the document that this thread handed over just now was not taken; empty: nothing is known
-/// against it.
-QString handOverError();
+/// Whether a printer wants a password with each document, for which a person must be asked.
+bool asksForPassword(const QString& printer);
+
+/// Whether a printer turns pages that lie clockwise to put them on its upright sheets.
+bool turnsClockwise(const QString& printer);
+
+/// What a document is begun with.
+struct SpoolOrder {
+    QString printer; ///< device name
+    QString title; ///< in the printer's queue
+    Sheet sheet;
+};
+
+/// A document on its way to a printer: drawn, closed, handed over.
+class SpoolDocument {
+public:
+    virtual ~SpoolDocument() = default;
+
+    /// Draws pages; its origin is the corner of the printable area.
+    virtual QPagedPaintDevice& device() = 0;
+
+    /// Closes what was drawn; nothing is drawn afterwards.
+    /// @return  false: it could not be kept
+    virtual bool close() = 0;
+
+    /// Gives it to the print system; may be called on another thread.
+    /// @return  why it was not taken, in plain English; empty: nothing is known against it
+    virtual QString handOver() = 0;
+};
+
+/// @return  null: there is no room where documents wait until they are complete
+std::unique_ptr<SpoolDocument> newSpoolDocument(const SpoolOrder& order);
 
 } // namespace pelloric::qt

@@ -3,6 +3,14 @@
 
 #include "print/qt/spooler.h"
 
+#include <QApplication>
+#include <QDir>
+#include <QFile>
+#include <QInputDialog>
+#include <QPdfWriter>
+#include <QTemporaryFile>
+#include <QThread>
+
 #include <cups/cups.h>
 
 #include <memory>
@@ -11,7 +19,11 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr int AnswerMs = 5000;
+/// For each step of asking for a sign of life: milliseconds.
+constexpr int AnswerMs = 2500;
+
+/// Fine enough that the thinnest line is 0.12 points wide, and coarse enough that it is seen.
+constexpr int Resolution = 600;
 
 struct FreeDestination {
     void operator()(cups_dest_t* destination) const { cupsFreeDests(1, destination); }
@@ -31,54 +43,185 @@ constexpr RefusingState RefusingStates[] = {
     { "printer-state", "5", "the printer is stopped" },
 };
 
+QString queueOf(const QString& printer) { return printer.section(u'/', 0, 0); }
+
 Destination destinationOf(const QString& printer)
 {
-    const QByteArray name = printer.section(u'/', 0, 0).toLocal8Bit();
+    const QByteArray name = queueOf(printer).toLocal8Bit();
     const QByteArray instance = printer.section(u'/', 1).toLocal8Bit();
     return Destination(cupsGetNamedDest(
         CUPS_HTTP_DEFAULT, name.constData(), instance.isEmpty() ? nullptr : instance.constData()));
 }
 
+const char* optionOf(const Destination& destination, const char* option)
+{
+    return destination ? cupsGetOption(option, destination->num_options, destination->options)
+                       : nullptr;
+}
+
 QString lastError() { return QString::fromUtf8(cupsLastErrorString()); }
 
-/// Why the print system cannot be asked; empty: it answers.
+QString noAnswer()
+{
+    return QStringLiteral("the print system does not answer (%1)").arg(lastError());
+}
+
+int giveUp(http_t*, void*) { return 0; }
+
+const char* noPassword(const char*, http_t*, const char*, const char*, void*) { return nullptr; }
+
+/// Asks the person before the screen; a program without windows leaves that to the print system.
+const char* askPassword(const char* prompt, http_t*, const char*, const char*, void*)
+{
+    static QByteArray password;
+    bool isGiven = false;
+    password = QInputDialog::getText(QApplication::activeWindow(),
+        QApplication::applicationDisplayName(), QString::fromLocal8Bit(prompt), QLineEdit::Password,
+        {}, &isGiven)
+                   .toLocal8Bit();
+    return isGiven ? password.constData() : nullptr;
+}
+
+/// A file that goes with its owner.
+class WaitingFile {
+public:
+    explicit WaitingFile(QString path)
+        : path_(std::move(path))
+    {
+    }
+    ~WaitingFile() { QFile::remove(path_); }
+    WaitingFile(const WaitingFile&) = delete;
+    WaitingFile& operator=(const WaitingFile&) = delete;
+
+    QByteArray name() const { return QFile::encodeName(path_); }
+
+private:
+    QString path_;
+};
+
+/// Drawn as PDF into a file of its own, which is sent when it is complete.
+class PdfDocument final : public SpoolDocument {
+public:
+    explicit PdfDocument(const SpoolOrder& order)
+        : order_(order)
+        , file_(std::make_unique<QTemporaryFile>(
+              QDir::tempPath() + QStringLiteral("/pelloric-XXXXXX.pdf")))
+    {
+    }
+
+    bool open()
+    {
+        if (!file_->open())
+            return false;
+        writer_ = std::make_unique<QPdfWriter>(file_.get());
+        writer_->setResolution(Resolution);
+        writer_->setTitle(order_.title);
+        writer_->setPageLayout(QPageLayout(order_.sheet.paper, order_.sheet.orientation,
+            order_.sheet.edges, QPageLayout::Point, QMarginsF()));
+        return true;
+    }
+
+    QPagedPaintDevice& device() override { return *writer_; }
+
+    bool close() override
+    {
+        writer_.reset();
+        const bool isWhole = file_->flush() && file_->error() == QFileDevice::NoError;
+        waiting_ = std::make_unique<WaitingFile>(file_->fileName());
+        file_->setAutoRemove(false);
+        file_.reset();
+        return isWhole;
+    }
+
+    QString handOver() override
+    {
+        cups_option_t* options = nullptr;
+        int count = cupsAddOption("media", order_.sheet.paper.key().toLocal8Bit(), 0, &options);
+        count = cupsAddOption("sides", "one-sided", count, &options);
+        if (order_.sheet.orientation == QPageLayout::Landscape)
+            count = cupsAddOption("landscape", "", count, &options);
+        if (QThread::currentThread() == QCoreApplication::instance()->thread()
+            && qobject_cast<QApplication*>(QCoreApplication::instance()))
+            cupsSetPasswordCB2(askPassword, nullptr);
+        const int job = cupsPrintFile(queueOf(order_.printer).toLocal8Bit(), waiting_->name(),
+            order_.title.toUtf8(), count, options);
+        cupsFreeOptions(count, options);
+        return job != 0
+            ? QString()
+            : QStringLiteral("the print system did not take the document (%1)").arg(lastError());
+    }
+
+private:
+    SpoolOrder order_;
+    std::unique_ptr<QTemporaryFile> file_;
+    std::unique_ptr<QPdfWriter> writer_;
+    std::unique_ptr<WaitingFile> waiting_;
+};
+
+} // namespace
+
+void prepareCallingThread() { cupsSetPasswordCB2(noPassword, nullptr); }
+
 QString silenceOfSystem()
 {
     http_t* const connection = httpConnect2(
         cupsServer(), ippPort(), nullptr, AF_UNSPEC, cupsEncryption(), 1, AnswerMs, nullptr);
     if (connection == nullptr)
-        return QStringLiteral("the print system does not answer (%1)").arg(lastError());
+        return noAnswer();
+    httpSetTimeout(connection, AnswerMs / 1000.0, giveUp, nullptr);
+    ipp_t* const response = cupsDoRequest(connection, ippNewRequest(IPP_OP_CUPS_GET_DEFAULT), "/");
+    const QString silence = response == nullptr ? noAnswer() : QString();
+    ippDelete(response);
     httpClose(connection);
-    return {};
+    return silence;
 }
-
-} // namespace
 
 QString refusalOf(const QString& printer)
 {
-    if (printer.isEmpty()) {
-        const QString silence = silenceOfSystem();
-        return silence.isEmpty() ? QStringLiteral("there is no printer") : silence;
-    }
+    if (printer.isEmpty())
+        return QStringLiteral("there is no printer");
     const Destination destination = destinationOf(printer);
     if (!destination) {
         const QString silence = silenceOfSystem();
         return silence.isEmpty() ? QStringLiteral("there is no such printer") : silence;
     }
     for (const RefusingState& state : RefusingStates) {
-        const char* const value
-            = cupsGetOption(state.option, destination->num_options, destination->options);
+        const char* const value = optionOf(destination, state.option);
         if (value != nullptr && qstrcmp(value, state.value) == 0)
             return QString::fromLatin1(state.meaning);
     }
     return {};
 }
 
-QString handOverError()
+bool asksForPassword(const QString& printer)
 {
-    if (cupsLastError() <= IPP_STATUS_OK_CONFLICTING)
-        return {};
-    return QStringLiteral("the print system did not take the document (%1)").arg(lastError());
+    const Destination destination = destinationOf(printer);
+    const QByteArray required(optionOf(destination, "auth-info-required"));
+    return !required.isEmpty() && required != "none" && required != "negotiate";
+}
+
+bool turnsClockwise(const QString& printer)
+{
+    const Destination destination = destinationOf(printer);
+    if (!destination)
+        return false;
+    cups_dinfo_t* const info = cupsCopyDestInfo(CUPS_HTTP_DEFAULT, destination.get());
+    if (info == nullptr)
+        return false;
+    ipp_attribute_t* const preferred = cupsFindDestDefault(
+        CUPS_HTTP_DEFAULT, destination.get(), info, "landscape-orientation-requested-preferred");
+    const bool isReverse
+        = preferred != nullptr && ippGetInteger(preferred, 0) == IPP_ORIENT_REVERSE_LANDSCAPE;
+    cupsFreeDestInfo(info);
+    return isReverse;
+}
+
+std::unique_ptr<SpoolDocument> newSpoolDocument(const SpoolOrder& order)
+{
+    auto document = std::make_unique<PdfDocument>(order);
+    if (!document->open())
+        return nullptr;
+    return document;
 }
 
 } // namespace pelloric::qt

@@ -213,6 +213,7 @@ void setTabKeys(QTabWidget& tabs, const char* keys)
         });
     }
     tabs.tabBar()->setProperty(KeyProperty, letters);
+    tabs.setAccessibleName(tabs.window()->windowTitle());
 }
 
 void showAltKeys(QWidget& window) { new AltKeyMarks(window); }

@@ -99,6 +99,10 @@ void nameBox(QComboBox& box, const QString& name)
     // The toolkit keeps one of each factory.
     QAccessible::installFactory(namedInterface);
     box.setProperty(NamedProperty, true);
+    // The box may have been told of already, by the toolkit's own interface.
+    QAccessibleInterface* const told = QAccessible::queryAccessibleInterface(&box);
+    if (told != nullptr && dynamic_cast<NamedComboBox*>(told) == nullptr)
+        QAccessible::deleteAccessibleInterface(QAccessible::uniqueId(told));
     box.setAccessibleName(name);
     box.view()->setAccessibleName(name);
     if (box.lineEdit())

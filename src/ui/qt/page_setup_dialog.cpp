@@ -4,8 +4,10 @@
 #include "ui/qt/page_setup_dialog.h"
 
 #include "platform/qt/qt_text.h"
+#include "print/paper_names.h"
 #include "ui/numeric_text.h"
 #include "ui/qt/dialog_parts.h"
+#include "ui/qt/hint_label.h"
 #include "ui/qt/page_sketch.h"
 #include "ui/qt/page_texts_tab.h"
 #include "ui/qt/sheet_picture.h"
@@ -18,7 +20,9 @@
 #include <QLineEdit>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QSignalBlocker>
 #include <QTabWidget>
+#include <QTimer>
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
@@ -42,6 +46,16 @@ constexpr MarginRow MarginRows[] = {
     { Margin::Right, "Right:", "cmdRight", "txtRight", 'R' },
 };
 
+/// A print system that answers at once fills the list before the dialog opens.
+constexpr std::chrono::milliseconds BeforeOpening { 150 };
+constexpr int BetweenLooksMs = 50; ///< for an answer that is still to come
+
+/// The papers of an answer, or while there is none the standard ones.
+std::vector<PaperForm> formsOf(const PrinterFacts* facts)
+{
+    return facts ? facts->forms : standardPaperForms();
+}
+
 QFrame* bareFrame(const QString& name, QWidget* parent)
 {
     auto* frame = new QFrame(parent);
@@ -54,7 +68,9 @@ QFrame* bareFrame(const QString& name, QWidget* parent)
 PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent)
     : QDialog(parent)
     , platform_(platform)
-    , state_(platform_)
+    , inquiry_(platform_.printers.inquire({}))
+    , state_(platform_, formsOf(inquiry_->facts(BeforeOpening)))
+    , answerTimer_(new QTimer(this))
 {
     setWindowTitle(toQString(PageSetupTitle));
     setModal(true);
@@ -72,6 +88,9 @@ PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent)
     connect(buttons.ok, &QPushButton::clicked, this, &PageSetupDialog::save);
     showPaper();
     showMargins();
+    answerTimer_->setInterval(BetweenLooksMs);
+    connect(answerTimer_, &QTimer::timeout, this, &PageSetupDialog::takePapers);
+    takePapers();
 }
 
 void PageSetupDialog::useFontDialog(ChooseFont choose) { texts_->useFontDialog(std::move(choose)); }
@@ -83,6 +102,8 @@ QWidget* PageSetupDialog::makePageTab()
     group->setObjectName(QStringLiteral("Frame1"));
     auto* inside = new QVBoxLayout(group);
     inside->addWidget(makePaperList(group), 1);
+    papersHint_ = new HintLabel(QStringLiteral("labPapersHint"), group);
+    inside->addWidget(papersHint_);
     auto* below = new QHBoxLayout;
     below->addLayout(makeSizeBoxes(group));
     below->addStretch();
@@ -98,6 +119,7 @@ QWidget* PageSetupDialog::makePaperList(QWidget* parent)
     papers_ = new QTreeWidget(parent);
     papers_->setObjectName(QStringLiteral("ListView1"));
     papers_->setAccessibleName(tr("Papers"));
+    setFocusKey(*papers_, '1', *papers_);
     papers_->setRootIsDecorated(false);
     papers_->setUniformRowHeights(true);
     papers_->setAllColumnsShowFocus(true);
@@ -105,24 +127,11 @@ QWidget* PageSetupDialog::makePaperList(QWidget* parent)
     for (const TextView column : PaperColumns)
         columns.append(toQString(column));
     papers_->setHeaderLabels(columns);
-    const QIcon sheet = paperIcon(false);
-    const QIcon envelope = paperIcon(true);
-    for (const PaperRow& row : state_.paperRows()) {
-        auto* item = new QTreeWidgetItem(papers_,
-            { toQString(row.name), toQString(row.cx), toQString(row.cy), toQString(row.value) });
-        item->setIcon(0, row.isEnvelope ? envelope : sheet);
-        for (int column = 1; column < papers_->columnCount(); ++column)
-            item->setTextAlignment(column, Qt::AlignRight | Qt::AlignVCenter);
-    }
     QHeaderView& header = *papers_->header();
     header.setStretchLastSection(false);
     header.setSectionResizeMode(QHeaderView::ResizeToContents);
     header.setSectionResizeMode(0, QHeaderView::Stretch);
-    // The paper in force stands out, but is no choice of the user's yet: the label still waits.
-    if (QTreeWidgetItem* present = papers_->topLevelItem(state_.paper.paperCode - 1)) {
-        papers_->setCurrentItem(present);
-        papers_->scrollToItem(present, QAbstractItemView::PositionAtCenter);
-    }
+    fillPapers();
     connect(papers_, &QTreeWidget::itemSelectionChanged, this, &PageSetupDialog::clickPaper);
     connect(papers_, &QTreeWidget::itemClicked, this, &PageSetupDialog::clickPaper);
     return papers_;
@@ -220,6 +229,41 @@ UpDownBox* PageSetupDialog::makeMarginBox(Margin margin, QWidget* parent)
     });
     connect(box->textBox(), &QLineEdit::textChanged, this, [this, margin] { typeMargin(margin); });
     return box;
+}
+
+/// The paper in force stands out, but is no choice of the user's yet: the label still waits.
+void PageSetupDialog::fillPapers()
+{
+    const QSignalBlocker silent(papers_);
+    papers_->clear();
+    const QIcon sheet = paperIcon(false);
+    const QIcon envelope = paperIcon(true);
+    for (const PaperRow& row : state_.paperRows()) {
+        auto* item = new QTreeWidgetItem(papers_,
+            { toQString(row.name), toQString(row.cx), toQString(row.cy), toQString(row.value) });
+        item->setIcon(0, row.isEnvelope ? envelope : sheet);
+        for (int column = 1; column < papers_->columnCount(); ++column)
+            item->setTextAlignment(column, Qt::AlignRight | Qt::AlignVCenter);
+    }
+    if (QTreeWidgetItem* present = papers_->topLevelItem(state_.paper.paperCode - 1)) {
+        papers_->setCurrentItem(present);
+        papers_->scrollToItem(present, QAbstractItemView::PositionAtCenter);
+    }
+}
+
+/// Puts the printer's papers into the list as soon as the print system has told them.
+void PageSetupDialog::takePapers()
+{
+    const PrinterFacts* const facts = inquiry_->facts(std::chrono::milliseconds(0));
+    if (!facts)
+        return answerTimer_->start();
+    if (answerTimer_->isActive()) {
+        state_.setForms(facts->forms);
+        fillPapers();
+    }
+    answerTimer_->stop();
+    if (!facts->trouble.empty())
+        papersHint_->say(tr("These are the standard papers: %1.").arg(toQString(facts->trouble)));
 }
 
 void PageSetupDialog::clickPaper()

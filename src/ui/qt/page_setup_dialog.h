@@ -4,28 +4,35 @@
 #pragma once
 
 #include "platform/platform.h"
+#include "platform/printer.h"
 #include "ui/page_setup.h"
 #include "ui/qt/font_chooser.h"
 
 #include <QDialog>
 
 #include <array>
+#include <memory>
 #include <optional>
 
 class QLabel;
 class QLayout;
 class QLineEdit;
 class QRadioButton;
+class QTimer;
 class QTreeWidget;
 
 namespace pelloric::qt {
 
+class HintLabel;
 class PageSketch;
 class PageTextsTab;
 class SheetPicture;
 class UpDownBox;
 
 /// The modal dialog "Page Setup": paper, margins, header and footer of the settings file.
+///
+/// It opens with the standard papers where the print system has not told its own by then; these
+/// come in later, and what was chosen meanwhile stays.
 class PageSetupDialog final : public QDialog {
     Q_OBJECT
 
@@ -48,6 +55,8 @@ private:
     QWidget* makeMarginsTab();
     UpDownBox* makeMarginBox(Margin margin, QWidget* parent);
 
+    void fillPapers();
+    void takePapers();
     void clickPaper();
     void chooseOrientation(bool portrait);
     void showPaper();
@@ -56,9 +65,12 @@ private:
     void save();
 
     Platform platform_;
+    std::unique_ptr<PrinterInquiry> inquiry_; ///< null: the print system has answered
     PageSetupState state_;
     std::optional<SaveOutcome> saved_;
+    QTimer* answerTimer_;
     QTreeWidget* papers_ = nullptr;
+    HintLabel* papersHint_ = nullptr;
     QLabel* paperName_ = nullptr;
     QLineEdit* width_ = nullptr;
     QLineEdit* height_ = nullptr;

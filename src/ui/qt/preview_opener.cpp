@@ -7,6 +7,7 @@
 #include "controls/qt/kestrane.h"
 #include "platform/automation_object.h"
 #include "print/qt/qt_printing.h"
+#include "ui/qt/page_files.h"
 #include "ui/qt/preview_window.h"
 
 #include <QCoreApplication>
@@ -41,6 +42,7 @@ void uninstall()
 
 QtPreviewOpener::QtPreviewOpener(QtPlatform& platform)
     : platform_(platform)
+    , folders_(std::make_shared<UsedFolders>())
 {
 }
 
@@ -56,6 +58,7 @@ PreviewWindow& QtPreviewOpener::showWindow()
     if (!window()) {
         window_ = new PreviewWindow(platform_);
         window_->setPrompts(prompts_);
+        window_->useFolders(folders_);
     }
     if (!showing_)
         return *window_;

@@ -11,6 +11,7 @@
 namespace pelloric::qt {
 
 class PreviewWindow;
+class UsedFolders;
 class QtPlatform;
 
 /// Opens the one preview window; a window that is open already is used again and raised.
@@ -43,6 +44,7 @@ private:
     QtPlatform& platform_;
     PreviewPrompts prompts_;
     bool showing_ = true;
+    std::shared_ptr<UsedFolders> folders_;
     QPointer<PreviewWindow> window_;
 };
 

@@ -8,7 +8,9 @@
 #include "ui/tool_table.h"
 
 #include <QFileDialog>
+#include <QFileInfo>
 #include <QMessageBox>
+#include <QUrl>
 
 namespace pelloric::qt {
 
@@ -16,14 +18,49 @@ namespace {
 
 constexpr int AboutPictureSize = 64; ///< pixels
 
+/// The suffix of a filter: "PDF document (*.pdf)".
+QString suffixOf(const QString& filter) { return filter.section(u'.', -1).section(u')', 0, 0); }
+
+bool endsInOneOf(const QString& path, const QStringList& suffixes)
+{
+    return suffixes.isEmpty() || suffixes.contains(QFileInfo(path).suffix(), Qt::CaseInsensitive);
+}
+
+/// The toolkit's own dialog, which has a side bar for the places.
+void prepare(QFileDialog& dialog, const FileQuestion& question)
+{
+    dialog.setOption(QFileDialog::DontUseNativeDialog);
+    dialog.setAcceptMode(question.isSave ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
+    dialog.setFileMode(question.isSave ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
+    QList<QUrl> places = dialog.sidebarUrls();
+    for (const QString& place : question.places) {
+        const QUrl url = QUrl::fromLocalFile(place);
+        if (!places.contains(url) && QFileInfo(place).isDir())
+            places.append(url);
+    }
+    dialog.setSidebarUrls(places);
+    if (!question.name.isEmpty())
+        dialog.selectFile(question.name);
+    if (question.suffixes.isEmpty())
+        return;
+    dialog.setDefaultSuffix(question.suffixes.front());
+    QObject::connect(&dialog, &QFileDialog::filterSelected, &dialog,
+        [&dialog](const QString& filter) { dialog.setDefaultSuffix(suffixOf(filter)); });
+}
+
+/// A name with a foreign ending gets the right one and is shown once more, so that an older file of
+/// that name is not overwritten unasked.
 QString chooseFile(QWidget& window, const FileQuestion& question)
 {
     QFileDialog dialog(&window, question.title, question.folder, question.filter);
-    dialog.setAcceptMode(question.isSave ? QFileDialog::AcceptSave : QFileDialog::AcceptOpen);
-    dialog.setFileMode(question.isSave ? QFileDialog::AnyFile : QFileDialog::ExistingFile);
-    if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty())
-        return {};
-    return dialog.selectedFiles().front();
+    prepare(dialog, question);
+    while (dialog.exec() == QDialog::Accepted && !dialog.selectedFiles().isEmpty()) {
+        const QString path = dialog.selectedFiles().front();
+        if (endsInOneOf(path, question.suffixes))
+            return path;
+        dialog.selectFile(path + QLatin1Char('.') + dialog.defaultSuffix());
+    }
+    return {};
 }
 
 void showAbout(QWidget& window)

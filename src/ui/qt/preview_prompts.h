@@ -4,6 +4,7 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 
 #include <functional>
 
@@ -11,12 +12,15 @@ class QWidget;
 
 namespace pelloric::qt {
 
-/// A question for the path of a document file.
+/// A question for the path of a file.
 struct FileQuestion {
     QString title;
     QString folder; ///< shown first
     QString filter; ///< in the toolkit's form: "Name (*.suffix)"
     bool isSave = false;
+    QString name {}; ///< proposed; may be empty
+    QStringList suffixes {}; ///< one of them ends the path, the first is added; empty: any ending
+    QStringList places {}; ///< folders that are offered beside the usual ones
 };
 
 /// What the preview window asks people and tells about itself; a host may put its own in.

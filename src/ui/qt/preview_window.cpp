@@ -13,6 +13,7 @@
 #include "ui/qt/choice_box.h"
 #include "ui/qt/grid_style_dialog.h"
 #include "ui/qt/icon_set.h"
+#include "ui/qt/page_files.h"
 #include "ui/qt/page_setup_dialog.h"
 #include "ui/qt/preview_toolbar.h"
 #include "ui/qt/print_options_dialog.h"
@@ -25,11 +26,14 @@
 #include <QGuiApplication>
 #include <QMenu>
 #include <QPointer>
+#include <QProgressDialog>
 #include <QScreen>
 #include <QScrollBar>
 #include <QSettings>
 #include <QShortcut>
 #include <QTimer>
+
+#include <algorithm>
 
 namespace pelloric::qt {
 
@@ -86,6 +90,7 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     , services_(platform)
     , platform_(platform.record())
     , prompts_(standardPrompts())
+    , folders_(std::make_shared<UsedFolders>())
     , toolbar_(new PreviewToolbar(this))
     , canvas_(new Sorvane(platform, this))
     , contextMenu_(new QMenu(this))
@@ -102,6 +107,7 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     contextMenu_->setObjectName(QStringLiteral("PopMenu"));
     for (QAction* const action : toolbar_->contextActions())
         contextMenu_->addAction(action);
+    addSavePages();
     connectTools();
     session_.emplace(canvas_->canvas(), static_cast<PreviewHost&>(*this));
     navigationChanged();
@@ -133,6 +139,16 @@ void PreviewWindow::connectTools()
     });
     auto* const escape = new QShortcut(QKeySequence(Qt::Key_Escape), this);
     connect(escape, &QShortcut::activated, this, &PreviewWindow::leave);
+}
+
+void PreviewWindow::addSavePages()
+{
+    auto* const action = new QAction(tr("Save as PDF"), this);
+    action->setObjectName(QStringLiteral("SavePages"));
+    action->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_E));
+    connect(action, &QAction::triggered, this, &PreviewWindow::savePages);
+    addAction(action);
+    contextMenu_->addAction(action);
 }
 
 void PreviewWindow::setPrompts(PreviewPrompts prompts)
@@ -194,13 +210,22 @@ void PreviewWindow::reZoom()
 
 void PreviewWindow::print(bool allPages, TextView pageList, std::int16_t copies)
 {
+    printPages({ .allPages = allPages, .pageList = Text(pageList), .copies = copies });
+}
+
+/// @return  false: the user has ended it
+bool PreviewWindow::printPages(const PrintArguments& arguments)
+{
     const Command command(*this);
+    services_.loop().forgetCancel();
     try {
-        session_->print(allPages, pageList, copies);
+        session_->print(arguments.allPages, arguments.pageList, arguments.copies);
     } catch (const RunTimeError& error) {
-        if (error.number() != ErrorNumber::Cancelled)
-            platform_.messages.show(messageOf(error));
+        if (error.number() == ErrorNumber::Cancelled)
+            return false;
+        platform_.messages.show(messageOf(error));
     }
+    return true;
 }
 
 void PreviewWindow::click(int id)
@@ -209,7 +234,7 @@ void PreviewWindow::click(int id)
     session_->click(id);
 }
 
-/// Ends the build or the print job that runs, or else the preview.
+/// Ends a build or a print job that runs, or else the preview.
 void PreviewWindow::leave()
 {
     if (canvas_->canvas().isBusy())
@@ -266,10 +291,42 @@ DialogEnd PreviewWindow::showPageSetup()
 
 void PreviewWindow::showPrintOptions()
 {
-    const auto procedure = [this](const PrintArguments& arguments) {
-        print(arguments.allPages, arguments.pageList, arguments.copies);
-    };
-    PrintOptionsDialog(platform_, procedure, this).exec();
+    PrintOptionsDialog* shown = nullptr;
+    PrintOptionsDialog dialog(
+        platform_, [&](const PrintArguments& arguments) { return printFrom(*shown, arguments); },
+        pagesToPrint(), this);
+    shown = &dialog;
+    dialog.onStop([this] { services_.loop().cancel(); });
+    dialog.exec();
+    // The command that shows the dialog has to end first.
+    if (dialog.wantsFile())
+        QMetaObject::invokeMethod(this, &PreviewWindow::savePages, Qt::QueuedConnection);
+}
+
+PrintPages PreviewWindow::pagesToPrint() const
+{
+    const Canvas& canvas = canvas_->canvas();
+    return { .count = canvas.Totalpages(),
+        .paper = { .code = canvas.style().PagerSizeValue,
+            .orientation = canvas.style().PagerOrientation,
+            .width = canvas.page.myWidth,
+            .height = canvas.page.myHeight } };
+}
+
+/// @return  why the dialog stays open; empty: it closes
+QString PreviewWindow::printFrom(PrintOptionsDialog& dialog, const PrintArguments& arguments)
+{
+    Canvas& canvas = canvas_->canvas();
+    canvas.pageSent
+        = [&dialog](std::int64_t sent, std::int64_t wanted) { dialog.showSent(sent, wanted); };
+    const bool isThrough = printPages(arguments);
+    canvas.pageSent = {};
+    if (isThrough)
+        return {};
+    const ProgressBar& progress = canvas.progress();
+    return tr("Printing was ended: %1 of %2 pages were sent.")
+        .arg(progress.value)
+        .arg(progress.maximum);
 }
 
 void PreviewWindow::showAbout() { prompts_.showAbout(*this); }
@@ -280,10 +337,40 @@ std::filesystem::path PreviewWindow::chooseFileToSave() { return choose(saveFile
 
 std::filesystem::path PreviewWindow::choose(const FileQuestion& question)
 {
-    const QString path = prompts_.chooseFile(*this, question);
+    FileQuestion asked = question;
+    asked.places = folders_->folders();
+    const QString path = prompts_.chooseFile(*this, asked);
     if (path.isEmpty())
         throw RunTimeError(ErrorNumber::Cancelled);
+    folders_->use(path);
     return toText(path);
+}
+
+void PreviewWindow::savePages()
+{
+    if (isBusy())
+        return;
+    const Command command(*this);
+    const QString title = toQString(canvas_->canvas().documentTitle());
+    try {
+        writePages(choose(savePagesQuestion(title, folders_->last())));
+    } catch (const RunTimeError& error) {
+        if (error.number() != ErrorNumber::Cancelled)
+            platform_.messages.show(messageOf(error));
+    }
+}
+
+/// The dialog comes up when it takes a while.
+void PreviewWindow::writePages(const std::filesystem::path& path)
+{
+    QProgressDialog progress(tr("Saving the pages…"), tr("Cancel"), 0, 1, this);
+    progress.setWindowModality(Qt::WindowModal);
+    progress.setObjectName(QStringLiteral("SavingPages"));
+    qt::savePages(canvas_->canvas(), services_.fonts(), path, [&](int done, int total) {
+        progress.setMaximum(std::max(1, total));
+        progress.setValue(done);
+        return !progress.wasCanceled();
+    });
 }
 
 void PreviewWindow::showContextMenu(QPoint at)

@@ -14,11 +14,18 @@
 
 class QMenu;
 
+namespace pelloric {
+struct PrintArguments;
+}
+
 namespace pelloric::qt {
 
 class PreviewToolbar;
+class PrintOptionsDialog;
 class QtPlatform;
 class Sorvane;
+class UsedFolders;
+struct PrintPages;
 
 /// The preview window `frmPrintPreview`: a canvas, `Sorvane1`, and the toolbar that drives it.
 ///
@@ -54,8 +61,16 @@ public:
     /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build
     void reZoom();
 
-    /// Prints all pages or a page list; a printer's error is told in a message box.
+    /// Prints all pages or a page list; a printer's error is told in a message box. Escape ends it
+    /// after the page in work.
     void print(bool allPages, TextView pageList, std::int16_t copies);
+
+    /// Asks for a file and saves the pages there as PDF, or as pictures by the name's ending; what
+    /// fails is told in a message box. Escape ends it.
+    void savePages();
+
+    /// Keeps the folders of the session elsewhere, for several windows one after the other.
+    void useFolders(std::shared_ptr<UsedFolders> folders) { folders_ = std::move(folders); }
 
     /// Whether a command, a build among them, runs at the moment.
     bool isBusy() const;
@@ -83,7 +98,12 @@ private:
     void unload() override;
     void navigationChanged() override;
 
+    bool printPages(const PrintArguments& arguments);
+    PrintPages pagesToPrint() const;
+    QString printFrom(PrintOptionsDialog& dialog, const PrintArguments& arguments);
     void connectTools();
+    void addSavePages();
+    void writePages(const std::filesystem::path& path);
     void click(int id);
     void leave();
     void showContextMenu(QPoint at);
@@ -95,6 +115,7 @@ private:
     QtPlatform& services_;
     Platform platform_;
     PreviewPrompts prompts_;
+    std::shared_ptr<UsedFolders> folders_;
     std::unique_ptr<AutomationObject> grid_;
     PreviewToolbar* toolbar_;
     Sorvane* canvas_;

@@ -48,6 +48,18 @@ TEST_F(PrintCommand, PrintsASavedDocumentOnThePaperItWasLaidOutFor)
     EXPECT_EQ(jobs[0].media, QStringLiteral("K16"));
 }
 
+TEST_F(PrintCommand, WarnsOfASheetOnWhichThePagesDoNotFit)
+{
+    const ProgramResult result
+        = pelloric({ QStringLiteral("print"), wine(), QStringLiteral("--paper"),
+            QStringLiteral("8k"), QStringLiteral("--pages"), QStringLiteral("1") });
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.errors,
+        QStringLiteral("pelloric: The pages are 270 x 390 mm, the printer's sheet is A4 "
+                       "(210 x 297 mm): what does not fit on it is lost.\n"));
+    EXPECT_EQ(result.output, QStringLiteral("T1: 1 page sent\n"));
+}
+
 TEST_F(PrintCommand, SaysInOneLineWhatIsWrong)
 {
     struct Case {

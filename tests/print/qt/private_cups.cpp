@@ -83,11 +83,32 @@ QString PrivateCups::waitUntilReady()
 
 bool PrivateCups::addPrinter(const QString& name)
 {
+    return addDescribedPrinter(name, testsFolder() + QStringLiteral("/data/forms.ppd"));
+}
+
+bool PrivateCups::addPrinter(const QString& name, const std::vector<Change>& changes)
+{
+    QFile described(testsFolder() + QStringLiteral("/data/forms.ppd"));
+    QFile changed(folder() + QLatin1Char('/') + name + QStringLiteral(".ppd"));
+    if (!described.open(QIODevice::ReadOnly) || !changed.open(QIODevice::WriteOnly))
+        return false;
+    QByteArray text = described.readAll();
+    for (const Change& change : changes) {
+        if (!text.contains(change.from))
+            return false;
+        text.replace(change.from, change.to);
+    }
+    changed.write(text);
+    changed.close();
+    return addDescribedPrinter(name, changed.fileName());
+}
+
+bool PrivateCups::addDescribedPrinter(const QString& name, const QString& description)
+{
     return command(QStringLiteral("lpadmin"),
         { QStringLiteral("-p"), name, QStringLiteral("-E"), QStringLiteral("-v"),
-            QStringLiteral("file:/dev/null"), QStringLiteral("-P"),
-            testsFolder() + QStringLiteral("/data/forms.ppd"), QStringLiteral("-o"),
-            QStringLiteral("sides-default=two-sided-long-edge") });
+            QStringLiteral("file:/dev/null"), QStringLiteral("-P"), description,
+            QStringLiteral("-o"), QStringLiteral("sides-default=two-sided-long-edge") });
 }
 
 bool PrivateCups::command(const QString& program, const QStringList& arguments)

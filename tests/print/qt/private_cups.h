@@ -5,6 +5,7 @@
 
 #include "fakes/temp_folder.h"
 
+#include <QByteArray>
 #include <QProcess>
 #include <QString>
 #include <QStringList>
@@ -48,6 +49,13 @@ public:
     /// Adds a printer with the papers of tests/data/forms.ppd, two-sided by default.
     bool addPrinter(const QString& name);
 
+    /// As above, with some lines of its description changed.
+    struct Change {
+        QByteArray from;
+        QByteArray to;
+    };
+    bool addPrinter(const QString& name, const std::vector<Change>& changes);
+
     /// Runs one of the scheduler's commands: lpadmin, cupsdisable, cupsreject, ...
     bool command(const QString& program, const QStringList& arguments);
 
@@ -64,6 +72,7 @@ public:
     void stop();
 
 private:
+    bool addDescribedPrinter(const QString& name, const QString& description);
     QString waitUntilReady();
 
     TempFolder folder_;

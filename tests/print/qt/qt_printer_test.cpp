@@ -88,6 +88,31 @@ std::int16_t codeNamed(const std::vector<PaperForm>& forms, TextView name)
     return 0;
 }
 
+/// What lets a printer take sizes of the user's own.
+std::vector<PrivateCups::Change> customSizes()
+{
+    return { { "*DefaultImageableArea: A4",
+        "*VariablePaperSize: True\n*MaxMediaWidth: \"2000\"\n*MaxMediaHeight: \"3000\"\n"
+        "*HWMargins: 18 24 20 30\n"
+        "*NonUIOrderDependency: 10 AnySetup *CustomPageSize\n"
+        "*CustomPageSize True: \"pop pop pop <</PageSize[5 -2 roll]>>setpagedevice\"\n"
+        "*ParamCustomPageSize Width: 1 points 36 2000\n"
+        "*ParamCustomPageSize Height: 2 points 36 3000\n"
+        "*ParamCustomPageSize WidthOffset: 3 points 0 0\n"
+        "*ParamCustomPageSize HeightOffset: 4 points 0 0\n"
+        "*ParamCustomPageSize Orientation: 5 int 0 0\n"
+        "*DefaultImageableArea: A4" } };
+}
+
+/// A job without a form, for pages of a size in millimetres.
+PrintJob exactJob(double widthMm, double heightMm)
+{
+    PrintJob job = jobOf(1, 0);
+    job.pageWidth = static_cast<Twips>(std::lround(widthMm * 56.7));
+    job.pageHeight = static_cast<Twips>(std::lround(heightMm * 56.7));
+    return job;
+}
+
 /// Prints words on a grid of positions and compares where they came to stand.
 /// @param margin  of the paper at the left: points
 void expectTextsInPlace(const PageDocument& document, const QString& path, double margin)
@@ -173,7 +198,69 @@ TEST_F(QtPrinterTest, PutsTextsWhereTheRecordsStandFromTheCornerOfThePrintableAr
     ASSERT_EQ(cups.jobs().size(), 3U);
     expectTextsInPlace(document, cups.documentOf(1), 18);
     expectTextsInPlace(document, cups.documentOf(2), 36);
-    expectTextsInPlace(document, cups.documentOf(3), 18);
+    expectTextsInPlace(document, cups.documentOf(3), 24);
+}
+
+TEST_F(QtPrinterTest, BeginsLyingPagesAtTheTurnedCornerOfThePrintableArea)
+{
+    ASSERT_TRUE(cups.addPrinter(
+        QStringLiteral("Clockwise"), { { "Orientation: Plus90", "Orientation: Minus90" } }));
+    PageDocument document;
+    addText(document, { 0, 0 }, u"corner");
+    const auto corner = [&](int job) { return wordsOf(cups.documentOf(job)).at(0).topLeft; };
+    doPrint(document, jobOf(1), DefaultFont, printing.printer());
+    doPrint(document, jobOf(1, 9, 2), DefaultFont, printing.printer());
+    printing.system().makeCurrent(u"Clockwise");
+    doPrint(document, jobOf(1, 9, 2), DefaultFont, printing.printer());
+    ASSERT_EQ(cups.jobs().size(), 3U);
+    // The free edges of the upright A4 sheet: left 18, top 30, right 20, bottom 24 points.
+    const double above = corner(1).y() - 30; // of the face, over its letters
+    EXPECT_NEAR(corner(1).x(), 18, 0.1);
+    EXPECT_NEAR(corner(2).x(), 24, 0.1);
+    EXPECT_NEAR(corner(2).y(), 18 + above, 0.1);
+    EXPECT_NEAR(corner(3).x(), 30, 0.1);
+    EXPECT_NEAR(corner(3).y(), 20 + above, 0.1);
+}
+
+TEST_F(QtPrinterTest, SendsTheExactSizeWhereNoFormIsNamed)
+{
+    ASSERT_TRUE(cups.addPrinter(QStringLiteral("Any"), customSizes()));
+    printing.system().makeCurrent(u"Any");
+    Printer& printer = printing.printer();
+    const auto sheet = [&](const PrintJob& job) {
+        return printing.system()
+            .sheetFor({ job.paperSize, job.orientation, job.pageWidth, job.pageHeight })
+            .value_or(PaperForm());
+    };
+    const PrintJob eightK = exactJob(270, 390);
+    EXPECT_NEAR(sheet(eightK).widthMm, 270, 0.5);
+    EXPECT_NEAR(sheet(eightK).heightMm, 390, 0.5);
+    doPrint(twoPages(), eightK, DefaultFont, printer);
+    doPrint(twoPages(), exactJob(150, 100), DefaultFont, printer);
+    doPrint(twoPages(), exactJob(197, 273), DefaultFont, printer);
+    doPrint(twoPages(), exactJob(297, 210), DefaultFont, printer);
+    doPrint(twoPages(), jobOf(1, 8), DefaultFont, printer);
+    EXPECT_EQ(printer.paperSize(), 9);
+    const std::vector<SpooledJob> jobs = cups.jobs();
+    ASSERT_EQ(jobs.size(), 10U);
+    const char* const sizes[]
+        = { "765 x 1106", "425 x 283", "558 x 774", "842 x 595", "842 x 1191" };
+    for (std::size_t i = 0; i < jobs.size(); ++i)
+        EXPECT_EQ(pageSizeOf(cups.documentOf(jobs[i].number)), QLatin1String(sizes[i / 2]));
+    EXPECT_TRUE(jobs[0].media.startsWith(QStringLiteral("Custom."))) << jobs[0].media.toStdString();
+    EXPECT_EQ(jobs[4].media, QStringLiteral("K16"));
+    EXPECT_EQ(jobs[6].media, QStringLiteral("A4"));
+}
+
+TEST_F(QtPrinterTest, TakesItsDefaultSheetForASizeThatItDoesNotTake)
+{
+    const PrintJob job = exactJob(270, 390);
+    const auto sheet = printing.system().sheetFor({ 0, 1, job.pageWidth, job.pageHeight });
+    ASSERT_TRUE(sheet);
+    EXPECT_EQ(sheet->name, u"A4");
+    doPrint(twoPages(), job, DefaultFont, printing.printer());
+    ASSERT_EQ(cups.jobs().size(), 2U);
+    EXPECT_EQ(pageSizeOf(cups.documentOf(1)), QStringLiteral("595 x 842"));
 }
 
 TEST_F(QtPrinterTest, SendsAPageWithoutRecordsAsABlankPage)

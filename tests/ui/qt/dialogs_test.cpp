@@ -387,7 +387,8 @@ TEST_F(PageSetupDialogTest, ClickingAPaperFillsTheBoxesByOrientation)
 
 TEST_F(PageSetupDialogTest, ThePaperInForceStandsOutAndTheLabelWaitsForAClick)
 {
-    const PageSetupDialog dialog(services());
+    PageSetupDialog dialog(services());
+    showTab(dialog, 0);
     auto& list = child<QTreeWidget>(dialog, "ListView1");
     ASSERT_EQ(list.selectedItems().size(), 1);
     EXPECT_EQ(list.indexOfTopLevelItem(list.selectedItems().front()), 8);
@@ -591,6 +592,7 @@ TEST_F(PageSetupDialogTest, NoMarginLineIsDraggedOffTheSheet)
     for (const Case& row : cases) {
         auto& line = child<QWidget>(dialog, row.line);
         const QPoint start = line.rect().center();
+        QTest::mouseMove(&dialog, { 1, 1 });
         QTest::mouseMove(&line, start);
         QTest::mousePress(&line, Qt::LeftButton, {}, start);
         QTest::mouseMove(&line, start + row.way);
@@ -828,8 +830,10 @@ TEST_F(PrintOptionsDialogTest, HandsThePageListOn)
     };
     for (const Case& range : cases) {
         std::vector<PrintArguments> printed;
-        PrintOptionsDialog dialog(
-            services(), [&](const PrintArguments& arguments) { printed.push_back(arguments); });
+        PrintOptionsDialog dialog(services(), [&](const PrintArguments& arguments) {
+            printed.push_back(arguments);
+            return QString();
+        });
         child<QRadioButton>(dialog, "Option1(1)").click();
         QTest::keyClicks(&child<QLineEdit>(dialog, "Text1"), range.typed);
         press(dialog, "cmdOk");
@@ -844,8 +848,10 @@ TEST_F(PrintOptionsDialogTest, HandsThePageListOn)
 TEST_F(PrintOptionsDialogTest, CountsCopiesByTypingAndByItsButtons)
 {
     std::vector<PrintArguments> printed;
-    PrintOptionsDialog dialog(
-        services(), [&](const PrintArguments& arguments) { printed.push_back(arguments); });
+    PrintOptionsDialog dialog(services(), [&](const PrintArguments& arguments) {
+        printed.push_back(arguments);
+        return QString();
+    });
     auto& copies = child<QLineEdit>(dialog, "Text2");
     auto& steps = child<QAbstractSpinBox>(dialog, "UpDown1");
     typeInto(copies, "a1x");
@@ -872,7 +878,10 @@ TEST_F(PrintOptionsDialogTest, MakesTheChosenPrinterTheCurrentOne)
 
 TEST_F(PrintOptionsDialogTest, RefusesWithAMessageAndStaysOpen)
 {
-    const auto print = [](const PrintArguments&) { FAIL() << "nothing can be printed"; };
+    const auto print = [](const PrintArguments&) {
+        ADD_FAILURE() << "nothing can be printed";
+        return QString();
+    };
     printers.closed = { u"First" };
     PrintOptionsDialog closed(services(), print);
     closed.show();
@@ -904,6 +913,7 @@ TEST_F(PrintOptionsDialogTest, PrintsOnceHoweverOftenItIsPressed)
         child<QPushButton>(*shown, "cmdOk").click();
         QTest::keyClick(shown, Qt::Key_Escape);
         EXPECT_TRUE(shown->isVisible());
+        return QString();
     });
     shown = &dialog;
     dialog.show();
@@ -914,13 +924,184 @@ TEST_F(PrintOptionsDialogTest, PrintsOnceHoweverOftenItIsPressed)
 
 TEST_F(PrintOptionsDialogTest, TooManyCopiesPrintNothingAndAreShown)
 {
-    PrintOptionsDialog dialog(services(), [](const PrintArguments&) { FAIL(); });
+    PrintOptionsDialog dialog(services(), [](const PrintArguments&) {
+        ADD_FAILURE();
+        return QString();
+    });
     dialog.show();
     typeInto(child<QLineEdit>(dialog, "Text2"), "40000");
     press(dialog, "cmdOk");
     EXPECT_TRUE(dialog.isVisible());
     EXPECT_EQ(child<QLineEdit>(dialog, "Text2").selectedText(), "40000");
     QToolTip::hideText();
+}
+
+TEST_F(PrintOptionsDialogTest, SaysWhileItIsTypedWhatWouldPrintNothing)
+{
+    PrintOptionsDialog dialog(services(), {}, { .count = 12 });
+    dialog.show();
+    const auto hint = [&](const char* name) {
+        const auto& label = child<QLabel>(dialog, name);
+        return label.isVisible() ? label.text().toStdString() : std::string();
+    };
+    auto& range = child<QLineEdit>(dialog, "Text1");
+    auto& copies = child<QLineEdit>(dialog, "Text2");
+    EXPECT_EQ(hint("labRangeHint"), "");
+    EXPECT_EQ(hint("labCopiesHint"), "");
+    child<QRadioButton>(dialog, "Option1(1)").click();
+    EXPECT_EQ(hint("labRangeHint"), "No page is named yet, so nothing would be printed.");
+    typeInto(range, "13-20");
+    EXPECT_EQ(hint("labRangeHint"), "None of these pages exists: the last one is 12.");
+    typeInto(range, "12-20");
+    EXPECT_EQ(hint("labRangeHint"), "");
+    typeInto(range, "x");
+    EXPECT_NE(hint("labRangeHint"), "");
+    child<QRadioButton>(dialog, "Option1(0)").click();
+    EXPECT_EQ(hint("labRangeHint"), "");
+    typeInto(copies, "0");
+    EXPECT_EQ(hint("labCopiesHint"), "Without a copy nothing would be printed.");
+    typeInto(copies, "40000");
+    EXPECT_EQ(hint("labCopiesHint"), "These are more copies than can be printed.");
+    typeInto(copies, "");
+    EXPECT_EQ(hint("labCopiesHint"), "");
+}
+
+TEST_F(PrintOptionsDialogTest, ShowsWhatIsSentAndStaysToSayWhereItWasEnded)
+{
+    PrintOptionsDialog* shown = nullptr;
+    int stops = 0;
+    PrintOptionsDialog dialog(services(), [&](const PrintArguments&) {
+        shown->showSent(3, 12);
+        EXPECT_TRUE(child<QPushButton>(*shown, "cmdStop").isVisible());
+        EXPECT_EQ(child<QLabel>(*shown, "labSent").text(), "3 of 12 pages sent");
+        child<QPushButton>(*shown, "cmdStop").click();
+        QTest::keyClick(shown, Qt::Key_Escape);
+        EXPECT_TRUE(shown->isVisible());
+        return QStringLiteral("3 of 12 pages were sent.");
+    });
+    shown = &dialog;
+    dialog.onStop([&] { ++stops; });
+    dialog.show();
+    press(dialog, "cmdOk");
+    EXPECT_EQ(stops, 2);
+    EXPECT_TRUE(dialog.isVisible());
+    EXPECT_FALSE(child<QPushButton>(dialog, "cmdStop").isVisible());
+    EXPECT_EQ(child<QLabel>(dialog, "labEnd").text(), "3 of 12 pages were sent.");
+    EXPECT_TRUE(child<QComboBox>(dialog, "cboPrinter").isEnabled());
+    QTest::keyClick(&dialog, Qt::Key_Escape);
+    EXPECT_FALSE(dialog.isVisible());
+}
+
+TEST_F(PrintOptionsDialogTest, OffersAFileWhereThereIsNoPrinter)
+{
+    PrintOptionsDialog printing(services(), {});
+    printing.show();
+    EXPECT_FALSE(child<QPushButton>(printing, "cmdSavePages").isVisible());
+    printers.names.clear();
+    printers.current.clear();
+    PrintOptionsDialog dialog(services(), {});
+    dialog.show();
+    EXPECT_EQ(child<QLabel>(dialog, "labPrinterHint").text(), "There is no printer.");
+    EXPECT_FALSE(dialog.wantsFile());
+    press(dialog, "cmdSavePages");
+    EXPECT_TRUE(dialog.wantsFile());
+    EXPECT_FALSE(dialog.isVisible());
+}
+
+TEST_F(PrintOptionsDialogTest, WarnsOfASheetOfAnotherSize)
+{
+    const PaperRequest pages { .code = 9, .width = 15309, .height = 22113 };
+    const PrintOptionsDialog fitting(services(), {}, { .paper = pages });
+    EXPECT_EQ(child<QLabel>(fitting, "labPrinterHint").text(), "");
+    printers.sheet = PaperForm { u"A4", 210, 297 };
+    const PrintOptionsDialog dialog(services(), {}, { .paper = pages });
+    EXPECT_EQ(child<QLabel>(dialog, "labPrinterHint").text(),
+        "The pages are 270 x 390 mm, the printer's sheet is A4 (210 x 297 mm): what does not fit "
+        "on it is lost.");
+}
+
+namespace {
+
+/// Printers of a system that tells about them late, or never.
+class LatePrinters final : public FakePrinterSystem {
+public:
+    class Late final : public PrinterInquiry {
+    public:
+        explicit Late(const LatePrinters& system)
+            : system_(system)
+        {
+        }
+
+        const PrinterFacts* facts(std::chrono::milliseconds) override
+        {
+            return system_.answer ? &*system_.answer : nullptr;
+        }
+
+    private:
+        const LatePrinters& system_;
+    };
+
+    std::unique_ptr<PrinterInquiry> inquire(const PaperRequest&) const override
+    {
+        return std::make_unique<Late>(*this);
+    }
+
+    std::optional<PrinterFacts> answer;
+};
+
+/// A platform whose print system answers late.
+struct LateWorld : DialogWorld {
+    LatePrinters late;
+
+    Platform platform()
+    {
+        const Platform& known = services();
+        return { known.metrics, known.codec, known.messages, known.loop, known.clock, known.folders,
+            known.printer, late, known.library };
+    }
+};
+
+using LatePrintersTest = LateWorld;
+
+} // namespace
+
+TEST_F(LatePrintersTest, PageSetupOpensWithTheStandardPapersUntilThePrinterTellsItsOwn)
+{
+    PageSetupDialog dialog(platform());
+    dialog.show();
+    auto& list = child<QTreeWidget>(dialog, "ListView1");
+    EXPECT_EQ(list.topLevelItemCount(), static_cast<int>(standardPaperForms().size()));
+    clickRow(list, 10);
+    EXPECT_EQ(child<QLabel>(dialog, "labPagerSize").text(), "PagerSize: A5");
+    late.answer.emplace().forms = standardPaperForms();
+    late.answer->forms.push_back({ u"16开", 197, 273 });
+    ASSERT_TRUE(QTest::qWaitFor([&] { return list.topLevelItemCount() == 48; }));
+    EXPECT_EQ(list.topLevelItem(47)->text(0), "16开");
+    EXPECT_TRUE(list.topLevelItem(10)->isSelected());
+    EXPECT_EQ(child<QLabel>(dialog, "labPapersHint").text(), "");
+}
+
+TEST_F(LatePrintersTest, PageSetupSaysThatThePrintSystemIsSilent)
+{
+    PageSetupDialog dialog(platform());
+    dialog.show();
+    late.answer.emplace().forms = standardPaperForms();
+    late.answer->trouble = u"the print system does not answer";
+    auto& hint = child<QLabel>(dialog, "labPapersHint");
+    ASSERT_TRUE(QTest::qWaitFor([&] { return hint.isVisible(); }));
+    EXPECT_EQ(hint.text(), "These are the standard papers: the print system does not answer.");
+}
+
+TEST_F(LatePrintersTest, PrintOpensAtOnceAndThePrintersComeIn)
+{
+    PrintOptionsDialog dialog(platform(), {});
+    dialog.show();
+    auto& list = child<QComboBox>(dialog, "cboPrinter");
+    EXPECT_EQ(list.count(), 0);
+    late.answer.emplace().names = { u"First", u"第二台" };
+    late.answer->current = u"第二台";
+    ASSERT_TRUE(QTest::qWaitFor([&] { return list.count() == 2; }));
+    EXPECT_EQ(list.currentText(), "第二台");
 }
 
 TEST(FontChooser, AnswersWhatItWasOpenedWith)

@@ -22,6 +22,9 @@
 #include <QComboBox>
 #include <QDialog>
 #include <QDir>
+#include <QFile>
+#include <QFileDialog>
+#include <QFileInfo>
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
@@ -402,7 +405,8 @@ TEST_F(PreviewWindowTest, OpensTheContextMenuByTheRightButton)
     QStringList texts;
     for (const QAction* const action : menu->actions())
         texts.append(action->text());
-    EXPECT_EQ(texts, QStringList({ "Clear  All Pages", "Open File", "Save File" }));
+    EXPECT_EQ(texts.mid(0, 3), QStringList({ "Clear  All Pages", "Open File", "Save File" }));
+    EXPECT_TRUE(texts.contains(QStringLiteral("Save as PDF")));
     menu->actions().front()->trigger();
     menu->close();
     EXPECT_EQ(canvas().Totalpages(), 1);
@@ -713,5 +717,106 @@ TEST(PreviewDemo, WalksThroughWithoutADisplay)
 }
 
 } // namespace
+
+TEST_F(PreviewWindowTest, SavesThePagesAsThePathsEndingSays)
+{
+    std::vector<FileQuestion> questions;
+    QString answer;
+    PreviewPrompts prompts;
+    prompts.chooseFile = [&](QWidget&, const FileQuestion& question) {
+        questions.push_back(question);
+        return answer;
+    };
+    opener_.setPrompts(prompts);
+    PreviewWindow& window = preview(3);
+    canvas().documentName = u"Orders: May/June";
+    const QString folder = QString::fromStdString(folder_.path().string());
+    const auto begins = [&](const QString& name, const QByteArray& start) {
+        QFile file(folder + name);
+        return file.open(QIODevice::ReadOnly) && file.readAll().contains(start);
+    };
+    answer = folder + QStringLiteral("/a.pdf");
+    QTest::keyClick(&window, Qt::Key_E, Qt::ControlModifier);
+    EXPECT_TRUE(begins(QStringLiteral("/a.pdf"), "%PDF"));
+    ASSERT_EQ(questions.size(), 1U);
+    EXPECT_TRUE(questions[0].isSave);
+    EXPECT_EQ(questions[0].title, "Save as PDF");
+    EXPECT_EQ(questions[0].name, "Orders- May-June.pdf");
+    EXPECT_EQ(questions[0].suffixes, QStringList({ "pdf", "png", "svg" }));
+    EXPECT_TRUE(questions[0].places.isEmpty());
+    answer = folder + QStringLiteral("/b.PNG");
+    QTest::keyClick(&window, Qt::Key_E, Qt::ControlModifier);
+    EXPECT_TRUE(begins(QStringLiteral("/b.PNG"), "PNG"));
+    EXPECT_EQ(questions[1].folder, folder);
+    EXPECT_EQ(questions[1].places, QStringList(folder));
+    answer = folder + QStringLiteral("/c.svg");
+    QTest::keyClick(&window, Qt::Key_E, Qt::ControlModifier);
+    EXPECT_TRUE(begins(QStringLiteral("/c.svg"), "<svg"));
+    EXPECT_TRUE(messages_.take().empty());
+    answer.clear();
+    QTest::keyClick(&window, Qt::Key_E, Qt::ControlModifier);
+    EXPECT_TRUE(messages_.take().empty());
+    answer = folder + QStringLiteral("/missing/d.pdf");
+    QTest::keyClick(&window, Qt::Key_E, Qt::ControlModifier);
+    EXPECT_EQ(messages_.take().size(), 1U);
+}
+
+TEST_F(PreviewWindowTest, OpenAndSaveKeepTheirFolderAndOfferThoseOfTheSession)
+{
+    std::vector<FileQuestion> questions;
+    const QString path = QString::fromStdString((folder_.path() / "a.ostl").string());
+    PreviewPrompts prompts;
+    prompts.chooseFile = [&](QWidget&, const FileQuestion& question) {
+        questions.push_back(question);
+        return path;
+    };
+    opener_.setPrompts(prompts);
+    PreviewWindow& window = preview(3);
+    QTest::keyClick(&window, Qt::Key_S, Qt::ControlModifier);
+    QTest::keyClick(&window, Qt::Key_O, Qt::ControlModifier);
+    ASSERT_EQ(questions.size(), 2U);
+    for (const FileQuestion& question : questions) {
+        EXPECT_EQ(question.folder, QStringLiteral("/"));
+        EXPECT_EQ(question.filter, "Ostrel (*.ostl)");
+        EXPECT_TRUE(question.suffixes.isEmpty());
+        EXPECT_TRUE(question.name.isEmpty());
+    }
+    EXPECT_EQ(questions[1].places, QStringList(QFileInfo(path).absolutePath()));
+}
+
+TEST_F(PreviewWindowTest, TheFileDialogHasTheSessionsFoldersAndAddsTheEnding)
+{
+    const QString folder = QString::fromStdString(folder_.path().string());
+    const auto answer = [&](const QString& typed, const QString& filter) {
+        FileQuestion question { .title = QStringLiteral("Save as PDF"),
+            .folder = folder,
+            .filter = QStringLiteral("PDF document (*.pdf);;PNG pictures (*.png)"),
+            .isSave = true };
+        question.suffixes = { QStringLiteral("pdf"), QStringLiteral("png") };
+        question.name = QStringLiteral("report.pdf");
+        question.places = { folder };
+        QTimer::singleShot(0, [&] {
+            auto* const dialog = qobject_cast<QFileDialog*>(QApplication::activeModalWidget());
+            ASSERT_NE(dialog, nullptr);
+            EXPECT_TRUE(dialog->sidebarUrls().contains(QUrl::fromLocalFile(folder)));
+            auto* const name = dialog->findChild<QLineEdit*>(QStringLiteral("fileNameEdit"));
+            EXPECT_EQ(name->text(), "report.pdf");
+            if (!filter.isEmpty()) {
+                dialog->selectNameFilter(filter);
+                emit dialog->filterSelected(filter);
+            }
+            name->setText(typed);
+            // A foreign ending is completed and shown again.
+            QTimer::singleShot(100, dialog, [dialog] { QTest::keyClick(dialog, Qt::Key_Return); });
+            QTest::keyClick(dialog, Qt::Key_Return);
+        });
+        QWidget window;
+        return standardPrompts().chooseFile(window, question).mid(folder.size());
+    };
+    EXPECT_EQ(answer(QStringLiteral("x"), {}), "/x.pdf");
+    EXPECT_EQ(answer(QStringLiteral("x.png"), {}), "/x.png");
+    EXPECT_EQ(answer(QStringLiteral("x"), QStringLiteral("PNG pictures (*.png)")), "/x.png");
+    EXPECT_EQ(answer(QStringLiteral("x.doc"), {}), "/x.doc.pdf");
+}
 
 } // namespace pelloric::qt

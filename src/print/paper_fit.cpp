@@ -1,0 +1,54 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "print/paper_fit.h"
+
+#include "document/page_document.h"
+#include "platform/numbers.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace pelloric {
+
+namespace {
+
+constexpr double TwipsPerMm = TwipsPerCm / 10.0;
+
+bool isSameLength(double mm, Twips twips)
+{
+    return std::abs(mm - twips / TwipsPerMm) < SamePaperMm;
+}
+
+Text wholeMm(double mm) { return decimal(roundToInt32(std::clamp(mm, 0.0, 100000.0))); }
+
+Text sizeText(double widthMm, double heightMm)
+{
+    return wholeMm(widthMm) + u" x " + wholeMm(heightMm) + u" mm";
+}
+
+} // namespace
+
+bool isPaperOf(const PaperForm& paper, Twips width, Twips height)
+{
+    const auto [narrow, wide] = std::minmax(paper.widthMm, paper.heightMm);
+    return isSameLength(narrow, std::min(width, height))
+        && isSameLength(wide, std::max(width, height));
+}
+
+Text paperWarning(const PaperRequest& pages, const std::optional<PaperForm>& sheet)
+{
+    if (!sheet || pages.width <= 0 || pages.height <= 0)
+        return {};
+    if (isSameLength(sheet->widthMm, pages.width) && isSameLength(sheet->heightMm, pages.height))
+        return {};
+    const double width = pages.width / TwipsPerMm;
+    const double height = pages.height / TwipsPerMm;
+    Text text = u"The pages are " + sizeText(width, height) + u", the printer's sheet is "
+        + sheet->name + u" (" + sizeText(sheet->widthMm, sheet->heightMm) + u")";
+    const bool isLost
+        = width > sheet->widthMm + SamePaperMm || height > sheet->heightMm + SamePaperMm;
+    return text + (isLost ? u": what does not fit on it is lost." : u".");
+}
+
+} // namespace pelloric

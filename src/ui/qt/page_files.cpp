@@ -1,0 +1,123 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/qt/page_files.h"
+
+#include "controls/canvas.h"
+#include "export/qt/page_export.h"
+#include "platform/file_bytes.h"
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "ui/qt/preview_prompts.h"
+
+#include <QCoreApplication>
+#include <QFileInfo>
+#include <QStandardPaths>
+
+#include <array>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr int MostFolders = 8; ///< in the side bar
+
+/// A kind of file that pages can be saved as.
+struct PageFile {
+    const char* suffix;
+    const char* description;
+    void (*write)(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options,
+        const std::filesystem::path& path);
+};
+
+void writePdf(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options,
+    const std::filesystem::path& path)
+{
+    exportPdf(canvas.document(), canvas.page, fonts, options, path);
+}
+
+void writePngs(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options,
+    const std::filesystem::path& path)
+{
+    exportPngs(canvas.document(), canvas.page, fonts, options, path);
+}
+
+void writeSvgs(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options,
+    const std::filesystem::path& path)
+{
+    exportSvg(canvas.document(), canvas.page, fonts, options, path);
+}
+
+/// The first is the one that is offered.
+constexpr auto PageFiles = std::to_array<PageFile>({
+    { "pdf", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "PDF document"), writePdf },
+    { "png", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "PNG pictures"), writePngs },
+    { "svg", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "SVG drawings"), writeSvgs },
+});
+
+QString words(const char* text)
+{
+    return QCoreApplication::translate("pelloric::qt::PageFiles", text);
+}
+
+/// A title as a file can be named.
+QString nameAfter(const QString& title)
+{
+    QString name = title.simplified();
+    for (QChar& character : name) {
+        if (QStringLiteral("/\\:*?\"<>|").contains(character))
+            character = QLatin1Char('-');
+    }
+    return name.isEmpty() ? words(QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "report")) : name;
+}
+
+} // namespace
+
+FileQuestion savePagesQuestion(const QString& title, const QString& folder)
+{
+    FileQuestion question { .title
+        = words(QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "Save as PDF")),
+        .folder = folder,
+        .filter = {},
+        .isSave = true };
+    QStringList filters;
+    for (const PageFile& file : PageFiles) {
+        const QString suffix = QLatin1String(file.suffix);
+        filters.append(QStringLiteral("%1 (*.%2)").arg(words(file.description), suffix));
+        question.suffixes.append(suffix);
+    }
+    question.filter = filters.join(QStringLiteral(";;"));
+    question.name = nameAfter(title) + QLatin1Char('.') + question.suffixes.front();
+    return question;
+}
+
+void savePages(Canvas& canvas, QtFonts& fonts, const std::filesystem::path& path,
+    const std::function<bool(int done, int total)>& mayGoOn)
+{
+    const QString suffix = QFileInfo(toQString(pathText(path))).suffix().toLower();
+    for (const PageFile& file : PageFiles) {
+        if (suffix != QLatin1String(file.suffix))
+            continue;
+        const ExportOptions options { .title = canvas.documentTitle(), .progress = mayGoOn };
+        return canvas.keepDocument([&] { file.write(canvas, fonts, options, path); });
+    }
+    throw RunTimeError(
+        ErrorNumber::InvalidCall, pathText(path) + u": the name must end in .pdf, .png or .svg");
+}
+
+void UsedFolders::use(const QString& file)
+{
+    const QString folder = QFileInfo(file).absolutePath();
+    folders_.removeAll(folder);
+    folders_.prepend(folder);
+    while (folders_.size() > MostFolders)
+        folders_.removeLast();
+}
+
+QString UsedFolders::last() const
+{
+    return folders_.isEmpty() ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation)
+                              : folders_.front();
+}
+
+} // namespace pelloric::qt
