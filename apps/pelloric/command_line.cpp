@@ -38,7 +38,7 @@ constexpr auto Advices = std::to_array<Advice>({
 } // namespace
 
 CommandLine::CommandLine(
-    const QStringList& arguments, std::initializer_list<OptionTable> tables, int files)
+    const QStringList& arguments, const std::vector<OptionTable>& tables, int files)
 {
     for (const OptionTable table : tables) {
         for (const Option& option : table) {

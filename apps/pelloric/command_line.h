@@ -7,9 +7,9 @@
 #include <QString>
 #include <QStringList>
 
-#include <initializer_list>
 #include <span>
 #include <stdexcept>
+#include <vector>
 
 namespace pelloric {
 class RunTimeError;
@@ -50,7 +50,7 @@ class CommandLine {
 public:
     /// @param files  how many arguments that are no options are needed
     /// @throws CommandError WrongUsage: unknown options, missing values, another number of files
-    CommandLine(const QStringList& arguments, std::initializer_list<OptionTable> tables, int files);
+    CommandLine(const QStringList& arguments, const std::vector<OptionTable>& tables, int files);
 
     bool has(const char* option) const;
 

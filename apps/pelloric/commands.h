@@ -3,9 +3,12 @@
 
 #pragma once
 
+#include "command_line.h"
+
 #include <QStringList>
 
 #include <span>
+#include <vector>
 
 namespace pelloric::app {
 
@@ -16,13 +19,17 @@ struct Invocation {
     QStringList arguments; ///< what stands behind the command's name
 };
 
-/// One of the things that the program can do.
+/// The tables of a command's options, in the order of its help.
+using OptionTables = std::vector<OptionTable>;
+
+/// One of the things that the program can do; help, manual page and completions are made of it.
 struct Command {
     const char* name = nullptr;
     const char* synopsis = nullptr; ///< what stands behind the name
     const char* summary = nullptr; ///< one line
     int (*run)(const Invocation& invocation) = nullptr; ///< answers the exit status; may throw
-    QString (*details)() = nullptr; ///< the rest of the command's help; may be missing
+    OptionTables (*options)() = nullptr; ///< may be missing
+    QString (*details)() = nullptr; ///< prose of the command's help, ends a line; may be missing
 };
 
 /// All commands, in the order in which they are listed.
@@ -30,10 +37,12 @@ std::span<const Command> commands();
 
 /// `pelloric demo`: a host with all kinds of grids.
 int runDemo(const Invocation& invocation);
+OptionTables demoOptions();
 QString demoDetails();
 
 /// `pelloric preview`: a table in the preview window.
 int runPreview(const Invocation& invocation);
+OptionTables previewOptions();
 QString previewDetails();
 
 /// `pelloric open`: a saved document in the preview window.
@@ -42,6 +51,7 @@ QString openDetails();
 
 /// `pelloric export`: a table or a document as PDF, images or a document file; needs no display.
 int runExport(const Invocation& invocation);
+OptionTables exportOptions();
 QString exportDetails();
 
 /// `pelloric run`: a script that drives the controls by name; needs no display.
@@ -50,17 +60,24 @@ QString scriptDetails();
 
 /// `pelloric print`: a table or a document on a printer; needs no display.
 int runPrint(const Invocation& invocation);
+OptionTables printOptions();
 QString printDetails();
 
 /// `pelloric printers`: the printers of the system and whether they take jobs; needs no display.
 int runPrinters(const Invocation& invocation);
+OptionTables printersOptions();
 QString printersDetails();
 
 /// `pelloric settings`: shows or restores the settings file; needs no display.
 int runSettings(const Invocation& invocation);
-QString settingsDetails();
+OptionTables settingsOptions();
 
-/// `pelloric help`: all commands, or one of them at length.
+/// `pelloric completion`: what makes a shell complete the program's arguments.
+int runCompletion(const Invocation& invocation);
+QString completionDetails();
+
+/// `pelloric help`: all commands, or one of them at length, or the manual page.
 int runHelp(const Invocation& invocation);
+OptionTables helpOptions();
 
 } // namespace pelloric::app

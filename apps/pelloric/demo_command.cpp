@@ -47,16 +47,31 @@ QString samplesFolder(const CommandLine& line)
                                       "--samples"));
 }
 
-/// The walk changes neither the person's settings nor where their windows stand.
+/// Settings that go with the demonstration: it changes neither the person's own nor where their
+/// windows stand.
+class DemoSettings {
+public:
+    /// @throws CommandError there is no room for them
+    explicit DemoSettings(qt::QtPlatform& platform)
+    {
+        if (!folder_.isValid())
+            throw CommandError(QStringLiteral("%1; check the folder of temporary files")
+                                   .arg(folder_.errorString()));
+        QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder_.path());
+        platform.folders().setSystemDirectory(qt::toText(folder_.path()));
+        deployDefaultSettings(platform.record());
+    }
+
+private:
+    QTemporaryDir folder_;
+};
+
 int walk(const Invocation& invocation, const CommandLine& line)
 {
     const HeadlessWidgets application(invocation);
-    const QTemporaryDir folder;
-    QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder.path());
-    qt::QtPreviewOpener& opener = qt::installPreviewWindow();
     qt::QtPlatform& platform = qt::defaultPlatform();
-    platform.folders().setSystemDirectory(qt::toText(folder.path()));
-    deployDefaultSettings(platform.record());
+    const DemoSettings settings(platform);
+    qt::QtPreviewOpener& opener = qt::installPreviewWindow();
     DemoWindow demo(platform, samplesFolder(line));
     walkDemo(demo, opener, platform, line.value("walk"));
     return Done;
@@ -66,13 +81,13 @@ int walk(const Invocation& invocation, const CommandLine& line)
 
 int runDemo(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, { Options }, 0);
+    const CommandLine line(invocation.arguments, demoOptions(), 0);
     if (line.has("walk"))
         return walk(invocation, line);
     WindowedApplication application(invocation);
-    qt::QtPreviewOpener& opener = qt::installPreviewWindow();
     qt::QtPlatform& platform = qt::defaultPlatform();
-    prepareSettings(platform.record());
+    const DemoSettings settings(platform);
+    qt::QtPreviewOpener& opener = qt::installPreviewWindow();
     std::optional<StateLog> log;
     if (line.has("log"))
         log.emplace(line.value("log"), opener);
@@ -83,9 +98,12 @@ int runDemo(const Invocation& invocation)
 
 QString demoDetails()
 {
-    return QStringLiteral("Shows one form with a flex grid, a list view and a data grid on sample\n"
-                          "tables, each with a button that previews it.\n\n")
-        + optionHelp(Options);
+    return QStringLiteral(
+        "Shows one form with a flex grid, a list view and a data grid on sample\n"
+        "tables, each with its host code and a button that previews it; tables of\n"
+        "your own can be opened beside them. What its dialogs change is forgotten.\n");
 }
+
+OptionTables demoOptions() { return { Options }; }
 
 } // namespace pelloric::app

@@ -5,22 +5,32 @@
 
 #include "command_line.h"
 #include "controls/qt/kestrane.h"
-#include "grids/qt/data_view_grid.h"
+#include "demo_code/demo_code.h"
+#include "own_table.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "table_model.h"
 #include "table_source.h"
 #include "tables/qt/csv_table.h"
 #include "ui/qt/icon_set.h"
 
 #include <QCheckBox>
+#include <QClipboard>
+#include <QFile>
+#include <QFontDatabase>
+#include <QGridLayout>
 #include <QGroupBox>
+#include <QGuiApplication>
 #include <QHBoxLayout>
 #include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPlainTextEdit>
 #include <QPushButton>
+#include <QRegularExpression>
 #include <QSpinBox>
+#include <QSplitter>
 #include <QSqlTableModel>
 #include <QTabWidget>
 #include <QTableView>
@@ -30,7 +40,7 @@
 
 #include <algorithm>
 #include <initializer_list>
-#include <memory>
+#include <optional>
 
 namespace pelloric::app {
 
@@ -48,7 +58,7 @@ constexpr int ColumnAir = 18; ///< pixels
 
 constexpr int RowHeight = 24; ///< of the tables: pixels
 
-constexpr int FacadeSize = 28; ///< pixels
+constexpr int CodeShare = 2; ///< of five parts of a page's width
 
 /// The connection's name in the program.
 const QString Connection = QStringLiteral("samples");
@@ -82,6 +92,16 @@ QStringList titlesOf(const TableGrid& table)
     return titles;
 }
 
+/// The part of a file of host code that is shown.
+QString shownCode(const char* name)
+{
+    QFile file(QStringLiteral(":/demo_code/") + QLatin1String(name));
+    if (!file.open(QIODevice::ReadOnly))
+        return {};
+    const QString mark = QStringLiteral("//! [shown]\n");
+    return QString::fromUtf8(file.readAll()).section(mark, 1, 1).trimmed();
+}
+
 /// Columns as wide as what they hold, with some air; the report takes these widths.
 void fitColumns(QHeaderView& header)
 {
@@ -108,15 +128,22 @@ DemoWindow::DemoWindow(qt::QtPlatform& platform, const QString& samples)
     layout->addWidget(pages_, 1);
     layout->addWidget(makeReportBox());
     setCentralWidget(body);
-    addPage(QStringLiteral("FlexGrid"), tr("&Flex Grid"),
-        tr("A table widget: 178 wines in 15 columns, more than one sheet is wide."),
-        makeFlexGrid(samples + QStringLiteral("/wine.csv")));
-    addPage(QStringLiteral("ListView"), tr("&List View"),
-        tr("A tree widget in report mode: the countries of the world in English and Chinese."),
-        makeListView(samples + QStringLiteral("/countries-zh.csv")));
-    addPage(QStringLiteral("DataGrid"), tr("&Data Grid"),
-        tr("A table view on an SQL table, which is walked in place: time zones and their places."),
-        makeDataGrid(samples + QStringLiteral("/samples.sqlite")));
+    QTableWidget* const table = makeFlexGrid(samples + QStringLiteral("/wine.csv"));
+    addPage({ QStringLiteral("FlexGrid"), tr("&Flex Grid"),
+                tr("A table widget: 178 wines in 15 columns, more than one sheet is wide."),
+                "flex_grid.cpp", [=, this] { previewTable(*facade_, *table, footer_->text()); } },
+        table);
+    QTreeWidget* const list = makeListView(samples + QStringLiteral("/countries-zh.csv"));
+    addPage({ QStringLiteral("ListView"), tr("&List View"),
+                tr("A tree widget in report mode: the countries of the world in English and "
+                   "Chinese."),
+                "list_view.cpp", [=, this] { previewList(*facade_, *list, footer_->text()); } },
+        list);
+    QTableView* const view = makeDataGrid(samples + QStringLiteral("/samples.sqlite"));
+    addPage({ QStringLiteral("DataGrid"), tr("&Data Grid"),
+                tr("A table view on an SQL table: time zones and their places."), "data_grid.cpp",
+                [=, this] { previewQuery(*facade_, *view, footer_->text()); } },
+        view);
     resize(FirstSize);
 }
 
@@ -130,20 +157,32 @@ DemoWindow::~DemoWindow()
 
 QWidget* DemoWindow::makeHeading()
 {
+    auto* const row = new QWidget;
     auto* const heading = new QLabel(tr("Choose a table, say how it is to look, and preview it."));
     heading->setObjectName(QStringLiteral("labHeading"));
+    heading->setWordWrap(true);
     QFont font = heading->font();
     font.setPointSizeF(font.pointSizeF() * 1.25);
     heading->setFont(font);
-    return heading;
+    auto* const own = new QPushButton(
+        qt::libraryIcon(QStringLiteral("open"), palette()), tr("&Open your own table…"));
+    own->setObjectName(QStringLiteral("openTable"));
+    own->setToolTip(tr("A CSV or TSV file, or a table of an SQLite database"));
+    connect(own, &QPushButton::clicked, this, &DemoWindow::addOwnTable);
+    auto* const layout = new QHBoxLayout(row);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(heading, 1);
+    layout->addWidget(own);
+    return row;
 }
 
 QWidget* DemoWindow::makeReportBox()
 {
     auto* const box = new QGroupBox(tr("Report"));
     auto* const layout = new QHBoxLayout(box);
-    facade_->setToolTip(tr("The control Kestrane, which previews the tables"));
-    facade_->setFixedSize(FacadeSize, FacadeSize);
+    // A host places the control where it likes; it previews just as well when it is not shown.
+    facade_->setParent(box);
+    facade_->hide();
     showHeader_ = new QCheckBox(tr("Column &titles"));
     showHeader_->setObjectName(QStringLiteral("ShowHeader"));
     mergeGrid_ = new QCheckBox(tr("&Merge equal cells"));
@@ -156,10 +195,10 @@ QWidget* DemoWindow::makeReportBox()
     footer_->setObjectName(QStringLiteral("Footer"));
     auto* const rowLabel = new QLabel(tr("First &row:"));
     rowLabel->setBuddy(startRow_);
-    auto* const footerLabel = new QLabel(tr("F&ooter:"));
+    auto* const footerLabel = new QLabel(tr("Foot&er:"));
     footerLabel->setBuddy(footer_);
     for (QWidget* const part : std::initializer_list<QWidget*> {
-             facade_, showHeader_, mergeGrid_, rowLabel, startRow_, footerLabel })
+             showHeader_, mergeGrid_, rowLabel, startRow_, footerLabel })
         layout->addWidget(part);
     layout->addWidget(footer_, 1);
     layout->setSpacing(Margin);
@@ -171,31 +210,85 @@ QWidget* DemoWindow::makeReportBox()
     return box;
 }
 
-void DemoWindow::addPage(
-    const QString& name, const QString& title, const QString& about, QAbstractItemView* view)
+/// The Tab key goes from the grid on to its button.
+void DemoWindow::addPage(const Page& page, QAbstractItemView* view)
 {
-    auto* const page = new QWidget;
-    auto* const layout = new QVBoxLayout(page);
+    auto* const holder = new QWidget;
+    auto* const layout = new QVBoxLayout(holder);
     auto* const button
         = new QPushButton(qt::libraryIcon(QStringLiteral("whole-page"), palette()), tr("&Preview"));
-    button->setObjectName(QStringLiteral("preview") + name);
+    button->setObjectName(QStringLiteral("preview") + page.name);
     button->setAutoDefault(true);
-    view->setObjectName(name);
+    view->setObjectName(page.name);
     view->setAlternatingRowColors(true);
-    view->setAccessibleName(about);
+    view->setAccessibleName(page.about);
     auto* const top = new QHBoxLayout;
-    auto* const text = new QLabel(about);
+    auto* const text = new QLabel(page.about);
     text->setWordWrap(true);
     top->addWidget(text, 1);
     top->addWidget(button);
     layout->addLayout(top);
-    layout->addWidget(view, 1);
-    const QString header = QString(title).remove(QLatin1Char('&'));
-    connect(button, &QPushButton::clicked, this, [=, this] { preview(view, header); });
-    pages_->addTab(page, title);
+    auto* const parts = new QSplitter(Qt::Horizontal);
+    parts->addWidget(view);
+    parts->addWidget(makeCode(page));
+    parts->setStretchFactor(0, 5 - CodeShare);
+    parts->setStretchFactor(1, CodeShare);
+    layout->addWidget(parts, 1);
+    connect(button, &QPushButton::clicked, this, page.preview);
+    pages_->addTab(holder, page.title);
+    setTabOrder(view, button);
+    for (QWidget* const part : parts->widget(1)->findChildren<QWidget*>(
+             QRegularExpression(QStringLiteral("^(code|copy)"))))
+        setTabOrder(button, part);
 }
 
-QAbstractItemView* DemoWindow::makeFlexGrid(const QString& file)
+/// What a host writes for a page, to read and to copy.
+QWidget* DemoWindow::makeCode(const Page& page)
+{
+    auto* const box = new QWidget;
+    auto* const caption = new QLabel(tr("Host code:"));
+    auto* const code = new QPlainTextEdit(shownCode(page.code));
+    code->setObjectName(QStringLiteral("code") + page.name);
+    code->setReadOnly(true);
+    code->setTabChangesFocus(true);
+    code->setLineWrapMode(QPlainTextEdit::NoWrap);
+    code->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
+    code->setAccessibleName(tr("Host code"));
+    auto* const copy = new QPushButton(tr("&Copy"));
+    copy->setObjectName(QStringLiteral("copy") + page.name);
+    copy->setToolTip(tr("Copies the code to the clipboard"));
+    connect(copy, &QPushButton::clicked, code,
+        [code] { QGuiApplication::clipboard()->setText(code->toPlainText()); });
+    auto* const layout = new QGridLayout(box);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(caption, 0, 0);
+    layout->addWidget(copy, 0, 1);
+    layout->addWidget(code, 1, 0, 1, 2);
+    layout->setColumnStretch(0, 1);
+    return box;
+}
+
+/// Adds a page for a table that the person chooses.
+void DemoWindow::addOwnTable()
+{
+    std::optional<OwnTable> own = askOwnTable(*this);
+    if (!own)
+        return;
+    auto* const view = new QTableView;
+    const QString name = own->name;
+    view->setModel(new TableModel(std::move(own->table), view));
+    view->setTabKeyNavigation(false);
+    view->verticalHeader()->setDefaultSectionSize(RowHeight);
+    fitColumns(*view->horizontalHeader());
+    addPage({ QStringLiteral("OwnTable%1").arg(++ownTables_), QString(name).replace('&', "&&"),
+                tr("A table of your own: %1.").arg(name), "own_table.cpp",
+                [=, this] { previewView(*facade_, *view, name, footer_->text()); } },
+        view);
+    pages_->setCurrentIndex(pages_->count() - 1);
+    view->setFocus();
+}
+
+QTableWidget* DemoWindow::makeFlexGrid(const QString& file)
 {
     const TableGrid table = readSample(file);
     auto* const view = new QTableWidget(static_cast<int>(table.rowCount()), table.columnCount());
@@ -211,7 +304,7 @@ QAbstractItemView* DemoWindow::makeFlexGrid(const QString& file)
     return view;
 }
 
-QAbstractItemView* DemoWindow::makeListView(const QString& file)
+QTreeWidget* DemoWindow::makeListView(const QString& file)
 {
     const TableGrid table = readSample(file);
     auto* const view = new QTreeWidget;
@@ -227,7 +320,7 @@ QAbstractItemView* DemoWindow::makeListView(const QString& file)
     return view;
 }
 
-QAbstractItemView* DemoWindow::makeDataGrid(const QString& file)
+QTableView* DemoWindow::makeDataGrid(const QString& file)
 {
     database_ = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), Connection);
     database_.setConnectOptions(QStringLiteral("QSQLITE_OPEN_READONLY"));
@@ -246,18 +339,6 @@ QAbstractItemView* DemoWindow::makeDataGrid(const QString& file)
     view->verticalHeader()->setDefaultSectionSize(RowHeight);
     fitColumns(*view->horizontalHeader());
     return view;
-}
-
-void DemoWindow::preview(QAbstractItemView* view, const QString& title)
-{
-    facade_->AddHeader(title, pelloric::AlignmentType::LocLeft);
-    facade_->AddHeader(QStringLiteral("[Date Printed]"), pelloric::AlignmentType::LocRight);
-    facade_->AddFooter(footer_->text(), pelloric::AlignmentType::LocCenter);
-    auto* const table = qobject_cast<QTableView*>(view);
-    if (table != nullptr && view->objectName() == QLatin1String("DataGrid"))
-        facade_->doPreview(std::make_unique<qt::DataViewGrid>(*table));
-    else
-        facade_->doPreview(view);
 }
 
 } // namespace pelloric::app

@@ -6,11 +6,16 @@
 #include <QMainWindow>
 #include <QSqlDatabase>
 
+#include <functional>
+
 class QAbstractItemView;
 class QCheckBox;
 class QLineEdit;
 class QSpinBox;
 class QTabWidget;
+class QTableView;
+class QTableWidget;
+class QTreeWidget;
 
 namespace pelloric::qt {
 class Kestrane;
@@ -19,8 +24,8 @@ class QtPlatform;
 
 namespace pelloric::app {
 
-/// The demonstration: one form with a flex grid, a list view and a data grid on real tables, and
-/// one `Kestrane` that previews them.
+/// The demonstration: one form with a flex grid, a list view and a data grid on real tables, the
+/// host code of each beside it, and one `Kestrane` that previews them.
 class DemoWindow final : public QMainWindow {
     Q_OBJECT
 
@@ -31,18 +36,27 @@ public:
     DemoWindow(qt::QtPlatform& platform, const QString& samples);
     ~DemoWindow() override;
 
-    /// The pages of the form: "Flex Grid", "List View", "Data Grid".
+    /// The pages of the form: "Flex Grid", "List View", "Data Grid", then the person's own tables.
     QTabWidget& pages() { return *pages_; }
 
 private:
+    /// A page of the form.
+    struct Page {
+        QString name; ///< of its view; its button is "preview" and this
+        QString title; ///< of its tab
+        QString about; ///< what its table is
+        const char* code; ///< the file of its host code
+        std::function<void()> preview; ///< runs that code
+    };
+
     QWidget* makeHeading();
     QWidget* makeReportBox();
-    void addPage(
-        const QString& name, const QString& title, const QString& about, QAbstractItemView* view);
-    QAbstractItemView* makeFlexGrid(const QString& file);
-    QAbstractItemView* makeListView(const QString& file);
-    QAbstractItemView* makeDataGrid(const QString& file);
-    void preview(QAbstractItemView* view, const QString& title);
+    void addPage(const Page& page, QAbstractItemView* view);
+    QWidget* makeCode(const Page& page);
+    QTableWidget* makeFlexGrid(const QString& file);
+    QTreeWidget* makeListView(const QString& file);
+    QTableView* makeDataGrid(const QString& file);
+    void addOwnTable();
 
     QSqlDatabase database_;
     qt::Kestrane* facade_;
@@ -51,6 +65,7 @@ private:
     QCheckBox* mergeGrid_ = nullptr;
     QSpinBox* startRow_ = nullptr;
     QLineEdit* footer_ = nullptr;
+    int ownTables_ = 0;
 };
 
 } // namespace pelloric::app

@@ -16,6 +16,7 @@
 #include "progress_line.h"
 #include "report_builder.h"
 #include "report_options.h"
+#include "table_selection.h"
 #include "table_source.h"
 
 #include <QFileInfo>
@@ -164,7 +165,7 @@ void exportTable(
 
 int runExport(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, { Options, sourceOptions(), reportOptions() }, 1);
+    const CommandLine line(invocation.arguments, exportOptions(), 1);
     const Order order(line);
     if (isSameFile(order.file, order.out))
         throw CommandError(
@@ -185,10 +186,14 @@ int runExport(const Invocation& invocation)
 QString exportDetails()
 {
     return QStringLiteral(
-               "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
-               "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
-               "Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n\n")
-        + optionHelp(Options) + optionHelp(sourceOptions()) + optionHelp(reportOptions());
+        "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
+        "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
+        "Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n");
+}
+
+OptionTables exportOptions()
+{
+    return { Options, sourceOptions(), selectionOptions(), reportOptions() };
 }
 
 } // namespace pelloric::app

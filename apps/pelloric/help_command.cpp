@@ -3,12 +3,19 @@
 
 #include "command_line.h"
 #include "commands.h"
+#include "manual.h"
+
+#include <array>
 
 namespace pelloric::app {
 
 namespace {
 
 constexpr int SynopsisWidth = 24;
+
+constexpr auto Options = std::to_array<Option>({
+    { "man", nullptr, "write the manual page of the program" },
+});
 
 QString heading(const Command& command)
 {
@@ -31,13 +38,27 @@ QString overview()
             "\n\"pelloric help COMMAND\" says more, \"pelloric --version\" the version.\n");
 }
 
+/// What stands behind a command's summary.
+QString restOf(const Command& command)
+{
+    QString text;
+    if (command.details)
+        text += QLatin1Char('\n') + command.details();
+    if (!command.options)
+        return text;
+    text += QLatin1Char('\n');
+    for (const OptionTable table : command.options())
+        text += optionHelp(table);
+    return text;
+}
+
 QString detailsOf(const QString& name)
 {
     for (const Command& command : commands()) {
         if (name == QLatin1String(command.name)) {
             const QString text = heading(command) + QLatin1Char('\n')
                 + QString::fromUtf8(command.summary) + QStringLiteral(".\n");
-            return command.details ? text + QLatin1Char('\n') + command.details() : text;
+            return text + restOf(command);
         }
     }
     throw CommandError(
@@ -48,6 +69,10 @@ QString detailsOf(const QString& name)
 
 int runHelp(const Invocation& invocation)
 {
+    if (invocation.arguments == QStringList(QStringLiteral("--man"))) {
+        print(manualPage());
+        return Done;
+    }
     if (invocation.arguments.isEmpty()) {
         print(overview());
         return Done;
@@ -56,5 +81,7 @@ int runHelp(const Invocation& invocation)
         print(detailsOf(name));
     return Done;
 }
+
+OptionTables helpOptions() { return { Options }; }
 
 } // namespace pelloric::app

@@ -18,17 +18,21 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Commands = std::to_array<Command>({
-    { "demo", "", "Shows all kinds of grids on sample tables", runDemo, demoDetails },
-    { "preview", "FILE", "Shows a table in the preview window", runPreview, previewDetails },
-    { "open", "FILE.ostl", "Shows a saved document in the preview window", runOpen, openDetails },
+    { "demo", "", "Shows all kinds of grids on sample tables", runDemo, demoOptions, demoDetails },
+    { "preview", "FILE", "Shows a table in the preview window", runPreview, previewOptions,
+        previewDetails },
+    { "open", "FILE.ostl", "Shows a saved document in the preview window", runOpen, nullptr,
+        openDetails },
     { "export", "FILE -o OUT", "Writes a table as PDF, PNG, SVG or a document file", runExport,
-        exportDetails },
+        exportOptions, exportDetails },
     { "run", "SCRIPT.js [ARGUMENT...]", "Runs a script that drives the controls by name", runScript,
-        scriptDetails },
-    { "print", "FILE", "Prints a table or a document file", runPrint, printDetails },
-    { "printers", "", "Lists the printers", runPrinters, printersDetails },
-    { "settings", "", "Shows or restores the settings file", runSettings, settingsDetails },
-    { "help", "[COMMAND]", "Explains the commands", runHelp },
+        nullptr, scriptDetails },
+    { "print", "FILE", "Prints a table or a document file", runPrint, printOptions, printDetails },
+    { "printers", "", "Lists the printers", runPrinters, printersOptions, printersDetails },
+    { "settings", "", "Shows or restores the settings file", runSettings, settingsOptions },
+    { "completion", "SHELL", "Writes the completion of a shell: bash, zsh or fish", runCompletion,
+        nullptr, completionDetails },
+    { "help", "[COMMAND]", "Explains the commands", runHelp, helpOptions },
 });
 
 bool asksForHelp(const QString& argument)

@@ -10,6 +10,7 @@
 #include "progress_line.h"
 #include "report_builder.h"
 #include "report_options.h"
+#include "table_selection.h"
 #include "table_source.h"
 #include "ui/qt/preview_opener.h"
 #include "windows.h"
@@ -32,7 +33,7 @@ void prepareWidths(TableGrid& grid, const CommandLine& line, Platform platform)
 
 int runPreview(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, { sourceOptions(), reportOptions() }, 1);
+    const CommandLine line(invocation.arguments, previewOptions(), 1);
     if (isDocumentName(line.file(0)))
         throw CommandError(QStringLiteral("%1 is a saved document; show it with \"pelloric open\"")
                                .arg(line.file(0)),
@@ -63,8 +64,9 @@ QString previewDetails()
                           "SQLite database\n"
                           "(db.sqlite:table, or db.sqlite with --query). With one of the options "
                           "for headers,\n"
-                          "paper and so on, what the window's dialogs change is not kept.\n\n")
-        + optionHelp(sourceOptions()) + optionHelp(reportOptions());
+                          "paper and so on, what the window's dialogs change is not kept.\n");
 }
+
+OptionTables previewOptions() { return { sourceOptions(), selectionOptions(), reportOptions() }; }
 
 } // namespace pelloric::app

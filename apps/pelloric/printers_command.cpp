@@ -36,7 +36,7 @@ void listPapers(const qt::QtPrinterSystem& system)
 
 int runPrinters(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, { Options }, 0);
+    const CommandLine line(invocation.arguments, printersOptions(), 0);
     const HeadlessApplication application(invocation);
     qt::QtPrinterSystem system;
     const Text current = system.currentPrinter();
@@ -57,8 +57,9 @@ int runPrinters(const Invocation& invocation)
 
 QString printersDetails()
 {
-    return QStringLiteral("The printer with the star is used when none is named.\n\n")
-        + optionHelp(Options);
+    return QStringLiteral("The printer with the star is used when none is named.\n");
 }
+
+OptionTables printersOptions() { return { Options }; }
 
 } // namespace pelloric::app

@@ -48,7 +48,7 @@ QString settingsText(const Platform& platform)
 
 int runSettings(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, { Options }, 0);
+    const CommandLine line(invocation.arguments, settingsOptions(), 0);
     const HeadlessApplication application(invocation);
     qt::QtPlatform platform;
     const Platform record = platform.record();
@@ -65,6 +65,6 @@ int runSettings(const Invocation& invocation)
     return Done;
 }
 
-QString settingsDetails() { return optionHelp(Options); }
+OptionTables settingsOptions() { return { Options }; }
 
 } // namespace pelloric::app

@@ -7,6 +7,7 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "progress_line.h"
+#include "table_selection.h"
 #include "tables/qt/csv_table.h"
 #include "tables/qt/sqlite_table.h"
 
@@ -25,13 +26,6 @@ constexpr auto Options = std::to_array<Option>({
 });
 
 constexpr char DatabaseMark[] = "SQLite format 3";
-
-bool isDatabase(const QString& name)
-{
-    QFile file(name);
-    return QFileInfo(name).isFile() && file.open(QIODevice::ReadOnly)
-        && file.read(sizeof DatabaseMark - 1) == DatabaseMark;
-}
 
 /// A database file and one of its tables; no table when the name is all file. Both may hold colons:
 /// the longest name of a file that there is counts.
@@ -103,6 +97,13 @@ OptionTable sourceOptions() { return Options; }
 
 std::filesystem::path pathOf(const QString& name) { return qt::toText(name); }
 
+bool isDatabase(const QString& name)
+{
+    QFile file(name);
+    return QFileInfo(name).isFile() && file.open(QIODevice::ReadOnly)
+        && file.read(sizeof DatabaseMark - 1) == DatabaseMark;
+}
+
 bool isDocumentName(const QString& name)
 {
     return name.endsWith(QLatin1String(".ostl"), Qt::CaseInsensitive);
@@ -128,8 +129,9 @@ TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& 
     if (!isFromDatabase && !name.table.isEmpty())
         throw CommandError(QStringLiteral("%1 is no SQLite database").arg(name.file));
     try {
-        return isFromDatabase ? readDatabase(name, line, progress)
-                              : readValues(name.file, line, progress);
+        return selected(isFromDatabase ? readDatabase(name, line, progress)
+                                       : readValues(name.file, line, progress),
+            line);
     } catch (const RunTimeError& error) {
         if (error.number() == ErrorNumber::Cancelled)
             throw;

@@ -18,6 +18,9 @@ OptionTable sourceOptions();
 /// A path as the person wrote it.
 std::filesystem::path pathOf(const QString& name);
 
+/// Whether a file is an SQLite database.
+bool isDatabase(const QString& name);
+
 /// Whether a name is that of a document file.
 bool isDocumentName(const QString& name);
 

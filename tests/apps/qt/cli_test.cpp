@@ -304,4 +304,113 @@ TEST_F(Program, SaysInOneLineThatAPictureCannotBeWritten)
 
 #endif
 
+TEST_F(Program, TakesTheColumnsAndRowsThatAreAskedForInTheirOrder)
+{
+    folder_.write("t.csv", "Name,Size,Town\nb,10,Y\na,9,X\nd,x,Y\nc,-1,X\n");
+    struct Case {
+        const char* options;
+        const char* text;
+    };
+    const Case cases[] = {
+        { "--columns Town,Name",
+            "TownName"
+            "Yb"
+            "Xa"
+            "Yd"
+            "Xc" },
+        { "--columns #3,size --rows 2-3",
+            "TownSize"
+            "X9"
+            "Yx" },
+        { "--columns Name --sort Size",
+            "Name"
+            "c"
+            "a"
+            "b"
+            "d" },
+        { "--columns Name --sort Size:desc --rows -2",
+            "Name"
+            "d"
+            "b" },
+        { "--columns Name --sort Town,Name:desc",
+            "Name"
+            "c"
+            "a"
+            "d"
+            "b" },
+        { "--columns Name --rows 4",
+            "Name"
+            "c" },
+        { "--columns Name --rows 3-",
+            "Name"
+            "d"
+            "c" },
+    };
+    for (const Case& row : cases) {
+        const Ended ended
+            = run(words("export t.csv -o t.pdf --footer-center . ") + words(row.options));
+        EXPECT_EQ(ended.status, 0) << ended.errors;
+        std::string text = pdfText("t.pdf");
+        std::erase_if(text, [](char c) { return c == ' ' || c == '\n' || c == '\f'; });
+        EXPECT_TRUE(has(text, row.text)) << row.options << ": " << text;
+    }
+    const Ended unknown = run(words("export t.csv -o u.pdf --columns Nam"));
+    EXPECT_EQ(unknown.status, 2);
+    EXPECT_EQ(unknown.errors,
+        "pelloric: --columns: there is no column \"Nam\"; the table has Name, Size, Town\n");
+    EXPECT_EQ(run(words("export t.csv -o u.pdf --rows 5-9")).errors,
+        "pelloric: --rows 5-9 names no row; the table has 4\n");
+    EXPECT_EQ(run(words("export t.csv -o u.pdf --rows x")).status, 2);
+}
+
+TEST_F(Program, CompletesItsCommandsAndOptionsInBash)
+{
+    const std::string file = folder_.file("pelloric.bash").string();
+    folder_.write("pelloric.bash", run(words("completion bash")).output);
+    const auto completed = [&](const QString& typed) {
+        QProcess bash;
+        bash.start(QStringLiteral("bash"),
+            { QStringLiteral("-c"),
+                QStringLiteral("cd %1; . ./pelloric.bash; COMP_WORDS=(%2); "
+                               "COMP_CWORD=$((${#COMP_WORDS[@]} - 1)); _pelloric; "
+                               "printf '%s ' \"${COMPREPLY[@]}\"")
+                    .arg(QString::fromStdString(folder_.path().string()), typed) });
+        bash.waitForFinished();
+        return bash.readAllStandardOutput().trimmed().toStdString();
+    };
+    EXPECT_EQ(completed(QStringLiteral("pelloric ex")), "export");
+    EXPECT_EQ(completed(QStringLiteral("pelloric export --head")),
+        "--header-left --header-center --header-right");
+    EXPECT_EQ(completed(QStringLiteral("pelloric export pell")), "pelloric.bash");
+    EXPECT_EQ(completed(QStringLiteral("pelloric completion z")), "zsh");
+}
+
+TEST_F(Program, NamesEveryOptionInItsManualAndCompletions)
+{
+    const std::string manual = run(words("help --man")).output;
+    const std::string zsh = run(words("completion zsh")).output;
+    const std::string fish = run(words("completion fish")).output;
+    EXPECT_TRUE(manual.starts_with(".TH PELLORIC 1"));
+    int options = 0;
+    for (const QString& command : words("demo preview export print printers settings")) {
+        const QString help
+            = QString::fromStdString(run({ QStringLiteral("help"), command }).output);
+        for (const QString& line : help.split(QLatin1Char('\n'))) {
+            if (!line.startsWith(QStringLiteral("  -")))
+                continue;
+            ++options;
+            std::string name = line.trimmed().section(QLatin1Char(' '), 0, 0).toStdString();
+            EXPECT_TRUE(has(zsh, "'" + name + "[")) << name;
+            const std::size_t start = name.find_first_not_of('-');
+            EXPECT_TRUE(has(fish, (start == 1 ? " -s " : " -l ") + name.substr(start) + " "))
+                << name;
+            for (std::size_t at = 0; (at = name.find('-', at)) != std::string::npos; at += 2)
+                name.insert(at, "\\");
+            EXPECT_TRUE(has(manual, "\\fB" + name + "\\fR")) << name;
+        }
+    }
+    EXPECT_GT(options, 40);
+    EXPECT_EQ(run(words("completion tcsh")).status, 2);
+}
+
 } // namespace pelloric::qt

@@ -1,0 +1,185 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "table_selection.h"
+
+#include "platform/numbers.h"
+#include "platform/qt/qt_text.h"
+
+#include <QCollator>
+
+#include <algorithm>
+#include <array>
+#include <numeric>
+#include <vector>
+
+namespace pelloric::app {
+
+namespace {
+
+constexpr auto Options = std::to_array<Option>({
+    { "columns", "NAME,...", "only these columns, in this order; #3 is the third" },
+    { "sort", "NAME,...", "sort the rows by these columns; NAME:desc downwards" },
+    { "rows", "A-B", "only these rows, from 1, after sorting; 100- and -100 work, too" },
+});
+
+/// The parts of a list with commas; a part in double quotes may hold commas itself.
+QStringList partsOf(const QString& list)
+{
+    QStringList parts { QString() };
+    bool isQuoted = false;
+    for (const QChar character : list) {
+        if (character == QLatin1Char('"'))
+            isQuoted = !isQuoted;
+        else if (character == QLatin1Char(',') && !isQuoted)
+            parts.append(QString());
+        else
+            parts.back().append(character);
+    }
+    for (QString& part : parts)
+        part = part.trimmed();
+    return parts;
+}
+
+QStringList titlesOf(const TableGrid& table)
+{
+    QStringList titles;
+    for (int column = 0; column < table.columnCount(); ++column)
+        titles.append(qt::toQString(table.column(column).title).trimmed());
+    return titles;
+}
+
+/// The first column of a title, whatever its letter case where no other has it exactly.
+int columnNamed(const QString& name, const QStringList& titles, const char* option)
+{
+    bool isNumber = false;
+    const int number = name.startsWith(QLatin1Char('#')) ? name.mid(1).toInt(&isNumber) : 0;
+    if (isNumber && number >= 1 && number <= titles.size())
+        return number - 1;
+    const auto exact = titles.indexOf(name);
+    if (exact >= 0)
+        return static_cast<int>(exact);
+    for (int column = 0; column < titles.size(); ++column) {
+        if (titles.at(column).compare(name, Qt::CaseInsensitive) == 0)
+            return column;
+    }
+    constexpr int MostTold = 20;
+    QString known = titles.mid(0, MostTold).join(QStringLiteral(", "));
+    if (titles.size() > MostTold)
+        known += QStringLiteral(", …");
+    throw CommandError(QStringLiteral("--%1: there is no column \"%2\"; the table has %3")
+                           .arg(QLatin1String(option), name, known),
+        WrongUsage);
+}
+
+std::vector<int> columnsOf(const CommandLine& line, const QStringList& titles)
+{
+    std::vector<int> columns;
+    if (!line.has("columns")) {
+        columns.resize(static_cast<std::size_t>(titles.size()));
+        std::iota(columns.begin(), columns.end(), 0);
+        return columns;
+    }
+    for (const QString& name : partsOf(line.value("columns")))
+        columns.push_back(columnNamed(name, titles, "columns"));
+    return columns;
+}
+
+/// What a row is sorted by in one column: numbers by size before texts, these as the locale has it.
+struct SortKey {
+    bool isText = false;
+    double number = 0;
+    QCollatorSortKey text;
+};
+
+void sortBy(const TableGrid& table, int column, bool isDown, std::vector<std::int64_t>& rows)
+{
+    QCollator collator;
+    collator.setNumericMode(true);
+    std::vector<SortKey> keys;
+    keys.reserve(rows.size());
+    for (std::int64_t row = 0; row < table.rowCount(); ++row) {
+        const TextView cell = table.cell(row, column);
+        const bool isText = !isNumber(cell);
+        keys.push_back({ isText, isText ? 0 : leadingNumber(cell),
+            collator.sortKey(isText ? qt::toQString(cell) : QString()) });
+    }
+    const auto isBefore = [&keys, isDown](std::int64_t one, std::int64_t other) {
+        const SortKey& first = keys[static_cast<std::size_t>(isDown ? other : one)];
+        const SortKey& second = keys[static_cast<std::size_t>(isDown ? one : other)];
+        if (first.isText != second.isText)
+            return second.isText;
+        return first.isText ? first.text < second.text : first.number < second.number;
+    };
+    std::stable_sort(rows.begin(), rows.end(), isBefore);
+}
+
+/// The last column that is named matters least, so it is sorted by first.
+void sortRows(const TableGrid& table, const CommandLine& line, const QStringList& titles,
+    std::vector<std::int64_t>& rows)
+{
+    QStringList names = partsOf(line.value("sort"));
+    std::reverse(names.begin(), names.end());
+    for (QString name : names) {
+        const bool isDown = name.endsWith(QLatin1String(":desc"), Qt::CaseInsensitive);
+        if (isDown || name.endsWith(QLatin1String(":asc"), Qt::CaseInsensitive))
+            name.truncate(name.lastIndexOf(QLatin1Char(':')));
+        sortBy(table, columnNamed(name.trimmed(), titles, "sort"), isDown, rows);
+    }
+}
+
+/// Keeps the rows of a range: "5", "5-9", "5-", "-9".
+void cutRows(const QString& range, std::vector<std::int64_t>& rows)
+{
+    const auto dash = range.indexOf(QLatin1Char('-'));
+    const auto end = [&](const QString& text, std::int64_t missing) {
+        bool isNumber = false;
+        const qlonglong number = text.trimmed().toLongLong(&isNumber);
+        if (text.trimmed().isEmpty() && dash >= 0)
+            return missing;
+        if (!isNumber || number < 1)
+            throw CommandError(
+                QStringLiteral("--rows takes a range such as 1-100, not \"%1\"").arg(range),
+                WrongUsage);
+        return static_cast<std::int64_t>(number);
+    };
+    const auto count = static_cast<std::int64_t>(rows.size());
+    const std::int64_t first = end(dash < 0 ? range : range.left(dash), 1);
+    const std::int64_t last = dash < 0 ? first : end(range.mid(dash + 1), count);
+    if (first > last || first > count)
+        throw CommandError(
+            QStringLiteral("--rows %1 names no row; the table has %2").arg(range).arg(count));
+    rows.resize(static_cast<std::size_t>(std::min(last, count)));
+    rows.erase(rows.begin(), rows.begin() + (first - 1));
+}
+
+} // namespace
+
+OptionTable selectionOptions() { return Options; }
+
+TableGrid selected(TableGrid table, const CommandLine& line)
+{
+    if (!line.has("columns") && !line.has("sort") && !line.has("rows"))
+        return table;
+    const QStringList titles = titlesOf(table);
+    const std::vector<int> columns = columnsOf(line, titles);
+    std::vector<std::int64_t> rows(static_cast<std::size_t>(table.rowCount()));
+    std::iota(rows.begin(), rows.end(), 0);
+    if (line.has("sort"))
+        sortRows(table, line, titles, rows);
+    if (line.has("rows"))
+        cutRows(line.value("rows").trimmed(), rows);
+    std::vector<TableColumn> taken;
+    for (const int column : columns)
+        taken.push_back(table.column(column));
+    TableGrid result(std::move(taken));
+    std::vector<TextView> cells(columns.size());
+    for (const std::int64_t row : rows) {
+        for (std::size_t at = 0; at < columns.size(); ++at)
+            cells[at] = table.cell(row, columns[at]);
+        result.addRow(cells);
+    }
+    return result;
+}
+
+} // namespace pelloric::app
