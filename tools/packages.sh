@@ -58,6 +58,14 @@ PackagesCheck=(
     reuse
 )
 
+# Makes and judges the Debian packages.
+PackagesPackage=(
+    desktop-file-utils
+    dpkg-dev
+    file
+    lintian
+)
+
 # fail TEXT: ends the script with one line on standard error.
 fail() {
     printf '%s: %s\n' "${0##*/}" "$1" >&2
@@ -106,7 +114,7 @@ aptGet() {
     return "$status"
 }
 
-# needPackages GROUP...: installs what is missing of the groups build, test, bench and check.
+# needPackages GROUP...: installs what is missing of the groups build, test, bench, check, package.
 needPackages() {
     local group list package missing=()
     for group in "$@"; do

@@ -6,6 +6,7 @@
 #include "platform/run_time_error.h"
 #include "print/paper_names.h"
 #include "print/print_job.h"
+#include "print/qt/beside.h"
 #include "print/qt/print_calls.h"
 #include "print/qt/private_cups.h"
 #include "print/qt/qt_printing.h"
@@ -18,12 +19,10 @@
 #include <QElapsedTimer>
 #include <QLabel>
 #include <QTest>
-#include <QTimer>
 #include <QTreeWidget>
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <atomic>
 #include <thread>
 
@@ -36,25 +35,6 @@ using std::chrono::milliseconds;
 constexpr qint64 Deadline = 3000;
 constexpr qint64 Slack = 7000; ///< for a loaded machine
 constexpr qint64 LongestPause = 1500; ///< 300 on a machine that does nothing else: milliseconds
-
-/// The longest time in which the event loop did not come round.
-class LoopWatch {
-public:
-    LoopWatch()
-    {
-        since_.start();
-        QObject::connect(
-            &timer_, &QTimer::timeout, [this] { longest_ = std::max(longest_, since_.restart()); });
-        timer_.start(10);
-    }
-
-    qint64 longest() const { return std::max(longest_, since_.elapsed()); }
-
-private:
-    QTimer timer_;
-    QElapsedTimer since_;
-    qint64 longest_ = 0;
-};
 
 class SilentSystemTest : public testing::Test {
 protected:
@@ -101,7 +81,7 @@ TEST_F(SilentSystemTest, PrintingEndsInWordsAndTheLoopGoesRoundMeanwhile)
 {
     PageDocument document;
     addText(document, { 100, 100 }, u"one");
-    const LoopWatch watch;
+    const Beside watch;
     QElapsedTimer timer;
     timer.start();
     try {
@@ -127,7 +107,7 @@ TEST_F(SilentSystemTest, PageSetupOpensAtOnceWithTheStandardPapersAndThenSaysWhy
     auto* const list = dialog.findChild<QTreeWidget*>(QStringLiteral("ListView1"));
     EXPECT_EQ(list->topLevelItemCount(), static_cast<int>(standardPaperForms().size()));
     EXPECT_EQ(hintOf(dialog, "labPapersHint"), "");
-    const LoopWatch watch;
+    const Beside watch;
     ASSERT_TRUE(QTest::qWaitFor(
         [&] { return !hintOf(dialog, "labPapersHint").isEmpty(); }, Deadline + Slack));
     EXPECT_TRUE(hintOf(dialog, "labPapersHint").contains(QStringLiteral("does not answer")));
