@@ -12,6 +12,7 @@
 #include <QThread>
 
 #include <cups/cups.h>
+#include <cups/ppd.h>
 
 #include <memory>
 
@@ -111,7 +112,8 @@ public:
 
     bool open()
     {
-        if (!file_->open())
+        // Without such a folder the name would be one of the root.
+        if (QDir::tempPath().isEmpty() || !file_->open())
             return false;
         writer_ = std::make_unique<QPdfWriter>(file_.get());
         writer_->setResolution(Resolution);
@@ -200,21 +202,25 @@ bool asksForPassword(const QString& printer)
     return !required.isEmpty() && required != "none" && required != "negotiate";
 }
 
+// Only the description of the printer says which way its pages are turned, and it is read with the
+// print system's older functions.
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wdeprecated-declarations"
+
 bool turnsClockwise(const QString& printer)
 {
-    const Destination destination = destinationOf(printer);
-    if (!destination)
+    const char* const name = cupsGetPPD(queueOf(printer).toLocal8Bit());
+    if (name == nullptr)
         return false;
-    cups_dinfo_t* const info = cupsCopyDestInfo(CUPS_HTTP_DEFAULT, destination.get());
-    if (info == nullptr)
-        return false;
-    ipp_attribute_t* const preferred = cupsFindDestDefault(
-        CUPS_HTTP_DEFAULT, destination.get(), info, "landscape-orientation-requested-preferred");
-    const bool isReverse
-        = preferred != nullptr && ippGetInteger(preferred, 0) == IPP_ORIENT_REVERSE_LANDSCAPE;
-    cupsFreeDestInfo(info);
-    return isReverse;
+    const QString file = QFile::decodeName(name);
+    ppd_file_t* const description = ppdOpenFile(name);
+    const bool isClockwise = description != nullptr && description->landscape < 0;
+    ppdClose(description);
+    QFile::remove(file);
+    return isClockwise;
 }
+
+#pragma GCC diagnostic pop
 
 std::unique_ptr<SpoolDocument> newSpoolDocument(const SpoolOrder& order)
 {
