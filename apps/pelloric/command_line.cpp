@@ -8,6 +8,7 @@
 
 #include <QCommandLineOption>
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 #include <cstdio>
@@ -50,11 +51,11 @@ CommandLine::CommandLine(
     if (!parser_.parse(QStringList(QString()) + arguments))
         throw CommandError(parser_.errorText(), WrongUsage);
     const auto given = parser_.positionalArguments().size();
-    if (given > files)
+    if (files != OneOrMore && given > files)
         throw CommandError(QStringLiteral("one argument too many: %1; quote names with blanks")
                                .arg(parser_.positionalArguments().at(files)),
             WrongUsage);
-    if (given < files)
+    if (given < std::max(files, files == OneOrMore ? 1 : 0))
         throw CommandError(QStringLiteral("the file is missing"), WrongUsage);
 }
 

@@ -45,10 +45,13 @@ struct Option {
 
 using OptionTable = std::span<const Option>;
 
+/// Stands for the number of files of a command that takes one or more.
+inline constexpr int OneOrMore = -1;
+
 /// The arguments of a command, taken apart.
 class CommandLine {
 public:
-    /// @param files  how many arguments that are no options are needed
+    /// @param files  how many arguments that are no options are needed; or `OneOrMore`
     /// @throws CommandError WrongUsage: unknown options, missing values, another number of files
     CommandLine(const QStringList& arguments, const std::vector<OptionTable>& tables, int files);
 
@@ -56,6 +59,9 @@ public:
 
     /// The value of an option, the last one given; empty when it was not given.
     QString value(const char* option) const;
+
+    /// The arguments that are no options.
+    QStringList files() const { return parser_.positionalArguments(); }
 
     QString file(int number) const { return parser_.positionalArguments().at(number); }
 

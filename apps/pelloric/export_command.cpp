@@ -4,11 +4,13 @@
 #include "command_line.h"
 #include "commands.h"
 #include "controls/canvas.h"
+#include "document/append_pages.h"
 #include "document/ostl_format.h"
 #include "document/ostl_writer.h"
 #include "export/qt/page_export.h"
 #include "headless.h"
 #include "interruption.h"
+#include "outcome.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
@@ -19,7 +21,10 @@
 #include "table_selection.h"
 #include "table_source.h"
 
+#include <QDir>
+#include <QFile>
 #include <QFileInfo>
+#include <QTemporaryDir>
 
 #include <algorithm>
 #include <array>
@@ -30,10 +35,15 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "o", "OUT", "where to: a name that ends in .pdf, .png, .svg or .ostl" },
+    { "o", "OUT", "where to: a name that ends in .pdf, .png, .svg or .ostl; a folder; or -" },
+    { "join", nullptr, "several inputs into one file, one behind the other" },
+    { "format", "NAME", "pdf, png, svg or ostl, for a folder or - (pdf)" },
     { "pages", "LIST", "only these pages: 1,3,5-12" },
     { "dpi", "N", "pixels an inch of .png images (150)" },
 });
+
+/// The name that stands for the standard output.
+const QString StandardOutput = QStringLiteral("-");
 
 constexpr double LeastDpi = 10;
 constexpr double MostDpi = 2400;
@@ -69,7 +79,7 @@ void writeDocument(const Export& job)
         job.options, job.path);
     const int leftOut = job.document.Totalpages - 1 - ostl::LastPageIndex;
     if (leftOut > 0)
-        tell(QStringLiteral("a document file holds %1 pages; the last %2 were left out")
+        note(QStringLiteral("a document file holds %1 pages; the last %2 were left out")
                  .arg(ostl::LastPageIndex + 1)
                  .arg(leftOut));
 }
@@ -89,28 +99,51 @@ constexpr auto Formats = std::to_array<Format>({
     { "ostl", writeDocument, false, false },
 });
 
+const Format* findFormat(const QString& name)
+{
+    for (const Format& format : Formats) {
+        if (name.compare(QLatin1String(format.extension), Qt::CaseInsensitive) == 0)
+            return &format;
+    }
+    return nullptr;
+}
+
+/// @param name  empty: the first of all
+const Format& formatNamed(const QString& name)
+{
+    const Format* const format = name.isEmpty() ? &Formats.front() : findFormat(name);
+    if (!format)
+        throw CommandError(
+            QStringLiteral("--format takes pdf, png, svg or ostl, not \"%1\"").arg(name),
+            WrongUsage);
+    return *format;
+}
+
 const Format& formatOf(const QString& out)
 {
-    const QString extension = QFileInfo(out).suffix().toLower();
-    for (const Format& format : Formats) {
-        if (extension == QLatin1String(format.extension))
-            return format;
-    }
-    throw CommandError(
-        QStringLiteral("%1: the name must end in .pdf, .png, .svg or .ostl").arg(out), WrongUsage);
+    const Format* const format = findFormat(QFileInfo(out).suffix());
+    if (!format)
+        throw CommandError(
+            QStringLiteral("%1: the name must end in .pdf, .png, .svg or .ostl").arg(out),
+            WrongUsage);
+    return *format;
 }
 
 /// What the options say, checked before anything is read.
 struct Order {
     explicit Order(const CommandLine& line)
-        : file(line.file(0))
+        : files(line.files())
         , out(line.value("o"))
+        , isJoined(line.has("join"))
     {
         if (out.isEmpty())
             throw CommandError(
                 QStringLiteral("say where to export to: -o OUT.pdf, .png, .svg or .ostl"),
                 WrongUsage);
-        format = &formatOf(out);
+        if (line.has("format") || isFolder() || out == StandardOutput)
+            format = &formatNamed(line.has("format") ? line.value("format") : QString());
+        else
+            format = &formatOf(out);
         if (line.has("pages") && !format->takesPages)
             throw CommandError(
                 QStringLiteral("--pages is for .pdf, .png and .svg; a document file holds all"),
@@ -119,67 +152,176 @@ struct Order {
             throw CommandError(QStringLiteral("--dpi is for .png images"), WrongUsage);
         if (line.has("dpi"))
             dpi = static_cast<int>(numberOf("dpi", line.value("dpi"), LeastDpi, MostDpi, true));
+        if (out == StandardOutput && line.has("json"))
+            throw CommandError(
+                QStringLiteral("-o - and --json both want the standard output"), WrongUsage);
     }
 
-    QString file;
+    /// Whether every input gets a file of its own in the folder `out`.
+    bool isFolder() const
+    {
+        return !isJoined
+            && (files.size() > 1 || out.endsWith(QLatin1Char('/')) || QFileInfo(out).isDir());
+    }
+
+    QStringList files;
     QString out;
+    bool isJoined;
     const Format* format = nullptr;
     int dpi = qt::ExportOptions().dpi;
 };
 
-void exportPages(const Order& order, const CommandLine& line, const PageDocument& document,
-    const PageSetup& setup, qt::QtPlatform& platform, ProgressLine& progress)
-{
-    qt::ExportOptions options;
-    options.pages = pagesOf(line.value("pages"), document.Totalpages);
-    options.dpi = order.dpi;
-    options.title = qt::toText(line.has("title") ? line.value("title") : plainName(order.file));
-    options.progress = [&](int done, int total) {
-        progress.show("Writing", static_cast<double>(done) / std::max(1, total));
-        return Interruption::mayGoOn();
-    };
-    order.format->write({ document, setup, platform, options, pathOf(order.out) });
-}
+/// Laid-out pages and what is told of them.
+struct Laid {
+    PageDocument document;
+    PageSetup setup;
+    QJsonObject facts;
+};
 
-/// A saved document: its pages are put out as they are.
-void exportDocument(
-    const Order& order, const CommandLine& line, qt::QtPlatform& platform, ProgressLine& progress)
+/// The pages of a saved document as they are, or of a table.
+Laid layOut(
+    const QString& file, const CommandLine& line, qt::QtPlatform& platform, ProgressLine& progress)
 {
-    const SavedDocument saved = readDocument(order.file, line, platform.record());
-    exportPages(order, line, saved.document, saved.setup, platform, progress);
-}
-
-void exportTable(
-    const Order& order, const CommandLine& line, qt::QtPlatform& platform, ProgressLine& progress)
-{
-    auto grid = std::make_unique<TableGrid>(readTable(order.file, line, progress));
+    if (isDocumentName(file)) {
+        SavedDocument saved = readDocument(file, line, platform.record());
+        return { std::move(saved.document), saved.setup, {} };
+    }
+    auto grid = std::make_unique<TableGrid>(readTable(file, line, progress));
+    const auto rows = static_cast<qint64>(grid->rowCount());
     const PrivateSettings settings(platform, line);
     Platform record = platform.record();
     Canvas canvas(record);
     buildReport(canvas, *grid, line, progress);
-    grid.reset();
-    exportPages(order, line, canvas.document(), canvas.page, platform, progress);
+    const QJsonObject facts { { QStringLiteral("rows"), rows },
+        { QStringLiteral("columns"), grid->columnCount() },
+        { QStringLiteral("bands"), static_cast<qint64>(canvas.table()->ColumnBands.size()) } };
+    return { std::move(canvas.document()), canvas.page, facts };
+}
+
+void write(const Order& order, const CommandLine& line, const Laid& laid, const QString& title,
+    const QString& out, qt::QtPlatform& platform, ProgressLine& progress)
+{
+    qt::ExportOptions options;
+    options.pages = pagesOf(line.value("pages"), laid.document.Totalpages);
+    options.dpi = order.dpi;
+    options.title = qt::toText(line.has("title") ? line.value("title") : title);
+    options.progress = [&](int done, int total) {
+        progress.show("Writing", static_cast<double>(done) / std::max(1, total));
+        return Interruption::mayGoOn();
+    };
+    order.format->write({ laid.document, laid.setup, platform, options, pathOf(out) });
+}
+
+void refuseOverwriting(const QString& file, const QString& out)
+{
+    if (isSameFile(file, out))
+        throw CommandError(
+            QStringLiteral("%1 is the file that is read; export to another one").arg(out));
+}
+
+void tellMade(const Outcome& outcome, const Order& order, const QString& input, const QString& out,
+    const Laid& laid)
+{
+    QJsonObject facts = laid.facts;
+    facts.insert(QStringLiteral("input"), input);
+    facts.insert(QStringLiteral("file"), out);
+    facts.insert(QStringLiteral("format"), QLatin1String(order.format->extension));
+    facts.insert(QStringLiteral("pages"), laid.document.Totalpages);
+    outcome.tellMade(facts);
+}
+
+/// The file of an input in the folder; a second one of the same name gets a number.
+QString placeIn(
+    const QString& folder, const QString& name, const Format& format, QStringList& taken)
+{
+    const QString suffix = QLatin1Char('.') + QLatin1String(format.extension);
+    QString file = name + suffix;
+    for (int number = 2; taken.contains(file); ++number)
+        file = QStringLiteral("%1-%2").arg(name).arg(number) + suffix;
+    taken.append(file);
+    return QDir(folder).filePath(file);
+}
+
+void exportEach(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
+    ProgressLine& progress, const Outcome& outcome)
+{
+    if (order.isFolder() && !QDir().mkpath(order.out))
+        throw CommandError(QStringLiteral("%1: the folder cannot be made").arg(order.out));
+    QStringList taken;
+    for (const QString& file : order.files) {
+        const QString name = plainName(file);
+        const QString out
+            = order.isFolder() ? placeIn(order.out, name, *order.format, taken) : order.out;
+        refuseOverwriting(file, out);
+        const Laid laid = layOut(file, line, platform, progress);
+        write(order, line, laid, name, out, platform, progress);
+        tellMade(outcome, order, file, out, laid);
+    }
+}
+
+void exportJoined(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
+    ProgressLine& progress, const Outcome& outcome)
+{
+    Laid joined;
+    bool isFirst = true;
+    for (const QString& file : order.files) {
+        refuseOverwriting(file, order.out);
+        const Laid laid = layOut(file, line, platform, progress);
+        if (!isFirst
+            && (laid.setup.myWidth != joined.setup.myWidth
+                || laid.setup.myHeight != joined.setup.myHeight))
+            throw CommandError(
+                QStringLiteral("%1 has pages of another size; --join wants one size").arg(file));
+        joined.setup = laid.setup;
+        appendPages(joined.document, laid.document, isFirst);
+        isFirst = false;
+    }
+    write(order, line, joined, plainName(order.files.front()), order.out, platform, progress);
+    tellMade(outcome, order, order.files.join(QLatin1Char(' ')), order.out, joined);
+}
+
+/// What is written for the standard output is complete before the first byte goes there.
+void exportToOutput(Order order, const CommandLine& line, qt::QtPlatform& platform,
+    ProgressLine& progress, const Outcome& outcome)
+{
+    const QTemporaryDir folder;
+    order.out = folder.filePath(QStringLiteral("out.") + QLatin1String(order.format->extension));
+    if (order.files.size() > 1)
+        exportJoined(order, line, platform, progress, outcome);
+    else
+        exportEach(order, line, platform, progress, outcome);
+    QFile file(order.out);
+    if (!file.open(QIODevice::ReadOnly))
+        throw CommandError(QStringLiteral("several pages as .%1 do not go into one output; name a "
+                                          "file, or a page with --pages")
+                               .arg(QLatin1String(order.format->extension)),
+            WrongUsage);
+    QFile output;
+    const QByteArray bytes = file.readAll();
+    if (!output.open(stdout, QIODevice::WriteOnly) || output.write(bytes) != bytes.size()
+        || !output.flush())
+        throw CommandError(QStringLiteral("standard output cannot be written"));
 }
 
 } // namespace
 
 int runExport(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, exportOptions(), 1);
+    const CommandLine line(invocation.arguments, exportOptions(), OneOrMore);
     const Order order(line);
-    if (isSameFile(order.file, order.out))
-        throw CommandError(
-            QStringLiteral("%1 is the file that is read; export to another one").arg(order.out));
+    const Outcome outcome(line);
     const HeadlessApplication application(invocation);
     qt::QtPlatform platform;
     qt::StreamMessages messages;
     platform.useMessages(messages);
     const Interruption interruption(platform.loop());
     ProgressLine progress;
-    if (isDocumentName(order.file))
-        exportDocument(order, line, platform, progress);
+    if (order.out == StandardOutput)
+        exportToOutput(order, line, platform, progress, outcome);
+    else if (order.isJoined)
+        exportJoined(order, line, platform, progress, outcome);
     else
-        exportTable(order, line, platform, progress);
+        exportEach(order, line, platform, progress, outcome);
     return messages.exitStatus();
 }
 
@@ -188,12 +330,14 @@ QString exportDetails()
     return QStringLiteral(
         "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
         "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
-        "Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n");
+        "Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
+        "FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
+        "file each in the folder OUT, or with --join one file.\n");
 }
 
 OptionTables exportOptions()
 {
-    return { Options, sourceOptions(), selectionOptions(), reportOptions() };
+    return { Options, sourceOptions(), selectionOptions(), reportOptions(), outcomeOptions() };
 }
 
 } // namespace pelloric::app

@@ -23,7 +23,7 @@ constexpr auto Commands = std::to_array<Command>({
         previewDetails },
     { "open", "FILE.ostl", "Shows a saved document in the preview window", runOpen, nullptr,
         openDetails },
-    { "export", "FILE -o OUT", "Writes a table as PDF, PNG, SVG or a document file", runExport,
+    { "export", "FILE... -o OUT", "Writes tables as PDF, PNG, SVG or a document file", runExport,
         exportOptions, exportDetails },
     { "run", "SCRIPT.js [ARGUMENT...]", "Runs a script that drives the controls by name", runScript,
         nullptr, scriptDetails },

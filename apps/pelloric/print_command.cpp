@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "headless.h"
 #include "interruption.h"
+#include "outcome.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -99,12 +100,13 @@ void choosePaper(
         .height = job.pageHeight };
     const Text warning = paperWarning(pages, system.sheetFor(pages));
     if (!warning.empty())
-        tell(qt::toQString(warning));
+        note(qt::toQString(warning));
 }
 
 /// Prints the pages and says how many there were.
 void printPages(const Order& order, const PageDocument& document, PrintJob job,
-    const Font& defaultFont, qt::QtPrinting& printing, ProgressLine& progress)
+    const Font& defaultFont, qt::QtPrinting& printing, ProgressLine& progress,
+    const Outcome& outcome)
 {
     job.allPages = order.pages.isEmpty();
     if (!job.allPages) {
@@ -127,24 +129,28 @@ void printPages(const Order& order, const PageDocument& document, PrintJob job,
         throw CommandError(detailOf(error));
     }
     progress.clear();
-    print(QStringLiteral("%1: %2 %3 sent\n")
-              .arg(qt::toQString(printing.system().currentPrinter()))
-              .arg(total)
-              .arg(QLatin1String(total == 1 ? "page" : "pages")));
+    const QString printer = qt::toQString(printing.system().currentPrinter());
+    outcome.tellMade(
+        { { QStringLiteral("input"), order.file }, { QStringLiteral("printer"), printer },
+            { QStringLiteral("pages"), static_cast<qint64>(total) } },
+        QStringLiteral("%1: %2 %3 sent\n")
+            .arg(printer)
+            .arg(total)
+            .arg(QLatin1String(total == 1 ? "page" : "pages")));
 }
 
 void printDocument(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
-    qt::QtPrinting& printing, ProgressLine& progress)
+    qt::QtPrinting& printing, ProgressLine& progress, const Outcome& outcome)
 {
     const SavedDocument saved = readDocument(order.file, line, platform.record());
     PrintJob job;
     job.orientation = saved.setup.myWidth > saved.setup.myHeight ? 2 : 1;
     choosePaper(job, saved.setup, job.paperSize, printing.system());
-    printPages(order, saved.document, job, Font {}, printing, progress);
+    printPages(order, saved.document, job, Font {}, printing, progress, outcome);
 }
 
 void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
-    qt::QtPrinting& printing, ProgressLine& progress)
+    qt::QtPrinting& printing, ProgressLine& progress, const Outcome& outcome)
 {
     auto grid = std::make_unique<TableGrid>(readTable(order.file, line, progress));
     const PrivateSettings settings(platform, line);
@@ -156,7 +162,8 @@ void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& pla
     const ReportStyle& style = canvas.style();
     job.orientation = style.PagerOrientation;
     choosePaper(job, canvas.page, style.PagerSizeValue, printing.system());
-    printPages(order, canvas.document(), job, canvas.recorder().textFont(), printing, progress);
+    printPages(
+        order, canvas.document(), job, canvas.recorder().textFont(), printing, progress, outcome);
 }
 
 } // namespace
@@ -165,6 +172,7 @@ int runPrint(const Invocation& invocation)
 {
     const CommandLine line(invocation.arguments, printOptions(), 1);
     const Order order(line);
+    const Outcome outcome(line);
     const HeadlessApplication application(invocation);
     qt::QtPlatform platform;
     qt::StreamMessages messages;
@@ -174,9 +182,9 @@ int runPrint(const Invocation& invocation)
     const Interruption interruption(platform.loop());
     ProgressLine progress;
     if (isDocumentName(order.file))
-        printDocument(order, line, platform, printing, progress);
+        printDocument(order, line, platform, printing, progress, outcome);
     else
-        printTable(order, line, platform, printing, progress);
+        printTable(order, line, platform, printing, progress, outcome);
     return messages.exitStatus();
 }
 
@@ -190,7 +198,7 @@ QString printDetails()
 
 OptionTables printOptions()
 {
-    return { Options, sourceOptions(), selectionOptions(), reportOptions() };
+    return { Options, sourceOptions(), selectionOptions(), reportOptions(), outcomeOptions() };
 }
 
 } // namespace pelloric::app

@@ -3,6 +3,8 @@
 
 #include "progress_line.h"
 
+#include "outcome.h"
+
 #include <algorithm>
 #include <cstdio>
 
@@ -31,7 +33,7 @@ bool isTerminal()
 } // namespace
 
 ProgressLine::ProgressLine()
-    : isTerminal_(isTerminal())
+    : isTerminal_(isTerminal() && !isQuiet())
 {
     sinceShown_.start();
 }

@@ -3,6 +3,7 @@
 
 #include "report_options.h"
 
+#include "outcome.h"
 #include "platform/file_bytes.h"
 #include "platform/numbers.h"
 #include "platform/platform.h"
@@ -201,7 +202,7 @@ void changeFonts(const CommandLine& line, Changes& changes)
             throw CommandError(QStringLiteral("--font needs the name of a face"), WrongUsage);
         const QString family = qt::QtFonts::resolve(name);
         if (family.compare(name, Qt::CaseInsensitive) != 0)
-            tell(QStringLiteral("the font %1 is not installed; %2 is taken instead")
+            note(QStringLiteral("the font %1 is not installed; %2 is taken instead")
                      .arg(name, family));
         for (const TextView key : FontNameKeys)
             changes.add(key, name);

@@ -13,8 +13,10 @@
 
 #include <QFile>
 #include <QFileInfo>
+#include <QTemporaryFile>
 
 #include <array>
+#include <optional>
 
 namespace pelloric::app {
 
@@ -23,7 +25,13 @@ namespace {
 constexpr auto Options = std::to_array<Option>({
     { "query", "SQL", "what to take of a database: a SELECT statement" },
     { "encoding", "NAME", "of a CSV or TSV file; else found out (UTF-8, GB18030)" },
+    { "delimiter", "C", "between its values: a character, or \"tab\"; else found out" },
+    { "no-quote", nullptr, "its quotation marks are characters like any other" },
 });
+
+/// The name that stands for the standard input, and what that is called.
+const QString StandardInput = QStringLiteral("-");
+const QString StandardInputName = QStringLiteral("standard input");
 
 constexpr char DatabaseMark[] = "SQLite format 3";
 
@@ -62,6 +70,47 @@ void checkReadable(const QString& name)
         throw CommandError(QStringLiteral("%1: you may not read this file").arg(name));
 }
 
+/// The delimiter that the options name; 0: none.
+char delimiterOf(const CommandLine& line)
+{
+    if (!line.has("delimiter"))
+        return 0;
+    const QString text = line.value("delimiter");
+    if (text == QLatin1String("tab") || text == QLatin1String("\\t"))
+        return '\t';
+    const char character = text.size() == 1 ? text.front().toLatin1() : '\0';
+    if (character < ' ' && character != '\t')
+        throw CommandError(
+            QStringLiteral("--delimiter takes one ASCII character, or \"tab\", not \"%1\"")
+                .arg(text),
+            WrongUsage);
+    return character;
+}
+
+/// What a pipe hands over, in a file that can be read twice.
+class PipedInput {
+public:
+    PipedInput()
+    {
+        QFile in;
+        if (!file_.open() || !in.open(stdin, QIODevice::ReadOnly))
+            throw CommandError(
+                QStringLiteral("the standard input cannot be kept: %1").arg(file_.errorString()));
+        constexpr qint64 Piece = 1 << 20;
+        for (QByteArray bytes = in.read(Piece); !bytes.isEmpty(); bytes = in.read(Piece)) {
+            if (file_.write(bytes) != bytes.size())
+                throw CommandError(QStringLiteral("the standard input cannot be kept: %1")
+                                       .arg(file_.errorString()));
+        }
+        file_.close();
+    }
+
+    QString name() const { return file_.fileName(); }
+
+private:
+    QTemporaryFile file_;
+};
+
 TableGrid readDatabase(const DatabaseName& name, const CommandLine& line, ProgressLine& progress)
 {
     if (line.has("encoding"))
@@ -88,7 +137,11 @@ TableGrid readValues(const QString& name, const CommandLine& line, ProgressLine&
         progress.show("Reading", part);
         return Interruption::mayGoOn();
     };
-    return qt::readCsv(pathOf(name), { .encoding = line.value("encoding"), .progress = step });
+    return qt::readCsv(pathOf(name),
+        { .encoding = line.value("encoding"),
+            .delimiter = delimiterOf(line),
+            .isQuoted = !line.has("no-quote"),
+            .progress = step });
 }
 
 } // namespace
@@ -117,17 +170,23 @@ bool isSameFile(const QString& file, const QString& other)
 
 QString plainName(const QString& name)
 {
+    if (name == StandardInput)
+        return QStringLiteral("table");
     return QFileInfo(splitName(name).file).completeBaseName();
 }
 
 TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& progress)
 {
     const Interruption::AtOnce atOnce;
-    const DatabaseName name = splitName(file);
+    std::optional<PipedInput> piped;
+    if (file == StandardInput)
+        piped.emplace();
+    const DatabaseName name = splitName(piped ? piped->name() : file);
+    const QString shown = piped ? StandardInputName : name.file;
     checkReadable(name.file);
     const bool isFromDatabase = isDatabase(name.file);
     if (!isFromDatabase && !name.table.isEmpty())
-        throw CommandError(QStringLiteral("%1 is no SQLite database").arg(name.file));
+        throw CommandError(QStringLiteral("%1 is no SQLite database").arg(shown));
     try {
         return selected(isFromDatabase ? readDatabase(name, line, progress)
                                        : readValues(name.file, line, progress),
@@ -135,7 +194,7 @@ TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& 
     } catch (const RunTimeError& error) {
         if (error.number() == ErrorNumber::Cancelled)
             throw;
-        throw CommandError(QStringLiteral("%1: %2").arg(name.file, detailOf(error)));
+        throw CommandError(QStringLiteral("%1: %2").arg(shown, detailOf(error)));
     }
 }
 

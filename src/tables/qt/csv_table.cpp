@@ -34,7 +34,10 @@ constexpr char Gb18030[] = "GB18030";
 constexpr char Tab = '\t';
 
 /// In the order in which an equal number of them is settled.
-constexpr auto Delimiters = std::to_array({ ',', Tab, ';' });
+constexpr auto Delimiters = std::to_array({ ',', Tab, ';', '|' });
+
+/// Stands for the quotation mark where there is none.
+constexpr unsigned char NoByteOfUtf8 = 0xFF;
 
 [[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::TypeMismatch, what); }
 
@@ -170,7 +173,7 @@ private:
     bool isFirst_ = true;
 };
 
-char delimiterOf(const std::filesystem::path& path, QByteArrayView start)
+char delimiterOf(const std::filesystem::path& path, QByteArrayView start, bool hasQuotes)
 {
     const QString extension = QString::fromStdU16String(path.extension().u16string()).toLower();
     if (extension == QLatin1String(".tsv") || extension == QLatin1String(".tab"))
@@ -178,7 +181,7 @@ char delimiterOf(const std::filesystem::path& path, QByteArrayView start)
     std::array<int, Delimiters.size()> counts {};
     bool isQuoted = false;
     for (const char byte : start) {
-        isQuoted = isQuoted != (byte == '"');
+        isQuoted = isQuoted != (hasQuotes && byte == '"');
         if (isQuoted)
             continue;
         if (byte == '\n' || byte == '\r')
@@ -202,12 +205,14 @@ public:
 /// Runs the parser over all pieces and keeps count of the lines.
 class CsvParser {
 public:
-    CsvParser(CsvReceiver& receiver, char delimiter)
+    CsvParser(CsvReceiver& receiver, char delimiter, bool isQuoted)
         : receiver_(receiver)
     {
         if (csv_init(&parser_, CSV_REPALL_NL) != 0)
             throw RunTimeError(ErrorNumber::InvalidCall, u"the CSV reader cannot be set up");
         csv_set_delim(&parser_, static_cast<unsigned char>(delimiter));
+        if (!isQuoted)
+            csv_set_quote(&parser_, NoByteOfUtf8);
     }
 
     ~CsvParser() { csv_free(&parser_); }
@@ -393,7 +398,7 @@ struct Pass {
 void run(const Pass& pass, CsvReceiver& receiver)
 {
     Utf8Pieces pieces(pass.file, pass.encoding);
-    CsvParser parser(receiver, pass.delimiter);
+    CsvParser parser(receiver, pass.delimiter, pass.options.isQuoted);
     for (QByteArray bytes = pieces.next(); !bytes.isEmpty(); bytes = pieces.next()) {
         parser.take(bytes);
         const double part = pass.begin + pieces.partRead() / 2;
@@ -410,7 +415,9 @@ TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
     const std::unique_ptr<QIODevice> file = openFile(path);
     const QByteArray encoding = encodingOf(*file, options.encoding);
     const QByteArray start = Utf8Pieces(*file, encoding).next().left(SniffedBytes);
-    Pass pass { *file, encoding, delimiterOf(path, start), options };
+    const char delimiter
+        = options.delimiter != 0 ? options.delimiter : delimiterOf(path, start, options.isQuoted);
+    Pass pass { *file, encoding, delimiter, options };
     SizeCounter sizes;
     run(pass, sizes);
     if (sizes.rows == 0)

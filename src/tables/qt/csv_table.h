@@ -17,6 +17,8 @@ struct CsvOptions {
     /// Name of the encoding; empty: UTF-8 or UTF-16 by a byte order mark, else UTF-8 when all of
     /// the file is that, else GB18030.
     QString encoding {};
+    char delimiter = 0; ///< between values; 0: found out
+    bool isQuoted = true; ///< false: a quotation mark is a character like any other
     /// Told now and then how much has been read; answers whether to go on. May be empty.
     std::function<bool(double part)> progress {};
 };

@@ -6,6 +6,9 @@
 
 #include <QFile>
 #include <QImage>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
 #include <QProcess>
 #include <QProcessEnvironment>
 #include <QSqlDatabase>
@@ -361,6 +364,81 @@ TEST_F(Program, TakesTheColumnsAndRowsThatAreAskedForInTheirOrder)
     EXPECT_EQ(run(words("export t.csv -o u.pdf --rows 5-9")).errors,
         "pelloric: --rows 5-9 names no row; the table has 4\n");
     EXPECT_EQ(run(words("export t.csv -o u.pdf --rows x")).status, 2);
+}
+
+TEST_F(Program, ReadsAndWritesPipes)
+{
+    QProcess process;
+    start(process, words("export - -o - --title Piped --delimiter |"));
+    process.write("a|b\n1|2,5\n");
+    process.closeWriteChannel();
+    ASSERT_TRUE(process.waitForFinished(LongestRun));
+    EXPECT_EQ(process.exitCode(), 0);
+    EXPECT_EQ(process.readAllStandardError().toStdString(), "");
+    folder_.write("piped.pdf", process.readAllStandardOutput().toStdString());
+    const std::string text = pdfText("piped.pdf");
+    for (const char* const part : { "Piped", "2,5" })
+        EXPECT_TRUE(has(text, part)) << text;
+    QProcess svg;
+    start(svg, words("export - -o - --format svg"));
+    svg.write("a\n1\n");
+    svg.closeWriteChannel();
+    ASSERT_TRUE(svg.waitForFinished(LongestRun));
+    EXPECT_TRUE(svg.readAllStandardOutput().contains("<svg"));
+}
+
+TEST_F(Program, WritesSeveralInputsIntoAFolderOrOneBehindTheOther)
+{
+    folder_.write("one.csv", "a\nfirst\n");
+    folder_.write("two.csv", "a\nsecond\n");
+    std::filesystem::create_directory(folder_.path() / "other");
+    folder_.write("other/one.csv", "a\nthird\n");
+    EXPECT_EQ(run(words("export one.csv two.csv other/one.csv -o out")).status, 0);
+    EXPECT_TRUE(has(pdfText("out/one.pdf"), "first"));
+    EXPECT_TRUE(has(pdfText("out/two.pdf"), "second"));
+    EXPECT_TRUE(has(pdfText("out/one-2.pdf"), "third"));
+    const Ended joined
+        = run(words("export one.csv two.csv -o all.pdf --join --footer-center [Page&#]"));
+    EXPECT_EQ(joined.status, 0) << joined.errors;
+    const std::string text = pdfText("all.pdf");
+    EXPECT_LT(text.find("first"), text.find('\f'));
+    EXPECT_GT(text.find("second"), text.find('\f'));
+    EXPECT_EQ(run(words("export one.csv two.csv -o all.csv --join")).status, 2);
+}
+
+TEST_F(Program, TellsInJsonWhatItMadeAndNothingWhenQuiet)
+{
+    folder_.write("one.csv", "a,b\n1,2\n3,4\n");
+    folder_.write("two.csv", "a\n1\n");
+    const Ended told = run(words("export one.csv two.csv -o out --json --font Nowhere"));
+    EXPECT_EQ(told.status, 0);
+    EXPECT_EQ(told.errors, "");
+    const QList<QByteArray> lines = QByteArray::fromStdString(told.output).trimmed().split('\n');
+    ASSERT_EQ(lines.size(), 2);
+    const QJsonObject first = QJsonDocument::fromJson(lines[0]).object();
+    EXPECT_EQ(first[QStringLiteral("pages")].toInt(), 1);
+    EXPECT_EQ(first[QStringLiteral("rows")].toInt(), 2);
+    EXPECT_EQ(first[QStringLiteral("columns")].toInt(), 2);
+    EXPECT_EQ(first[QStringLiteral("bands")].toInt(), 1);
+    EXPECT_EQ(first[QStringLiteral("input")].toString(), "one.csv");
+    EXPECT_TRUE(first[QStringLiteral("file")].toString().endsWith(QStringLiteral("one.pdf")));
+    EXPECT_TRUE(first[QStringLiteral("warnings")].toArray().at(0).toString().contains(
+        QStringLiteral("Nowhere is not installed")));
+    const Ended quiet = run(words("export one.csv -o q.pdf --quiet --font Nowhere"));
+    EXPECT_EQ(quiet.status, 0);
+    EXPECT_EQ(quiet.output + quiet.errors, "");
+    const Ended wrong = run(words("export missing.csv -o q.pdf --quiet"));
+    EXPECT_EQ(wrong.status, 1);
+    EXPECT_TRUE(has(wrong.errors, "missing.csv"));
+}
+
+TEST_F(Program, TakesQuotationMarksForWhatTheyAreWhenAsked)
+{
+    folder_.write("q.csv", "a;b\n\"1\" x;2\"\n");
+    const Ended ended = run(words("export q.csv -o q.pdf --delimiter ; --no-quote"));
+    EXPECT_EQ(ended.status, 0) << ended.errors;
+    EXPECT_TRUE(has(pdfText("q.pdf"), "\"1\" x"));
+    EXPECT_EQ(run(words("export q.csv -o q.pdf --delimiter ab")).status, 2);
 }
 
 TEST_F(Program, CompletesItsCommandsAndOptionsInBash)
