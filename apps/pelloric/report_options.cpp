@@ -3,6 +3,7 @@
 
 #include "report_options.h"
 
+#include "lengths.h"
 #include "outcome.h"
 #include "platform/file_bytes.h"
 #include "platform/numbers.h"
@@ -19,6 +20,7 @@
 
 #include <array>
 #include <cmath>
+#include <optional>
 #include <utility>
 #include <vector>
 
@@ -34,7 +36,8 @@ constexpr auto Options = std::to_array<Option>({
     { "footer-left", "TEXT", "footer texts, likewise" },
     { "footer-center", "TEXT", "" },
     { "footer-right", "TEXT", "" },
-    { "paper", "NAME", "A3, A4, A5, B5, Letter, Legal, 8k, 16k, or 100x150mm" },
+    { "paper", "NAME", "A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in" },
+    { "margins", "LENGTHS", "top,right,bottom,left, or one for all: 10mm, 1.5cm or 0.5in" },
     { "landscape", nullptr, "the paper's long side lies below" },
     { "portrait", nullptr, "the paper stands upright" },
     { "merge", nullptr, "print equal neighbouring cells once" },
@@ -69,12 +72,15 @@ struct Paper {
 };
 
 constexpr auto Papers = std::to_array<Paper>({
+    { "A2", 420, 594 },
     { "A3", 297, 420 },
     { "A4", 210, 297 },
     { "A5", 148, 210 },
+    { "A6", 105, 148 },
     { "B5", 182, 257 },
     { "Letter", 215.9, 279.4 },
     { "Legal", 215.9, 355.6 },
+    { "Tabloid", 279.4, 431.8 },
     { "8k", 270, 390 },
     { "16k", 197, 273 },
 });
@@ -108,16 +114,22 @@ PaperChoice paperOf(const QString& text)
         if (name.compare(text, Qt::CaseInsensitive) == 0)
             return { name, paper.widthMm, paper.heightMm };
     }
-    static const QRegularExpression sizes(
-        QStringLiteral("^(\\d+(?:\\.\\d+)?)[xX×](\\d+(?:\\.\\d+)?)(?:mm)?$"));
-    const auto match = sizes.match(text);
-    if (!match.hasMatch())
+    const std::optional<SizeMm> size = sizeOf(text);
+    if (!size)
         throw CommandError(QStringLiteral("unknown paper \"%1\"; take one of %2, or a size such as "
-                                          "100x150mm")
+                                          "100x150mm or 4x6in")
                                .arg(text, paperNames()),
             WrongUsage);
-    return { text, numberOf("paper", match.captured(1), LeastPaperMm, MostPaperMm, false),
-        numberOf("paper", match.captured(2), LeastPaperMm, MostPaperMm, false) };
+    const auto held = [&text](double mm) {
+        if (mm < LeastPaperMm || mm > MostPaperMm)
+            throw CommandError(QStringLiteral("--paper takes lengths from %1 to %2 mm, not \"%3\"")
+                                   .arg(LeastPaperMm)
+                                   .arg(MostPaperMm)
+                                   .arg(text),
+                WrongUsage);
+        return mm;
+    };
+    return { text, held(size->width), held(size->height) };
 }
 
 /// The place of a paper in the list of forms, from 1; 0, which is no form, for any other size.
@@ -192,6 +204,32 @@ void changePaper(const CommandLine& line, Changes& changes)
     changes.add(u"PagerWidth", formatNumber(width));
     changes.add(u"PagerHeight", formatNumber(height));
     changes.add(u"PagerOrientation", QString::number(isLandscape ? 2 : 1));
+}
+
+/// The keys of the margins, in the order of the option.
+constexpr TextView MarginKeys[] = { u"Top", u"Right", u"Buttom", u"Left" };
+
+/// A margin of nothing would be taken for the usual one.
+constexpr double LeastMarginMm = 1;
+
+void changeMargins(const CommandLine& line, Changes& changes)
+{
+    if (!line.has("margins"))
+        return;
+    const QStringList parts = line.value("margins").split(QLatin1Char(','));
+    for (std::size_t margin = 0; margin < std::size(MarginKeys); ++margin) {
+        const bool isOne = parts.size() == 1;
+        const auto at = isOne ? 0 : static_cast<qsizetype>(margin);
+        const std::optional<double> mm = millimetresOf(parts.value(at));
+        if ((!isOne && parts.size() != 4) || !mm || *mm < LeastMarginMm || *mm > MostPaperMm)
+            throw CommandError(
+                QStringLiteral("--margins takes one length of %1 mm or more, or four "
+                               "(top,right,bottom,left), not \"%2\"")
+                    .arg(LeastMarginMm)
+                    .arg(line.value("margins")),
+                WrongUsage);
+        changes.add(MarginKeys[margin], formatNumber(*mm));
+    }
 }
 
 void changeFonts(const CommandLine& line, Changes& changes)
@@ -288,6 +326,7 @@ PrivateSettings::PrivateSettings(qt::QtPlatform& platform, const CommandLine& li
         changes.add(u"GridMerge", QStringLiteral("1"));
     changeFonts(line, changes);
     changePaper(line, changes);
+    changeMargins(line, changes);
     changeTexts(line, changes);
     changes.write(record);
 }

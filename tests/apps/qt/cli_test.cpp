@@ -366,6 +366,40 @@ TEST_F(Program, TakesTheColumnsAndRowsThatAreAskedForInTheirOrder)
     EXPECT_EQ(run(words("export t.csv -o u.pdf --rows x")).status, 2);
 }
 
+TEST_F(Program, TakesPapersAndMarginsInTheUsualUnits)
+{
+    folder_.write("t.csv", "a\n1\n");
+    struct Case {
+        const char* paper;
+        int width;
+        int height;
+    };
+    const Case cases[] = {
+        { "A6", 413, 583 },
+        { "tabloid", 1100, 1700 },
+        { "10x15cm", 394, 591 },
+        { "4x6in", 400, 600 },
+        { "4inx150mm", 400, 591 },
+        { "100x150", 394, 591 },
+    };
+    for (const Case& row : cases) {
+        const Ended ended
+            = run(words("export t.csv -o t.png --dpi 100 --paper") + words(row.paper));
+        EXPECT_EQ(ended.status, 0) << ended.errors;
+        const QSize size = QImage(QString::fromStdString(folder_.file("t.png").string())).size();
+        EXPECT_NEAR(size.width(), row.width, 1) << row.paper;
+        EXPECT_NEAR(size.height(), row.height, 1) << row.paper;
+    }
+    EXPECT_EQ(run(words("export t.csv -o t.pdf --paper 1x1mm")).status, 2);
+    EXPECT_EQ(run(words("export t.csv -o t.pdf --margins 10mm,1cm,0.5in,20")).status, 0);
+    EXPECT_EQ(run(words("export t.csv -o t.pdf --margins 15mm")).status, 0);
+    for (const char* const wrong : { "0", "1,2", "x", "-5", "10mm,10mm,10mm,10mm,10mm" }) {
+        const Ended ended = run(words("export t.csv -o t.pdf --margins") + words(wrong));
+        EXPECT_EQ(ended.status, 2) << wrong;
+        EXPECT_TRUE(has(ended.errors, "--margins takes one length")) << ended.errors;
+    }
+}
+
 TEST_F(Program, ReadsAndWritesPipes)
 {
     QProcess process;
