@@ -74,10 +74,12 @@ TEST(PrintDoubts, AreRaisedByARangeThatNamesNoPage)
         { u"5-9", PrintDoubt::None },
     };
     for (const Case& row : cases)
-        EXPECT_EQ(rangeDoubt({ .allPages = false, .range = Text(row.range), .copies = {} }, 5), row.doubt)
+        EXPECT_EQ(
+            rangeDoubt({ .allPages = false, .range = Text(row.range), .copies = {} }, 5), row.doubt)
             << toUtf8(row.range);
     EXPECT_EQ(rangeDoubt({ .allPages = true, .range = u"6", .copies = {} }, 5), PrintDoubt::None);
-    EXPECT_EQ(rangeDoubt({ .allPages = false, .range = u"30000", .copies = {} }, 0), PrintDoubt::None);
+    EXPECT_EQ(
+        rangeDoubt({ .allPages = false, .range = u"30000", .copies = {} }, 0), PrintDoubt::None);
     EXPECT_EQ(copiesDoubt(u""), PrintDoubt::None);
     EXPECT_EQ(copiesDoubt(u"2"), PrintDoubt::None);
     EXPECT_EQ(copiesDoubt(u"0"), PrintDoubt::NoCopy);

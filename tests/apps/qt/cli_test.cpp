@@ -357,10 +357,10 @@ TEST_F(Program, TakesTheColumnsAndRowsThatAreAskedForInTheirOrder)
         std::erase_if(text, [](char c) { return c == ' ' || c == '\n' || c == '\f'; });
         EXPECT_TRUE(has(text, row.text)) << row.options << ": " << text;
     }
-    const Ended unknown = run(words("export t.csv -o u.pdf --columns Nam"));
+    const Ended unknown = run(words("export t.csv -o u.pdf --columns Nope"));
     EXPECT_EQ(unknown.status, 2);
     EXPECT_EQ(unknown.errors,
-        "pelloric: --columns: there is no column \"Nam\"; the table has Name, Size, Town\n");
+        "pelloric: --columns: there is no column \"Nope\"; the table has Name, Size, Town\n");
     EXPECT_EQ(run(words("export t.csv -o u.pdf --rows 5-9")).errors,
         "pelloric: --rows 5-9 names no row; the table has 4\n");
     EXPECT_EQ(run(words("export t.csv -o u.pdf --rows x")).status, 2);

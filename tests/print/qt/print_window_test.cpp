@@ -100,13 +100,14 @@ QString textOf(const PrintOptionsDialog& dialog, const char* label)
 TEST_F(PrintWindowTest, ShowsThePagesThatAreSentAndAnswersAllTheTime)
 {
     QStringList shown;
-    const qint64 longest = printMeanwhile(
-        [&](PrintOptionsDialog& open) { shown.append(textOf(open, "labSent")); });
+    const qint64 longest
+        = printMeanwhile([&](PrintOptionsDialog& open) { shown.append(textOf(open, "labSent")); });
     shown.removeAll(QString());
     shown.removeDuplicates();
     EXPECT_GT(shown.size(), 2);
     const int pages = window->canvas().canvas().Totalpages();
-    EXPECT_TRUE(!shown.isEmpty() && shown.back().endsWith(QStringLiteral(" of %1 pages sent").arg(pages)));
+    EXPECT_TRUE(
+        !shown.isEmpty() && shown.back().endsWith(QStringLiteral(" of %1 pages sent").arg(pages)));
     RecordProperty("longest_pause_ms", static_cast<int>(longest));
     EXPECT_LT(longest, LongestPause);
     EXPECT_EQ(cups.jobs().size(), static_cast<std::size_t>(pages));
