@@ -2,9 +2,11 @@
 // SPDX-License-Identifier: MIT
 
 #include "controls/canvas.h"
+#include "controls/qt/sorvane.h"
 #include "fakes/temp_folder.h"
 #include "platform/qt/qt_platform.h"
 #include "settings/default_settings.h"
+#include "support/test_paths.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
 #include "ui_host_form.h"

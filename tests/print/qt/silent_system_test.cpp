@@ -13,6 +13,7 @@
 #include "print/qt/silent_server.h"
 #include "settings/default_settings.h"
 #include "support/recorded_pages.h"
+#include "support/test_paths.h"
 #include "ui/qt/page_setup_dialog.h"
 #include "ui/qt/print_options_dialog.h"
 
