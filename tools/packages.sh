@@ -16,6 +16,7 @@ PackagesBuild=(
     libcups2-dev
     libgmock-dev
     libgtest-dev
+    libpng-dev
     libqt6sql6-sqlite
     ninja-build
     nlohmann-json3-dev
@@ -29,7 +30,9 @@ PackagesBuild=(
 PackagesTest=(
     cups-client
     cups-daemon
+    fontconfig
     imagemagick
+    librsvg2-bin
     openbox
     poppler-utils
     python3

@@ -8,6 +8,7 @@
 #include "document/ostl_format.h"
 #include "document/ostl_writer.h"
 #include "export/qt/page_export.h"
+#include "font_notes.h"
 #include "headless.h"
 #include "interruption.h"
 #include "outcome.h"
@@ -40,6 +41,7 @@ constexpr auto Options = std::to_array<Option>({
     { "format", "NAME", "pdf, png, svg or ostl, for a folder or - (pdf)" },
     { "pages", "LIST", "only these pages: 1,3,5-12" },
     { "dpi", "N", "pixels an inch of .png images (150)" },
+    { "jobs", "N", "pages of .png images made at a time (one for each processor)" },
 });
 
 /// The name that stands for the standard output.
@@ -47,6 +49,7 @@ const QString StandardOutput = QStringLiteral("-");
 
 constexpr double LeastDpi = 10;
 constexpr double MostDpi = 2400;
+constexpr double MostJobs = 256;
 
 /// What is exported, and what it takes.
 struct Export {
@@ -64,7 +67,7 @@ void writePdf(const Export& job)
 
 void writePngs(const Export& job)
 {
-    qt::exportPngs(job.document, job.setup, job.platform.fonts(), job.options, job.path);
+    qt::exportPngs(job.document, job.setup, job.options, job.path);
 }
 
 void writeSvg(const Export& job)
@@ -150,6 +153,10 @@ struct Order {
                 WrongUsage);
         if (line.has("dpi") && !format->takesDpi)
             throw CommandError(QStringLiteral("--dpi is for .png images"), WrongUsage);
+        if (line.has("jobs") && !format->takesDpi)
+            throw CommandError(QStringLiteral("--jobs is for .png images"), WrongUsage);
+        if (line.has("jobs"))
+            jobs = static_cast<int>(numberOf("jobs", line.value("jobs"), 1, MostJobs, true));
         if (line.has("dpi"))
             dpi = static_cast<int>(numberOf("dpi", line.value("dpi"), LeastDpi, MostDpi, true));
         if (out == StandardOutput && line.has("json"))
@@ -169,6 +176,7 @@ struct Order {
     bool isJoined;
     const Format* format = nullptr;
     int dpi = qt::ExportOptions().dpi;
+    int jobs = qt::ExportOptions().jobs;
 };
 
 /// Laid-out pages and what is told of them.
@@ -201,9 +209,11 @@ Laid layOut(
 void write(const Order& order, const CommandLine& line, const Laid& laid, const QString& title,
     const QString& out, qt::QtPlatform& platform, ProgressLine& progress)
 {
+    tellFonts(laid.document, platform);
     qt::ExportOptions options;
     options.pages = pagesOf(line.value("pages"), laid.document.Totalpages);
     options.dpi = order.dpi;
+    options.jobs = order.jobs;
     options.title = qt::toText(line.has("title") ? line.value("title") : title);
     options.progress = [&](int done, int total) {
         progress.show("Writing", static_cast<double>(done) / std::max(1, total));

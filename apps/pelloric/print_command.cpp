@@ -4,6 +4,7 @@
 #include "command_line.h"
 #include "commands.h"
 #include "controls/canvas.h"
+#include "font_notes.h"
 #include "headless.h"
 #include "interruption.h"
 #include "outcome.h"
@@ -143,6 +144,7 @@ void printDocument(const Order& order, const CommandLine& line, qt::QtPlatform& 
     qt::QtPrinting& printing, ProgressLine& progress, const Outcome& outcome)
 {
     const SavedDocument saved = readDocument(order.file, line, platform.record());
+    tellFonts(saved.document, platform);
     PrintJob job;
     job.orientation = saved.setup.myWidth > saved.setup.myHeight ? 2 : 1;
     choosePaper(job, saved.setup, job.paperSize, printing.system());
@@ -158,6 +160,7 @@ void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& pla
     Canvas canvas(record);
     buildReport(canvas, *grid, line, progress);
     grid.reset();
+    tellFonts(canvas.document(), platform);
     PrintJob job;
     const ReportStyle& style = canvas.style();
     job.orientation = style.PagerOrientation;

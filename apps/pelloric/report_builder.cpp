@@ -5,6 +5,7 @@
 
 #include "controls/canvas.h"
 #include "document/ostl_reader.h"
+#include "font_notes.h"
 #include "grids/table_grid.h"
 #include "platform/automation_object.h"
 #include "platform/platform.h"
@@ -68,6 +69,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
 
 void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress)
 {
+    requireFonts();
     loadSettings(canvas);
     setColumnWidths(grid, line, canvas);
     const LayoutProgress watched(canvas, progress);
@@ -85,6 +87,7 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
             QStringLiteral("--%1 does not apply to a saved document, whose pages are laid out")
                 .arg(QString::fromLatin1(option)),
             WrongUsage);
+    requireFonts();
     SavedDocument saved;
     try {
         if (readOstl(platform.codec, pathOf(file), saved.document, saved.setup)

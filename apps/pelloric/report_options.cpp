@@ -238,10 +238,6 @@ void changeFonts(const CommandLine& line, Changes& changes)
         const QString name = line.value("font");
         if (name.trimmed().isEmpty())
             throw CommandError(QStringLiteral("--font needs the name of a face"), WrongUsage);
-        const QString family = qt::QtFonts::resolve(name);
-        if (family.compare(name, Qt::CaseInsensitive) != 0)
-            note(QStringLiteral("the font %1 is not installed; %2 is taken instead")
-                     .arg(name, family));
         for (const TextView key : FontNameKeys)
             changes.add(key, name);
     }

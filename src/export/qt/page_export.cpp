@@ -6,23 +6,25 @@
 #include "document/ostl_writer.h"
 #include "document/page_document.h"
 #include "export/qt/exact_page_device.h"
+#include "export/qt/page_workers.h"
 #include "export/qt/pending_files.h"
+#include "export/qt/png_bytes.h"
+#include "export/qt/svg_page.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_drawing_surface.h"
+#include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "view/joined_lines.h"
 #include "view/page_renderer.h"
 
-#include <QBuffer>
 #include <QImage>
-#include <QImageWriter>
 #include <QPageLayout>
 #include <QPainter>
 #include <QPdfWriter>
-#include <QSvgGenerator>
 
 #include <algorithm>
+#include <memory>
 #include <numeric>
 #include <string>
 
@@ -35,9 +37,6 @@ constexpr double InchesPerMetre = 1 / 0.0254;
 
 /// A cosmetic line of a PDF is one pixel of this resolution wide: fine, and seen everywhere.
 constexpr int PdfResolution = 600;
-
-/// Pixels per inch that SVG files count in.
-constexpr int SvgResolution = 96;
 
 constexpr Twips LargestPaper = 288000; ///< 200 inches, which is all that a PDF page can measure
 constexpr double MostPixels = 1U << 28U;
@@ -112,6 +111,39 @@ private:
     PageRenderer renderer_;
     QRectF paper_;
     QtFonts& fonts_;
+};
+
+/// Makes pictures of pages, with fonts of its own.
+class ImagePainter {
+public:
+    ImagePainter(const PageDocument& document, const PageSetup& setup, int dpi, QSize size)
+        : pages_(document, setup, fonts_)
+        , dpi_(dpi)
+        , image_(size, QImage::Format_RGB32)
+    {
+        if (image_.isNull())
+            throw RunTimeError(
+                ErrorNumber::Overflow, u"there is no memory for an image this large");
+        const int dotsPerMetre = roundToInt32(dpi * InchesPerMetre);
+        image_.setDotsPerMeterX(dotsPerMetre);
+        image_.setDotsPerMeterY(dotsPerMetre);
+    }
+
+    /// The bytes of a page's PNG file; empty: there is no memory for them.
+    QByteArray png(int page)
+    {
+        image_.fill(Qt::white);
+        QPainter painter(&image_);
+        pages_.paint(page, painter, dpi_, true);
+        painter.end();
+        return pngBytes(image_);
+    }
+
+private:
+    QtFonts fonts_;
+    PagePainter pages_;
+    int dpi_;
+    QImage image_;
 };
 
 void setUpPdf(QPdfWriter& writer, const PageSetup& setup, const Text& title)
@@ -192,25 +224,20 @@ void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fo
 }
 
 std::vector<std::filesystem::path> exportPngs(const PageDocument& document, const PageSetup& setup,
-    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path)
+    const ExportOptions& options, const std::filesystem::path& path)
 {
     checkPaper(setup);
-    const PagePainter pagePainter(document, setup, fonts);
-    QImage image(pixelsOf(setup, options.dpi), QImage::Format_RGB32);
-    if (image.isNull())
-        throw RunTimeError(ErrorNumber::Overflow, u"there is no memory for an image this large");
-    const int dotsPerMetre = roundToInt32(options.dpi * InchesPerMetre);
-    image.setDotsPerMeterX(dotsPerMetre);
-    image.setDotsPerMeterY(dotsPerMetre);
-    return exportEach(document, options, path, [&](int page, QFile& file) {
-        image.fill(Qt::white);
-        QPainter painter(&image);
-        pagePainter.paint(page, painter, options.dpi, true);
-        painter.end();
-        // The image library itself tells the world when it cannot write.
-        QBuffer bytes;
-        return QImageWriter(&bytes, "png").write(image)
-            && file.write(bytes.data()) == bytes.data().size();
+    const QSize size = pixelsOf(setup, options.dpi);
+    // A font belongs to the thread that uses it, so every thread finds its own.
+    const auto makeMaker = [&] {
+        return [painter = std::make_shared<ImagePainter>(document, setup, options.dpi, size)](
+                   int page) { return painter->png(page); };
+    };
+    const int jobs = options.jobs > 0 ? options.jobs : defaultJobs();
+    PageWorkers workers(differentPagesOf(document, options), jobs, makeMaker);
+    return exportEach(document, options, path, [&](int, QFile& file) {
+        const QByteArray bytes = workers.next();
+        return !bytes.isEmpty() && file.write(bytes) == bytes.size();
     });
 }
 
@@ -218,20 +245,15 @@ std::vector<std::filesystem::path> exportSvg(const PageDocument& document, const
     QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path)
 {
     checkPaper(setup);
-    const PagePainter pagePainter(document, setup, fonts);
-    const QSizeF size = QSizeF(setup.myWidth, setup.myHeight) * SvgResolution / TwipsPerInch;
+    const PageRenderer renderer(document);
     return exportEach(document, options, path, [&](int page, QFile& file) {
-        QSvgGenerator generator;
-        generator.setOutputDevice(&file);
-        generator.setResolution(SvgResolution);
-        generator.setSize(QSize(roundToInt32(size.width()), roundToInt32(size.height())));
-        generator.setViewBox(QRectF(QPointF(), size));
-        generator.setTitle(toQString(options.title));
-        QPainter painter;
-        if (!painter.begin(&generator))
-            return false;
-        pagePainter.paint(page, painter, SvgResolution, true);
-        return painter.end();
+        SvgPage svg({ setup.myWidth, setup.myHeight }, options.title, fonts);
+        JoinedLines joined(svg);
+        renderer.replay(page, {}, joined);
+        joined.finish();
+        const std::string bytes = svg.take();
+        const auto size = static_cast<qint64>(bytes.size());
+        return file.write(bytes.data(), size) == size;
     });
 }
 

@@ -24,6 +24,7 @@ struct ExportOptions {
     /// Zero-based pages in the order in which they are put out; empty: all of them.
     std::vector<int> pages {};
     int dpi = 150; ///< of images: pixels per inch, 1 or more
+    int jobs = 0; ///< threads that make images; 0: as many as the machine runs at once
     Text title {}; ///< of a PDF or SVG file
     /// Told before each page how many are done; answers whether to go on. May be empty.
     std::function<bool(int done, int total)> progress {};
@@ -46,10 +47,12 @@ void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fo
 /// @return  the files in the order of the pages
 /// @throws RunTimeError as `exportPdf`; Overflow: also an image of more pixels than can be held
 std::vector<std::filesystem::path> exportPngs(const PageDocument& document, const PageSetup& setup,
-    QtFonts& fonts, const ExportOptions& options, const std::filesystem::path& path);
+    const ExportOptions& options, const std::filesystem::path& path);
 
-/// Writes one SVG file for each page, named as the images are; texts stay texts.
+/// Writes one SVG file for each page, named as the images are.
 ///
+/// Glyphs are outlines, so that a page looks the same in every viewer, whatever fonts it has; over
+/// them lie the texts unseen, so that they can be found, marked and copied.
 /// @return  the files in the order of the pages
 /// @throws RunTimeError as `exportPdf`
 std::vector<std::filesystem::path> exportSvg(const PageDocument& document, const PageSetup& setup,

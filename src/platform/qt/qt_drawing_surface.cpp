@@ -3,6 +3,7 @@
 
 #include "platform/qt/qt_drawing_surface.h"
 
+#include "platform/qt/glyph_runs.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
 
@@ -10,6 +11,7 @@
 #include <QPaintEngine>
 #include <QPainter>
 #include <QPainterPath>
+#include <QRawFont>
 
 #include <algorithm>
 #include <array>
@@ -21,9 +23,6 @@ namespace pelloric::qt {
 namespace {
 
 constexpr double TwipsPerPoint = 20;
-
-/// A made-up bold is the same text again, shifted by this part of an em.
-constexpr double BoldShift = 1.0 / 32;
 
 /// An em this close to whole pixels is taken as whole.
 constexpr double WholePixel = 1e-4;
@@ -57,6 +56,20 @@ QColor colorOf(Color color)
 }
 
 QPointF pointOf(Tpoint point) { return QPointF(point.x, point.y); }
+
+/// Draws bold glyphs; those of faces without a bold one are drawn twice, set apart by the pen that
+/// would go around their outlines.
+void drawBold(QPainter& painter, const ShapedRun& shaped, QPointF at)
+{
+    for (const QGlyphRun& glyphs : shaped.glyphs) {
+        const QRawFont font = glyphs.rawFont();
+        const bool isMadeUp = isBoldMadeUp(font);
+        const QPointF half(isMadeUp ? font.lineThickness() * MadeUpBoldStroke / 2 : 0, 0);
+        painter.drawGlyphRun(at - half, glyphs);
+        if (isMadeUp)
+            painter.drawGlyphRun(at + half, glyphs);
+    }
+}
 
 bool keepsTexts(const QPainter& painter)
 {
@@ -273,7 +286,7 @@ void QtDrawingSurface::drawGlyphs(const TextRun& run, QPointF baseline)
         font.setStyleStrategy(QFont::PreferAntialias);
         const double width = toTwips(run.advance);
         const double shaped = QFontMetricsF(font).horizontalAdvance(string) * fontScale_;
-        squeeze = shaped > width && width > 0 ? width / shaped : 1;
+        squeeze = squeezeFor(shaped, width);
     }
     painter_.setFont(font);
     const bool isScaled = fontScale_ != 1 || squeeze != 1;
@@ -283,9 +296,12 @@ void QtDrawingSurface::drawGlyphs(const TextRun& run, QPointF baseline)
         painter_.scale(fontScale_ * squeeze, fontScale_);
     }
     const QPointF at = isScaled ? QPointF() : baseline;
-    painter_.drawText(at, string);
-    if (face_->isBoldMadeUp() && !isPaper_)
-        painter_.drawText(at + QPointF(em_ / fontScale_ * BoldShift, 0), string);
+    const bool isPlainAscii
+        = std::ranges::all_of(run.text, [](char16_t unit) { return unit < 0x80; });
+    if (isPaper_ || !bold_ || (isPlainAscii && !face_->isBoldMadeUp()))
+        painter_.drawText(at, string);
+    else
+        drawBold(painter_, shapeRun(run, *face_, font_.pixelSize()), at);
     if (isScaled)
         painter_.setTransform(before);
 }

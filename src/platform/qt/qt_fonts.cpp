@@ -3,11 +3,16 @@
 
 #include "platform/qt/qt_fonts.h"
 
+#include "platform/qt/glyph_runs.h"
 #include "platform/qt/qt_text.h"
 
 #include <QFontDatabase>
 #include <QFontInfo>
+#include <QRawFont>
 #include <QStringList>
+
+#include <algorithm>
+#include <array>
 
 namespace pelloric::qt {
 
@@ -26,6 +31,31 @@ QStringList substitutes()
 {
     return { QStringLiteral("SimSun"), QStringLiteral("NSimSun"), QStringLiteral("AR PL UMing CN"),
         QStringLiteral("Noto Serif CJK SC"), QStringLiteral("WenQuanYi Zen Hei") };
+}
+
+/// What names of Song-style families hold, whatever their letters' case.
+constexpr auto SongMarks = std::to_array<TextView>(
+    { u"宋", u"明體", u"明体", u"SimSun", u"Song", u"MingLiU", u"UMing" });
+
+/// Whether a name asks for a Song-style face. A number stands for a name that was not kept, and so
+/// does an empty name.
+bool isSongStyle(const QString& name)
+{
+    bool isNumber = false;
+    name.toDouble(&isNumber);
+    return name.isEmpty() || isNumber || std::ranges::any_of(SongMarks, [&](TextView mark) {
+        return name.contains(borrowed(mark), Qt::CaseInsensitive);
+    });
+}
+
+/// The first installed Song-style family; empty: there is none.
+QString songFamily()
+{
+    for (const QString& substitute : substitutes()) {
+        if (QFontDatabase::hasFamily(substitute))
+            return substitute;
+    }
+    return {};
 }
 
 QStringList familiesOf(const QString& family)
@@ -50,15 +80,6 @@ QFont preparedFont(const QString& family, bool bold, bool italic, int pixels)
     font.setStyleStrategy(
         static_cast<QFont::StyleStrategy>(QFont::PreferNoShaping | QFont::PreferAntialias));
     return font;
-}
-
-bool hasBoldFace(const QString& family)
-{
-    for (const QString& style : QFontDatabase::styles(family)) {
-        if (QFontDatabase::weight(family, style) >= QFont::DemiBold)
-            return true;
-    }
-    return false;
 }
 
 double lineHeightOf(const QFont& reference)
@@ -99,8 +120,15 @@ QFont QtFace::installedFont(int pixels) const
     return plain;
 }
 
+/// A character that no face has is as wide as what the face has in its place. It is not measured as
+/// a text, for a shaper would put more than one glyph there.
 double QtFace::glyphAdvance(char32_t codePoint)
 {
+    if (!hasGlyph(codePoint)) {
+        const QList<QPointF> advances
+            = QRawFont::fromFont(reference_).advancesForGlyphIndexes({ 0 });
+        return advances.isEmpty() ? 0 : advances.first().x() / ReferencePixels * TwipsPerPoint;
+    }
     const QString character = QString::fromUcs4(&codePoint, 1);
     return metrics_.horizontalAdvance(character) / ReferencePixels * TwipsPerPoint;
 }
@@ -126,12 +154,13 @@ QString QtFonts::resolve(const QString& name)
 {
     if (!name.isEmpty() && QFontDatabase::hasFamily(name))
         return name;
-    for (const QString& substitute : substitutes()) {
-        if (QFontDatabase::hasFamily(substitute))
-            return substitute;
-    }
-    return QFontInfo(QFont()).family();
+    if (const QString song = songFamily(); !song.isEmpty() && isSongStyle(name))
+        return song;
+    const QString matched = QFontInfo(name.isEmpty() ? QFont() : QFont(name)).family();
+    return matched.left(matched.lastIndexOf(QStringLiteral(" ["))); // without its foundry
 }
+
+bool QtFonts::hasAny() { return QFontMetricsF(QFont()).inFont(QLatin1Char('0')); }
 
 void QtFonts::installSubstitutions()
 {
@@ -143,13 +172,24 @@ QtFace& QtFonts::resolvedFace(const FaceKey& key)
 {
     if (byName_.size() >= MostNames)
         byName_.clear();
-    const QString family = resolve(toQString(key.name));
+    const QString name = toQString(key.name);
+    const QString family = resolve(name);
+    note(name, family);
     const FaceKey familyKey { toText(family), key.bold, key.italic };
     auto& face = byFamily_[familyKey];
     if (!face)
         face = std::make_unique<QtFace>(family, key.bold, key.italic);
     byName_[key] = face.get();
     return *face;
+}
+
+void QtFonts::note(const QString& asked, const QString& taken)
+{
+    const bool isMeant = asked.isEmpty() || asked.compare(taken, Qt::CaseInsensitive) == 0
+        || (isSongStyle(asked) && substitutes().contains(taken));
+    const FontNote note { toText(asked), toText(taken) };
+    if (!isMeant && notes_.size() < MostNames && std::ranges::find(notes_, note) == notes_.end())
+        notes_.push_back(note);
 }
 
 } // namespace pelloric::qt

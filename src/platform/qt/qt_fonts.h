@@ -10,6 +10,7 @@
 #include <QString>
 
 #include <map>
+#include <vector>
 
 namespace pelloric::qt {
 
@@ -59,10 +60,20 @@ private:
     bool isBoldMadeUp_;
 };
 
+/// A family that was asked for, is not installed, and is answered by another.
+struct FontNote {
+    Text asked;
+    Text taken;
+
+    bool operator==(const FontNote&) const = default;
+};
+
 /// Resolves faces by name and keeps what was resolved.
 ///
-/// A family that is not installed is answered by the first installed one of a short list of
-/// Song-style families; the same list fills in for characters that a family lacks.
+/// A name that asks for a Song-style face, such as "宋体" or the number that a saved document holds
+/// in place of a name, is answered by the first installed one of a short list of Song-style
+/// families. Any other family that is not installed is answered as the system's font matching has
+/// it. The Song-style list fills in for characters that a family lacks.
 class QtFonts {
 public:
     QtFonts();
@@ -75,16 +86,25 @@ public:
     /// The installed family that stands for a name.
     static QString resolve(const QString& name);
 
+    /// What was taken for families that are not installed, each said once; a Song-style face for a
+    /// Song-style name is what was meant, and needs no note.
+    const std::vector<FontNote>& notes() const { return notes_; }
+
+    /// Whether there is any font to draw with.
+    static bool hasAny();
+
     /// Lets widgets, too, show "宋体" and the names that stand for it in the substitute family.
     static void installSubstitutions();
 
 private:
     QtFace& resolvedFace(const FaceKey& key);
+    void note(const QString& asked, const QString& taken);
 
     std::map<FaceKey, QtFace*> byName_;
     std::map<FaceKey, std::unique_ptr<QtFace>> byFamily_;
     FaceKey lastKey_;
     QtFace* last_ = nullptr;
+    std::vector<FontNote> notes_;
 };
 
 } // namespace pelloric::qt

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "fakes/temp_folder.h"
+#include "platform/qt/qt_fonts.h"
 #include "support/test_paths.h"
 
 #include <QFile>
@@ -114,6 +115,51 @@ TEST_F(Program, AppliesTheOptionsOfAReport)
     EXPECT_EQ(image.size(), QSize(591, 394));
 }
 
+TEST_F(Program, TellsWhichCharactersNoFontHasAndWhichFaceWasTaken)
+{
+    folder_.write("t.csv", "a\nไทย\n\xF3\xB0\x80\x80\n");
+    const Ended ended = run(words("export t.csv -o t.png --font NoSuchFace"));
+    EXPECT_EQ(ended.status, 0);
+    const std::string taken = qt::QtFonts::resolve(QStringLiteral("NoSuchFace")).toStdString();
+    EXPECT_EQ(ended.errors,
+        "pelloric: the font NoSuchFace is not installed; " + taken
+            + " is taken instead\n"
+              "pelloric: 4 characters have no glyph in any installed font and show as hollow boxes "
+              "(3 Thai, 1 private); install fonts-noto-core\n");
+    folder_.write("u.csv", "a\nÄ 北京\n");
+    EXPECT_EQ(run(words("export u.csv -o u.png")).errors, "");
+}
+
+TEST_F(Program, RefusesToWriteWithoutAnyFont)
+{
+    folder_.write("t.csv", "a\n1\n");
+    folder_.write("fonts.conf",
+        "<?xml version=\"1.0\"?><!DOCTYPE fontconfig SYSTEM \"fonts.dtd\"><fontconfig>"
+        "<dir>/nowhere</dir></fontconfig>");
+    qputenv("FONTCONFIG_FILE", QByteArray::fromStdString(folder_.file("fonts.conf").string()));
+    const Ended ended = run(words("export t.csv -o t.pdf"));
+    qunsetenv("FONTCONFIG_FILE");
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_EQ(ended.errors,
+        "pelloric: no font is installed, so no text can be drawn; install fonts-dejavu-core, and "
+        "fonts-arphic-uming for Chinese texts\n");
+}
+
+TEST_F(Program, MakesTheSameImagesWithAnyNumberOfJobs)
+{
+    std::string rows = "n\n";
+    for (int row = 0; row < 300; ++row)
+        rows += std::to_string(row) + "\n";
+    folder_.write("t.csv", rows);
+    EXPECT_EQ(run(words("export t.csv -o one.png --dpi 50 --jobs 1")).status, 0);
+    EXPECT_EQ(run(words("export t.csv -o many.png --dpi 50 --jobs 3")).status, 0);
+    for (int page = 1; page <= 7; ++page) {
+        const std::string number = "-00" + std::to_string(page) + ".png";
+        EXPECT_EQ(folder_.read("one" + number), folder_.read("many" + number)) << page;
+        EXPECT_FALSE(folder_.read("one" + number).empty()) << page;
+    }
+}
+
 TEST_F(Program, LeavesTheUsersSettingsAlone)
 {
     EXPECT_EQ(run(words("settings")).status, 0);
@@ -214,6 +260,7 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
         { "export t.csv -o t.pdf --landscape --portrait", 2, "not both" },
         { "export missing.csv -o t.pdf", 1, "missing.csv: there is no such file" },
         { "export open_quote.csv -o kept.pdf", 1, "line 3: a quoted value that never ends" },
+        { "export t.csv -o t.pdf --jobs 2", 2, "--jobs is for .png" },
         { "export bad_bytes.csv -o kept.pdf", 1, "line 2: bytes that are neither" },
         { "export empty.csv -o kept.pdf", 1, "empty.csv: the file is empty" },
         { "export t.csv -o kept.pdf --encoding no", 1, "unknown encoding no" },

@@ -17,6 +17,7 @@
 #include <QProcess>
 #include <QRegularExpression>
 #include <QSvgRenderer>
+#include <QXmlStreamReader>
 
 #include <gtest/gtest.h>
 
@@ -163,7 +164,7 @@ TEST_F(PageExport, RefusesAPageThatDoesNotExistAndWritesNothing)
 TEST_F(PageExport, ImagesHaveThePapersSizeOnWhite)
 {
     addThreePages();
-    const auto paths = exportPngs(document_, setup_, fonts_, { .dpi = 96 }, folder_.file("a.png"));
+    const auto paths = exportPngs(document_, setup_, { .dpi = 96 }, folder_.file("a.png"));
     ASSERT_EQ(paths.size(), 3U);
     EXPECT_EQ(paths.at(2), folder_.file("a-003.png"));
     const QImage image(nameOf(paths.at(2)));
@@ -178,14 +179,14 @@ TEST_F(PageExport, ASinglePageIsWrittenToThePathItself)
     addThreePages();
     const auto path = folder_.file("a.png");
     const ExportOptions options { .pages = { 1, 1 }, .dpi = 30 };
-    EXPECT_EQ(exportPngs(document_, setup_, fonts_, options, path), std::vector { path });
+    EXPECT_EQ(exportPngs(document_, setup_, options, path), std::vector { path });
     EXPECT_EQ(folder_.names(), std::vector<std::string> { "a.png" });
 }
 
 TEST_F(PageExport, RefusesAnImageThatIsTooLarge)
 {
     const auto attempt
-        = [&] { exportPngs(document_, setup_, fonts_, { .dpi = 100000 }, folder_.file("a.png")); };
+        = [&] { exportPngs(document_, setup_, { .dpi = 100000 }, folder_.file("a.png")); };
     EXPECT_EQ(errorOf(attempt), ErrorNumber::Overflow);
 }
 
@@ -206,6 +207,56 @@ TEST_F(PageExport, SvgFilesCanBeRead)
     EXPECT_TRUE(folder_.read("a-002.svg").find("page2of3") != std::string::npos);
 }
 
+TEST_F(PageExport, SvgFilesHoldNothingThatXmlForbids)
+{
+    add({ 100, 100 },
+        Text { u'a', 1, 0x1B, u'<', u'&', u'"', 0xD800, 0xFFFE, u'\t', u'b', u'\n', u'c' });
+    exportSvg(document_, setup_, fonts_, { .title = u"<&>" }, folder_.file("a.svg"));
+    QXmlStreamReader xml(QByteArray::fromStdString(folder_.read("a.svg")));
+    QString texts;
+    while (!xml.atEnd()) {
+        xml.readNext();
+        if (xml.isStartElement() && xml.name() == QLatin1String("text"))
+            texts += xml.readElementText() + QLatin1Char('|');
+    }
+    EXPECT_FALSE(xml.hasError()) << xml.errorString().toStdString();
+    EXPECT_EQ(texts.toStdString(), "a|<&\"|\xEF\xBF\xBD|b|c|");
+}
+
+TEST_F(PageExport, SvgStrokesAndHatchesAreSeenInLibrsvg)
+{
+    setup_.myWidth = 14400;
+    setup_.myHeight = 14400;
+    for (std::int16_t style = 0; style < 5; ++style)
+        addLine(document_, { 0, 750 + 1500 * style }, { 14400, 750 + 1500 * style },
+            { .LineStyle = style, .LineWidth = 3 });
+    for (std::int16_t style = 0; style < 8; ++style)
+        addLine(document_, { 1800 * style + 300, 9000 }, { 1800 * style + 1500, 12000 },
+            { .LineStyle = 5, .FillStyle = style, .FillColor = 0 });
+    exportSvg(document_, setup_, fonts_, {}, folder_.file("a.svg"));
+    ask(QStringLiteral("rsvg-convert"),
+        { QStringLiteral("-o"), nameOf(folder_.file("a.png")), nameOf(folder_.file("a.svg")) });
+    const QImage image(nameOf(folder_.file("a.png")));
+    ASSERT_EQ(image.size(), QSize(960, 960));
+    const auto inkOf = [&](const QRect& area) {
+        double ink = 0;
+        for (int y = area.top(); y <= area.bottom(); ++y) {
+            for (int x = area.left(); x <= area.right(); ++x)
+                ink += 1 - qGray(image.pixel(x, y)) / 255.0;
+        }
+        return ink / (area.width() * area.height());
+    };
+    // Of a band as high as the pen: all of it, and what the strokes of each style cover.
+    const double strokes[] = { 1, 4.0 / 6, 1.0 / 3, 5.0 / 9, 6.0 / 12 };
+    for (int style = 0; style < 5; ++style)
+        EXPECT_NEAR(inkOf({ 0, 40 + 100 * style, 960, 20 }) * 20 / 3, strokes[style], 0.05)
+            << style;
+    // Lines of one unit in tiles of eight; a diagonal covers root two of what a level line does.
+    const double fills[] = { 1, 0, 1.0 / 8, 1.0 / 8, 0.177, 0.177, 15.0 / 64, 0.33 };
+    for (int style = 0; style < 8; ++style)
+        EXPECT_NEAR(inkOf({ 120 * style + 28, 608, 64, 184 }), fills[style], 0.03) << style;
+}
+
 TEST_F(PageExport, ADocumentFileIsTheSavedOne)
 {
     addThreePages();
@@ -222,8 +273,7 @@ TEST_F(PageExport, AFailureLeavesWhatThereWas)
     folder_.write("a-001.png", "old");
     const ExportOptions options { .dpi = 30, .progress = [](int done, int) { return done < 2; } };
     EXPECT_EQ(errorOf([&] { pdf(options); }), ErrorNumber::Cancelled);
-    EXPECT_EQ(
-        errorOf([&] { exportPngs(document_, setup_, fonts_, options, folder_.file("a.png")); }),
+    EXPECT_EQ(errorOf([&] { exportPngs(document_, setup_, options, folder_.file("a.png")); }),
         ErrorNumber::Cancelled);
     EXPECT_EQ(folder_.read("a.pdf"), "old");
     EXPECT_EQ(folder_.read("a-001.png"), "old");

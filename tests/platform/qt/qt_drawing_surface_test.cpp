@@ -149,6 +149,66 @@ TEST_F(QtDrawingSurfaceTest, PrintingBreaksTheLine)
     EXPECT_GT(inkOf(image).top(), (100 + 209) * 96 / Inch);
 }
 
+TEST_F(QtDrawingSurfaceTest, EveryLineOfATextBeginsAtItsX)
+{
+    const QImage whole = drawn([&](DrawingSurface& surface) {
+        setFont(surface, 10);
+        surface.setCurrentX(720);
+        surface.setCurrentY(100);
+        surface.print(u"ab\r\ncd\n\nef");
+    });
+    const Twips line = textHeight(fonts_.face(Uming, false, false), 10);
+    const QImage parts = drawn([&](DrawingSurface& surface) {
+        setFont(surface, 10);
+        const std::pair<TextView, int> rows[] = { { u"ab", 0 }, { u"cd", 1 }, { u"ef", 3 } };
+        for (const auto& [text, row] : rows) {
+            surface.setCurrentX(720);
+            surface.setCurrentY(100 + row * line);
+            surface.print(text);
+        }
+    });
+    EXPECT_EQ(whole, parts);
+    EXPECT_GT(inkAmount(whole), 0);
+}
+
+TEST_F(QtDrawingSurfaceTest, TabsAreGapsAndOtherControlCharactersNothing)
+{
+    const auto shown = [&](TextView text, Twips x = 720) {
+        return drawn([&](DrawingSurface& surface) {
+            setFont(surface, 10);
+            surface.setCurrentX(x);
+            surface.print(text);
+        });
+    };
+    EXPECT_EQ(shown(u"a\tb"), shown(u"a    b"));
+    EXPECT_EQ(shown(u"\tb"), shown(u"b", 720 + 400));
+    const Text controls { u'a', 0, 1, 0x1B, 0x7F, 0x85, 0x200B, 0xFEFF, u'b' };
+    EXPECT_EQ(shown(controls), shown(u"ab"));
+}
+
+TEST_F(QtDrawingSurfaceTest, ACharacterThatNoFaceHasIsAHollowBoxUnlikeTheBallotBox)
+{
+    const auto shown = [&](TextView text) {
+        return drawn(300, {}, [&](DrawingSurface& surface) {
+            setFont(surface, 30);
+            surface.setFontName(Latin);
+            surface.setCurrentX(720);
+            surface.print(text);
+        });
+    };
+    const QImage thai = shown(u"\u0E01");
+    const QRect box = inkOf(thai);
+    ASSERT_FALSE(box.isEmpty());
+    EXPECT_EQ(thai.pixel(box.center()), qRgb(255, 255, 255));
+    EXPECT_LT(qGray(thai.pixel(box.left() + 3, box.center().y())), 64);
+    EXPECT_LT(qGray(thai.pixel(box.center().x(), box.bottom() - 3)), 64);
+    EXPECT_GT(box.bottom(), inkOf(shown(u"\u2610")).bottom() + 5) << "it reaches below the line";
+    const double advance = fonts_.face(Latin, false, false).unitAdvance(0x0E01) * 30 * 300 / Inch;
+    EXPECT_LE(box.width(), advance);
+    EXPECT_GT(box.width(), advance / 2);
+    EXPECT_NEAR(inkOf(shown(u"\u0E01\u0E02")).right() - box.right(), advance, 1.5);
+}
+
 TEST_F(QtDrawingSurfaceTest, AMadeUpBoldIsBlackerButNoWider)
 {
     const auto print = [&](bool bold) {

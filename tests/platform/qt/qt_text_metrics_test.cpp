@@ -4,7 +4,10 @@
 #include "platform/qt/qt_text_metrics.h"
 
 #include "platform/qt/qt_fonts.h"
+#include "platform/qt/qt_text.h"
 #include "platform/qt/uming.h"
+
+#include <QProcess>
 
 #include <gtest/gtest.h>
 
@@ -57,12 +60,62 @@ TEST_F(QtTextMetricsTest, ATextIsAsWideAsItsCharacters)
     }
 }
 
-TEST_F(QtTextMetricsTest, FacesThatAreNotInstalledAnswerTheSubstitute)
+TEST_F(QtTextMetricsTest, NamesOfSongStyleFacesAnswerTheInstalledOne)
 {
-    FaceMetrics* const substitute = &metrics_.face(u"宋体", false, false);
-    for (const TextView name : { u"0", u"no such face", u"" })
-        EXPECT_EQ(&metrics_.face(name, false, false), substitute);
-    EXPECT_EQ(textWidth(substitute->advanceOf(u"宋"), 10), 200);
+    FaceMetrics* const song = &metrics_.face(u"宋体", false, false);
+    for (const TextView name :
+        { u"0", u"10.5", u"", u"新宋体", u"仿宋", u"simsun", u"SimSun-ExtB" })
+        EXPECT_EQ(&metrics_.face(name, false, false), song) << toUtf8(name);
+    EXPECT_EQ(textWidth(song->advanceOf(u"宋"), 10), 200);
+    EXPECT_TRUE(fonts_.notes().empty());
+}
+
+TEST_F(QtTextMetricsTest, OtherFacesThatAreNotInstalledAnswerWhatTheSystemMatches)
+{
+    for (const char* const name :
+        { "Arial", "Times New Roman", "Courier New", "Verdana", "黑体" }) {
+        QProcess match;
+        match.start(QStringLiteral("fc-match"),
+            { QStringLiteral("-f"), QStringLiteral("%{family[0]}"), QString::fromUtf8(name) });
+        ASSERT_TRUE(match.waitForFinished()) << "fc-match: install fontconfig";
+        const QString family = QString::fromUtf8(match.readAllStandardOutput());
+        ASSERT_FALSE(family.isEmpty());
+        EXPECT_EQ(QtFonts::resolve(QString::fromUtf8(name)).toStdString(), family.toStdString())
+            << name;
+    }
+}
+
+TEST_F(QtTextMetricsTest, WhatWasTakenForAMissingFaceIsNotedOnce)
+{
+    for (int round = 0; round < 2; ++round) {
+        metrics_.face(u"No Such Face", false, false);
+        metrics_.face(u"No Such Face", true, false);
+        metrics_.face(u"DejaVu Sans", false, false);
+        metrics_.face(u"宋体", false, false);
+    }
+    const Text taken = toText(QtFonts::resolve(QStringLiteral("No Such Face")));
+    EXPECT_EQ(fonts_.notes(), (std::vector<FontNote> { { u"No Such Face", taken } }));
+}
+
+TEST_F(QtTextMetricsTest, ATabIsAsWideAsFourBlanksAndOtherControlCharactersAreNothing)
+{
+    for (const TextView name : { Uming, TextView(u"DejaVu Sans") }) {
+        FaceMetrics& face = metrics_.face(name, false, false);
+        EXPECT_EQ(face.unitAdvance(u'\t'), static_cast<float>(4 * face.unitAdvance(u' ')));
+        for (const char16_t unit : { 0x00, 0x01, 0x0D, 0x1B, 0x7F, 0x85, 0xAD, 0x200B, 0xFEFF })
+            EXPECT_EQ(face.unitAdvance(unit), 0) << static_cast<int>(unit);
+    }
+}
+
+TEST_F(QtTextMetricsTest, CharactersThatNoFaceHasAreTold)
+{
+    FaceMetrics& face = uming();
+    EXPECT_EQ(face.kindOf(U'A'), CharacterKind::Plain);
+    EXPECT_EQ(face.kindOf(U'宋'), CharacterKind::Plain);
+    EXPECT_EQ(face.kindOf(0x0E01), CharacterKind::Missing); // Thai
+    EXPECT_GT(face.unitAdvance(0x0E01), 0);
+    EXPECT_EQ(face.kindOf(0xFFFE), CharacterKind::Missing);
+    EXPECT_EQ(face.kindOf(0x10FFFF), CharacterKind::Missing);
 }
 
 TEST_F(QtTextMetricsTest, AMadeUpBoldIsAsWideAsTheRegularFace)
