@@ -28,7 +28,8 @@ if(TARGET pelloric)
             DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/pelloric/${room}/qt"
             FILES_MATCHING PATTERN "*.h")
     endforeach()
-    install(FILES "${PROJECT_SOURCE_DIR}/cmake/FindLibCsv.cmake" DESTINATION "${PELLORIC_PACKAGE_DIR}")
+    install(FILES "${PROJECT_SOURCE_DIR}/cmake/FindLibZip.cmake"
+        "${PROJECT_SOURCE_DIR}/cmake/FindUchardet.cmake" DESTINATION "${PELLORIC_PACKAGE_DIR}")
 endif()
 if(TARGET pelloric_app)
     install(TARGETS pelloric_app COMPONENT tools)

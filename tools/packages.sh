@@ -12,12 +12,13 @@ PackagesBuild=(
     fonts-arphic-uming
     fonts-dejavu-core
     g++
-    libcsv-dev
     libcups2-dev
     libgmock-dev
     libgtest-dev
     libpng-dev
     libqt6sql6-sqlite
+    libuchardet-dev
+    libzip-dev
     ninja-build
     nlohmann-json3-dev
     qt6-base-dev

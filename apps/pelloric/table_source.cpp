@@ -4,11 +4,14 @@
 #include "table_source.h"
 
 #include "interruption.h"
+#include "outcome.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "progress_line.h"
 #include "table_selection.h"
 #include "tables/qt/csv_table.h"
+#include "tables/qt/json_table.h"
+#include "tables/qt/office_table.h"
 #include "tables/qt/sqlite_table.h"
 
 #include <QFile>
@@ -17,6 +20,7 @@
 
 #include <array>
 #include <optional>
+#include <vector>
 
 namespace pelloric::app {
 
@@ -24,9 +28,9 @@ namespace {
 
 constexpr auto Options = std::to_array<Option>({
     { "query", "SQL", "what to take of a database: a SELECT statement" },
-    { "encoding", "NAME", "of a CSV or TSV file; else found out (UTF-8, GB18030)" },
-    { "delimiter", "C", "between its values: a character, or \"tab\"; else found out" },
-    { "no-quote", nullptr, "its quotation marks are characters like any other" },
+    { "encoding", "NAME", "of a text file; else found out" },
+    { "delimiter", "CHAR", "between the values of a CSV file, or tab; else found out" },
+    { "no-quote", nullptr, "a quote in a CSV file is a character like any other" },
 });
 
 /// The name that stands for the standard input, and what that is called.
@@ -69,24 +73,6 @@ void checkReadable(const QString& name)
     if (!info.isReadable())
         throw CommandError(QStringLiteral("%1: you may not read this file").arg(name));
 }
-
-/// The delimiter that the options name; 0: none.
-char delimiterOf(const CommandLine& line)
-{
-    if (!line.has("delimiter"))
-        return 0;
-    const QString text = line.value("delimiter");
-    if (text == QLatin1String("tab") || text == QLatin1String("\\t"))
-        return '\t';
-    const char character = text.size() == 1 ? text.front().toLatin1() : '\0';
-    if (character < ' ' && character != '\t')
-        throw CommandError(
-            QStringLiteral("--delimiter takes one ASCII character, or \"tab\", not \"%1\"")
-                .arg(text),
-            WrongUsage);
-    return character;
-}
-
 /// What a pipe hands over, in a file that can be read twice.
 class PipedInput {
 public:
@@ -129,7 +115,42 @@ TableGrid readDatabase(const DatabaseName& name, const CommandLine& line, Progre
     return qt::readSqlite(source);
 }
 
-TableGrid readValues(const QString& name, const CommandLine& line, ProgressLine& progress)
+/// @throws CommandError WrongUsage
+std::optional<char> delimiterOf(const CommandLine& line)
+{
+    if (!line.has("delimiter"))
+        return {};
+    const QString text = line.value("delimiter");
+    if (text.compare(QLatin1String("tab"), Qt::CaseInsensitive) == 0
+        || text == QLatin1String("\\t"))
+        return '\t';
+    constexpr char16_t FirstPastAscii = 0x80;
+    if (text.size() != 1 || text.front() >= QChar(FirstPastAscii) || text.front() == u'"')
+        throw CommandError(
+            QStringLiteral("--delimiter takes one ASCII character, or \"tab\", not \"%1\"")
+                .arg(text),
+            WrongUsage);
+    return text.front().toLatin1();
+}
+
+bool isJson(const QString& name)
+{
+    const QString extension = QFileInfo(name).suffix().toLower();
+    for (const char* const json : { "json", "jsonl", "ndjson" }) {
+        if (extension == QLatin1String(json))
+            return true;
+    }
+    if (extension == QLatin1String("csv") || extension == QLatin1String("tsv"))
+        return false;
+    constexpr qint64 SniffedBytes = 4096;
+    QFile file(name);
+    return file.open(QIODevice::ReadOnly) && !file.isSequential()
+        && qt::looksLikeJson(file.read(SniffedBytes).toStdString());
+}
+
+/// @param shown  what the file is called in warnings
+TableGrid readValues(
+    const QString& name, const QString& shown, const CommandLine& line, ProgressLine& progress)
 {
     if (line.has("query"))
         throw CommandError(QStringLiteral("--query is for databases; %1 is none").arg(name));
@@ -137,11 +158,19 @@ TableGrid readValues(const QString& name, const CommandLine& line, ProgressLine&
         progress.show("Reading", part);
         return Interruption::mayGoOn();
     };
-    return qt::readCsv(pathOf(name),
+    const std::optional<char> delimiter = delimiterOf(line);
+    if (isJson(name))
+        return qt::readJson(pathOf(name), { .encoding = line.value("encoding"), .progress = step });
+    std::vector<Text> notes;
+    TableGrid grid = qt::readCsv(pathOf(name),
         { .encoding = line.value("encoding"),
-            .delimiter = delimiterOf(line),
-            .isQuoted = !line.has("no-quote"),
-            .progress = step });
+            .progress = step,
+            .delimiter = delimiter,
+            .hasQuotes = !line.has("no-quote"),
+            .notes = &notes });
+    for (const Text& text : notes)
+        note(QStringLiteral("%1: %2").arg(shown, qt::toQString(text)));
+    return grid;
 }
 
 } // namespace
@@ -185,11 +214,16 @@ TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& 
     const QString shown = piped ? StandardInputName : name.file;
     checkReadable(name.file);
     const bool isFromDatabase = isDatabase(name.file);
-    if (!isFromDatabase && !name.table.isEmpty())
-        throw CommandError(QStringLiteral("%1 is no SQLite database").arg(shown));
+    const bool isOffice = qt::isOfficeFile(pathOf(name.file));
+    if (!isFromDatabase && !isOffice && !name.table.isEmpty())
+        throw CommandError(
+            QStringLiteral("%1 is no SQLite database and no office file").arg(shown));
     try {
+        if (isOffice)
+            return selected(
+                qt::readOffice({ .path = pathOf(name.file), .sheet = name.table }), line);
         return selected(isFromDatabase ? readDatabase(name, line, progress)
-                                       : readValues(name.file, line, progress),
+                                       : readValues(name.file, shown, line, progress),
             line);
     } catch (const RunTimeError& error) {
         if (error.number() == ErrorNumber::Cancelled)

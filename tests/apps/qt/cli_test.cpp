@@ -145,6 +145,19 @@ TEST_F(Program, RefusesToWriteWithoutAnyFont)
         "fonts-arphic-uming for Chinese texts\n");
 }
 
+TEST_F(Program, ReadsJsonAndSaysWhatItGuessed)
+{
+    folder_.write("t.json", "[{\"City\":\"Kyoto\",\"n\":1},{\"n\":2.50}]");
+    EXPECT_EQ(run(words("export t.json -o t.pdf")).errors, "");
+    EXPECT_TRUE(has(pdfText("t.pdf"), "Kyoto"));
+    EXPECT_TRUE(has(pdfText("t.pdf"), "2.50"));
+    folder_.write("w.csv", "Name;Ort\nM\xFCller;K\xF6ln\nJos\xE9;Caf\xE9\n");
+    EXPECT_EQ(run(words("export w.csv -o w.pdf")).errors,
+        "pelloric: w.csv: the encoding was guessed to be windows-1252; name another one if letters "
+        "look wrong\n");
+    EXPECT_TRUE(has(pdfText("w.pdf"), "Müller"));
+}
+
 TEST_F(Program, MakesTheSameImagesWithAnyNumberOfJobs)
 {
     std::string rows = "n\n";
@@ -237,8 +250,8 @@ struct ErrorCase {
 TEST_F(Program, ExplainsEveryErrorInOneLine)
 {
     folder_.write("t.csv", "a\n1\n");
-    folder_.write("open_quote.csv", "a\n1\n\"x\n");
-    folder_.write("bad_bytes.csv", "a\n\xFF\xFF\n");
+    folder_.write("one_object.json", "{\n\"rows\": []\n}\n");
+    folder_.write("bad_bytes.csv", "a\n\xB3\xC7\xB1");
     folder_.write("empty.csv", "");
     folder_.write("broken.ostl", "nothing");
     folder_.write("kept.pdf", "old");
@@ -259,7 +272,8 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
         { "export t.csv -o t.ostl --pages 1", 2, "--pages" },
         { "export t.csv -o t.pdf --landscape --portrait", 2, "not both" },
         { "export missing.csv -o t.pdf", 1, "missing.csv: there is no such file" },
-        { "export open_quote.csv -o kept.pdf", 1, "line 3: a quoted value that never ends" },
+        { "export one_object.json -o kept.pdf", 1, "one_object.json: the file is one object" },
+        { "export t.csv -o t.pdf --delimiter xy", 2, "--delimiter" },
         { "export t.csv -o t.pdf --jobs 2", 2, "--jobs is for .png" },
         { "export bad_bytes.csv -o kept.pdf", 1, "line 2: bytes that are neither" },
         { "export empty.csv -o kept.pdf", 1, "empty.csv: the file is empty" },

@@ -71,6 +71,12 @@ TEST(CsvTable, ReadsTitlesAndCells)
         { "tabs.tsv", "a\tb,c\n1\t2\n", "a|b,c|/1|2|" },
         { "sniffed_tabs.csv", "a\tb\n1\t2\n", "a|b|/1|2|" },
         { "sniffed_semicolons.csv", "a;b;\"c,d,e,f\"\n1;2,5;3\n", "a|b|c,d,e,f|/1|2,5|3|" },
+        { "open_quote.csv", "a,b\n1,2\n3,\"x\ny,4\n", "a|b|/1|2|/3|\"x|/y|4|" },
+        { "text_behind_quote.csv", "a,b\n\"abc\" def,2\n3,4\n", "a|b|/\"abc\" def|2|/3|4|" },
+        { "bars.txt", "a|b\n1|2,5\n", "a|b|/1|2,5|" },
+        { "commas.tsv", "a,b\n1,2\n", "a|b|/1|2|" },
+        { "western.csv", "Name,Ort\nM\xFCller,K\xF6ln\nJos\xE9,Caf\xE9\n",
+            "Name|Ort|/Müller|Köln|/José|Café|" },
         { "empty_cells.tsv", "a\tb\tc\n\t\t3\n", "a|b|c|/||3|" },
     };
     for (const ReadCase& row : cases)
@@ -94,14 +100,18 @@ TEST(CsvTable, ReadsAnEncodingThatIsAskedFor)
 TEST(CsvTable, NamesTheLineOfWhatItCannotRead)
 {
     const ReadCase cases[] = {
-        { "open_quote.csv", "a,b\n1,2\n3,\"x\ny,4\n",
-            "Type mismatch: line 3: a quoted value that never ends" },
-        { "bad_bytes.csv", "a\n1\n\xFF\xFF\n",
-            "Type mismatch: line 3: bytes that are neither UTF-8 nor GB18030 text; name the "
-            "encoding" },
         { "cut_gb.csv", "\xB3\xC7\n\xB1\xB1\n\xBE",
             "Type mismatch: line 3: bytes that are neither UTF-8 nor GB18030 text; name the "
             "encoding" },
+        { "marked_as_utf8.csv",
+            "\xEF\xBB\xBF"
+            "a\n\xB3\xC7\n",
+            "Type mismatch: line 2: bytes that are no UTF-8, which the file's mark says it is" },
+        { "half_utf16.csv",
+            std::string_view("\xFF\xFE"
+                             "a\0\n\0b",
+                7),
+            "Type mismatch: bytes that are no UTF-16LE, which the file's mark says it is" },
         { "zero.csv", std::string_view("a\n\"x\ny\"\n\0\n", 10),
             "Type mismatch: line 4: a zero byte; this is no text file" },
         { "empty.csv", "", "Type mismatch: the file is empty" },
@@ -111,6 +121,31 @@ TEST(CsvTable, NamesTheLineOfWhatItCannotRead)
         EXPECT_EQ(read(row.name, row.bytes), row.result) << row.name;
     EXPECT_EQ(read("a.csv", "a\n\xE9\n", QStringLiteral("UTF-8")),
         "Type mismatch: line 2: bytes that are no UTF-8");
+}
+
+TEST(CsvTable, ReadsAsItIsToldToRead)
+{
+    const TempFolder folder;
+    const auto path = folder.write("a.csv", "a;b,\"c\n1;2,\"3\n");
+    EXPECT_EQ(dump(readCsv(path, { .delimiter = ';' })), u"a|b,\"c|/1|2,\"3|");
+    EXPECT_EQ(dump(readCsv(folder.write("b.csv", "\"a,b\"\n\"1,2\"\n"), { .hasQuotes = false })),
+        u"\"a|b\"|/\"1|2\"|");
+}
+
+TEST(CsvTable, SaysWhichEncodingWasGuessedAndWhichRowsLookGlued)
+{
+    const TempFolder folder;
+    std::vector<Text> notes;
+    readCsv(folder.write("utf8.csv", "Ä,b\n\"x\ny\",2\n"), { .notes = &notes });
+    EXPECT_EQ(notes, std::vector<Text>());
+    readCsv(folder.write("w.csv", "Name,Ort\nM\xFCller,K\xF6ln\nJos\xE9,Caf\xE9\n"),
+        { .notes = &notes });
+    readCsv(folder.write("g.csv", "a,b,c\n1,2,3\n\"x,2,3\ny\",4\n5,6,7\n"), { .notes = &notes });
+    EXPECT_EQ(notes,
+        (std::vector<Text> {
+            u"the encoding was guessed to be windows-1252; name another one if letters look wrong",
+            u"the row at line 3 may be several rows glued together: a quoted value goes on over a "
+            u"line break, and the row has not as many values as the titles" }));
 }
 
 TEST(CsvTable, RefusesAnUnknownEncodingAndAMissingFile)

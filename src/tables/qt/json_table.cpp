@@ -1,0 +1,310 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "tables/qt/json_table.h"
+
+#include "platform/run_time_error.h"
+
+#include <nlohmann/json.hpp>
+
+#include <algorithm>
+#include <limits>
+#include <optional>
+#include <unordered_map>
+#include <vector>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max();
+constexpr std::string_view Blanks = " \t\r\n";
+
+constexpr TextView WantedShape
+    = u"a table is an array of objects, [{\"name\": value, …}, …], or one object a line";
+
+[[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::TypeMismatch, what); }
+
+/// The columns of the table by their names, in the order in which they came up.
+class Names {
+public:
+    std::size_t columnOf(const std::string& name)
+    {
+        const auto [found, isNew] = columns_.try_emplace(name, names_.size());
+        if (isNew)
+            names_.push_back(name);
+        return found->second;
+    }
+
+    const std::vector<std::string>& all() const { return names_; }
+
+private:
+    std::unordered_map<std::string, std::size_t> columns_;
+    std::vector<std::string> names_;
+};
+
+/// Takes the objects of a table apart as they are parsed.
+///
+/// Without a grid it only learns the names; with one it fills the rows. What is nested in a value
+/// is written down again as it comes.
+class TableReceiver : public nlohmann::json_sax<nlohmann::json> {
+public:
+    /// @param isLine  the text is one object of a file of lines
+    TableReceiver(Names& names, TableGrid* grid, bool isLine)
+        : names_(names)
+        , grid_(grid)
+        , objectDepth_(isLine ? 1 : 2)
+    {
+    }
+
+    /// Why it is no table; empty: it is one.
+    TextView refusal() const { return refusal_; }
+    /// Where and why it is no JSON.
+    std::optional<std::size_t> errorPosition() const { return errorPosition_; }
+    const std::string& error() const { return error_; }
+
+    bool null() override { return take("null", {}); }
+    bool boolean(bool value) override
+    {
+        return value ? take("true", "true") : take("false", "false");
+    }
+    bool number_integer(number_integer_t value) override
+    {
+        const std::string text = std::to_string(value);
+        return take(text, text);
+    }
+    bool number_unsigned(number_unsigned_t value) override
+    {
+        const std::string text = std::to_string(value);
+        return take(text, text);
+    }
+    bool number_float(number_float_t, const string_t& text) override { return take(text, text); }
+    bool string(string_t& value) override
+    {
+        return isNested() ? take(nlohmann::json(value).dump(-1, ' ', false, Replace), {})
+                          : take({}, value);
+    }
+    bool binary(binary_t&) override { return false; }
+
+    bool start_object(std::size_t) override
+    {
+        ++depth_;
+        if (depth_ < objectDepth_)
+            return refuseShape();
+        if (depth_ > objectDepth_)
+            return open('{');
+        values_.assign(names_.all().size(), {});
+        return true;
+    }
+    bool key(string_t& name) override
+    {
+        if (depth_ > objectDepth_) {
+            separate();
+            nested_ += nlohmann::json(name).dump(-1, ' ', false, Replace) + ":";
+            followsKey_ = true;
+            return true;
+        }
+        column_ = names_.columnOf(name);
+        return column_ < MostColumns || refuseWith(u"more than 32767 different names");
+    }
+    bool end_object() override
+    {
+        if (depth_-- > objectDepth_)
+            return close('}');
+        endRow();
+        return true;
+    }
+    bool start_array(std::size_t) override
+    {
+        ++depth_;
+        if (depth_ < objectDepth_)
+            return true;
+        return depth_ > objectDepth_ ? open('[') : refuseShape();
+    }
+    bool end_array() override { return depth_-- > objectDepth_ ? close(']') : true; }
+
+    bool parse_error(
+        std::size_t position, const std::string&, const nlohmann::detail::exception& error) override
+    {
+        errorPosition_ = position;
+        error_ = error.what();
+        return false;
+    }
+
+private:
+    static constexpr auto Replace = nlohmann::json::error_handler_t::replace;
+
+    bool isNested() const { return depth_ > objectDepth_; }
+
+    bool refuseWith(TextView why)
+    {
+        refusal_ = why;
+        return false;
+    }
+
+    bool refuseShape() { return refuseWith(WantedShape); }
+
+    /// @param json   as it stands in a nested value
+    /// @param plain  as a cell shows it
+    bool take(const std::string& json, const std::string& plain)
+    {
+        if (depth_ < objectDepth_)
+            return refuseShape();
+        if (isNested()) {
+            separate();
+            nested_ += json;
+            return true;
+        }
+        put(plain);
+        return true;
+    }
+
+    void separate()
+    {
+        if (!followsKey_ && !nested_.empty() && nested_.back() != '[' && nested_.back() != '{')
+            nested_ += ",";
+        followsKey_ = false;
+    }
+
+    bool open(char bracket)
+    {
+        separate();
+        nested_ += bracket;
+        return true;
+    }
+
+    bool close(char bracket)
+    {
+        nested_ += bracket;
+        if (depth_ == objectDepth_) {
+            put(nested_);
+            nested_.clear();
+        }
+        return true;
+    }
+
+    void put(const std::string& value)
+    {
+        if (values_.size() <= column_)
+            values_.resize(column_ + 1);
+        values_[column_] = value;
+    }
+
+    void endRow()
+    {
+        if (grid_ == nullptr)
+            return;
+        texts_.clear();
+        for (const std::string& value : values_)
+            texts_.push_back(fromUtf8(value));
+        grid_->addRow(std::vector<TextView>(texts_.begin(), texts_.end()));
+    }
+
+    Names& names_;
+    TableGrid* grid_;
+    int objectDepth_; ///< of the objects that are rows
+    int depth_ = 0;
+    std::size_t column_ = 0;
+    std::vector<std::string> values_;
+    std::vector<Text> texts_;
+    std::string nested_;
+    bool followsKey_ = false;
+    TextView refusal_;
+    std::optional<std::size_t> errorPosition_;
+    std::string error_;
+};
+
+std::int64_t lineAt(std::string_view text, std::size_t position)
+{
+    return std::ranges::count(text.substr(0, position), '\n') + 1;
+}
+
+/// What the parser says, without its own name and counts.
+Text explained(const std::string& error)
+{
+    const std::size_t colon = error.rfind(": ");
+    return u"this is no JSON: "
+        + fromUtf8(colon == std::string::npos ? error : error.substr(colon + 2));
+}
+
+/// @param firstLine  of the text in its file
+void parse(std::string_view text, TableReceiver& receiver, std::int64_t firstLine)
+{
+    if (nlohmann::json::sax_parse(text.begin(), text.end(), &receiver))
+        return;
+    if (receiver.errorPosition()) {
+        const std::size_t position = std::min(*receiver.errorPosition(), text.size());
+        refuse(atLine(firstLine - 1 + lineAt(text, position > 0 ? position - 1 : 0),
+            explained(receiver.error())));
+    }
+    refuse(atLine(firstLine, receiver.refusal()));
+}
+
+/// Parses all of a file: an array as a whole, and anything else line by line.
+void parseAll(std::string_view text, Names& names, TableGrid* grid)
+{
+    const std::size_t first = text.find_first_not_of(Blanks);
+    if (first == std::string_view::npos)
+        refuse(u"the file is empty");
+    if (text[first] == '[') {
+        TableReceiver receiver(names, grid, false);
+        parse(text, receiver, 1);
+        return;
+    }
+    std::int64_t line = 0;
+    while (!text.empty()) {
+        ++line;
+        const std::size_t end = std::min(text.find('\n'), text.size());
+        const std::string_view object = text.substr(0, end);
+        text.remove_prefix(std::min(end + 1, text.size()));
+        if (object.find_first_not_of(Blanks) == std::string_view::npos)
+            continue;
+        TableReceiver receiver(names, grid, true);
+        parse(object, receiver, line);
+    }
+}
+
+/// A file that is one object over several lines is no table, and fails in its first line.
+void refuseOneObject(std::string_view text)
+{
+    const std::size_t first = text.find_first_not_of(Blanks);
+    if (first == std::string_view::npos || text[first] != '{')
+        return;
+    const std::string_view line = text.substr(0, text.find('\n', first));
+    if (!nlohmann::json::accept(line) && nlohmann::json::accept(text))
+        refuse(u"the file is one object; " + Text(WantedShape)
+            + u"; take the array out of it, for example with: jq .NAME");
+}
+
+} // namespace
+
+bool looksLikeJson(std::string_view start)
+{
+    const std::size_t first = start.find_first_not_of(Blanks);
+    if (first == std::string_view::npos || (start[first] != '[' && start[first] != '{'))
+        return false;
+    const std::size_t next = start.find_first_not_of(Blanks, first + 1);
+    if (next == std::string_view::npos)
+        return false;
+    constexpr std::string_view InArray = "{[]\"-0123456789tfn";
+    const std::string_view expected = start[first] == '{' ? "\"}" : InArray;
+    const bool isLine = start.find('\n', first) < next;
+    return expected.find(start[next]) != std::string_view::npos
+        && (start[first] == '{' || start[next] == '{' || isLine);
+}
+
+TableGrid readJson(const std::filesystem::path& path, const TextFileOptions& options)
+{
+    const TextFile file = readTextFile(path, options);
+    refuseOneObject(file.text);
+    Names names;
+    parseAll(file.text, names, nullptr);
+    std::vector<TableColumn> columns;
+    for (const std::string& name : names.all())
+        columns.push_back({ .title = fromUtf8(name), .width = -1 });
+    TableGrid grid(std::move(columns));
+    parseAll(file.text, names, &grid);
+    return grid;
+}
+
+} // namespace pelloric::qt

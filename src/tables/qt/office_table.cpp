@@ -1,0 +1,87 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "tables/qt/office_table.h"
+
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+#include "tables/qt/sheet_cells.h"
+#include "tables/qt/zip_entries.h"
+
+#include <QFile>
+#include <QFileInfo>
+#include <QProcess>
+#include <QStandardPaths>
+#include <QTemporaryDir>
+
+#include <algorithm>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr int ConversionTime = 120000; ///< milliseconds
+
+constexpr char ZipMark[] = "PK\x03\x04";
+constexpr char OldOfficeMark[] = "\xD0\xCF\x11\xE0";
+
+[[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::TypeMismatch, what); }
+
+QByteArray startOf(const std::filesystem::path& path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) ? file.read(4) : QByteArray();
+}
+
+QString extensionOf(const std::filesystem::path& path)
+{
+    return QString::fromStdU16String(path.extension().u16string()).toLower();
+}
+
+/// Converts an office file of another kind.
+/// @return  the file as .xlsx, in the folder
+std::filesystem::path converted(const std::filesystem::path& path, const QTemporaryDir& folder)
+{
+    const QString program = QStandardPaths::findExecutable(QStringLiteral("soffice"));
+    if (program.isEmpty())
+        refuse(u"this office file has to be converted by LibreOffice, which is not installed; "
+               u"install libreoffice-calc, or save the file as .xlsx, .ods or CSV");
+    QProcess process;
+    const QString name = QString::fromStdU16String(path.u16string());
+    process.start(program,
+        { QStringLiteral("--headless"), QStringLiteral("--convert-to"), QStringLiteral("xlsx"),
+            QStringLiteral("--outdir"), folder.path(), name });
+    const bool hasEnded = process.waitForFinished(ConversionTime);
+    const QString made
+        = folder.filePath(QFileInfo(name).completeBaseName() + QStringLiteral(".xlsx"));
+    if (!hasEnded || process.exitCode() != 0 || !QFileInfo::exists(made))
+        refuse(u"LibreOffice could not convert this file; save it as .xlsx, .ods or CSV");
+    return toText(made);
+}
+
+} // namespace
+
+bool isOfficeFile(const std::filesystem::path& path)
+{
+    const QByteArray start = startOf(path);
+    const QString extension = extensionOf(path);
+    if (start == QByteArray(OldOfficeMark))
+        return true;
+    constexpr const char* Zipped[] = { ".xlsx", ".xlsm", ".ods", ".xltx" };
+    return start == QByteArray(ZipMark) && std::ranges::any_of(Zipped, [&](const char* zipped) {
+        return extension == QLatin1String(zipped);
+    });
+}
+
+TableGrid readOffice(const OfficeSource& source)
+{
+    const QTemporaryDir folder;
+    const bool isOld = startOf(source.path) == QByteArray(OldOfficeMark);
+    const std::filesystem::path path = isOld ? converted(source.path, folder) : source.path;
+    const ZipEntries file(path);
+    const SheetCells cells = file.has("content.xml") ? readOdsSheet(file, source.sheet)
+                                                     : readXlsxSheet(file, source.sheet);
+    return cells.toTable();
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,209 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "tables/qt/text_file.h"
+
+#include "platform/qt/qt_text.h"
+#include "platform/run_time_error.h"
+
+#include <QByteArray>
+#include <QFile>
+#include <QStringDecoder>
+
+#include <uchardet/uchardet.h>
+
+#include <algorithm>
+#include <memory>
+#include <vector>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr qint64 ChunkBytes = 1 << 20;
+
+/// More tells nothing new about the letters of a text.
+constexpr std::size_t DetectedBytes = 1U << 22U;
+
+constexpr char Utf8[] = "UTF-8";
+constexpr char Gb18030[] = "GB18030";
+constexpr char Western[] = "windows-1252";
+
+[[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::TypeMismatch, what); }
+
+Text named(const QByteArray& encoding) { return toText(QString::fromLatin1(encoding)); }
+
+QByteArray readAll(const std::filesystem::path& path, const TextFileOptions& options)
+{
+    QFile file(path);
+    std::error_code ignored;
+    if (std::filesystem::is_directory(path, ignored) || !file.open(QIODevice::ReadOnly))
+        throw RunTimeError(ErrorNumber::FileNotFound, toText(file.fileName()));
+    QByteArray bytes;
+    bytes.reserve(file.size());
+    while (true) {
+        const QByteArray chunk = file.read(ChunkBytes);
+        if (chunk.isEmpty())
+            break;
+        bytes += chunk;
+        const double part = file.size() > 0
+            ? static_cast<double>(bytes.size()) / static_cast<double>(file.size())
+            : 0;
+        if (options.progress && !options.progress(std::min(1.0, part)))
+            throw RunTimeError(ErrorNumber::Cancelled);
+    }
+    if (file.error() != QFileDevice::NoError)
+        throw RunTimeError(ErrorNumber::FileNotFound, toText(file.errorString()));
+    return bytes;
+}
+
+/// A text in another encoding; nothing that is no text of it is left unseen.
+struct Decoded {
+    std::string text; ///< UTF-8
+    bool isWhole = true; ///< all bytes are text
+};
+
+Decoded decode(QByteArrayView bytes, const QByteArray& encoding)
+{
+    QStringDecoder decoder(encoding.constData());
+    Decoded decoded;
+    for (qsizetype at = 0; at < bytes.size() && !decoder.hasError(); at += ChunkBytes) {
+        const QString piece = decoder(bytes.sliced(at, std::min(ChunkBytes, bytes.size() - at)));
+        decoded.text += piece.toUtf8().toStdString();
+    }
+    // A character that the file's end cuts off is an error only once something follows it.
+    const QString ignored = decoder(QByteArrayView("\n", 1));
+    decoded.isWhole = !decoder.hasError();
+    return decoded;
+}
+
+/// The first line with bytes that are no text; 0 when the lines tell nothing.
+std::int64_t badLine(QByteArrayView bytes, const QByteArray& encoding)
+{
+    std::int64_t line = 1;
+    for (qsizetype begin = 0; begin < bytes.size(); ++line) {
+        const qsizetype feed = bytes.indexOf('\n', begin);
+        const qsizetype end = feed < 0 ? bytes.size() : feed + 1;
+        if (!decode(bytes.sliced(begin, end - begin), encoding).isWhole)
+            return line;
+        begin = end;
+    }
+    return 0;
+}
+
+/// @param line  where the bytes are; 0 when no line tells
+[[noreturn]] void refuseBytes(std::int64_t line, TextView what)
+{
+    refuse(line > 0 ? atLine(line, what) : Text(what));
+}
+
+/// The bytes that every character of an encoding takes at least.
+qsizetype unitOf(const QByteArray& encoding)
+{
+    return encoding.startsWith("UTF-16") ? 2 : encoding.startsWith("UTF-32") ? 4 : 1;
+}
+
+/// Decodes as an encoding that the caller, or a mark, says it is.
+TextFile decodeAs(const QByteArray& bytes, const QByteArray& encoding, TextView whoSays)
+{
+    Decoded decoded = decode(bytes, encoding);
+    const qsizetype unit = unitOf(encoding);
+    if (!decoded.isWhole || bytes.size() % unit != 0)
+        refuseBytes(unit > 1 ? 0 : badLine(bytes, encoding),
+            u"bytes that are no " + named(encoding) + Text(whoSays));
+    return { std::move(decoded.text), QString::fromLatin1(encoding) };
+}
+
+QByteArray encodingOfMark(QByteArrayView start)
+{
+    const auto encoding = QStringConverter::encodingForData(start);
+    return encoding ? QByteArray(QStringConverter::nameForEncoding(*encoding)) : QByteArray();
+}
+
+/// What the letters of a text are most likely written in; empty: they do not tell.
+QByteArray detectedEncoding(const QByteArray& bytes)
+{
+    const std::unique_ptr<uchardet, decltype(&uchardet_delete)> detector(
+        uchardet_new(), &uchardet_delete);
+    const auto size = std::min(static_cast<std::size_t>(bytes.size()), DetectedBytes);
+    if (!detector || uchardet_handle_data(detector.get(), bytes.constData(), size) != 0)
+        return {};
+    uchardet_data_end(detector.get());
+    return uchardet_get_charset(detector.get());
+}
+
+/// Whether all letters outside of ASCII come in pairs, as those of Chinese texts do and those of
+/// Western words hardly ever.
+bool isAllPairs(QByteArrayView bytes)
+{
+    constexpr unsigned char FirstOfPair = 0xA1;
+    constexpr unsigned char LastOfPair = 0xFE;
+    std::size_t run = 0;
+    for (const char character : bytes) {
+        const auto byte = static_cast<unsigned char>(character);
+        if (byte < 0x80 && run % 2 != 0)
+            return false;
+        if (byte >= 0x80 && (byte < FirstOfPair || byte > LastOfPair))
+            return false;
+        run = byte < 0x80 ? 0 : run + 1;
+    }
+    return true; // the end may cut off a pair
+}
+
+/// The encodings to try, the likeliest first. A short Chinese text is easily taken for Western.
+std::vector<QByteArray> guesses(const QByteArray& bytes)
+{
+    const QByteArray detected = detectedEncoding(bytes);
+    const bool isWestern = detected.isEmpty() || detected.startsWith("ISO-8859")
+        || detected.startsWith("WINDOWS-125") || detected.startsWith("MAC");
+    if (isWestern && isAllPairs(bytes))
+        return { Gb18030 };
+    return { detected, Gb18030, Western };
+}
+
+/// Decodes as the likeliest encoding. A text that reads the same in the usual Western encoding as
+/// in the detected one is said to be Western.
+TextFile decodeGuessed(const QByteArray& bytes)
+{
+    for (const QByteArray& encoding : guesses(bytes)) {
+        if (encoding.isEmpty() || !QStringDecoder(encoding.constData()).isValid())
+            continue;
+        Decoded decoded = decode(bytes, encoding);
+        if (!decoded.isWhole)
+            continue;
+        const bool isWestern
+            = encoding.startsWith("ISO-8859") && decode(bytes, Western).text == decoded.text;
+        return { std::move(decoded.text), QString::fromLatin1(isWestern ? Western : encoding),
+            true };
+    }
+    // The encoding that fits longer is the likelier one.
+    refuseBytes(std::max(badLine(bytes, Utf8), badLine(bytes, Gb18030)),
+        u"bytes that are neither UTF-8 nor GB18030 text; name the encoding");
+}
+
+} // namespace
+
+Text atLine(std::int64_t line, TextView what)
+{
+    return (u"line " + decimal(line) + u": ").append(what);
+}
+
+TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options)
+{
+    const QByteArray bytes = readAll(path, options);
+    if (!options.encoding.isEmpty()) {
+        const QByteArray encoding = options.encoding.toLatin1();
+        if (!QStringDecoder(encoding.constData()).isValid())
+            refuse(u"unknown encoding " + toText(options.encoding)
+                + u"; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others");
+        return decodeAs(bytes, encoding, u"");
+    }
+    if (const QByteArray marked = encodingOfMark(bytes.first(std::min<qsizetype>(4, bytes.size())));
+        !marked.isEmpty())
+        return decodeAs(bytes, marked, u", which the file's mark says it is");
+    if (bytes.isValidUtf8())
+        return { bytes.toStdString(), QString::fromLatin1(Utf8) };
+    return decodeGuessed(bytes);
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,40 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include "platform/text.h"
+
+#include <QString>
+
+#include <filesystem>
+#include <functional>
+#include <string>
+
+namespace pelloric::qt {
+
+/// A text file that was read.
+struct TextFile {
+    std::string text; ///< UTF-8, without a byte order mark
+    QString encoding; ///< the name of the one that the file has
+    bool isGuessed = false; ///< neither the caller nor the file said so, and it is not UTF-8
+};
+
+/// How a text file is read.
+struct TextFileOptions {
+    QString encoding {}; ///< empty: by a byte order mark, else UTF-8, else guessed by the letters
+    /// Told now and then how much has been read; answers whether to go on. May be empty.
+    std::function<bool(double part)> progress {};
+};
+
+/// Reads a text file of any encoding.
+///
+/// @throws RunTimeError FileNotFound: it is missing or cannot be read, with the path; TypeMismatch,
+///         naming the line where there is one: an unknown encoding, or bytes that are no text;
+///         Cancelled: the progress said so
+TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options);
+
+/// "line 3: what": how errors of text files begin.
+Text atLine(std::int64_t line, TextView what);
+
+} // namespace pelloric::qt

@@ -1,0 +1,273 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "platform/numbers.h"
+#include "platform/qt/qt_text.h"
+#include "tables/number_look.h"
+#include "tables/qt/sheet_cells.h"
+#include "tables/qt/zip_entries.h"
+
+#include <QDateTime>
+#include <QMap>
+#include <QXmlStreamReader>
+
+#include <cmath>
+#include <functional>
+#include <unordered_map>
+
+namespace pelloric::qt {
+
+namespace {
+
+using Element = std::function<void(QXmlStreamReader& xml)>;
+
+/// Calls back at the beginning of every element of a file.
+/// @throws RunTimeError TypeMismatch: it is no XML
+void forEachElement(const QByteArray& bytes, const Element& element)
+{
+    QXmlStreamReader xml(bytes);
+    while (!xml.atEnd()) {
+        if (xml.readNext() == QXmlStreamReader::StartElement)
+            element(xml);
+    }
+    if (xml.hasError())
+        refuseDamaged();
+}
+
+QString attribute(const QXmlStreamReader& xml, const char* name)
+{
+    return xml.attributes().value(QLatin1String(name)).toString();
+}
+
+/// The text of an element with all its runs, but without the readings of Chinese characters.
+Text textOf(QXmlStreamReader& xml)
+{
+    Text text;
+    const QString name = xml.name().toString();
+    while (!xml.atEnd()) {
+        xml.readNext();
+        if (xml.isEndElement() && xml.name() == name)
+            break;
+        if (!xml.isStartElement())
+            continue;
+        if (xml.name() == QLatin1String("rPh"))
+            xml.skipCurrentElement();
+        else if (xml.name() == QLatin1String("t"))
+            text += toText(xml.readElementText(QXmlStreamReader::IncludeChildElements));
+    }
+    return text;
+}
+
+std::vector<Text> readSharedTexts(const ZipEntries& file)
+{
+    std::vector<Text> texts;
+    const QByteArray bytes = file.read("xl/sharedStrings.xml");
+    if (bytes.isEmpty())
+        return texts;
+    forEachElement(bytes, [&](QXmlStreamReader& xml) {
+        if (xml.name() == QLatin1String("si"))
+            texts.push_back(textOf(xml));
+    });
+    return texts;
+}
+
+/// The formats that files name only by their numbers.
+std::string_view builtInFormat(int number)
+{
+    static const std::unordered_map<int, std::string_view> Formats { { 1, "0" }, { 2, "0.00" },
+        { 3, "#,##0" }, { 4, "#,##0.00" }, { 9, "0%" }, { 10, "0.00%" }, { 14, "m/d/yy" },
+        { 15, "d-mmm-yy" }, { 16, "d-mmm" }, { 17, "mmm-yy" }, { 18, "h:mm" }, { 19, "h:mm:ss" },
+        { 20, "h:mm" }, { 21, "h:mm:ss" }, { 22, "m/d/yy h:mm" }, { 45, "mm:ss" },
+        { 46, "[h]:mm:ss" }, { 47, "mm:ss.0" } };
+    const auto found = Formats.find(number);
+    return found != Formats.end() ? found->second : std::string_view();
+}
+
+/// The looks of cells by the numbers of their styles.
+std::vector<NumberLook> readLooks(const ZipEntries& file)
+{
+    std::vector<NumberLook> looks;
+    const QByteArray bytes = file.read("xl/styles.xml");
+    if (bytes.isEmpty())
+        return looks;
+    std::unordered_map<int, std::string> formats;
+    bool isCellStyles = false;
+    forEachElement(bytes, [&](QXmlStreamReader& xml) {
+        const auto name = xml.name();
+        if (name == QLatin1String("numFmt"))
+            formats[attribute(xml, "numFmtId").toInt()]
+                = attribute(xml, "formatCode").toStdString();
+        else if (name == QLatin1String("cellXfs") || name == QLatin1String("cellStyleXfs"))
+            isCellStyles = name == QLatin1String("cellXfs");
+        else if (name == QLatin1String("cellStyles") || name == QLatin1String("dxfs"))
+            isCellStyles = false;
+        if (name != QLatin1String("xf") || !isCellStyles)
+            return;
+        const int number = attribute(xml, "numFmtId").toInt();
+        const auto own = formats.find(number);
+        looks.push_back(numberLook(
+            own != formats.end() ? std::string_view(own->second) : builtInFormat(number)));
+    });
+    return looks;
+}
+
+/// What a workbook says of its sheets.
+struct Workbook {
+    QStringList names;
+    QStringList relations;
+    bool startsIn1904 = false;
+};
+
+Workbook readWorkbook(const ZipEntries& file)
+{
+    Workbook book;
+    forEachElement(file.read("xl/workbook.xml"), [&](QXmlStreamReader& xml) {
+        if (xml.name() == QLatin1String("workbookPr")) {
+            const QString origin = attribute(xml, "date1904");
+            book.startsIn1904 = origin == QLatin1String("1") || origin == QLatin1String("true");
+        }
+        if (xml.name() != QLatin1String("sheet"))
+            return;
+        book.names.append(attribute(xml, "name"));
+        for (const QXmlStreamAttribute& one : xml.attributes()) {
+            if (one.name() == QLatin1String("id"))
+                book.relations.append(one.value().toString());
+        }
+    });
+    if (book.names.isEmpty() || book.relations.size() != book.names.size())
+        refuseDamaged();
+    return book;
+}
+
+/// The place of a sheet's file in the archive.
+QByteArray sheetFile(const ZipEntries& file, const QString& relation)
+{
+    QString target;
+    forEachElement(file.read("xl/_rels/workbook.xml.rels"), [&](QXmlStreamReader& xml) {
+        if (attribute(xml, "Id") == relation)
+            target = attribute(xml, "Target");
+    });
+    if (target.isEmpty())
+        refuseDamaged();
+    return target.startsWith(u'/') ? target.mid(1).toUtf8() : "xl/" + target.toUtf8();
+}
+
+/// The row and column of a place such as "BC12", from 0.
+struct Place {
+    std::int64_t row = -1;
+    std::int64_t column = -1;
+};
+
+Place placeOf(const QString& text)
+{
+    constexpr std::int64_t Letters = 26;
+    Place place { 0, 0 };
+    for (const QChar character : text) {
+        if (character >= u'A' && character <= u'Z')
+            place.column = place.column * Letters + (character.unicode() - u'A' + 1);
+        else if (character >= u'0' && character <= u'9')
+            place.row = place.row * 10 + (character.unicode() - u'0');
+        if (place.row > 1'000'000'000 || place.column > 1'000'000'000)
+            refuseDamaged();
+    }
+    return { place.row - 1, place.column - 1 };
+}
+
+/// Whole seconds; a date at midnight has no time, and a time of the first day no date.
+Text dateText(double days, bool startsIn1904)
+{
+    constexpr double SecondsOfDay = 86400;
+    constexpr double FarthestDay = 3'000'000;
+    if (!(std::abs(days) <= FarthestDay))
+        return formatNumber(days);
+    const QDate first = startsIn1904 ? QDate(1904, 1, 1) : QDate(1899, 12, 30);
+    const auto seconds = static_cast<qint64>(std::nearbyint(days * SecondsOfDay));
+    const QDateTime moment = QDateTime(first, QTime(0, 0), Qt::UTC).addSecs(seconds);
+    const QString time = moment.time().toString(QStringLiteral("HH:mm:ss"));
+    if (days >= 0 && days < 1 && seconds > 0)
+        return toText(time);
+    const QString date = moment.date().toString(Qt::ISODate);
+    return toText(moment.time() == QTime(0, 0) ? date : date + u' ' + time);
+}
+
+/// Reads the cells of a sheet one by one.
+class SheetReader {
+public:
+    SheetReader(const ZipEntries& file, bool startsIn1904)
+        : texts_(readSharedTexts(file))
+        , looks_(readLooks(file))
+        , startsIn1904_(startsIn1904)
+    {
+    }
+
+    SheetCells read(const QByteArray& bytes)
+    {
+        forEachElement(bytes, [&](QXmlStreamReader& xml) {
+            if (xml.name() == QLatin1String("row")) {
+                const QString number = attribute(xml, "r");
+                next_ = { number.isEmpty() ? next_.row + 1 : number.toLongLong() - 1, 0 };
+            } else if (xml.name() == QLatin1String("c")) {
+                readCell(xml);
+            }
+        });
+        return std::move(cells_);
+    }
+
+private:
+    void readCell(QXmlStreamReader& xml)
+    {
+        const QString place = attribute(xml, "r");
+        if (!place.isEmpty())
+            next_ = placeOf(place);
+        const QString type = attribute(xml, "t");
+        const auto style = attribute(xml, "s").toULongLong();
+        Text text;
+        while (!xml.atEnd()) {
+            xml.readNext();
+            if (xml.isEndElement() && xml.name() == QLatin1String("c"))
+                break;
+            if (xml.isStartElement() && xml.name() == QLatin1String("is"))
+                text = textOf(xml);
+            else if (xml.isStartElement() && xml.name() == QLatin1String("v"))
+                text = shown(xml.readElementText(), type, style);
+        }
+        cells_.put(next_.row, next_.column, std::move(text));
+        ++next_.column;
+    }
+
+    Text shown(const QString& value, const QString& type, std::size_t style) const
+    {
+        if (type == QLatin1String("s")) {
+            const auto number = value.toULongLong();
+            return number < texts_.size() ? texts_[number] : Text();
+        }
+        if (type == QLatin1String("b"))
+            return value == QLatin1String("1") ? u"True" : u"False";
+        bool isNumber = false;
+        const double number = value.toDouble(&isNumber);
+        if (!isNumber || (!type.isEmpty() && type != QLatin1String("n")))
+            return toText(value);
+        const NumberLook look = style < looks_.size() ? looks_[style] : NumberLook();
+        return look.isDate ? dateText(number, startsIn1904_) : shownNumber(number, look);
+    }
+
+    std::vector<Text> texts_;
+    std::vector<NumberLook> looks_;
+    bool startsIn1904_;
+    Place next_;
+    SheetCells cells_;
+};
+
+} // namespace
+
+SheetCells readXlsxSheet(const ZipEntries& file, const QString& sheet)
+{
+    const Workbook book = readWorkbook(file);
+    const qsizetype index = sheet.isEmpty() ? 0 : book.names.indexOf(sheet);
+    if (index < 0)
+        refuseSheet(sheet, book.names);
+    return SheetReader(file, book.startsIn1904)
+        .read(file.read(sheetFile(file, book.relations.at(index))));
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,84 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace pelloric {
+
+/// How the values of a file are told apart.
+struct ValuesDialect {
+    char delimiter = ','; ///< an ASCII character
+    bool hasQuotes = true; ///< false: a quote is a character like any other
+
+    bool operator==(const ValuesDialect&) const = default;
+};
+
+/// Walks over the rows of a text of separated values, in UTF-8.
+///
+/// A value is quoted only when its closing quote is followed by a delimiter, a line end or the end;
+/// it may hold delimiters, line breaks and doubled quotes. In any other value every quote is text.
+/// Blanks around a value that is not quoted, and before one that is, do not belong to it. A line
+/// ends at CR LF, at LF alone or at CR alone. Empty lines are passed over.
+class SeparatedValues {
+public:
+    /// @param text  borrowed, outlives the object
+    SeparatedValues(std::string_view text, ValuesDialect dialect);
+
+    /// Goes to the next row. @return  false: there is none
+    bool nextRow();
+
+    std::size_t valueCount() const { return values_.size(); }
+    /// A value of the row, from 0; borrowed until the next row.
+    std::string_view value(std::size_t index) const;
+
+    /// The line on which the row begins, from 1.
+    std::int64_t line() const { return rowLine_; }
+    /// Whether a value of the row holds a line break.
+    bool hasLineBreak() const { return hasLineBreak_; }
+    /// Whether a value of the row that is not quoted holds a quote.
+    bool hasStrayQuote() const { return hasStrayQuote_; }
+    /// How much of the text has been read: bytes.
+    std::size_t position() const { return position_; }
+
+private:
+    /// A value of the row, in the text, or in the scratch space where doubled quotes were undone.
+    struct Piece {
+        std::size_t begin = 0;
+        std::size_t length = 0;
+        bool isScratch = false;
+    };
+
+    bool isLineEnd(std::size_t at) const { return text_[at] == '\n' || text_[at] == '\r'; }
+    bool endsValue(std::size_t at) const;
+    void skipLineEnds();
+    void readRow();
+    bool readQuoted(std::size_t quote);
+    void readPlain();
+    void addUnquoted(std::string_view inner);
+
+    std::string_view text_;
+    ValuesDialect dialect_;
+    std::size_t position_ = 0;
+    std::int64_t line_ = 1;
+    std::int64_t rowLine_ = 1;
+    bool hasLineBreak_ = false;
+    bool hasStrayQuote_ = false;
+    std::vector<Piece> values_;
+    std::string scratch_;
+};
+
+/// Finds out what separates the values: the one of comma, tab, semicolon and vertical bar by which
+/// most rows have as many values as the titles and no quote inside of a value; of equals the one
+/// that makes most values.
+///
+/// @param start  the first rows of a text, in UTF-8; the last of them may be cut off
+/// @return       a comma where nothing tells
+char findDelimiter(std::string_view start);
+
+} // namespace pelloric
