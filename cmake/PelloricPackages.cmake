@@ -36,7 +36,7 @@ set(CPACK_COMPONENT_RUNTIME_DESCRIPTION "print preview and printing of grids (li
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_NAME libpelloric-dev)
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_DEPENDS
-    "${same}, qt6-base-dev, qt6-declarative-dev, qt6-svg-dev, libcsv-dev, libcups2-dev")
+    "${same}, qt6-base-dev, qt6-declarative-dev, qt6-svg-dev, libcups2-dev, libpng-dev, libuchardet-dev, libzip-dev")
 set(CPACK_COMPONENT_DEVELOPMENT_DESCRIPTION "print preview and printing of grids (development files)
  Pelloric gives programs with a grid on their form a print preview, real
  printing, and PDF, PNG and SVG files of the same pages.

@@ -338,8 +338,9 @@ int runExport(const Invocation& invocation)
 QString exportDetails()
 {
     return QStringLiteral(
-        "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
-        "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
+        "FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
+        ".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
+        "--query), or a saved document (.ostl).\n"
         "Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
         "FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
         "file each in the folder OUT, or with --join one file.\n");

@@ -60,10 +60,11 @@ int runPreview(const Invocation& invocation)
 
 QString previewDetails()
 {
-    return QStringLiteral("FILE is a CSV or TSV file, whose first row holds the titles, or an "
-                          "SQLite database\n"
-                          "(db.sqlite:table, or db.sqlite with --query). With one of the options "
-                          "for headers,\n"
+    return QStringLiteral("FILE is a CSV or TSV file, whose first row holds the titles, a JSON "
+                          "file, an .xlsx or\n"
+                          ".ods file (file.xlsx:Sheet), or an SQLite database (db.sqlite:table, or "
+                          "db.sqlite with\n"
+                          "--query). With one of the options for headers,\n"
                           "paper and so on, what the window's dialogs change is not kept.\n");
 }
 

@@ -194,8 +194,9 @@ int runPrint(const Invocation& invocation)
 QString printDetails()
 {
     return QStringLiteral(
-        "FILE is a CSV or TSV file, whose first row holds the titles, an SQLite database\n"
-        "(db.sqlite:table, or db.sqlite with --query), or a saved document (.ostl).\n"
+        "FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
+        ".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
+        "--query), or a saved document (.ostl).\n"
         "Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
 }
 

@@ -30,7 +30,7 @@ bool isSameFile(const QString& file, const QString& other);
 /// What a name says without its folder and extension.
 QString plainName(const QString& name);
 
-/// Reads the table that a command's file and options name: a CSV or TSV file, or a table
+/// Reads the table that a command's file and options name: a text or office file, or a table
 /// ("db.sqlite:table") or query of an SQLite database.
 /// @throws CommandError naming the file; RunTimeError Cancelled
 TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& progress);
