@@ -36,10 +36,10 @@ void writePdf(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options
     exportPdf(canvas.document(), canvas.page, fonts, options, path);
 }
 
-void writePngs(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options,
-    const std::filesystem::path& path)
+void writePngs(
+    const Canvas& canvas, QtFonts&, const ExportOptions& options, const std::filesystem::path& path)
 {
-    exportPngs(canvas.document(), canvas.page, fonts, options, path);
+    exportPngs(canvas.document(), canvas.page, options, path);
 }
 
 void writeSvgs(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options,
