@@ -10,7 +10,9 @@
 #include "settings/settings_file.h"
 #include "settings/settings_keys.h"
 
+#include <algorithm>
 #include <array>
+#include <optional>
 
 namespace pelloric {
 
@@ -62,15 +64,63 @@ constexpr auto Defaults = std::to_array<DefaultSetting>({
 });
 static_assert(Defaults.size() == SettingsKeys.size());
 
+constexpr int MostKept = 10000; ///< files beside a settings file
+
+/// Whether a line of the text begins with a key.
+bool holdsSettings(TextView text)
+{
+    while (!text.empty()) {
+        const TextView line = text.substr(0, text.find_first_of(u"\r\n"));
+        if (std::ranges::any_of(
+                SettingsKeys, [line](TextView key) { return trimmed(line).starts_with(key); }))
+            return true;
+        text.remove_prefix(std::min(text.size(), line.size() + 1));
+    }
+    return false;
+}
+
+/// Copies a file to the first free name beside it; an existing file is never overwritten.
+/// @throws RunTimeError WriteFailed: the copy cannot be made
+void keepBeside(const std::filesystem::path& path)
+{
+    std::filesystem::path copy = path;
+    copy += ".bak";
+    for (int number = 1; number < MostKept; ++number) {
+        std::error_code error;
+        if (std::filesystem::copy_file(path, copy, error))
+            return;
+        if (error != std::errc::file_exists)
+            break;
+        copy = path;
+        copy += ".bak" + std::to_string(number);
+    }
+    throw RunTimeError(ErrorNumber::WriteFailed, pathText(copy));
+}
+
+/// The bytes of a file; nothing when it cannot be read.
+std::optional<std::string> readableBytes(const std::filesystem::path& path)
+{
+    try {
+        return readFileBytes(path);
+    } catch (const RunTimeError&) {
+        return std::nullopt;
+    }
+}
+
 } // namespace
 
 std::span<const DefaultSetting> defaultSettings() { return Defaults; }
 
-Text defaultSettingsText()
+Text defaultSettingsText() { return settingsTextWith({}); }
+
+Text settingsTextWith(std::span<const SettingChange> values)
 {
     Text text = u"\"\r\n";
-    for (const DefaultSetting& setting : Defaults)
-        text.append(setting.key).append(u"= ").append(setting.value).append(u"\r\n");
+    for (const DefaultSetting& setting : Defaults) {
+        const auto other = std::ranges::find(values, setting.key, &SettingChange::key);
+        const TextView value = other == values.end() ? setting.value : other->value;
+        text.append(setting.key).append(u"= ").append(value).append(u"\r\n");
+    }
     return text.append(u"\"\r\n");
 }
 
@@ -78,14 +128,31 @@ bool deployDefaultSettings(const Platform& platform)
 {
     const std::filesystem::path path = settingsPath(platform);
     std::error_code error;
-    if (std::filesystem::exists(path, error))
-        return false;
-    std::filesystem::create_directories(path.parent_path(), error);
-    std::string bytes;
-    platform.codec.encode(defaultSettingsText(), bytes);
-    if (!createFile(path, bytes))
-        throw RunTimeError(ErrorNumber::WriteFailed, pathText(path));
+    if (std::filesystem::exists(path, error)) {
+        const std::optional<std::string> present = readableBytes(path);
+        if (!present || holdsSettings(platform.codec.decode(*present)))
+            return false;
+    }
+    replaceByDefaultSettings(platform, {});
     return true;
+}
+
+void replaceByDefaultSettings(const Platform& platform, std::span<const SettingChange> values)
+{
+    const std::filesystem::path path = settingsPath(platform);
+    std::string bytes;
+    platform.codec.encode(settingsTextWith(values), bytes);
+    std::error_code error;
+    bool isWritten = false;
+    if (std::filesystem::exists(path, error)) {
+        keepBeside(path);
+        isWritten = rewriteFile(path, bytes, readableBytes(path).value_or(std::string()));
+    } else {
+        std::filesystem::create_directories(path.parent_path(), error);
+        isWritten = createFile(path, bytes);
+    }
+    if (!isWritten)
+        throw RunTimeError(ErrorNumber::WriteFailed, pathText(path));
 }
 
 } // namespace pelloric

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "platform/text.h"
+#include "settings/settings_file.h"
 
 #include <span>
 
@@ -24,11 +24,25 @@ std::span<const DefaultSetting> defaultSettings();
 /// The default file's text, in the form in which the program saves a settings file.
 Text defaultSettingsText();
 
+/// The same with other values for some keys.
+Text settingsTextWith(std::span<const SettingChange> values);
+
 /// Puts the default file into the system directory, which is created if need be, where there is
-/// no settings file; an existing one is never touched.
+/// no settings file.
 ///
-/// @return  whether the file was created
-/// @throws RunTimeError WriteFailed, with the path: the folder or the file cannot be created
+/// A file in which no line begins with a key is no settings file: it is kept beside as
+/// "OstlConfig.ini.bak", or ".bak1" and so on where that name is taken, and the default file takes
+/// its place. Any other file, and one that cannot be read, is never touched.
+///
+/// @return  whether the default file was put in place
+/// @throws RunTimeError WriteFailed, with the path: the folder or a file cannot be written; nothing
+///         is lost
 bool deployDefaultSettings(const Platform& platform);
+
+/// Puts the default file in place, with other values for some keys; a file that was there is kept
+/// beside as `deployDefaultSettings` does.
+///
+/// @throws RunTimeError WriteFailed, with the path; nothing is lost
+void replaceByDefaultSettings(const Platform& platform, std::span<const SettingChange> values);
 
 } // namespace pelloric

@@ -80,12 +80,61 @@ TEST(DefaultSettings, AreTheBytesThatASaveLeaves)
     EXPECT_EQ(platform.folder.read("OstlConfig.ini"), before);
 }
 
-TEST(DeployDefaultSettings, NeverTouchesAFileThatExists)
+TEST(DeployDefaultSettings, NeverTouchesASettingsFile)
+{
+    for (const char* content : { "Top= 3", "\"\r\nTop= 4000\r\n\"\r\n", "junk\n\n  FontSize=0\n",
+             "PagerSize", "\"\rLeft= 1\r\"" }) {
+        FakePlatform platform;
+        platform.folder.write("OstlConfig.ini", content);
+        EXPECT_FALSE(deployDefaultSettings(platform.services())) << content;
+        EXPECT_EQ(platform.folder.read("OstlConfig.ini"), content);
+        EXPECT_EQ(platform.folder.names().size(), 1U);
+    }
+}
+
+TEST(DeployDefaultSettings, KeepsAFileWithoutASettingBesideTheDefaults)
+{
+    FakePlatform deployed;
+    deployDefaultSettings(deployed.services());
+    const std::string defaults = deployed.folder.read("OstlConfig.ini");
+    for (const std::string_view content :
+        { "", "\"\"\r\n", "\"\r\n\"\r\n", "<html>", "my Top= 3\n", "\0\0" }) {
+        FakePlatform platform;
+        platform.folder.write("OstlConfig.ini", content);
+        EXPECT_TRUE(deployDefaultSettings(platform.services())) << content;
+        EXPECT_EQ(platform.folder.read("OstlConfig.ini"), defaults);
+        EXPECT_EQ(platform.folder.read("OstlConfig.ini.bak"), content);
+    }
+}
+
+TEST(DeployDefaultSettings, NeverOverwritesAFileThatWasKept)
 {
     FakePlatform platform;
-    platform.folder.write("OstlConfig.ini", "");
+    for (const char* content : { "one", "two", "three" }) {
+        platform.folder.write("OstlConfig.ini", content);
+        EXPECT_TRUE(deployDefaultSettings(platform.services()));
+    }
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini.bak"), "one");
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini.bak1"), "two");
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini.bak2"), "three");
+}
+
+TEST(DeployDefaultSettings, ReplacesWhatAFacadeWroteBeforeIt)
+{
+    FakePlatform platform;
+    writeSetting(platform.services(), u"HeaderLeft", u"before");
+    writeSetting(platform.services(), u"HeaderLeft", u"again");
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini"), "\"\r\n\"\r\n");
+    EXPECT_TRUE(deployDefaultSettings(platform.services()));
+    EXPECT_EQ(readSetting(platform.services(), u"PagerSizeValue"), u"9");
+}
+
+TEST(DeployDefaultSettings, LeavesAFolderOfThatNameAlone)
+{
+    FakePlatform platform;
+    std::filesystem::create_directory(platform.folder.file("OstlConfig.ini"));
     EXPECT_FALSE(deployDefaultSettings(platform.services()));
-    EXPECT_EQ(platform.folder.read("OstlConfig.ini"), "");
+    EXPECT_EQ(platform.folder.names().size(), 1U);
 }
 
 TEST(DeployDefaultSettings, CreatesTheFolder)

@@ -6,7 +6,10 @@
 #include "controls/qt/default_platform.h"
 #include "controls/qt/kestrane.h"
 #include "platform/automation_object.h"
+#include "platform/qt/qt_platform.h"
+#include "platform/run_time_error.h"
 #include "print/qt/qt_printing.h"
+#include "settings/default_settings.h"
 #include "ui/qt/page_files.h"
 #include "ui/qt/preview_window.h"
 
@@ -28,6 +31,16 @@ Installed& installed()
 {
     static Installed instance;
     return instance;
+}
+
+/// Where there are no settings yet, the first preview finds the default ones.
+void deploySettings(const Platform& platform)
+{
+    try {
+        deployDefaultSettings(platform);
+    } catch (const RunTimeError&) {
+        // A folder that cannot be written is no reason to end a host; the preview tells of it.
+    }
 }
 
 /// Windows and printers must not outlive the application.
@@ -76,6 +89,7 @@ PreviewWindow* QtPreviewOpener::window() const
 
 QtPreviewOpener& installPreviewWindow(QtPlatform& platform)
 {
+    deploySettings(platform.record());
     Installed& now = installed();
     if (!now.opener)
         qAddPostRoutine(uninstall);

@@ -50,6 +50,9 @@ private:
 
 /// From now on the facades of the program preview in the preview window on these services.
 ///
+/// Where there is no settings file the default one is put in place, see `deployDefaultSettings`;
+/// a folder that cannot be written is told by the first preview.
+///
 /// @param platform  outlives the application object, or is given up by installing another
 /// @return          the opener; gone with the application object
 QtPreviewOpener& installPreviewWindow(QtPlatform& platform);
