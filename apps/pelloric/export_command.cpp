@@ -19,6 +19,7 @@
 #include "progress_line.h"
 #include "report_builder.h"
 #include "report_options.h"
+#include "shape_options.h"
 #include "table_selection.h"
 #include "table_source.h"
 
@@ -348,7 +349,8 @@ QString exportDetails()
 
 OptionTables exportOptions()
 {
-    return { Options, sourceOptions(), selectionOptions(), reportOptions(), outcomeOptions() };
+    return { Options, sourceOptions(), selectionOptions(), reportOptions(), shapeOptions(),
+        outcomeOptions() };
 }
 
 } // namespace pelloric::app

@@ -5,14 +5,17 @@
 #include "commands.h"
 #include "controls/canvas.h"
 #include "controls/qt/default_platform.h"
+#include "controls/qt/sorvane.h"
 #include "interruption.h"
 #include "platform/run_time_error.h"
 #include "progress_line.h"
 #include "report_builder.h"
 #include "report_options.h"
+#include "shape_options.h"
 #include "table_selection.h"
 #include "table_source.h"
 #include "ui/qt/preview_opener.h"
+#include "ui/qt/preview_window.h"
 #include "windows.h"
 
 #include <optional>
@@ -54,6 +57,7 @@ int runPreview(const Invocation& invocation)
     else
         prepareSettings(platform.record());
     prepareWidths(*grid, line, platform.record());
+    opener.showWindow().canvas().canvas().options = shapeOf(line);
     opener.openPreview(std::move(grid));
     return application.run();
 }
@@ -68,6 +72,9 @@ QString previewDetails()
                           "paper and so on, what the window's dialogs change is not kept.\n");
 }
 
-OptionTables previewOptions() { return { sourceOptions(), selectionOptions(), reportOptions() }; }
+OptionTables previewOptions()
+{
+    return { sourceOptions(), selectionOptions(), reportOptions(), shapeOptions() };
+}
 
 } // namespace pelloric::app

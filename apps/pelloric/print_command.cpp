@@ -18,6 +18,7 @@
 #include "progress_line.h"
 #include "report_builder.h"
 #include "report_options.h"
+#include "shape_options.h"
 #include "table_selection.h"
 #include "table_source.h"
 
@@ -202,7 +203,8 @@ QString printDetails()
 
 OptionTables printOptions()
 {
-    return { Options, sourceOptions(), selectionOptions(), reportOptions(), outcomeOptions() };
+    return { Options, sourceOptions(), selectionOptions(), reportOptions(), shapeOptions(),
+        outcomeOptions() };
 }
 
 } // namespace pelloric::app

@@ -16,6 +16,7 @@
 #include "progress_line.h"
 #include "report/content_widths.h"
 #include "report_options.h"
+#include "shape_options.h"
 #include "table_source.h"
 
 namespace pelloric::app {
@@ -73,6 +74,7 @@ void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, Progr
     loadSettings(canvas);
     setColumnWidths(grid, line, canvas);
     const LayoutProgress watched(canvas, progress);
+    canvas.options = shapeOf(line);
     canvas.doPreview(grid);
     if (canvas.table() == nullptr)
         throw CommandError(QStringLiteral("no column is wide enough to be printed; give other "
@@ -81,7 +83,8 @@ void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, Progr
 
 SavedDocument readDocument(const QString& file, const CommandLine& line, const Platform& platform)
 {
-    const char* const option = firstReportOption(line);
+    const char* const shape = firstShapeOption(line);
+    const char* const option = shape != nullptr ? shape : firstReportOption(line);
     if (option != nullptr && QLatin1String(option) != QLatin1String("title"))
         throw CommandError(
             QStringLiteral("--%1 does not apply to a saved document, whose pages are laid out")
