@@ -223,6 +223,22 @@ TEST_F(Program, ReadsTablesAndQueriesOfADatabase)
         "pelloric: s.sqlite: no table nothing; the database has: countries_zh, time_zones, wine\n");
 }
 
+TEST_F(Program, ChoosesAndArrangesRowsAndColumns)
+{
+    QFile::copy(QStringLiteral(PELLORIC_TESTS_DIR "/../samples/wine.csv"),
+        QString::fromStdString(folder_.file("w.csv").string()));
+    EXPECT_EQ(run(words("export w.csv -o a.pdf --columns Hue,Alcohol --rows 1-2")).status, 0);
+    EXPECT_TRUE(has(pdfText("a.pdf"), "14.23"));
+    EXPECT_FALSE(has(pdfText("a.pdf"), "Malic"));
+    EXPECT_EQ(
+        run(words("export w.csv -o b.pdf --columns Class,Hue --total count:Hue --fit")).status, 0);
+    EXPECT_TRUE(has(pdfText("b.pdf"), "178"));
+    const Ended missing = run(words("export w.csv -o c.pdf --columns Nope"));
+    EXPECT_EQ(missing.status, 1);
+    EXPECT_NE(missing.errors.find("Nope"), std::string::npos) << missing.errors;
+    EXPECT_EQ(run(words("export w.csv -o c.pdf --rows few")).status, 2);
+}
+
 TEST_F(Program, ReadsATableWhoseNameHoldsAColon)
 {
     {
