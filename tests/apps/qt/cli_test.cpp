@@ -234,7 +234,7 @@ TEST_F(Program, ChoosesAndArrangesRowsAndColumns)
         run(words("export w.csv -o b.pdf --columns Class,Hue --total count:Hue --fit")).status, 0);
     EXPECT_TRUE(has(pdfText("b.pdf"), "178"));
     const Ended missing = run(words("export w.csv -o c.pdf --columns Nope"));
-    EXPECT_EQ(missing.status, 1);
+    EXPECT_EQ(missing.status, 2);
     EXPECT_NE(missing.errors.find("Nope"), std::string::npos) << missing.errors;
     EXPECT_EQ(run(words("export w.csv -o c.pdf --rows few")).status, 2);
 }
