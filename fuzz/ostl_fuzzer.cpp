@@ -47,7 +47,7 @@ bool changesOnReading(const TextRecord& record, const PageDocument& document)
 bool changesOnReading(const PageDocument& document)
 {
     for (int page = 0; page < document.pageCount(); ++page) {
-        for (const TextRecord& record : document.texts(page)) {
+        for (const TextRecord record : document.texts(page)) {
             if (changesOnReading(record, document))
                 return true;
         }

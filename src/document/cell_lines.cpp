@@ -13,6 +13,8 @@ namespace {
 
 bool isBreak(char16_t unit) { return unit == u'\n' || unit == LineSeparator; }
 
+bool isSurrogate(char16_t unit) { return (unit & 0xF800U) == 0xD800U; }
+
 /// The largest sum of advances (at size 1) whose rounded width is at most `room`.
 class WidthLimit {
 public:
@@ -42,7 +44,12 @@ CellText readCellText(TextView text, const MeasuredFont& font)
             cell.hasSeparator = cell.hasSeparator || unit == LineSeparator;
             cell.hasCarriageReturn = cell.hasCarriageReturn || unit == u'\r';
         }
-        advance += font.face->nextAdvance(text, position);
+        if (isSurrogate(unit)) {
+            advance += font.face->nextAdvance(text, position);
+        } else {
+            advance += font.face->unitAdvance(unit);
+            ++position;
+        }
     }
     if (!cell.hasCarriageReturn)
         cell.width = textWidth(advance, font.size);

@@ -103,12 +103,12 @@ void writePage(const PageDocument& document, int page, LineWriter& writer)
 {
     writer.add(ostl::Page).add(std::int64_t { page }).add("]").endLine();
     writer.line(ostl::LinesBegin);
-    for (const LineRecord& record : document.lines(page))
+    for (const LineRecord record : document.lines(page))
         writeLine(document, record, writer);
     writer.line(ostl::LinesEnd);
     writer.line(ostl::TextsBegin);
     Text buffer;
-    for (const TextRecord& record : document.texts(page))
+    for (const TextRecord record : document.texts(page))
         writeText(document, record, writer, buffer);
     writer.line(ostl::TextsEnd);
 }

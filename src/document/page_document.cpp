@@ -42,12 +42,12 @@ PageDocument::PageDocument()
 void PageDocument::newPage()
 {
     Totalpages = narrowToInt16(std::int64_t { Totalpages } + 1);
-    const Page* full = pages_.empty() ? nullptr : &pages_.back();
-    const std::size_t lines = full != nullptr ? full->lines.size() : 0;
-    const std::size_t texts = full != nullptr ? full->texts.size() : 0;
-    if (full != nullptr) {
-        pages_.back().lines.shrink_to_fit();
-        pages_.back().texts.shrink_to_fit();
+    Page next;
+    if (!pages_.empty()) {
+        next.lines.reserveLike(pages_.back().lines); // the pages of a report are alike
+        next.texts.reserveLike(pages_.back().texts);
+        pages_.back().lines.shrinkToFit();
+        pages_.back().texts.shrinkToFit();
     }
     const auto count = static_cast<std::size_t>(std::max<std::int16_t>(Totalpages, 0));
     pages_.resize(count);
@@ -55,9 +55,7 @@ void PageDocument::newPage()
     currentPage = static_cast<std::int16_t>(Totalpages - 1);
     if (count == 0)
         return;
-    pages_.back() = {};
-    pages_.back().lines.reserve(lines); // the pages of a report are alike
-    pages_.back().texts.reserve(texts);
+    pages_.back() = std::move(next);
     pictures_.back().reset();
 }
 
@@ -68,16 +66,12 @@ PageDocument PageDocument::cleared() const
     return document;
 }
 
-std::span<const LineRecord> PageDocument::lines(int page) const { return pageAt(page).lines; }
-
-std::span<const TextRecord> PageDocument::texts(int page) const { return pageAt(page).texts; }
-
 Lineobj PageDocument::line(int page, std::size_t index) const
 {
     const auto records = lines(page);
     if (index >= records.size())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
-    const LineRecord& record = records[index];
+    const LineRecord record = records[index];
     const LinePen& lines = pen(record.pen);
     return { record.pt1, record.pt2, lines.LineStyle, lines.LineColor, lines.LineWidth,
         lines.FillStyle, lines.FillColor };
@@ -88,7 +82,7 @@ Textobj PageDocument::text(int page, std::size_t index) const
     const auto records = texts(page);
     if (index >= records.size())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
-    const TextRecord& record = records[index];
+    const TextRecord record = records[index];
     const TextStyle& look = style(record.style);
     return { record.pt, Text(record.text()), look.font, look.color };
 }
@@ -144,12 +138,12 @@ void PageDocument::shareStore(std::shared_ptr<TextStore> store)
 
 std::size_t PageDocument::memoryBytes() const
 {
-    std::size_t bytes = pages_.capacity() * sizeof(Page) + store_->capacityBytes();
+    std::size_t bytes
+        = pages_.capacity() * sizeof(Page) + patterns_.memoryBytes() + store_->capacityBytes();
     for (const auto& store : earlierStores_)
         bytes += store->capacityBytes();
     for (const Page& page : pages_) {
-        bytes += page.lines.capacity() * sizeof(LineRecord);
-        bytes += page.texts.capacity() * sizeof(TextRecord);
+        bytes += page.lines.memoryBytes() + page.texts.memoryBytes();
     }
     return bytes;
 }

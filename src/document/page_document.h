@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "document/page_records.h"
 #include "document/records.h"
 #include "document/text_store.h"
 
@@ -29,23 +30,6 @@ struct PageSetup {
 /// A margin given in whole centimetres, as twips.
 /// @throws RunTimeError Overflow: above 57 or below -57
 std::int16_t marginOfCentimetres(std::int16_t centimetres);
-
-/// A line as a page keeps it; the pen is the document's, by number.
-struct LineRecord {
-    Tpoint pt1;
-    Tpoint pt2;
-    std::uint32_t pen = 0;
-};
-
-/// A text as a page keeps it: a view into a text store; the style is the document's, by number.
-struct TextRecord {
-    Tpoint pt;
-    const char16_t* units = nullptr;
-    std::uint32_t length = 0;
-    std::uint32_t style = 0;
-
-    TextView text() const { return TextView(units, length); }
-};
 
 /// The laid-out pages: for each a list of lines, a list of texts and at most one picture.
 ///
@@ -78,9 +62,9 @@ public:
     bool hasPage(int page) const { return page >= 0 && page < pageCount(); }
 
     /// @throws RunTimeError SubscriptOutOfRange: no such page
-    std::span<const LineRecord> lines(int page) const;
+    LineRange lines(int page) const { return { pageAt(page).lines, patterns_ }; }
     /// @throws RunTimeError SubscriptOutOfRange: no such page
-    std::span<const TextRecord> texts(int page) const;
+    TextRange texts(int page) const { return TextRange(pageAt(page).texts); }
 
     /// The pen of a `LineRecord`.
     const LinePen& pen(std::uint32_t number) const { return pens_[number]; }
@@ -105,10 +89,31 @@ public:
     std::uint32_t styleNumber(const TextStyle& style);
 
     /// Appends to the current page. @throws RunTimeError SubscriptOutOfRange
-    void append(const LineRecord& line) { current().lines.push_back(line); }
+    void append(const LineRecord& line) { current().lines.append(line); }
     /// Appends to the current page; the text stays where it is.
     /// @throws RunTimeError SubscriptOutOfRange
-    void append(const TextRecord& text) { current().texts.push_back(text); }
+    void append(const TextRecord& text) { current().texts.append(text); }
+
+    /// Keeps the lines of rows that differ in nothing but top and bottom.
+    /// @param lines  in the order in which they are drawn
+    /// @return       the number of the pattern in this document
+    std::uint32_t addLinePattern(std::span<const PatternLine> lines)
+    {
+        return patterns_.add(lines);
+    }
+    /// The lines of a pattern.
+    std::span<const PatternLine> linePattern(std::uint32_t number) const
+    {
+        return patterns_[number];
+    }
+    /// Appends all lines of a pattern to the current page.
+    /// @throws RunTimeError SubscriptOutOfRange
+    void appendRow(Twips top, Twips bottom, std::uint32_t pattern)
+    {
+        const std::size_t lines = patterns_[pattern].size();
+        if (lines > 0)
+            current().lines.appendRow(top, bottom, pattern, lines);
+    }
 
     /// Where new texts are kept.
     TextStore& store() { return *store_; }
@@ -120,8 +125,8 @@ public:
 
 private:
     struct Page {
-        std::vector<LineRecord> lines;
-        std::vector<TextRecord> texts;
+        LineList lines;
+        TextList texts;
     };
 
     struct PenHash {
@@ -137,6 +142,7 @@ private:
 
     std::vector<Page> pages_;
     std::vector<std::optional<MapLocation>> pictures_;
+    LinePatterns patterns_;
     std::vector<LinePen> pens_;
     std::vector<TextStyle> styles_;
     std::unordered_map<LinePen, std::uint32_t, PenHash> penNumbers_;

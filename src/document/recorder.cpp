@@ -18,7 +18,9 @@ namespace {
 
 Twips sum(Twips a, Twips b)
 {
-    return roundToInt32(static_cast<double>(a) + static_cast<double>(b));
+    const std::int64_t exact = std::int64_t { a } + b;
+    return static_cast<Twips>(exact) == exact ? static_cast<Twips>(exact)
+                                              : roundToInt32(static_cast<double>(exact));
 }
 
 } // namespace
@@ -101,6 +103,22 @@ void Recorder::lineTo(Tpoint end)
     if (surface_ != nullptr)
         surface_->line(point_, end);
     point_ = end;
+}
+
+void Recorder::rowLines(Twips top, Twips bottom, std::uint32_t pattern)
+{
+    const std::span<const PatternLine> lines = document_.linePattern(pattern);
+    if (lines.empty())
+        return;
+    document_.appendRow(top, bottom, pattern);
+    if (surface_ != nullptr) {
+        applyLineAttributes();
+        for (const PatternLine& line : lines) {
+            const LineRecord record = line.in(top, bottom);
+            surface_->line(record.pt1, record.pt2);
+        }
+    }
+    point_ = lines.back().in(top, bottom).pt2;
 }
 
 void Recorder::printText(TextView text, bool newLine)

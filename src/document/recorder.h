@@ -66,6 +66,14 @@ public:
     /// @throws RunTimeError SubscriptOutOfRange: the current page does not exist
     void lineTo(Tpoint end);
 
+    /// Records the lines of a row of a table; the current point moves to the end of the last.
+    /// @param pattern  of the document
+    /// @throws RunTimeError SubscriptOutOfRange: the current page does not exist
+    void rowLines(Twips top, Twips bottom, std::uint32_t pattern);
+
+    /// The number that the document knows the line attributes by.
+    std::uint32_t penNumber() const { return penNumber_; }
+
     /// Records a text at the current point; one that holds line feeds is drawn on as many lines,
     /// each of which begins at the text's x.
     ///

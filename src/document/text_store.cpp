@@ -10,19 +10,29 @@ namespace pelloric {
 namespace {
 
 constexpr std::size_t SmallestBlock = 4096; ///< code units
-constexpr std::size_t LargestBlock = 1U << 19U; ///< code units
+constexpr std::size_t LargestBlock = 1U << 19U; ///< code units: as many as a place can tell
 
 } // namespace
 
-TextView TextStore::add(TextView text)
+std::uint64_t TextStore::place(TextView text)
 {
-    char16_t* place = text.size() <= freeUnits_ ? free_ : grow(text.size());
+    const char16_t* const units = copy(text);
+    const auto inBlock = static_cast<std::uint64_t>(units - blocks_[lastBlock_].units.get());
+    return (std::uint64_t { lastBlock_ } << BlockBits) | inBlock;
+}
+
+/// An empty text has a place, too.
+char16_t* TextStore::copy(TextView text)
+{
+    const bool fits = text.size() <= freeUnits_ && freeUnits_ > 0;
+    char16_t* const place = fits ? free_ : grow(text.size());
     std::copy(text.begin(), text.end(), place);
     if (place == free_) {
         free_ += text.size();
         freeUnits_ -= text.size();
+        lastBlock_ = freeBlock_;
     }
-    return { place, text.size() };
+    return place;
 }
 
 /// A text that does not fit the current block begins a new one, or gets one of its own when it is
@@ -36,9 +46,11 @@ char16_t* TextStore::grow(std::size_t units)
     char16_t* place = block.units.get();
     capacityBytes_ += block.size * sizeof(char16_t);
     blocks_.push_back(std::move(block));
+    lastBlock_ = blocks_.size() - 1;
     if (!alone) {
         free_ = place;
         freeUnits_ = blocks_.back().size;
+        freeBlock_ = lastBlock_;
     }
     return place;
 }

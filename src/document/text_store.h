@@ -5,6 +5,7 @@
 
 #include "platform/text.h"
 
+#include <cstdint>
 #include <memory>
 #include <vector>
 
@@ -15,7 +16,18 @@ namespace pelloric {
 class TextStore {
 public:
     /// Copies a text into the store.
-    TextView add(TextView text);
+    TextView add(TextView text) { return { copy(text), text.size() }; }
+
+    /// Copies a text into the store.
+    /// @return  where it begins, for `at`; less than 2^36 as long as the store holds less than
+    ///          128 GB
+    std::uint64_t place(TextView text);
+
+    /// The beginning of a text that `place` has copied.
+    const char16_t* at(std::uint64_t place) const
+    {
+        return blocks_[place >> BlockBits].units.get() + (place & BlockMask);
+    }
 
     /// Bytes that the store holds, unused ends of its blocks included.
     std::size_t capacityBytes() const { return capacityBytes_; }
@@ -26,9 +38,17 @@ private:
         std::size_t size = 0;
     };
 
+    /// A place is the number of a block, and these bits for the units in it; a larger block holds
+    /// one text.
+    static constexpr unsigned BlockBits = 19;
+    static constexpr std::uint64_t BlockMask = (1U << BlockBits) - 1;
+
+    char16_t* copy(TextView text);
     char16_t* grow(std::size_t units);
 
     std::vector<Block> blocks_;
+    std::size_t freeBlock_ = 0; ///< the block that `free_` is in
+    std::size_t lastBlock_ = 0; ///< the block of the text that was copied last
     char16_t* free_ = nullptr;
     std::size_t freeUnits_ = 0;
     std::size_t capacityBytes_ = 0;

@@ -208,6 +208,15 @@ std::int16_t roundToInt16(double value)
 
 std::int32_t roundToInt32(double value)
 {
+    constexpr double Usual = 1e9;
+    if (value > -Usual && value < Usual) { // most of the millions of positions of a layout
+        const auto whole = static_cast<std::int32_t>(value);
+        const double part = value - whole;
+        const bool isOdd = (whole & 1) != 0;
+        const int up = part > 0.5 || (part == 0.5 && isOdd) ? 1 : 0;
+        const int down = part < -0.5 || (part == -0.5 && isOdd) ? 1 : 0;
+        return whole + up - down;
+    }
     const double rounded = roundHalfEven(value);
     if (!(rounded >= -2147483648.0 && rounded <= 2147483647.0))
         throw RunTimeError(ErrorNumber::Overflow);

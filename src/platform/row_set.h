@@ -6,8 +6,18 @@
 #include "platform/value.h"
 
 #include <cstdint>
+#include <span>
 
 namespace pelloric {
+
+/// The longest text of a cell, in code units (32 MB); a longer one is refused before it is copied.
+inline constexpr std::size_t MostCellUnits = 1U << 24U;
+
+/// Refuses a text that is longer than any cell may be.
+/// @param record  from 1
+/// @param field   from 0
+/// @throws RunTimeError Overflow: names record and field
+void requireCellLength(TextView text, std::int64_t record, int field);
 
 /// A table of variant records with a cursor.
 ///
@@ -41,6 +51,15 @@ public:
     ///               where `keepsTexts()` says so
     /// @throws RunTimeError SubscriptOutOfRange: no such field, or no current record
     virtual Value value(int field) = 0;
+
+    /// Fields of the current record, from one on; only where `keepsTexts()` says that their texts
+    /// stay.
+    /// @throws RunTimeError as `value`
+    virtual void values(int first, std::span<Value> into)
+    {
+        for (Value& each : into)
+            each = value(first++);
+    }
 
     /// Whether texts of this row set live in the text store that it shares with the document.
     virtual bool keepsTexts() const { return false; }

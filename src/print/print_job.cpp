@@ -116,11 +116,11 @@ void printPage(const PageDocument& document, int page, const Font& defaultFont, 
     const auto texts = document.texts(page);
     printer.setFontName(defaultFont.name);
     printer.setFontSize(defaultFont.size);
-    for (const LineRecord& line : lines)
+    for (const LineRecord line : lines)
         printLine(line, document.pen(line.pen), printer);
     printer.setFillStyle(TransparentFill);
     Text buffer;
-    for (const TextRecord& text : texts) {
+    for (const TextRecord text : texts) {
         const TextView filled = withPageCount(text.text(), document.Totalpages, buffer);
         printText(text, document.style(text.style), filled, printer);
     }

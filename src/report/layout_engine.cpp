@@ -43,6 +43,8 @@ LayoutEngine::LayoutEngine(const ReportSource& source, const Platform& platform,
     , records_(source.rows, source.widths.size(), source.bands.size() > 1,
           platform.decimalSeparator, document.store())
     , cells_(source.widths.size())
+    , titlePatterns_(source.bands.size())
+    , rowPatterns_(source.bands.size())
 {
 }
 
@@ -116,15 +118,7 @@ void LayoutEngine::drawColumnTitles()
             source_.rows, source_.widths, false, platform_.decimalSeparator);
     drawTitleTexts(top);
     const Twips bottom = below(top, CellPadding + titleHeight_);
-    if (style.GridVer) {
-        for (const BandColumn& column : columns_)
-            drawLine({ column.edge, top }, { column.edge, bottom });
-        drawLine({ tableRight_, top }, { tableRight_, bottom });
-    }
-    if (style.GridHor) {
-        drawLine({ tableLeft_, top }, { tableRight_, top });
-        drawLine({ tableLeft_, bottom }, { tableRight_, bottom });
-    }
+    drawRow(top, bottom, titlePatterns_[band_], true);
     recorder_.setCurrentY(bottom);
 }
 
@@ -162,10 +156,10 @@ void LayoutEngine::layoutRow()
     printRow(rowTop);
     const Twips rowBottom = below(rowTop, CellPadding + rowHeight_);
     const bool pageIsFull = rowBottom > marginTop - Padding;
-    if (source_.style.GridVer)
-        drawVerticalLines(rowTop, rowBottom);
-    if (source_.style.GridHor)
-        drawRowLine(rowBottom, pageIsFull);
+    if (source_.style.GridMerge)
+        drawMergedLines(rowTop, rowBottom, pageIsFull);
+    else
+        drawRow(rowTop, rowBottom, rowPatterns_[band_], false);
     const bool isLastRecord = record_ == records_.count();
     if (pageIsFull)
         breakPage(below(rowBottom, LineGap));
@@ -263,23 +257,52 @@ void LayoutEngine::printCell(const BandColumn& column, Twips textTop)
     recorder_.printStored({ cell.printed, cell.width, true }, { x, textTop });
 }
 
-void LayoutEngine::drawVerticalLines(Twips rowTop, Twips rowBottom)
+/// Draws the lines of a row, which all rows of the band have alike.
+/// @param pattern   theirs; nothing: it is not known yet
+/// @param hasTopLine  as the titles have
+void LayoutEngine::drawRow(
+    Twips top, Twips bottom, std::optional<std::uint32_t>& pattern, bool hasTopLine)
 {
-    bool isFirst = true;
-    for (const BandColumn& column : columns_) {
-        if (isFirst || !source_.style.GridMerge || !equalsLeft(column.field))
-            drawLine({ column.edge, rowTop }, { column.edge, rowBottom });
-        isFirst = false;
-    }
-    drawLine({ tableRight_, rowTop }, { tableRight_, rowBottom });
+    if (!pattern)
+        pattern = document_.addLinePattern(linesOfRow(hasTopLine));
+    recorder_.rowLines(top, bottom, *pattern);
 }
 
-void LayoutEngine::drawRowLine(Twips rowBottom, bool pageIsFull)
+std::vector<PatternLine> LayoutEngine::linesOfRow(bool hasTopLine) const
 {
-    if (!source_.style.GridMerge) {
-        drawLine({ tableLeft_, rowBottom }, { tableRight_, rowBottom });
-        return;
+    const std::uint32_t pen = recorder_.penNumber();
+    const auto upright = [&](Twips x) { return PatternLine { x, x, false, true, pen }; };
+    const auto level = [&](bool atBottom) {
+        return PatternLine { tableLeft_, tableRight_, atBottom, atBottom, pen };
+    };
+    std::vector<PatternLine> lines;
+    if (source_.style.GridVer) {
+        for (const BandColumn& column : columns_)
+            lines.push_back(upright(column.edge));
+        lines.push_back(upright(tableRight_));
     }
+    if (source_.style.GridHor) {
+        if (hasTopLine)
+            lines.push_back(level(false));
+        lines.push_back(level(true));
+    }
+    return lines;
+}
+
+/// Draws the lines that merged cells leave of a row.
+void LayoutEngine::drawMergedLines(Twips rowTop, Twips rowBottom, bool pageIsFull)
+{
+    if (source_.style.GridVer) {
+        bool isFirst = true;
+        for (const BandColumn& column : columns_) {
+            if (isFirst || !equalsLeft(column.field))
+                drawLine({ column.edge, rowTop }, { column.edge, rowBottom });
+            isFirst = false;
+        }
+        drawLine({ tableRight_, rowTop }, { tableRight_, rowBottom });
+    }
+    if (!source_.style.GridHor)
+        return;
     for (const BandColumn& column : columns_) {
         if (pageIsFull || !equalsBelow(column.field))
             drawLine({ column.edge, rowBottom },

@@ -9,6 +9,7 @@
 #include "report/record_cells.h"
 
 #include <memory>
+#include <optional>
 #include <span>
 #include <vector>
 
@@ -88,8 +89,9 @@ private:
     double measureCell(RecordCell& cell, RowCell& row, double width);
     void printRow(Twips rowTop);
     void printCell(const BandColumn& column, Twips textTop);
-    void drawVerticalLines(Twips rowTop, Twips rowBottom);
-    void drawRowLine(Twips rowBottom, bool pageIsFull);
+    void drawRow(Twips top, Twips bottom, std::optional<std::uint32_t>& pattern, bool hasTopLine);
+    std::vector<PatternLine> linesOfRow(bool hasTopLine) const;
+    void drawMergedLines(Twips rowTop, Twips rowBottom, bool pageIsFull);
     void breakPage(Twips footerTop);
     void drawLine(Tpoint from, Tpoint to);
     TextView textOf(int field) const { return cells_[static_cast<std::size_t>(field)].text; }
@@ -116,6 +118,8 @@ private:
     std::int64_t record_ = 1; ///< the one that is being placed, from 1
     std::vector<RowCell> cells_; ///< one per field
     std::vector<CellLine> rowLines_;
+    std::vector<std::optional<std::uint32_t>> titlePatterns_; ///< by band
+    std::vector<std::optional<std::uint32_t>> rowPatterns_; ///< by band
     double rowHeight_ = 0; ///< of the texts: twips
     std::vector<double> pageRowHeights_; ///< of the rows on the pages of the present rows
     std::size_t rowsOnPage_ = 0;

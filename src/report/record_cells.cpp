@@ -36,16 +36,36 @@ RecordCells::RecordCells(RowSet& rows, std::size_t fieldCount, bool keepsPages,
 std::span<RecordCell> RecordCells::read(std::int64_t position, std::size_t first, std::size_t count)
 {
     const std::span<RecordCell> cells(cellsOf(position) + first, count);
+    const auto isRead = [](const RecordCell& cell) { return cell.isRead; };
+    if (std::all_of(cells.begin(), cells.end(), isRead))
+        return cells;
+    if (rows_.position() != position)
+        rows_.setPosition(position);
+    if (keepsTexts_ && !cells.front().isRead) {
+        readKept(cells, position, static_cast<int>(first));
+        return cells;
+    }
     int field = static_cast<int>(first);
     for (RecordCell& cell : cells) {
-        if (!cell.isRead) {
-            if (rows_.position() != position)
-                rows_.setPosition(position);
-            readCell(cell, field);
-        }
+        if (!cell.isRead)
+            take(rows_.value(field), position, field, cell);
         ++field;
     }
     return cells;
+}
+
+/// Reads in one call what most records are read of.
+void RecordCells::readKept(std::span<RecordCell> cells, std::int64_t position, int first)
+{
+    values_.resize(cells.size());
+    rows_.values(first, values_);
+    const Value* value = values_.data();
+    for (RecordCell& cell : cells) {
+        if (!cell.isRead)
+            take(*value, position, first, cell);
+        ++value;
+        ++first;
+    }
 }
 
 bool RecordCells::holds(std::int64_t position, int field, TextView text)
@@ -94,15 +114,16 @@ bool RecordCells::grow()
     return true;
 }
 
-void RecordCells::readCell(RecordCell& cell, int field)
+void RecordCells::take(const Value& value, std::int64_t position, int field, RecordCell& cell)
 {
-    const Value value = rows_.value(field);
     const bool isKept = keepsTexts_ && value.kind() == ValueKind::Text;
-    TextView text = trimmed(displayText(value, decimalSeparator_, buffer_));
+    TextView text = isKept ? value.text() : displayText(value, decimalSeparator_, buffer_);
+    if (!text.empty() && (text.front() == u' ' || text.back() == u' '))
+        text = trimmed(text);
+    if (text.size() > MostCellUnits)
+        requireCellLength(text, position, field);
     if (!isKept)
         text = store_.add(text);
-    if (text.size() > 0xFFFFFFFFU)
-        throw RunTimeError(ErrorNumber::Overflow);
     cell.units = text.data();
     cell.length = static_cast<std::uint32_t>(text.size());
     cell.isRead = true;

@@ -56,7 +56,7 @@ public:
     /// @param first  field from 0
     /// @param count  of fields
     /// @return       valid until another record is asked for
-    /// @throws RunTimeError Overflow: a text of 2^32 code units or more; or of the row set
+    /// @throws RunTimeError Overflow: a text longer than `MostCellUnits`; or of the row set
     std::span<RecordCell> read(std::int64_t position, std::size_t first, std::size_t count);
 
     /// Whether a record exists and its cell holds this text; null and the empty text are equal.
@@ -69,7 +69,8 @@ private:
     std::size_t slotOf(std::int64_t position) const;
     RecordCell* cellsOf(std::int64_t position);
     bool grow();
-    void readCell(RecordCell& cell, int field);
+    void readKept(std::span<RecordCell> cells, std::int64_t position, int first);
+    void take(const Value& value, std::int64_t position, int field, RecordCell& cell);
 
     RowSet& rows_;
     TextStore& store_;
@@ -82,6 +83,7 @@ private:
     char16_t decimalSeparator_;
     std::vector<std::int64_t> held_; ///< the record in each slot; 0: none
     std::vector<RecordCell> cells_; ///< slot by slot
+    std::vector<Value> values_;
     Text buffer_;
 };
 

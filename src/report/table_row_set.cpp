@@ -6,6 +6,8 @@
 #include "platform/run_time_error.h"
 
 #include <algorithm>
+#include <bit>
+#include <cmath>
 
 namespace pelloric {
 
@@ -13,6 +15,34 @@ namespace {
 
 /// A grid may promise more rows than it has; beyond this room is made as rows come.
 constexpr std::size_t MostReservedCells = 1U << 26U;
+
+/// From here on 64 bits are no number that arithmetic yields: three bits of a tag, 48 of content.
+constexpr std::uint64_t FirstTagged = 0xFFF8'0000'0000'0000ULL;
+constexpr std::uint64_t NoNumber = 0x7FF8'0000'0000'0000ULL;
+constexpr unsigned ContentBits = 48;
+constexpr std::uint64_t ContentMask = (1ULL << ContentBits) - 1;
+
+enum CellTag : std::uint64_t {
+    NullTag,
+    TruthTag,
+    DateTag,
+    LargeDateTag,
+    ShortTextTag,
+    LargeTextTag
+};
+
+/// The content of a date: milliseconds more than this before 1970.
+constexpr std::int64_t DateBias = 1LL << (ContentBits - 1);
+
+/// The content of a short text: its place in the store and its length.
+constexpr unsigned LengthBits = 12;
+constexpr std::uint64_t LongestShortText = (1U << LengthBits) - 1;
+constexpr std::uint64_t LastPlace = (1ULL << (ContentBits - LengthBits)) - 1;
+
+constexpr std::uint64_t tagged(std::uint64_t tag, std::uint64_t content)
+{
+    return FirstTagged | (tag << ContentBits) | content;
+}
 
 } // namespace
 
@@ -39,34 +69,86 @@ void TableRowSet::reserveRecords(std::int64_t records)
 
 void TableRowSet::addRecord()
 {
-    cells_.resize(cells_.size() + names_.size());
+    cells_.resize(cells_.size() + names_.size(), tagged(NullTag, 0));
     ++records_;
 }
 
 void TableRowSet::setLast(int field, const Value& value)
 {
-    Cell& cell = cells_[cells_.size() - names_.size() + static_cast<std::size_t>(field)];
+    if (value.kind() == ValueKind::Text)
+        requireCellLength(value.text(), records_, field);
+    cells_[cells_.size() - names_.size() + static_cast<std::size_t>(field)] = cellOf(value);
+}
+
+TableRowSet::Cell TableRowSet::cellOf(const Value& value)
+{
     switch (value.kind()) {
-    case ValueKind::Text: {
-        if (value.text().size() > 0xFFFFFFFFU)
-            throw RunTimeError(ErrorNumber::Overflow);
-        const TextView kept = store_->add(value.text());
-        cell.units = kept.data();
-        cell.length = static_cast<std::uint32_t>(kept.size());
-        break;
-    }
-    case ValueKind::Truth:
+    case ValueKind::Text:
+        return cellOfText(value.text());
     case ValueKind::Number:
+        return std::isnan(value.number()) ? NoNumber : std::bit_cast<Cell>(value.number());
+    case ValueKind::Truth:
+        return tagged(TruthTag, value.number() != 0 ? 1 : 0);
     case ValueKind::Date:
-        cell.number = value.number();
-        break;
+        return cellOfDate(value.number());
     case ValueKind::Null:
-        break;
+        return tagged(NullTag, 0);
     case ValueKind::Object:
     case ValueKind::Rows:
-        throw RunTimeError(ErrorNumber::TypeMismatch, u"a cell holds an object");
+        break;
     }
-    cell.kind = value.kind();
+    throw RunTimeError(ErrorNumber::TypeMismatch, u"a cell holds an object");
+}
+
+/// Dates of four thousand years on either side of 1970 need nothing beside their cell.
+TableRowSet::Cell TableRowSet::cellOfDate(double milliseconds)
+{
+    if (std::abs(milliseconds) >= static_cast<double>(DateBias))
+        return largeCell(LargeDateTag, { milliseconds, {} });
+    const auto whole = static_cast<std::int64_t>(milliseconds);
+    return tagged(DateTag, static_cast<std::uint64_t>(whole + DateBias));
+}
+
+TableRowSet::Cell TableRowSet::cellOfText(TextView text)
+{
+    if (text.size() > LongestShortText)
+        return largeCell(LargeTextTag, { 0, store_->add(text) });
+    const std::uint64_t place = store_->place(text);
+    if (place > LastPlace)
+        return largeCell(LargeTextTag, { 0, { store_->at(place), text.size() } });
+    return tagged(ShortTextTag, (place << LengthBits) | text.size());
+}
+
+TableRowSet::Cell TableRowSet::largeCell(std::uint64_t tag, const LargeValue& value)
+{
+    large_.push_back(value);
+    return tagged(tag, large_.size() - 1);
+}
+
+Value TableRowSet::valueOf(Cell cell) const
+{
+    if (cell < FirstTagged)
+        return Value::ofNumber(std::bit_cast<double>(cell));
+    const std::uint64_t content = cell & ContentMask;
+    switch ((cell - FirstTagged) >> ContentBits) {
+    case ShortTextTag:
+        return Value::ofText({ store_->at(content >> LengthBits), content & LongestShortText });
+    case LargeTextTag:
+        return Value::ofText(large_[content].text);
+    case TruthTag:
+        return Value::ofTruth(content != 0);
+    case DateTag:
+        return Value::ofDate(static_cast<std::int64_t>(content) - DateBias);
+    case LargeDateTag:
+        return Value::ofDate(static_cast<std::int64_t>(large_[content].number));
+    default:
+        return {};
+    }
+}
+
+std::size_t TableRowSet::memoryBytes() const
+{
+    return cells_.capacity() * sizeof(Cell) + large_.capacity() * sizeof(LargeValue);
 }
 
 TextView TableRowSet::fieldName(int field) const
@@ -86,22 +168,18 @@ Value TableRowSet::value(int field)
     if (field < 0 || field >= fieldCount() || isBeforeFirst() || isAfterLast())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
     const auto record = static_cast<std::size_t>(position_ - 1);
-    const Cell& cell = cells_[record * names_.size() + static_cast<std::size_t>(field)];
-    switch (cell.kind) {
-    case ValueKind::Text:
-        return Value::ofText(TextView(cell.units, cell.length));
-    case ValueKind::Truth:
-        return Value::ofTruth(cell.number != 0);
-    case ValueKind::Number:
-        return Value::ofNumber(cell.number);
-    case ValueKind::Date:
-        return Value::ofDate(static_cast<std::int64_t>(cell.number));
-    case ValueKind::Null:
-    case ValueKind::Object:
-    case ValueKind::Rows:
-        break;
-    }
-    return {};
+    return valueOf(cells_[record * names_.size() + static_cast<std::size_t>(field)]);
+}
+
+void TableRowSet::values(int first, std::span<Value> into)
+{
+    const auto end = static_cast<std::size_t>(first) + into.size();
+    if (first < 0 || end > names_.size() || isBeforeFirst() || isAfterLast())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    const auto record = static_cast<std::size_t>(position_ - 1);
+    const Cell* cell = cells_.data() + record * names_.size() + first;
+    for (Value& value : into)
+        value = valueOf(*cell++);
 }
 
 } // namespace pelloric

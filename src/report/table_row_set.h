@@ -12,7 +12,7 @@
 
 namespace pelloric {
 
-/// A row set in memory: 16 bytes a cell, and texts in a store that the document shares.
+/// A row set in memory: 8 bytes a cell, and texts in a store that the document shares.
 class TableRowSet final : public RowSet {
 public:
     /// @param store  where the texts of the cells are kept
@@ -33,6 +33,7 @@ public:
     /// Sets a field of the last record; a text is copied into the store.
     ///
     /// @param field  0 to `fieldCount() - 1`
+    /// @throws RunTimeError Overflow: a text longer than `MostCellUnits`; TypeMismatch: an object
     void setLast(int field, const Value& value);
 
     int fieldCount() const override { return static_cast<int>(names_.size()); }
@@ -41,23 +42,31 @@ public:
     std::int64_t position() const override { return position_; }
     void setPosition(std::int64_t position) override;
     Value value(int field) override;
+    void values(int first, std::span<Value> into) override;
     bool keepsTexts() const override { return true; }
 
     /// Bytes that the cells hold, the texts aside.
-    std::size_t memoryBytes() const { return cells_.capacity() * sizeof(Cell); }
+    std::size_t memoryBytes() const;
 
 private:
-    // A union has one first value. NOLINTNEXTLINE(cppcoreguidelines-pro-type-member-init)
-    struct Cell {
-        union {
-            double number = 0;
-            const char16_t* units; ///< of a text, which `length` belongs to
-        };
-        std::uint32_t length = 0;
-        ValueKind kind = ValueKind::Null;
+    /// A number as it is; anything else as one of those numbers that are no number: a tag, and
+    /// what it tells.
+    using Cell = std::uint64_t;
+
+    /// What a cell does not hold itself.
+    struct LargeValue {
+        double number = 0; ///< of a date
+        TextView text;
     };
 
+    Cell cellOf(const Value& value);
+    Cell cellOfDate(double milliseconds);
+    Cell cellOfText(TextView text);
+    Cell largeCell(std::uint64_t tag, const LargeValue& value);
+    Value valueOf(Cell cell) const;
+
     std::shared_ptr<TextStore> store_;
+    std::vector<LargeValue> large_;
     std::vector<Text> names_;
     std::unordered_set<Text> knownNames_;
     std::vector<Cell> cells_;

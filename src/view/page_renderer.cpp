@@ -67,13 +67,13 @@ void PageRenderer::replay(int page, const ReplayOptions& options, DrawingSurface
     surface.setFontSize(options.reportFontSize / options.divisor);
     if (const MapLocation* place = document_.picture(page))
         drawPicture(*place, surface);
-    for (const LineRecord& line : lines) {
+    for (const LineRecord line : lines) {
         const LinePen& pen = document_.pen(line.pen);
         if (mayShow(line, pen.LineWidth, options))
             drawLine(line, pen, surface);
     }
     Text buffer;
-    for (const TextRecord& text : texts) {
+    for (const TextRecord text : texts) {
         if (mayShow(text, document_.style(text.style).font.size, options))
             drawText(text, options, surface, buffer);
     }

@@ -46,7 +46,7 @@ struct OpenedWorld {
     Text texts(int page) const
     {
         Text all;
-        for (const TextRecord& record : document.texts(page))
+        for (const TextRecord record : document.texts(page))
             all.append(record.text()).append(u"|");
         return all;
     }

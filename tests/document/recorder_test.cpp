@@ -225,4 +225,29 @@ TEST_F(RecorderTest, DrawsOnAVisibleSurfaceAsWell)
     EXPECT_EQ(surface.log(), "");
 }
 
+TEST_F(RecorderTest, RecordsTheLinesOfARowByTheirPattern)
+{
+    recorder.setLineAttributes({ .LineColor = 7 });
+    const std::uint32_t pen = recorder.penNumber();
+    const auto lines = std::to_array<PatternLine>({ { 10, 10, false, true, pen },
+        { 90, 90, false, true, pen }, { 10, 90, true, true, pen } });
+    const std::uint32_t pattern = document.addLinePattern(lines);
+    const std::uint32_t none = document.addLinePattern({});
+    recorder.rowLines(100, 130, pattern);
+    EXPECT_EQ(recorder.point(), (Tpoint { 90, 130 }));
+    recorder.rowLines(130, 190, none);
+    ASSERT_EQ(document.lines(0).size(), 3U);
+    const Lineobj first = document.line(0, 0);
+    EXPECT_EQ(first.pt1, (Tpoint { 10, 100 }));
+    EXPECT_EQ(first.pt2, (Tpoint { 10, 130 }));
+    EXPECT_EQ(first.LineColor, 7);
+    EXPECT_EQ(document.line(0, 2).pt1, (Tpoint { 10, 130 }));
+    EXPECT_EQ(document.line(0, 2).pt2, (Tpoint { 90, 130 }));
+    FakeSurface surface;
+    recorder.drawOn(&surface, 1);
+    recorder.rowLines(200, 230, pattern);
+    EXPECT_NE(surface.log().find("line 90,200 90,230\n"), std::string::npos);
+    EXPECT_EQ(document.lines(0).size(), 6U);
+}
+
 } // namespace pelloric

@@ -31,6 +31,24 @@ TEST(TextStore, TakesAnEmptyTextAndOneLargerThanItsBlocks)
     EXPECT_EQ(before, u"before");
 }
 
+TEST(TextStore, FindsATextByItsPlace)
+{
+    TextStore store;
+    std::vector<std::pair<Text, std::uint64_t>> placed;
+    const Text block(1U << 17U, u'b');
+    for (int index = 0; index < 40; ++index) {
+        placed.emplace_back(decimal(index), store.place(decimal(index)));
+        placed.emplace_back(Text(), store.place({}));
+        placed.emplace_back(block, store.place(block));
+        store.add(u"between");
+    }
+    const Text large(3'000'000, u'l');
+    placed.emplace_back(large, store.place(large));
+    placed.emplace_back(u"after", store.place(u"after"));
+    for (const auto& [text, place] : placed)
+        EXPECT_EQ(TextView(store.at(place), text.size()), text);
+}
+
 TEST(TextStore, WastesLittle)
 {
     TextStore store;

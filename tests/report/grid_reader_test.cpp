@@ -243,7 +243,7 @@ TEST(GridTable, FreesItsRecordsAndKeepsTheRest)
 {
     TableGrid grid = gridOf({ { u"A", 500 } }, numberedRows(3, 1));
     GridTable table = readAs(PrintObjKind::MSFlexGrid, grid);
-    EXPECT_EQ(table.memoryBytes(), 3U * 16);
+    EXPECT_EQ(table.memoryBytes(), 3U * 8);
     table.dropRows();
     EXPECT_EQ(table.rows, nullptr);
     EXPECT_EQ(table.memoryBytes(), 0U);

@@ -43,7 +43,7 @@ std::vector<TableColumn> columnsOf(const std::vector<Twips>& widths)
 int verticalLinesAt(const PageDocument& document, int page, Twips x)
 {
     int count = 0;
-    for (const LineRecord& line : document.lines(page))
+    for (const LineRecord line : document.lines(page))
         count += line.pt1.x == x && line.pt2.x == x ? 1 : 0;
     return count;
 }
@@ -51,7 +51,7 @@ int verticalLinesAt(const PageDocument& document, int page, Twips x)
 /// Whether a line runs across from one point to the other.
 bool hasLine(const PageDocument& document, int page, Tpoint from, Tpoint to)
 {
-    for (const LineRecord& line : document.lines(page)) {
+    for (const LineRecord line : document.lines(page)) {
         if (line.pt1 == from && line.pt2 == to)
             return true;
     }
@@ -284,7 +284,7 @@ TEST(LayoutEngine, MergesAcrossPagesAndClosesTheLastRowOfAFullPage)
     ASSERT_EQ(document.pageCount(), 2);
     EXPECT_EQ(textsOf(document, 0), "T1|A");
     EXPECT_EQ(textsOf(document, 1), "T1");
-    const LineRecord& bottom = document.lines(0).back();
+    const LineRecord bottom = document.lines(0).back();
     EXPECT_EQ(bottom.pt1.y, bottom.pt2.y);
     EXPECT_GT(bottom.pt1.y, 5443 - 1021 - 72);
 }

@@ -395,7 +395,7 @@ private:
         const std::vector<Placed> wanted = textsOfPage(band, firstRow, rows);
         const bool fits = bandWidth(band) <= report_.setup.myWidth;
         std::size_t at = 0;
-        for (const TextRecord& text : document_.texts(page)) {
+        for (const TextRecord text : document_.texts(page)) {
             if (document_.style(text.style).color != CellColor)
                 continue;
             ASSERT_LT(at, wanted.size()) << "a text too many";
@@ -407,7 +407,7 @@ private:
                 checkSide(text.pt);
         }
         ASSERT_EQ(at, wanted.size()) << "a cell is missing";
-        for (const LineRecord& line : document_.lines(page)) {
+        for (const LineRecord line : document_.lines(page)) {
             if (fits) {
                 checkSide(line.pt1);
                 checkSide(line.pt2);
@@ -426,7 +426,7 @@ private:
     void checkSlots(int page) const
     {
         std::size_t count = 0;
-        for (const TextRecord& text : document_.texts(page)) {
+        for (const TextRecord text : document_.texts(page)) {
             if (document_.style(text.style).color == CellColor)
                 continue;
             ++count;

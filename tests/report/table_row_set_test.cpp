@@ -8,6 +8,10 @@
 
 #include <gtest/gtest.h>
 
+#include <bit>
+#include <cmath>
+#include <limits>
+
 namespace pelloric {
 
 namespace {
@@ -63,6 +67,62 @@ TEST_F(TableRows, KeepEveryKindOfValue)
     EXPECT_TRUE(rows.keepsTexts());
 }
 
+TEST_F(TableRows, KeepNumbersDatesAndTextsOfEverySize)
+{
+    constexpr double Infinity = std::numeric_limits<double>::infinity();
+    for (const double number : { 0.0, -0.0, 1e308, -1e308, 5e-324, Infinity, -Infinity })
+        add(Value::ofNumber(number), Value::ofTruth(false));
+    add(Value::ofNumber(-std::numeric_limits<double>::quiet_NaN()), Value());
+    constexpr std::int64_t Day = 86'400'000;
+    const std::vector<std::int64_t> dates { 0, -1, 1, -4000 * 365 * Day, 4000 * 365 * Day,
+        -(1LL << 47U), (1LL << 47U) - 1, -90'000 * 365 * Day, 90'000 * 365 * Day };
+    for (const std::int64_t date : dates)
+        add(Value::ofDate(date), Value());
+    const std::vector<std::size_t> lengths { 0, 1, 4095, 4096, 70'000, 600'000 };
+    for (const std::size_t length : lengths)
+        add(Value::ofText(Text(length, u'x')), Value::ofText(u"after"));
+    rows.moveFirst();
+    for (const double number : { 0.0, -0.0, 1e308, -1e308, 5e-324, Infinity, -Infinity }) {
+        EXPECT_EQ(std::bit_cast<std::uint64_t>(rows.value(0).number()),
+            std::bit_cast<std::uint64_t>(number));
+        EXPECT_EQ(rows.value(1).kind(), ValueKind::Truth);
+        EXPECT_EQ(rows.value(1).number(), 0);
+        rows.moveNext();
+    }
+    EXPECT_EQ(rows.value(0).kind(), ValueKind::Number);
+    EXPECT_TRUE(std::isnan(rows.value(0).number()));
+    rows.moveNext();
+    for (const std::int64_t date : dates) {
+        EXPECT_EQ(rows.value(0).kind(), ValueKind::Date);
+        EXPECT_EQ(rows.value(0).number(), static_cast<double>(date));
+        rows.moveNext();
+    }
+    for (const std::size_t length : lengths) {
+        EXPECT_EQ(rows.value(0).kind(), ValueKind::Text);
+        EXPECT_EQ(rows.value(0).text(), Text(length, u'x'));
+        EXPECT_EQ(rows.value(1).text(), u"after");
+        rows.moveNext();
+    }
+}
+
+TEST_F(TableRows, RefuseATextThatIsTooLongAndSayWhere)
+{
+    rows.addRecord();
+    rows.addRecord();
+    const Text longest(MostCellUnits, u'x');
+    rows.setLast(0, Value::ofText(longest));
+    try {
+        rows.setLast(1, Value::ofText(longest + u'x'));
+        ADD_FAILURE();
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(error.number(), ErrorNumber::Overflow);
+        EXPECT_NE(
+            error.text().find(
+                u"row 2, column 2 holds 16777217 characters, at most 16777216 can be printed"),
+            Text::npos);
+    }
+}
+
 TEST_F(TableRows, RefuseAnObjectInACell)
 {
     FakeObject object;
@@ -99,10 +159,10 @@ TEST_F(TableRows, MoveFirstOnAnEmptySetIsNoError)
     EXPECT_TRUE(rows.isAfterLast());
 }
 
-TEST_F(TableRows, TakeSixteenBytesACell)
+TEST_F(TableRows, TakeEightBytesACell)
 {
     rows.reserveRecords(1000);
-    EXPECT_EQ(rows.memoryBytes(), 1000U * 2 * 16);
+    EXPECT_EQ(rows.memoryBytes(), 1000U * 2 * 8);
     rows.reserveRecords(-3);
     EXPECT_EQ(rows.recordCount(), 0);
 }

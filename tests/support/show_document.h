@@ -55,7 +55,7 @@ inline std::string showDocument(const PageDocument& document)
 inline std::string textsOf(const PageDocument& document, int page)
 {
     std::string shown;
-    for (const TextRecord& text : document.texts(page))
+    for (const TextRecord text : document.texts(page))
         shown += (shown.empty() ? "" : "|") + showText(text.text());
     return shown;
 }
