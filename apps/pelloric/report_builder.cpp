@@ -49,7 +49,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
 {
     const Font& font = canvas.style().body.font;
     FaceMetrics& face = canvas.platform().metrics.face(font.name, font.bold, font.italic);
-    std::vector<Twips> widths = contentWidths(grid, face, font.size);
+    std::vector<Twips> widths = contentWidths(grid, face, font.size, &canvas.platform().loop);
     // A table exactly as wide as the room is divided.
     fitWidths(widths, canvas.page.myWidth - 2 * canvas.page.intLeft - 1);
     const QStringList given

@@ -34,7 +34,7 @@ Text pathText(const std::filesystem::path& path)
     return fromUtf8({ reinterpret_cast<const char*>(bytes.data()), bytes.size() });
 }
 
-std::string readFileBytes(const std::filesystem::path& path)
+std::string readFileBytes(const std::filesystem::path& path, std::size_t most)
 {
     std::ifstream stream(path, std::ios::binary);
     std::string bytes;
@@ -42,6 +42,10 @@ std::string readFileBytes(const std::filesystem::path& path)
     while (stream) {
         stream.read(chunk.data(), chunk.size());
         bytes.append(chunk.data(), static_cast<std::size_t>(stream.gcount()));
+        if (bytes.size() > most)
+            throw RunTimeError(ErrorNumber::Overflow,
+                pathText(path) + u" holds more than " + decimal(static_cast<std::int64_t>(most))
+                    + u" bytes");
     }
     if (!stream.is_open() || stream.bad())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));

@@ -6,6 +6,7 @@
 #include "platform/text.h"
 
 #include <filesystem>
+#include <string>
 
 namespace pelloric {
 
@@ -13,8 +14,11 @@ namespace pelloric {
 Text pathText(const std::filesystem::path& path);
 
 /// All bytes of a file.
-/// @throws RunTimeError FileNotFound, with the path: it is missing or cannot be read
-std::string readFileBytes(const std::filesystem::path& path);
+/// @param most  bytes that are read
+/// @throws RunTimeError FileNotFound, with the path: it is missing or cannot be read; Overflow,
+/// with
+///         the path: it is larger, or endless
+std::string readFileBytes(const std::filesystem::path& path, std::size_t most = std::string::npos);
 
 /// Creates a file; a failure leaves none behind.
 /// @return  whether all bytes were written

@@ -6,6 +6,7 @@
 #include "document/cell_lines.h"
 #include "grids/table_grid.h"
 #include "platform/numbers.h"
+#include "platform/services.h"
 #include "platform/text_metrics.h"
 #include "platform/text_runs.h"
 
@@ -73,12 +74,15 @@ double capFor(std::vector<Twips> widths, Twips room)
 
 } // namespace
 
-std::vector<Twips> contentWidths(const TableGrid& grid, FaceMetrics& body, float size)
+std::vector<Twips> contentWidths(
+    const TableGrid& grid, FaceMetrics& body, float size, MessageLoop* loop)
 {
     constexpr double Least = NarrowestContent;
     constexpr double Most = WidestContent;
     std::vector<Twips> widths;
     for (int column = 0; column < grid.columnCount(); ++column) {
+        if (loop != nullptr)
+            loop->keepAlive();
         const double advance = longestAdvance(grid, column, body);
         const double text = std::ceil(advance * std::max(0.0, static_cast<double>(size)));
         widths.push_back(roundToInt32(std::clamp(text + CellPadding + Clearance, Least, Most)));

@@ -11,6 +11,7 @@
 namespace pelloric {
 
 class FaceMetrics;
+class MessageLoop;
 class TableGrid;
 
 /// The bounds of a column's width that is taken from what the column holds: twips.
@@ -23,8 +24,11 @@ inline constexpr Twips WidestContent = 4500; ///< longer texts are wrapped
 /// longest text besides.
 /// @param body  the face that texts are printed in
 /// @param size  points
+/// @param loop  kept alive between columns; null: nothing is
 /// @return      twips, from `NarrowestContent` to `WidestContent`; left to right
-std::vector<Twips> contentWidths(const TableGrid& grid, FaceMetrics& body, float size);
+/// @throws RunTimeError Cancelled: by the message loop
+std::vector<Twips> contentWidths(
+    const TableGrid& grid, FaceMetrics& body, float size, MessageLoop* loop = nullptr);
 
 /// Narrows the widest columns so that all of them fit on one sheet, where that leaves each of them
 /// readable; else the widths stay as they are and the sheet's edge divides the table.

@@ -83,7 +83,7 @@ struct OldFile {
 OldFile readOldFile(const std::filesystem::path& path)
 {
     try {
-        return { readFileBytes(path), false };
+        return { readFileBytes(path, MostSettingsBytes), false };
     } catch (const RunTimeError&) {
         std::error_code error;
         const auto type = std::filesystem::status(path, error).type();
@@ -116,7 +116,8 @@ Text readSetting(const Platform& platform, TextView key)
 
 Text readSettingsText(const Platform& platform)
 {
-    return rewritable(platform.codec.decode(readFileBytes(settingsPath(platform))));
+    return rewritable(
+        platform.codec.decode(readFileBytes(settingsPath(platform), MostSettingsBytes)));
 }
 
 TextView findSettingLine(TextView key, TextView text)
@@ -159,7 +160,7 @@ SaveOutcome batchWrite(
 }
 
 SettingsSnapshot::SettingsSnapshot(const Platform& platform)
-    : text_(platform.codec.decode(readFileBytes(settingsPath(platform))))
+    : text_(platform.codec.decode(readFileBytes(settingsPath(platform), MostSettingsBytes)))
 {
 }
 

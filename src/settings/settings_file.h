@@ -12,6 +12,9 @@ namespace pelloric {
 
 struct Platform;
 
+/// A settings file of more bytes is refused before it is read to its end.
+inline constexpr std::size_t MostSettingsBytes = 1U << 24U;
+
 /// The settings file "OstlConfig.ini" in the system directory, asked for afresh at every call.
 ///
 /// It is a list of lines of the form key, "= ", value. What the program saves is one quoted text:

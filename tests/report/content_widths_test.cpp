@@ -4,7 +4,9 @@
 #include "report/content_widths.h"
 
 #include "fakes/fake_metrics.h"
+#include "fakes/fake_services.h"
 #include "grids/table_grid.h"
+#include "support/errors.h"
 
 #include <gtest/gtest.h>
 
@@ -79,6 +81,17 @@ TEST(FitWidths, NarrowOnlyTheWidestColumnsAndOnlyWhereTheyStayReadable)
         fitWidths(widths, row.room);
         EXPECT_EQ(widths, row.fitted) << "room " << row.room;
     }
+}
+
+TEST(ContentWidths, AreLeftBetweenTwoColumnsWhenTheUserCancels)
+{
+    const TableGrid grid({ { u"a", -1 }, { u"b", -1 }, { u"c", -1 } });
+    FakeMetrics metrics;
+    FakeMessageLoop loop;
+    loop.cancelAtBeat = 2;
+    EXPECT_EQ(errorOf([&] { contentWidths(grid, metrics.face(u"any", false, false), 10, &loop); }),
+        ErrorNumber::Cancelled);
+    EXPECT_EQ(loop.beats, 2);
 }
 
 } // namespace pelloric

@@ -331,4 +331,21 @@ TEST(BatchWrite, OfAMissingFileStopsOrMakesOneOfTwoQuotes)
     EXPECT_EQ(platform.folder.read(FileName), "\"\"\r\n");
 }
 
+TEST(SettingsFile, IsRefusedEarlyWhenItHasNoEnd)
+{
+    FakePlatform platform;
+    std::filesystem::create_symlink("/dev/zero", platform.folder.file(FileName));
+    EXPECT_EQ(errorOf([&] { readSetting(platform.services(), u"Top"); }), ErrorNumber::Overflow);
+    EXPECT_NE(writeSetting(platform.services(), u"Top", u"1"), SaveOutcome::Written);
+}
+
+TEST(SettingsFile, LargerThanItMayBeIsNeitherReadNorReplaced)
+{
+    const std::string large = "Top= 1\r\n" + std::string(MostSettingsBytes, 'x');
+    SettingsWorld world(large);
+    EXPECT_EQ(errorOf([&] { world.read(u"Top"); }), ErrorNumber::Overflow);
+    EXPECT_NE(world.write(u"Top", u"2"), SaveOutcome::Written);
+    EXPECT_EQ(world.bytes().size(), large.size());
+}
+
 } // namespace pelloric
