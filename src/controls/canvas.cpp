@@ -154,9 +154,9 @@ void Canvas::ReDrawZoom(AutomationObject& grid)
 
 void Canvas::build(AutomationObject& grid, bool takeWidths, const Shape& earlier)
 {
-    const FlagChange building(building_, true);
     bool isBuilt = false;
     try {
+        const FlagChange building(building_, true);
         const FlagChange hidden(view_.baseVisible, false);
         notifyView();
         platform_.loop.runOnce();

@@ -32,6 +32,7 @@ public:
     {
         paper.push_back(canvas_.view().baseVisible);
         divisor = canvas_.view().divisor;
+        building = canvas_.isBuilding();
     }
 
     void progressChanged() override { bars.push_back(canvas_.progress()); }
@@ -39,6 +40,7 @@ public:
     std::vector<bool> paper;
     std::vector<ProgressBar> bars;
     float divisor = 0;
+    bool building = false;
 
 private:
     Canvas& canvas_;
@@ -608,6 +610,7 @@ TEST_F(CanvasTest, EndsAtTheRowAtWhichTheUserCancels)
         EXPECT_EQ(showDocument(canvas.document()), now) << beat;
         EXPECT_EQ(canvas.page, held);
         EXPECT_FALSE(canvas.progress().visible);
+        EXPECT_FALSE(observer.building);
         EXPECT_FALSE(canvas.isBusy());
     }
     EXPECT_NE(page.myHeight, canvas.page.myHeight);
