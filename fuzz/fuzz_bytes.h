@@ -31,7 +31,7 @@ public:
     }
 
     /// 0 to `most`, both of them.
-    unsigned upTo(unsigned most) { return (byte() << 8U | byte()) % (most + 1); }
+    unsigned atMost(unsigned most) { return (byte() << 8U | byte()) % (most + 1); }
 
     bool chance() { return (byte() & 1U) != 0; }
 
@@ -40,7 +40,7 @@ public:
     {
         static constexpr double Odd[] = { -1, 0, 143.999, 144, 144.001, 1e9, -2147483649.0, 1e300 };
         const unsigned kind = byte();
-        return kind < 8 ? Odd[kind] : static_cast<double>(upTo(12000)) - 100;
+        return kind < 8 ? Odd[kind] : static_cast<double>(atMost(12000)) - 100;
     }
 
     /// Some code units; blanks, line ends, separators and halves of pairs among them.
@@ -49,7 +49,7 @@ public:
         static constexpr char16_t Odd[] = { u' ', u'\r', u'\n', u'★', 0xD83D, 0xDE00, u'\t', 0,
             u'[', u'宋', u'\u0301', u'\u202E' };
         Text text;
-        for (unsigned length = upTo(most); length > 0; --length) {
+        for (unsigned length = atMost(most); length > 0; --length) {
             const unsigned unit = byte();
             text.push_back(unit < std::size(Odd) ? Odd[unit] : static_cast<char16_t>(unit));
         }

@@ -35,7 +35,7 @@ public:
     AnyObject(fuzz::Bytes& bytes, int depth)
         : bytes_(bytes)
         , depth_(depth)
-        , hidden_(bytes.upTo(60))
+        , hidden_(bytes.atMost(60))
     {
     }
 
@@ -52,11 +52,11 @@ public:
 
     Value get(MemberId member, std::span<const Value>) override
     {
-        if (Names[static_cast<std::size_t>(member)] == u"Cols" && bytes_.upTo(8) == 0)
+        if (Names[static_cast<std::size_t>(member)] == u"Cols" && bytes_.atMost(8) == 0)
             return Value::ofNumber(bytes_.number());
         if (isCount(member))
-            return Value::ofNumber(bytes_.upTo(9));
-        switch (bytes_.upTo(12)) {
+            return Value::ofNumber(bytes_.atMost(9));
+        switch (bytes_.atMost(12)) {
         case 0:
             return {};
         case 1:
@@ -80,7 +80,7 @@ public:
 
     void put(MemberId, std::span<const Value>, const Value&) override
     {
-        if (bytes_.upTo(20) == 1)
+        if (bytes_.atMost(20) == 1)
             throw RunTimeError(ErrorNumber::NoSuchMember);
     }
 
@@ -112,7 +112,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         return 0;
     fuzz::Bytes bytes(data, size);
     Canvas canvas(platform.services);
-    canvas.m_PrintObj = static_cast<PrintObjKind>(bytes.upTo(4));
+    canvas.m_PrintObj = static_cast<PrintObjKind>(bytes.atMost(4));
     AnyObject grid(bytes, 0);
     try {
         canvas.doPreview(grid);

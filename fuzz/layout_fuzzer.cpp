@@ -21,12 +21,12 @@ namespace {
 
 TableGrid gridOf(fuzz::Bytes& bytes)
 {
-    std::vector<TableColumn> columns(1 + bytes.upTo(12));
+    std::vector<TableColumn> columns(1 + bytes.atMost(12));
     for (TableColumn& column : columns)
-        column = { bytes.text(12), static_cast<Twips>(bytes.upTo(7000)) - 1 };
+        column = { bytes.text(12), static_cast<Twips>(bytes.atMost(7000)) - 1 };
     const std::size_t count = columns.size();
     TableGrid grid(std::move(columns));
-    for (unsigned row = bytes.upTo(60); row > 0; --row) {
+    for (unsigned row = bytes.atMost(60); row > 0; --row) {
         std::vector<Text> texts(count);
         for (Text& text : texts)
             text = bytes.text(bytes.chance() ? 4 : 60);
@@ -45,7 +45,7 @@ Text settingsOf(fuzz::Bytes& bytes)
         if (kind < 200)
             settings.append(setting.value);
         else if (kind < 240)
-            settings.append(decimal(bytes.upTo(400)));
+            settings.append(decimal(bytes.atMost(400)));
         else
             settings.append(replaceAll(replaceAll(bytes.text(20), u"\r", u""), u"\n", u""));
         settings.append(u"\r\n");
@@ -89,7 +89,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         return 0;
     fuzz::Bytes bytes(data, size);
     platform.folders.write("OstlConfig.ini", toUtf8(settingsOf(bytes)));
-    platform.library.MarvenStartRow = static_cast<std::int32_t>(bytes.upTo(3));
+    platform.library.MarvenStartRow = static_cast<std::int32_t>(bytes.atMost(3));
     TableGrid grid = gridOf(bytes);
     Canvas canvas(platform.services);
     try {
