@@ -8,6 +8,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <iterator>
 #include <span>
 #include <vector>
 
@@ -106,6 +107,12 @@ class LineRange {
 public:
     class Iterator {
     public:
+        using iterator_category = std::input_iterator_tag;
+        using value_type = LineRecord;
+        using difference_type = std::ptrdiff_t;
+        using pointer = void;
+        using reference = LineRecord; ///< a value; nothing of the page is referred to
+
         Iterator(const LineRange& range, std::size_t group)
             : range_(&range)
             , group_(group)
@@ -121,6 +128,13 @@ public:
                 line_ = 0;
             }
             return *this;
+        }
+
+        Iterator operator++(int)
+        {
+            const Iterator before = *this;
+            ++*this;
+            return before;
         }
 
         bool operator==(const Iterator& other) const
@@ -229,6 +243,12 @@ class TextRange {
 public:
     class Iterator {
     public:
+        using iterator_category = std::input_iterator_tag;
+        using value_type = TextRecord;
+        using difference_type = std::ptrdiff_t;
+        using pointer = void;
+        using reference = TextRecord; ///< a value; nothing of the page is referred to
+
         Iterator(const TextList& list, std::size_t run, std::size_t text)
             : list_(&list)
             , run_(run)
@@ -244,6 +264,13 @@ public:
             if (run_ + 1 < list_->runs_.size() && list_->runs_[run_ + 1].first == text_)
                 ++run_;
             return *this;
+        }
+
+        Iterator operator++(int)
+        {
+            const Iterator before = *this;
+            ++*this;
+            return before;
         }
 
         bool operator==(const Iterator& other) const { return text_ == other.text_; }

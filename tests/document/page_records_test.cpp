@@ -37,6 +37,7 @@ void expectTexts(const TextList& list, const std::vector<TextRecord>& expected)
         ++index;
     }
     EXPECT_EQ(index, expected.size());
+    EXPECT_EQ(std::vector<TextRecord>(range.begin(), range.end()).size(), expected.size());
 }
 
 void expectLines(const LineRange& range, const std::vector<LineRecord>& expected)
@@ -49,6 +50,7 @@ void expectLines(const LineRange& range, const std::vector<LineRecord>& expected
         ++index;
     }
     EXPECT_EQ(index, expected.size());
+    EXPECT_EQ(std::vector<LineRecord>(range.begin(), range.end()), expected);
 }
 
 } // namespace
