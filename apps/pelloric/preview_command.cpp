@@ -15,6 +15,7 @@
 #include "table_selection.h"
 #include "table_source.h"
 #include "ui/qt/preview_opener.h"
+#include "ui/qt/preview_prompts.h"
 #include "ui/qt/preview_window.h"
 #include "windows.h"
 
@@ -56,7 +57,11 @@ int runPreview(const Invocation& invocation)
         settings.emplace(platform, line);
     else
         prepareSettings(platform.record());
-    prepareWidths(*grid, line, platform.record());
+    // Before every build: a dialog may have chosen another font or paper.
+    TableGrid& table = *grid;
+    qt::PreviewPrompts prompts;
+    prompts.beforeBuild = [&](AutomationObject&) { prepareWidths(table, line, platform.record()); };
+    opener.setPrompts(prompts);
     opener.showWindow().canvas().canvas().options = shapeOf(line);
     opener.openPreview(std::move(grid));
     return application.run();

@@ -61,10 +61,10 @@ LayoutProgress::LayoutProgress(Canvas& canvas, ProgressLine& line)
     : canvas_(canvas)
     , line_(line)
 {
-    canvas_.observe(this);
+    canvas_.observe(*this);
 }
 
-LayoutProgress::~LayoutProgress() { canvas_.observe(nullptr); }
+LayoutProgress::~LayoutProgress() { canvas_.forget(*this); }
 
 void LayoutProgress::progressChanged()
 {

@@ -117,6 +117,7 @@ void Canvas::clear()
     if (isBusy())
         return;
     recorder_.clear();
+    ++documentNumber_;
     endArrangement(view_);
     if (table_)
         table_->dropRows();
@@ -128,6 +129,7 @@ void Canvas::newPage()
     if (isBusy())
         return;
     recorder_.newPage();
+    ++documentNumber_;
     unloadSurfaces(view_);
     notifyView();
 }
@@ -270,8 +272,7 @@ bool Canvas::SaveFile(const std::filesystem::path& path)
     platform_.loop.runOnce();
     const auto report = [this](int step, int last) {
         progress_ = { true, std::max(1, last), step };
-        if (observer_ != nullptr)
-            observer_->progressChanged();
+        notify(&CanvasObserver::progressChanged);
     };
     bool written = true;
     try {
@@ -304,6 +305,7 @@ void Canvas::OpenFile(const std::filesystem::path& path)
 
 void Canvas::showFirstPage()
 {
+    ++documentNumber_;
     document_.currentPage = 0;
     changeView([this] { showNewDocument(view_, facts()); });
 }
@@ -326,8 +328,7 @@ void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrint
     progress_ = { true, std::max<std::int64_t>(1, wanted), 0 };
     job.pageSent = [this, wanted](std::int64_t sent) {
         progress_.value = sent;
-        if (observer_ != nullptr)
-            observer_->progressChanged();
+        notify(&CanvasObserver::progressChanged);
         if (pageSent)
             pageSent(sent, wanted);
         if (sent < wanted)
@@ -463,27 +464,39 @@ void Canvas::mouseUp(double x, double y)
     changeView([&] { pelloric::mouseUp(view_, facts(), x, y); }, &CanvasObserver::viewScrolled);
 }
 
+void Canvas::movePages(Tpoint first)
+{
+    changeView([&] { pelloric::movePages(view_, facts(), first); }, &CanvasObserver::viewScrolled);
+}
+
+void Canvas::bringIntoStep()
+{
+    changeView([this] { pelloric::bringIntoStep(view_, facts()); });
+}
+
+void Canvas::zoomAbout(float scale, double x, double y)
+{
+    changeView([&] { pelloric::zoomAbout(view_, facts(), scale, x, y); });
+}
+
 void Canvas::begin(std::int64_t maximum)
 {
     progress_ = { true, maximum, 0 };
     buildProgress_ = progress_;
-    if (observer_ != nullptr)
-        observer_->progressChanged();
+    notify(&CanvasObserver::progressChanged);
 }
 
 void Canvas::advance()
 {
     ++progress_.value;
     buildProgress_.value = progress_.value;
-    if (observer_ != nullptr)
-        observer_->progressChanged();
+    notify(&CanvasObserver::progressChanged);
 }
 
 void Canvas::end()
 {
     progress_.visible = false;
-    if (observer_ != nullptr)
-        observer_->progressChanged();
+    notify(&CanvasObserver::progressChanged);
 }
 
 /// Tells the observer after a change, also of what an error left behind.
@@ -495,14 +508,14 @@ void Canvas::changeView(const std::function<void()>& change, Notification notifi
         notifyView();
         throw;
     }
-    if (observer_ != nullptr)
-        (observer_->*notification)();
+    notify(notification);
 }
 
-void Canvas::notifyView()
+/// An observer may go while it is told.
+void Canvas::notify(Notification notification)
 {
-    if (observer_ != nullptr)
-        observer_->viewChanged();
+    for (std::size_t next = 0; next < observers_.size(); ++next)
+        (observers_[next]->*notification)();
 }
 
 } // namespace pelloric

@@ -14,6 +14,7 @@
 #include <filesystem>
 #include <functional>
 #include <optional>
+#include <vector>
 
 namespace pelloric {
 
@@ -68,8 +69,10 @@ public:
     /// What the last build did to bring its table onto the sheet.
     const FitResult& fit() const { return fit_; }
 
-    /// @param observer  borrowed, or null
-    void observe(CanvasObserver* observer) { observer_ = observer; }
+    /// Tells an observer, too, from now on.
+    /// @param observer  borrowed until `forget`
+    void observe(CanvasObserver& observer) { observers_.push_back(&observer); }
+    void forget(CanvasObserver& observer) { std::erase(observers_, &observer); }
 
     /// The number of pages as it is published; a host may write it.
     std::int16_t Totalpages() const { return document_.Totalpages; }
@@ -175,6 +178,12 @@ public:
     void mouseMove();
     void mouseDown(double x, double y);
     void mouseUp(double x, double y);
+    /// See `pelloric::movePages`.
+    void movePages(Tpoint first);
+    /// See `pelloric::bringIntoStep`.
+    void bringIntoStep();
+    /// See `pelloric::zoomAbout`.
+    void zoomAbout(float scale, double x, double y);
 
     const PageDocument& document() const { return document_; }
     /// For hosts that place a picture on a page.
@@ -185,6 +194,8 @@ public:
     const ProgressBar& progress() const { return progress_; }
     /// The progress bar as the last build left it.
     const ProgressBar& buildProgress() const { return buildProgress_; }
+    /// Another number tells that the pages are others: built, opened, cleared or more of them.
+    std::uint32_t documentNumber() const { return documentNumber_; }
     /// What the last build read of its grid, or null.
     const GridTable* table() const { return table_ ? &*table_ : nullptr; }
     PageFacts facts() const { return pageFactsOf(page, document_); }
@@ -217,7 +228,8 @@ private:
     using Notification = void (CanvasObserver::*)();
     void changeView(const std::function<void()>& change,
         Notification notification = &CanvasObserver::viewChanged);
-    void notifyView();
+    void notify(Notification notification);
+    void notifyView() { notify(&CanvasObserver::viewChanged); }
 
     Platform& platform_;
     PageDocument document_;
@@ -227,10 +239,11 @@ private:
     std::optional<GridTable> table_;
     ProgressBar progress_;
     ProgressBar buildProgress_;
-    CanvasObserver* observer_ = nullptr;
+    std::vector<CanvasObserver*> observers_;
     Text openedName_; ///< of the file that the document was opened from
     double titleTop_ = 0;
     FitResult fit_;
+    std::uint32_t documentNumber_ = 0;
     bool building_ = false;
     bool printing_ = false;
 };

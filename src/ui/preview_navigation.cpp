@@ -10,8 +10,6 @@
 #include "ui/tool_table.h"
 
 #include <algorithm>
-#include <cmath>
-#include <limits>
 
 namespace pelloric {
 
@@ -38,13 +36,38 @@ bool hasListItems(AutomationObject& grid)
     }
 }
 
-/// @throws RunTimeError Overflow: past single precision
-float toSingle(double value)
+/// The scale that a text names, held between 1 % and 6400 %; 0 stays 0.
+float scaleOf(TextView text)
 {
-    if (!(std::fabs(value) <= std::numeric_limits<float>::max()))
-        throw RunTimeError(ErrorNumber::Overflow);
-    return static_cast<float>(value);
+    const double scale = leadingNumber(text) / 100;
+    return static_cast<float>(scale == 0 ? 0 : std::clamp(scale, SmallestScale, LargestScale));
 }
+
+/// Whether a text stands in the list of scales as it is.
+bool isScaleEntry(TextView text) { return std::ranges::count(ScaleEntries, text) > 0; }
+
+/// The divisor at which a length fills another: a trace more, so that rounding hides no edge.
+float divisorFor(double length, Twips viewport)
+{
+    constexpr double Trace = 1.000001;
+    return static_cast<float>(length / std::max(viewport, 1) * Trace);
+}
+
+/// Counts a command for as long as it lives.
+class CommandCount {
+public:
+    explicit CommandCount(int& count)
+        : count_(++count)
+    {
+    }
+
+    ~CommandCount() { --count_; }
+    CommandCount(const CommandCount&) = delete;
+    CommandCount& operator=(const CommandCount&) = delete;
+
+private:
+    int& count_;
+};
 
 } // namespace
 
@@ -60,11 +83,13 @@ PreviewSession::PreviewSession(Canvas& canvas, PreviewHost& host)
     , host_(host)
 {
     canvas_.strSCliectRect = u"full";
-    takePosition();
-    state_.pageEntries = canvas_.Totalpages();
-    state_.countLabel = pageCountLabel(canvas_.Totalpages());
+    takePosition(canvas_.WindowPages() > 0);
+    takeEntries();
     state_.scale = InitialScaleText;
+    canvas_.observe(*this);
 }
+
+PreviewSession::~PreviewSession() { canvas_.forget(*this); }
 
 void PreviewSession::open(AutomationObject& grid)
 {
@@ -79,18 +104,24 @@ void PreviewSession::quietly(const std::function<void()>& command)
 {
     if (canvas_.isBusy())
         return;
+    const CommandCount counted(commands_);
+    standsAsOnPageOne_ = false;
     try {
         command();
+        keepPageInSight(canvas_);
     } catch (const std::exception&) {
-        return; // the window stays usable; a cancelled file dialog ends here too
+        showView(); // the window stays usable; a cancelled file dialog ends here too
+        return;
     }
+    if (!standsAsOnPageOne_)
+        showView();
 }
 
 void PreviewSession::click(int id)
 {
     quietly([&] {
         canvas_.setMouse();
-        canvas_.setReSetLeftTop(true);
+        askForCentring();
         if (const PreviewTool* const tool = clickedTool(id))
             dispatch(tool->action);
     });
@@ -130,7 +161,8 @@ void PreviewSession::dispatch(ToolAction action)
         return afterDialog(host_.showPageSetup());
     case ToolAction::WholePage:
         leaveWindow();
-        return canvas_.showWholePage();
+        canvas_.showWholePage();
+        return noteFit(Fit::LargerRatio);
     case ToolAction::TwoPages:
         return showWindow(2, canvas_.Currentpage() - 1, canvas_.Currentpage());
     case ToolAction::Exit:
@@ -180,6 +212,31 @@ void PreviewSession::openFile()
     refreshNavigation();
 }
 
+void PreviewSession::askForCentring()
+{
+    barsToStart(canvas_);
+    canvas_.setReSetLeftTop(true);
+}
+
+/// A paint while messages ran has used the demand up for a page that stood alone.
+void PreviewSession::centre()
+{
+    askForCentring();
+    canvas_.OnDraw();
+}
+
+/// A number that names no page leaves the page in view, from which the next one counts.
+void PreviewSession::existingCurrentPage()
+{
+    if (canvas_.document().hasPage(canvas_.document().currentPage))
+        return;
+    const auto page = showsPageWindow(canvas_.view())
+        ? std::optional<int>(std::max<int>(0, canvas_.WindowMinPage()))
+        : pageInView(canvas_.view(), canvas_.facts());
+    if (page)
+        canvas_.setCurrentpage(narrowToInt16(*page + 1));
+}
+
 void PreviewSession::showFirst()
 {
     canvas_.setCurrentpage(1);
@@ -192,6 +249,7 @@ void PreviewSession::showFirst()
 
 void PreviewSession::showPrevious()
 {
+    existingCurrentPage();
     if (canvas_.Currentpage() == 1)
         return;
     canvas_.setCurrentpage(narrowToInt16(std::int64_t { canvas_.Currentpage() } - 1));
@@ -205,6 +263,7 @@ void PreviewSession::showPrevious()
 
 void PreviewSession::showNext()
 {
+    existingCurrentPage();
     canvas_.setCurrentpage(narrowToInt16(std::int64_t { canvas_.Currentpage() } + 1));
     updatePosition();
     const std::int16_t pages = canvas_.WindowPages();
@@ -237,6 +296,8 @@ void PreviewSession::showManyPages()
     leaveWindow();
     canvas_.setMouse();
     canvas_.showAllPage();
+    centre();
+    noteFit(Fit::LargerRatio);
 }
 
 void PreviewSession::showWindow(std::int16_t pages, int firstPage, int lastPage)
@@ -244,6 +305,8 @@ void PreviewSession::showWindow(std::int16_t pages, int firstPage, int lastPage)
     canvas_.SetShowStyle(pages, narrowToInt16(firstPage), narrowToInt16(lastPage));
     updatePosition();
     canvas_.showMuliPage(pages);
+    centre();
+    noteFit(Fit::LargerRatio);
 }
 
 void PreviewSession::leaveWindow()
@@ -255,8 +318,13 @@ void PreviewSession::leaveWindow()
 void PreviewSession::chooseScale(TextView text)
 {
     quietly([&] {
-        canvas_.setDispScale(toSingle(leadingNumber(text) / 100));
-        state_.scale = text; // a scale that is refused leaves the one in force
+        const float scale = scaleOf(text);
+        if (scale != 0)
+            askForCentring();
+        canvas_.setDispScale(scale);
+        showView();
+        if (isScaleEntry(text))
+            state_.scale = text;
     });
 }
 
@@ -268,18 +336,152 @@ void PreviewSession::choosePage(TextView text)
     quietly([&] {
         const std::size_t point = entry.find(u'.');
         const TextView number = point == TextView::npos ? entry : entry.substr(point + 1);
-        canvas_.setCurrentpage(roundToInt16(leadingNumber(number)));
-        updatePosition();
+        const std::int16_t page = roundToInt16(leadingNumber(number));
+        if (page > 0 && page <= canvas_.Totalpages())
+            askForCentring();
+        canvas_.setCurrentpage(page);
         canvas_.showPage();
+        showView();
     });
+}
+
+void PreviewSession::read(ReadingWay way)
+{
+    quietly([&] {
+        if (!readWithinPages(canvas_, way))
+            turn(way);
+    });
+}
+
+/// Turns what is in view: the window of pages, or the page that stands alone. All pages at once
+/// have nothing behind them.
+void PreviewSession::turn(ReadingWay way)
+{
+    const bool isOn = way == ReadingWay::On;
+    const bool isWindow = showsPageWindow(canvas_.view());
+    takePosition(isWindow);
+    if (!(isOn ? state_.next : state_.previous) || (canvas_.view().multiPage && !isWindow))
+        return;
+    canvas_.setMouse();
+    askForCentring();
+    if (!isWindow) {
+        existingCurrentPage();
+        showAlone(canvas_.Currentpage() - 1 + (isOn ? 1 : -1));
+    } else {
+        // The window turns whatever page is current; one at the end would only raise a message.
+        const int current = canvas_.Currentpage();
+        canvas_.setCurrentpage(narrowToInt16(
+            std::clamp<int>(current, isOn ? 1 : 2, canvas_.Totalpages() - (isOn ? 1 : 0))));
+        isOn ? showNext() : showPrevious();
+    }
+    if (!isOn)
+        barsToEnd(canvas_);
+}
+
+void PreviewSession::showAlone(int page)
+{
+    canvas_.setCurrentpage(narrowToInt16(page + 1));
+    canvas_.showPage();
+    showView();
+}
+
+void PreviewSession::fitPageWidth() { showFitted(Fit::Width); }
+
+void PreviewSession::fitPage() { showFitted(Fit::Both); }
+
+void PreviewSession::showFitted(Fit fit)
+{
+    quietly([&] {
+        askForCentring();
+        existingCurrentPage();
+        canvas_.SetShowStyle(0, 0, 0);
+        canvas_.showPage();
+        setFittingScale(fit);
+        showView();
+    });
+}
+
+/// The larger ratio is the one that the arrangement in force is fitted by.
+void PreviewSession::setFittingScale(Fit fit)
+{
+    const ViewState& view = canvas_.view();
+    const PageFacts facts = canvas_.facts();
+    float divisor = 0;
+    if (fit == Fit::LargerRatio) {
+        divisor = fittingDivisor(view.viewportWidth, view.viewportHeight, view.grid, facts);
+        if (divisor < 0)
+            return; // the viewport has no room at all
+    } else {
+        divisor = divisorFor(static_cast<double>(facts.myWidth) + PageGap, view.viewportWidth);
+        if (fit == Fit::Both)
+            divisor = std::max(divisor,
+                divisorFor(static_cast<double>(facts.myHeight) + PageGap, view.viewportHeight));
+        divisor = std::clamp(
+            divisor, static_cast<float>(1 / LargestScale), static_cast<float>(1 / SmallestScale));
+    }
+    canvas_.setReSetLeftTop(true);
+    canvas_.setDispScale(1 / divisor);
+    noteFit(fit);
+}
+
+void PreviewSession::noteFit(Fit fit)
+{
+    fit_ = fit;
+    fitDivisor_ = canvas_.DispScale();
+}
+
+void PreviewSession::viewportChanged()
+{
+    quietly([&] {
+        if (fit_ != Fit::None && fitDivisor_ == canvas_.DispScale()) {
+            barsToStart(canvas_);
+            setFittingScale(fit_);
+        } else {
+            canvas_.bringIntoStep();
+        }
+        showView();
+    });
+}
+
+std::optional<int> PreviewSession::showPage(int page)
+{
+    std::optional<int> surface;
+    quietly([&] {
+        const ViewState& view = canvas_.view();
+        if (page < 0 || page >= canvas_.Totalpages() || !canvas_.document().hasPage(page))
+            return;
+        surface = 0;
+        if (view.multiPage && !showsPageWindow(view)) {
+            surface = page;
+        } else if (showsPageWindow(view)) {
+            const int first = std::max<int>(0, view.window.MinPage);
+            const int pages = view.window.nPages;
+            surface = (page - first) % pages;
+            if (page >= first && page < first + pages)
+                return;
+            surface = page % pages;
+            askForCentring();
+            canvas_.setCurrentpage(narrowToInt16(page + 1));
+            showWindow(view.window.nPages, page - *surface, page - *surface + pages - 1);
+        } else if (pageInView(view, canvas_.facts()) != page) {
+            askForCentring();
+            showAlone(page);
+        }
+    });
+    return surface;
 }
 
 void PreviewSession::refresh(bool rebuild)
 {
-    if (rebuild)
-        canvas_.doPreview(keptGrid());
-    else
+    if (!rebuild) {
         canvas_.OnDraw();
+        return refreshNavigation();
+    }
+    AutomationObject& grid = keptGrid();
+    askForCentring();
+    host_.beforeBuild(grid);
+    canvas_.doPreview(grid);
+    centre();
     refreshNavigation();
 }
 
@@ -299,44 +501,79 @@ AutomationObject& PreviewSession::keptGrid() const
 
 /// First and previous are enabled behind page 1, next and last before the last page; in a window of
 /// pages its first and last page count.
-void PreviewSession::takePosition()
+void PreviewSession::takePosition(bool isWindow)
 {
     const int total = canvas_.Totalpages();
-    const int current = canvas_.Currentpage() - 1;
-    const int pages = canvas_.WindowPages();
-    const bool window = pages > 0;
-    state_.first = state_.previous = (window ? canvas_.WindowMinPage() : current) > 0;
-    state_.next = state_.last = (window ? canvas_.WindowMaxPage() : current) < total - 1;
-    if (window) {
+    const int current
+        = pageInView(canvas_.view(), canvas_.facts()).value_or(canvas_.document().currentPage);
+    state_.first = state_.previous = (isWindow ? canvas_.WindowMinPage() : current) > 0;
+    state_.next = state_.last = (isWindow ? canvas_.WindowMaxPage() : current) < total - 1;
+    if (isWindow) {
         const int first = std::max<int>(0, canvas_.WindowMinPage());
-        const int last = std::max(first, std::min(total, first + pages) - 1);
+        const int last = std::max(first, std::min(total, first + canvas_.WindowPages()) - 1);
         state_.pageBox = pageBoxText(first + 1, last + 1);
     } else {
         state_.pageBox = pageBoxText(current + 1);
     }
 }
 
+/// Before an arrangement is shown: a window of pages that was set counts as shown already.
 void PreviewSession::updatePosition()
 {
-    takePosition();
+    takePosition(canvas_.WindowPages() > 0);
     host_.navigationChanged();
+}
+
+/// A text that was picked stays as long as its scale is in force.
+void PreviewSession::takeScale()
+{
+    if (scaleDivisor_ == canvas_.DispScale())
+        return;
+    scaleDivisor_ = canvas_.DispScale();
+    state_.scale = scaleText(scaleDivisor_);
 }
 
 void PreviewSession::showScale()
 {
-    state_.scale = scaleText(canvas_.DispScale());
+    scaleDivisor_ = canvas_.DispScale();
+    state_.scale = scaleText(scaleDivisor_);
     host_.navigationChanged();
+}
+
+void PreviewSession::takeEntries()
+{
+    state_.pageEntries = canvas_.Totalpages();
+    state_.countLabel = pageCountLabel(canvas_.Totalpages());
+}
+
+/// Shows what is in view, when that is not shown already.
+void PreviewSession::showView()
+{
+    const NavigationState before = state_;
+    takePosition(showsPageWindow(canvas_.view()));
+    takeScale();
+    takeEntries();
+    if (state_ != before)
+        host_.navigationChanged();
+}
+
+/// A command shows its end itself, and a build shows nothing of what it makes.
+void PreviewSession::viewChanged()
+{
+    if (commands_ > 0 || canvas_.isBuilding())
+        return;
+    standsAsOnPageOne_ = false;
+    showView();
 }
 
 /// The four tools stand as on page 1, whatever page is current.
 void PreviewSession::refreshNavigation()
 {
-    takePosition();
-    const int total = canvas_.Totalpages();
+    takePosition(showsPageWindow(canvas_.view()));
+    takeEntries();
     state_.first = state_.previous = false;
-    state_.next = state_.last = total >= 2;
-    state_.pageEntries = total;
-    state_.countLabel = pageCountLabel(total);
+    state_.next = state_.last = canvas_.Totalpages() >= 2;
+    standsAsOnPageOne_ = true;
     showScale();
 }
 

@@ -3,17 +3,19 @@
 
 #pragma once
 
+#include "controls/canvas.h"
 #include "platform/text.h"
+#include "ui/page_reading.h"
 
 #include <array>
 #include <cstdint>
 #include <filesystem>
 #include <functional>
+#include <optional>
 
 namespace pelloric {
 
 class AutomationObject;
-class Canvas;
 enum class PrintObjKind : std::int16_t;
 enum class ToolAction;
 
@@ -44,6 +46,9 @@ public:
     /// Releases the toolbar and closes the window; the canvas is cleared by then.
     virtual void unload() = 0;
 
+    /// A kept grid is about to be read: its owner may bring it up to date.
+    virtual void beforeBuild(AutomationObject&) { }
+
     /// The session's `state()` is another now: the window applies it without raising changes.
     virtual void navigationChanged() = 0;
 };
@@ -65,16 +70,22 @@ struct NavigationState {
 /// The kind of grid that an object is, found by asking for its members.
 PrintObjKind gridKindOf(AutomationObject& grid);
 
-/// What the preview window's tools do with its canvas.
+/// What the preview window's tools do with its canvas, and what its boxes show of it.
+///
+/// The state follows every change of the view, the canvas's own and a host's among them: page box
+/// and tools tell of the page or window in view, the scale box of the scale in force.
 ///
 /// Commands and combo changes run under one error trap: an error ends the command quietly. While
 /// the canvas builds pages, which lets messages run, every command is refused without a word.
-class PreviewSession {
+class PreviewSession : private CanvasObserver {
 public:
     /// Lets the canvas paint from now on.
     /// @param canvas  outlives the session
     /// @param host    outlives the session
     PreviewSession(Canvas& canvas, PreviewHost& host);
+    ~PreviewSession() override;
+    PreviewSession(const PreviewSession&) = delete;
+    PreviewSession& operator=(const PreviewSession&) = delete;
 
     const NavigationState& state() const { return state_; }
 
@@ -93,11 +104,34 @@ public:
     void click(int id);
 
     /// The scale combo has a text that was picked or entered: "   150 %".
+    ///
+    /// A scale is held between 1 % and 6400 %, and the pages are centred; 0 changes nothing.
     void chooseScale(TextView text);
 
     /// The page combo has a text that was picked or entered: "   NO. 5"; one that begins with "【"
     /// is ignored.
     void choosePage(TextView text);
+
+    /// Brings the bars to their start and has what is shown next centred.
+    void askForCentring();
+
+    /// Reads on or back by what the viewport shows; at the end of what is shown the page turns, or
+    /// the window of pages, and shows its beginning, or its end.
+    void read(ReadingWay way);
+
+    /// Shows one page, all of its width.
+    void fitPageWidth();
+    /// Shows one page, all of it.
+    void fitPage();
+
+    /// The viewport has another size: pages that were fitted are fitted again, and bars and pages
+    /// are brought into step.
+    void viewportChanged();
+
+    /// Shows a page: alone, or in the window or among the pages that are shown at present.
+    /// @param page  zero-based
+    /// @return      the surface that shows it, or nothing where there is no such page
+    std::optional<int> showPage(int page);
 
     /// Builds again from the kept grid, or else takes the layout anew; then the navigation.
     /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build
@@ -112,10 +146,18 @@ public:
     void print(bool allPages, TextView pageList, std::int16_t copies);
 
 private:
+    /// Which scale the pages follow while the viewport's size changes.
+    enum class Fit { None, LargerRatio, Width, Both };
+
+    void viewChanged() override;
+    void progressChanged() override { }
+
     void quietly(const std::function<void()>& command);
     void dispatch(ToolAction action);
     AutomationObject& keptGrid() const;
 
+    void centre();
+    void existingCurrentPage();
     void showFirst();
     void showPrevious();
     void showNext();
@@ -123,18 +165,31 @@ private:
     void showManyPages();
     void showWindow(std::int16_t pages, int firstPage, int lastPage);
     void leaveWindow();
+    void turn(ReadingWay way);
+    void showAlone(int page);
+    void showFitted(Fit fit);
+    void setFittingScale(Fit fit);
+    void noteFit(Fit fit);
     void afterDialog(DialogEnd end);
     void openFile();
 
-    void takePosition();
+    void takePosition(bool isWindow);
     void updatePosition();
+    void takeScale();
     void showScale();
+    void showView();
+    void takeEntries();
     void refreshNavigation();
 
     Canvas& canvas_;
     PreviewHost& host_;
     AutomationObject* grid_ = nullptr;
     NavigationState state_;
+    float scaleDivisor_ = 1; ///< that the text of the scale combo stands for
+    Fit fit_ = Fit::None;
+    float fitDivisor_ = 1; ///< that the fit gave: another one has ended it
+    int commands_ = 0; ///< that have not ended
+    bool standsAsOnPageOne_ = false; ///< the four tools do, until the view changes
 };
 
 } // namespace pelloric

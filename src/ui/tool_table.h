@@ -86,7 +86,7 @@ inline constexpr auto PreviewTools = std::to_array<PreviewTool>({
     { 9, u"tool9", u" Show More Pages", ToolKind::Button, true, ToolAction::ManyPages,
         ToolGroup::Arrangement, u"Ctrl+6", u"more-pages" },
     { 10, u"tool10", u"Show One Page", ToolKind::Button, true, ToolAction::OnePage,
-        ToolGroup::Arrangement, u"Ctrl+1", u"one-page" },
+        ToolGroup::Arrangement, u"Alt+1", u"one-page" },
     { 11, u"tool11", u"Move Smoth", ToolKind::Button, true, ToolAction::Pan, ToolGroup::Zoom,
         u"Ctrl+M", u"hand" },
     { 12, u"tool12", u"Print", ToolKind::Button, true, ToolAction::ShowPrintOptions,
@@ -96,7 +96,7 @@ inline constexpr auto PreviewTools = std::to_array<PreviewTool>({
     { 15, u"tool15", u" Show Whole Page", ToolKind::Button, true, ToolAction::WholePage,
         ToolGroup::Arrangement, u"Ctrl+0", u"whole-page" },
     { 16, u"tool15", u"Show Two Page", ToolKind::Button, true, ToolAction::TwoPages,
-        ToolGroup::Arrangement, u"Ctrl+2", u"two-pages" },
+        ToolGroup::Arrangement, u"Alt+2", u"two-pages" },
     { 16, u"cmbScala", u"Show Scala", ToolKind::Combo, true, ToolAction::ChooseScale,
         ToolGroup::Zoom, u"Ctrl+L", u"" },
     { 15, u"Page NO.", u"Page NO.", ToolKind::Combo, true, ToolAction::ChoosePage, ToolGroup::Pages,
@@ -106,7 +106,7 @@ inline constexpr auto PreviewTools = std::to_array<PreviewTool>({
     { 18, u"tool15", u"Show Four Page", ToolKind::Button, true, ToolAction::FourPages,
         ToolGroup::Arrangement, u"Ctrl+4", u"four-pages" },
     { 19, u"toolAbout", u"About", ToolKind::Button, true, ToolAction::ShowAbout, ToolGroup::Window,
-        u"F1", u"about" },
+        u"Shift+F1", u"about" },
     { 20, u"OpenFile", u"Open File", ToolKind::Button, true, ToolAction::OpenFile, ToolGroup::File,
         u"Ctrl+O", u"open" },
     { 21, u"SaveFile", u"Save File", ToolKind::Button, true, ToolAction::SaveFile, ToolGroup::File,
@@ -141,6 +141,10 @@ inline constexpr TextView InitialFileFolder = u"C:\\";
 #else
 inline constexpr TextView InitialFileFolder = u"/";
 #endif
+
+/// What a scale is held between where people choose one; 1 is 100 %.
+inline constexpr double SmallestScale = 0.01;
+inline constexpr double LargestScale = 64;
 
 /// What the scale combo shows before anything was zoomed.
 inline constexpr TextView InitialScaleText = u"   100 %";

@@ -123,6 +123,15 @@ void scroll(Twips& offset, std::int16_t& previous, ScrollBar& bar, std::int32_t 
     bar.value = now;
 }
 
+/// Unlike a scroll it takes a position between two steps, too.
+void moveAlong(Twips& offset, std::int16_t& previous, ScrollBar& bar, Twips wanted)
+{
+    const Twips farthest = StartOffset - Twips { bar.maximum } * ScrollStep;
+    offset = std::clamp(wanted, farthest, StartOffset);
+    previous = roundToInt16(static_cast<double>(StartOffset - offset) / ScrollStep);
+    bar.value = previous;
+}
+
 std::optional<int> existing(const PageFacts& facts, int page)
 {
     if (page < 0 || page >= facts.pageCount)
@@ -157,6 +166,12 @@ std::optional<int> pageOnSurface(const ViewState& view, const PageFacts& facts, 
     }
     const bool alone = !view.multiPage || view.surfaces.size() == 1;
     return existing(facts, alone ? facts.currentPage : surface);
+}
+
+std::optional<int> pageInView(const ViewState& view, const PageFacts& facts)
+{
+    const std::optional<int> current = existing(facts, facts.currentPage);
+    return current ? current : existing(facts, view.shownPage);
 }
 
 std::vector<int> surfacesInView(const ViewState& view, const PageFacts& facts)
@@ -199,6 +214,7 @@ void showPage(ViewState& view, const PageFacts& facts)
     view.style = OrderStyle::One;
     if (!existing(facts, facts.currentPage))
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    view.shownPage = facts.currentPage;
     endArrangement(view);
     view.baseVisible = true;
     if (view.grid != PageGrid {})
@@ -294,6 +310,37 @@ void setVbar(ViewState& view, const PageFacts& facts, std::int32_t value)
 {
     scroll(view.offset.y, view.previousVbar, view.Vbar, value);
     placeSurfaces(view, facts);
+}
+
+void movePages(ViewState& view, const PageFacts& facts, Tpoint first)
+{
+    if (view.Hbar.enabled)
+        moveAlong(view.offset.x, view.previousHbar, view.Hbar, first.x);
+    if (view.Vbar.enabled)
+        moveAlong(view.offset.y, view.previousVbar, view.Vbar, first.y);
+    placeSurfaces(view, facts);
+}
+
+void bringIntoStep(ViewState& view, const PageFacts& facts)
+{
+    const Tpoint wanted = view.offset;
+    view.previousHbar = view.previousVbar = 0;
+    view.ReSetLeftTop = true;
+    layOutAgain(view, facts);
+    movePages(view, facts, wanted);
+}
+
+void zoomAbout(ViewState& view, const PageFacts& facts, float scale, double x, double y)
+{
+    const double before = view.divisor;
+    const double pageX = x * before - view.offset.x;
+    const double pageY = y * before - view.offset.y;
+    view.previousHbar = view.previousVbar = 0;
+    view.ReSetLeftTop = true;
+    setDispScale(view, facts, scale);
+    const double divisor = view.divisor;
+    movePages(
+        view, facts, { roundToInt32(x * divisor - pageX), roundToInt32(y * divisor - pageY) });
 }
 
 void pan(ViewState& view) { view.pan = true; }

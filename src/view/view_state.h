@@ -52,6 +52,7 @@ struct ViewState {
     std::vector<Tpoint> surfaces { { StartOffset, StartOffset } }; ///< page twips; never empty
     bool baseVisible = false; ///< surface 0 is shown and the start-up icon is hidden
     bool portrait = true; ///< orientation flag
+    int shownPage = 0; ///< zero-based; the page that was shown alone last
 };
 
 /// The page that a paint of a surface shows.
@@ -61,6 +62,11 @@ struct ViewState {
 /// @param surface  from 0
 /// @return         zero-based, or nothing where the surface stays blank
 std::optional<int> pageOnSurface(const ViewState& view, const PageFacts& facts, int surface);
+
+/// The page that stands alone in the viewport, or would without an arrangement: the current one,
+/// and where that names no page the one that was shown last.
+/// @return  zero-based, or nothing where neither exists
+std::optional<int> pageInView(const ViewState& view, const PageFacts& facts);
 
 /// Whether a paint shows texts as stored, "[Pages]" included: true in a page window.
 bool showsPageWindow(const ViewState& view);
@@ -141,6 +147,25 @@ void setHbar(ViewState& view, const PageFacts& facts, std::int32_t value);
 /// @param value  not clamped to the bar's range
 /// @throws RunTimeError Overflow: value past 16 bits or position past 32; nothing has changed
 void setVbar(ViewState& view, const PageFacts& facts, std::int32_t value);
+
+/// Moves the pages to a position where bars are enabled, as far as these reach.
+///
+/// Each bar takes its nearest step, so that page and bar are at most half a step apart.
+/// @param first  of surface 0: page twips
+void movePages(ViewState& view, const PageFacts& facts, Tpoint first);
+
+/// Brings pages and bars into step after a drag, or after the viewport has become another.
+///
+/// Where no bar is needed the pages are centred, elsewhere they stay as far as the bar reaches.
+/// @throws RunTimeError as `layOutAgain`
+void bringIntoStep(ViewState& view, const PageFacts& facts);
+
+/// Shows another scale; the part of a page under a point of the viewport stays there as far as the
+/// bars reach, and where no bar is needed the pages are centred.
+/// @param scale  not 0
+/// @param x, y   screen twips from the viewport's corner
+/// @throws RunTimeError as `setDispScale`
+void zoomAbout(ViewState& view, const PageFacts& facts, float scale, double x, double y);
 
 /// Enters pan mode.
 void pan(ViewState& view);

@@ -25,7 +25,7 @@ public:
     explicit Observer(Canvas& canvas)
         : canvas_(canvas)
     {
-        canvas.observe(this);
+        canvas.observe(*this);
     }
 
     void viewChanged() override

@@ -9,6 +9,7 @@
 #include "grids/table_grid.h"
 #include "settings/default_settings.h"
 #include "support/errors.h"
+#include "ui/tool_table.h"
 
 #include <gtest/gtest.h>
 
@@ -246,7 +247,7 @@ TEST(PreviewNavigation, SetsTheScaleThatWasChosen)
     EXPECT_EQ(fixture.canvas.DispScale(), 4.0F);
     fixture.session().chooseScale(u"   200 %");
     EXPECT_EQ(fixture.canvas.DispScale(), 0.5F);
-    for (const TextView text : { u"0", u"abc", u"1e300", u"" }) {
+    for (const TextView text : { u"0", u"abc", u"" }) {
         fixture.session().chooseScale(text);
         EXPECT_EQ(fixture.canvas.DispScale(), 0.5F);
         EXPECT_EQ(fixture.session().state().scale, u"   200 %"); // the one in force
@@ -362,6 +363,229 @@ TEST(PreviewNavigation, FindsTheKindOfAGridByItsMembers)
     EXPECT_EQ(gridKindOf(list), PrintObjKind::ListView);
     for (NamedObject* const object : { &uncounted, &empty, &data })
         EXPECT_EQ(gridKindOf(*object), PrintObjKind::datagrid);
+}
+
+TEST(PreviewNavigation, HoldsAScaleBetweenOneAndSixThousandFourHundredPercent)
+{
+    struct Case {
+        TextView text;
+        float divisor;
+        TextView shown;
+    };
+    const Case cases[] = {
+        { u"0.5", 100, u"1%" },
+        { u"-50", 100, u"1%" },
+        { u"1", 100, u"1%" },
+        { u"33.333", 1 / 0.33333F, u"33.333%" },
+        { u"6400", 1 / 64.0F, u"6400%" },
+        { u"99999 %", 1 / 64.0F, u"6400%" },
+        { u"1e300", 1 / 64.0F, u"6400%" },
+    };
+    for (const Case& row : cases) {
+        Fixture fixture(1);
+        fixture.session().chooseScale(row.text);
+        EXPECT_FLOAT_EQ(fixture.canvas.DispScale(), row.divisor) << toUtf8(row.text);
+        EXPECT_EQ(fixture.session().state().scale, row.shown);
+    }
+}
+
+TEST(PreviewNavigation, CentresAtAChosenScaleAndKeepsAPageInSight)
+{
+    Fixture fixture(1);
+    fixture.session();
+    fixture.canvas.setViewport(6000, 6000);
+    fixture.canvas.showPage();
+    fixture.canvas.OnDraw();
+    fixture.canvas.setVbar(100);
+    fixture.session().chooseScale(u"   25 %");
+    EXPECT_EQ(fixture.canvas.view().offset, (Tpoint { 5946, 3480 }));
+    for (const TextView scale : { u"6400", u"1", u"500", u"10", u"6400" }) {
+        fixture.canvas.setVbar(fixture.canvas.view().Vbar.maximum);
+        fixture.session().chooseScale(scale);
+        EXPECT_FALSE(surfacesInView(fixture.canvas.view(), fixture.canvas.facts()).empty())
+            << toUtf8(scale);
+    }
+}
+
+TEST(PreviewNavigation, ShowsThePageThatWasPickedFromAWindowOfPages)
+{
+    Fixture fixture(9);
+    fixture.click({ 16 });
+    fixture.session().choosePage(u"   NO. 5");
+    EXPECT_EQ(fixture.position(), "5 (2,0,1) ++++ NO. 5");
+    fixture.click({ 7 });
+    EXPECT_EQ(fixture.position(), "6 (2,2,3) ++++ 【3-4】");
+    fixture.session().choosePage(u"   NO. 9");
+    EXPECT_EQ(fixture.position(), "9 (2,2,3) ++-- NO. 9");
+    fixture.session().choosePage(u"   NO. 1");
+    EXPECT_EQ(fixture.position(), "1 (2,2,3) --++ NO. 1");
+}
+
+TEST(PreviewNavigation, KeepsThePageInViewAfterANumberOfNoPage)
+{
+    struct Case {
+        TextView text;
+        std::int16_t current;
+    };
+    for (const Case& row : { Case { u"0", 0 }, { u"abc", 0 }, { u"NO. -3", -3 } }) {
+        Fixture fixture(9);
+        PreviewSession& session = fixture.session();
+        fixture.click({ 7, 7 });
+        session.choosePage(row.text);
+        EXPECT_EQ(fixture.canvas.Currentpage(), row.current);
+        EXPECT_EQ(toUtf8(session.state().pageBox), "NO. 3");
+        EXPECT_TRUE(session.state().previous);
+        fixture.click({ 7 });
+        EXPECT_EQ(fixture.position(), "4 (0,0,0) ++++ NO. 4");
+        session.choosePage(row.text);
+        fixture.click({ 6 });
+        EXPECT_EQ(fixture.position(), "3 (0,0,0) ++++ NO. 3");
+    }
+}
+
+TEST(PreviewNavigation, TellsOfWhatAHostDoesWithTheCanvas)
+{
+    Fixture fixture(9);
+    PreviewSession& session = fixture.session();
+    fixture.canvas.setDispScale(0.3F);
+    EXPECT_EQ(toUtf8(session.state().scale), "30%");
+    EXPECT_EQ(fixture.host.changes, 1);
+    fixture.canvas.setCurrentpage(9);
+    EXPECT_EQ(fixture.position(), "9 (0,0,0) ++-- NO. 9");
+    fixture.canvas.SetShowStyle(2, 2, 3);
+    fixture.canvas.showMuliPage(2);
+    EXPECT_EQ(fixture.position(), "9 (2,2,3) ++++ 【3-4】");
+    EXPECT_EQ(session.state().scale, scaleText(fixture.canvas.DispScale()));
+    fixture.canvas.clear();
+    EXPECT_EQ(toUtf8(session.state().countLabel), " 【共 1 页】");
+}
+
+TEST(PreviewNavigation, ShowsTheScaleThatAnArrangementWasFittedTo)
+{
+    Fixture fixture(9);
+    for (const int tool : { 15, 16, 18, 9 }) {
+        fixture.click({ tool });
+        EXPECT_EQ(fixture.session().state().scale, scaleText(fixture.canvas.DispScale())) << tool;
+    }
+}
+
+TEST(PreviewNavigation, BringsTheBarsToTheirStartBeforeAToolCentres)
+{
+    for (const int tool : { 11, 10, 3, 7, 19 }) {
+        Fixture fixture(2);
+        fixture.session();
+        fixture.canvas.setViewport(6000, 6000);
+        fixture.canvas.showPage();
+        fixture.canvas.OnDraw();
+        fixture.canvas.setVbar(60);
+        fixture.canvas.setHbar(30);
+        fixture.click({ tool });
+        fixture.canvas.showPage(); // as a paint does
+        const ViewState& view = fixture.canvas.view();
+        EXPECT_EQ(view.Vbar.value, 0) << tool;
+        EXPECT_EQ(view.Hbar.value, 0) << tool;
+        EXPECT_EQ(view.offset, (Tpoint { 100, 100 })) << tool;
+    }
+}
+
+TEST(PreviewNavigation, ReadsFromPageToPage)
+{
+    Fixture fixture(3);
+    PreviewSession& session = fixture.session();
+    fixture.canvas.setViewport(20000, 10000);
+    fixture.canvas.showPage();
+    fixture.canvas.OnDraw();
+    const auto place = [&] {
+        return fixture.position().substr(0, 1) + ":"
+            + std::to_string(fixture.canvas.view().Vbar.value);
+    };
+    std::vector<std::string> seen;
+    for (int press = 0; press < 9; ++press) {
+        session.read(ReadingWay::On);
+        seen.push_back(place());
+    }
+    EXPECT_EQ(seen,
+        (std::vector<std::string> {
+            "1:42", "1:72", "2:0", "2:42", "2:72", "3:0", "3:42", "3:72", "3:72" }));
+    seen.clear();
+    for (int press = 0; press < 9; ++press) {
+        session.read(ReadingWay::Back);
+        seen.push_back(place());
+    }
+    EXPECT_EQ(seen,
+        (std::vector<std::string> {
+            "3:30", "3:0", "2:72", "2:30", "2:0", "1:72", "1:30", "1:0", "1:0" }));
+}
+
+TEST(PreviewNavigation, ReadsOnFromAPageThatWasPickedFromAWindow)
+{
+    Fixture fixture(9);
+    fixture.click({ 16 });
+    fixture.session().choosePage(u"5");
+    fixture.canvas.setViewport(30000, 30000);
+    fixture.canvas.OnDraw();
+    fixture.session().read(ReadingWay::On);
+    EXPECT_EQ(fixture.position(), "6 (2,0,1) ++++ NO. 6");
+}
+
+TEST(PreviewNavigation, ReadsWindowsOfPagesWithoutAMessageAtTheLastPage)
+{
+    Fixture fixture(6);
+    fixture.canvas.setCurrentpage(6);
+    fixture.session();
+    fixture.canvas.setViewport(100000, 10000);
+    fixture.canvas.SetShowStyle(2, 0, 1);
+    fixture.canvas.showMuliPage(2);
+    fixture.canvas.setDispScale(0.1F);
+    fixture.session().read(ReadingWay::On);
+    EXPECT_EQ(fixture.position(), "6 (2,2,3) ++++ 【3-4】");
+}
+
+TEST(PreviewNavigation, FitsAPageAndKeepsItFittedInAnotherViewport)
+{
+    Fixture fixture(2);
+    PreviewSession& session = fixture.session();
+    fixture.canvas.setViewport(20000, 10000);
+    session.fitPageWidth();
+    EXPECT_NEAR(fixture.canvas.DispScale(), 12107 / 20000.0, 1e-5);
+    EXPECT_FALSE(fixture.canvas.view().Hbar.enabled);
+    session.fitPage();
+    EXPECT_NEAR(fixture.canvas.DispScale(), 17040 / 10000.0, 1e-5);
+    EXPECT_FALSE(fixture.canvas.view().Vbar.enabled);
+    fixture.canvas.setViewport(20000, 8520);
+    session.viewportChanged();
+    EXPECT_NEAR(fixture.canvas.DispScale(), 2, 1e-5);
+    EXPECT_EQ(session.state().scale, scaleText(fixture.canvas.DispScale()));
+    fixture.click({ 3 });
+    fixture.canvas.setViewport(20000, 10000);
+    session.viewportChanged();
+    EXPECT_NEAR(fixture.canvas.DispScale(), 1, 1e-5); // a zoom has ended the fit
+}
+
+TEST(PreviewNavigation, CentresANewReport)
+{
+    Fixture fixture(1);
+    deployDefaultSettings(fixture.platform.services());
+    TableGrid grid({ { u"a", 1000 } });
+    grid.addRow(std::vector<TextView> { u"1" });
+    fixture.canvas.setViewport(30000, 30000);
+    fixture.session().open(grid);
+    EXPECT_EQ(fixture.canvas.view().offset, (Tpoint { 8946, 6480 }));
+}
+
+TEST(PreviewNavigation, GoesToAPageInWhateverIsShown)
+{
+    Fixture fixture(21);
+    PreviewSession& session = fixture.session();
+    EXPECT_EQ(session.showPage(4), 0);
+    EXPECT_EQ(fixture.position(), "5 (0,0,0) ++++ NO. 5");
+    fixture.click({ 18 });
+    EXPECT_EQ(session.showPage(6), 2);
+    EXPECT_EQ(toUtf8(session.state().pageBox), "【5-8】");
+    EXPECT_EQ(session.showPage(13), 1);
+    EXPECT_EQ(toUtf8(session.state().pageBox), "【13-16】");
+    EXPECT_EQ(session.showPage(21), std::nullopt);
+    EXPECT_EQ(session.showPage(-1), std::nullopt);
 }
 
 } // namespace pelloric

@@ -8,6 +8,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <limits>
 
 namespace pelloric {
@@ -398,6 +399,70 @@ TEST_F(ViewTest, KnowsWhichOfManySurfacesAreSeen)
     EXPECT_FALSE(seen.empty());
     EXPECT_LT(seen.size(), 32767U);
     EXPECT_EQ(seen.front(), 0);
+}
+
+TEST_F(ViewTest, MovesPagesToAnyPositionThatABarReaches)
+{
+    setViewport(20000, 10000); // the vertical bar reaches to 72
+    layOutAgain(view, facts);
+    movePages(view, facts, { 5000, -2349 });
+    EXPECT_EQ(view.surfaces, (Surfaces { { 100, -2349 } }));
+    EXPECT_EQ(view.Vbar.value, 24);
+    EXPECT_EQ(view.previousVbar, 24);
+    movePages(view, facts, { 0, 800 });
+    EXPECT_EQ(view.offset.y, 100);
+    movePages(view, facts, { 0, -99999 });
+    EXPECT_EQ(view.offset.y, -7100);
+    EXPECT_EQ(view.Vbar.value, 72);
+}
+
+TEST_F(ViewTest, BringsPagesBackThatAnotherViewportHasLeftOutOfSight)
+{
+    setViewport(5000, 6000);
+    layOutAgain(view, facts);
+    setVbar(view, facts, 112);
+    setViewport(20000, 16000);
+    layOutAgain(view, facts);
+    bringIntoStep(view, facts);
+    EXPECT_EQ(view.Vbar, (ScrollBar { true, 12, 12, 11, 1 }));
+    EXPECT_EQ(view.surfaces, (Surfaces { { 3946, -1100 } })); // centred where there is no bar
+    setViewport(20000, 30000);
+    layOutAgain(view, facts);
+    EXPECT_EQ(view.offset.y, -1100);
+    bringIntoStep(view, facts);
+    EXPECT_EQ(view.surfaces, (Surfaces { { 3946, 6480 } }));
+    EXPECT_FALSE(view.ReSetLeftTop);
+}
+
+TEST_F(ViewTest, KeepsThePartOfThePageUnderAPointWhenItZooms)
+{
+    setViewport(6000, 6000);
+    layOutAgain(view, facts);
+    setVbar(view, facts, 50);
+    setHbar(view, facts, 20);
+    const double x = 3000 * 1.0 - view.offset.x;
+    const double y = 2000 * 1.0 - view.offset.y;
+    zoomAbout(view, facts, 1.25F, 3000, 2000);
+    EXPECT_EQ(view.offset.x, std::nearbyint(3000 * 0.8 - x));
+    EXPECT_EQ(view.offset.y, std::nearbyint(2000 * 0.8 - y));
+    zoomAbout(view, facts, 0.2F, 3000, 2000);
+    EXPECT_EQ(view.offset, (Tpoint { 8946, 6480 })); // all of it is seen, and centred
+}
+
+TEST_F(ViewTest, KeepsThePageInViewWhileTheCurrentOneDoesNotExist)
+{
+    addPages(4);
+    facts.currentPage = 2;
+    showPage(view, facts);
+    EXPECT_EQ(pageInView(view, facts), 2);
+    facts.currentPage = -1;
+    showPage(view, facts);
+    EXPECT_EQ(pageInView(view, facts), 2);
+    facts.currentPage = 3;
+    EXPECT_EQ(pageInView(view, facts), 3);
+    facts.currentPage = -4;
+    facts.pageCount = 1;
+    EXPECT_EQ(pageInView(view, facts), std::nullopt);
 }
 
 } // namespace pelloric

@@ -107,10 +107,21 @@ const BackScreen::Page* BackScreen::pageAt(QPoint position) const
 
 void BackScreen::mouseMoveEvent(QMouseEvent* event)
 {
-    if (pressed_ || pageAt(event->position().toPoint()))
-        host_.mouseMoved();
-    else
+    const QPointF at = event->position();
+    if (pressed_) {
+        if (!host_.takesMouse(pressedSurface_, *event, at - *pressed_))
+            host_.mouseMoved();
+    } else if (const Page* const page = pageAt(at.toPoint())) {
+        if (!host_.takesMouse(page->surface, *event, at - cornerOf(*page)))
+            host_.mouseMoved();
+    } else {
         event->ignore();
+    }
+}
+
+QPointF BackScreen::cornerOf(const Page& page)
+{
+    return page.place.area.topLeft() + page.place.origin;
 }
 
 void BackScreen::mousePressEvent(QMouseEvent* event)
@@ -120,8 +131,11 @@ void BackScreen::mousePressEvent(QMouseEvent* event)
         event->ignore();
         return;
     }
-    pressed_ = page->place.area.topLeft() + page->place.origin;
-    host_.mousePressed(event->button(), event->position() - *pressed_);
+    pressed_ = cornerOf(*page);
+    pressedSurface_ = page->surface;
+    const QPointF at = event->position() - *pressed_;
+    if (!host_.takesMouse(pressedSurface_, *event, at))
+        host_.mousePressed(event->button(), at);
 }
 
 /// Belongs to the page of the press, wherever the pointer is by then.
@@ -134,7 +148,8 @@ void BackScreen::mouseReleaseEvent(QMouseEvent* event)
     const QPointF at = event->position() - *pressed_;
     if (event->buttons() == Qt::NoButton)
         pressed_.reset();
-    host_.mouseReleased(event->button(), at);
+    if (!host_.takesMouse(pressedSurface_, *event, at))
+        host_.mouseReleased(event->button(), at);
 }
 
 } // namespace pelloric::qt

@@ -55,10 +55,12 @@ protected:
 private:
     void paintPage(const Page& page, QPainter& painter, const QRect& exposed);
     const Page* pageAt(QPoint position) const;
+    static QPointF cornerOf(const Page& page);
 
     SurfaceHost& host_;
     std::vector<Page> pages_;
     std::optional<QPointF> pressed_; ///< the corner of the page that a button went down on: pixels
+    int pressedSurface_ = 0; ///< of that page
 };
 
 } // namespace pelloric::qt

@@ -5,12 +5,17 @@
 
 #include "controls/qt/hand_cursor.h"
 #include "controls/qt/member_calls.h"
+#include "controls/qt/page_guest.h"
 #include "controls/qt/progress_area.h"
 #include "controls/qt/start_icon.h"
 #include "platform/numbers.h"
+#include "platform/platform.h"
 #include "platform/qt/qt_drawing_surface.h"
+#include "platform/qt/qt_text.h"
 #include "view/page_renderer.h"
+#include "view/page_texts.h"
 
+#include <QAccessible>
 #include <QCursor>
 #include <QLabel>
 #include <QPainter>
@@ -37,8 +42,8 @@ constexpr std::size_t MostSurfaces = 64;
 
 constexpr double ZoomStep = 1.25; ///< of a wheel click
 
-constexpr double SmallestScale = 1.0 / 1024; ///< the wheel zooms no further out
-constexpr double LargestScale = 64; ///< the wheel zooms no further in
+constexpr double SmallestScale = 0.01; ///< wheel and pinch zoom no further out
+constexpr double LargestScale = 64; ///< wheel and pinch zoom no further in
 
 /// Reaches the pages of no document: a coordinate beyond all 32-bit twips has no meaning.
 Twips wholeTwips(double twips)
@@ -92,13 +97,6 @@ void showBar(QScrollBar& bar, const ScrollBar& state)
     bar.setValue(state.value);
 }
 
-/// The value of a bar that moves the pages by so much, kept within the bar.
-int barValueAfter(const ScrollBar& bar, std::int16_t previous, double moved)
-{
-    const double value = previous - moved / ScrollStep;
-    return static_cast<int>(std::nearbyint(std::clamp<double>(value, 0, bar.maximum)));
-}
-
 } // namespace
 
 CanvasAreas::CanvasAreas(QWidget& control, Canvas& canvas, QtFonts& fonts, RightButton rightButton)
@@ -125,10 +123,10 @@ CanvasAreas::CanvasAreas(QWidget& control, Canvas& canvas, QtFonts& fonts, Right
         [this](int value) { MemberCalls::endQuietly([&] { canvas_.setHbar(value); }); });
     QObject::connect(Vbar_, &QScrollBar::valueChanged, &control_,
         [this](int value) { MemberCalls::endQuietly([&] { canvas_.setVbar(value); }); });
-    canvas_.observe(this);
+    canvas_.observe(*this);
 }
 
-CanvasAreas::~CanvasAreas() { canvas_.observe(nullptr); }
+CanvasAreas::~CanvasAreas() { canvas_.forget(*this); }
 
 QScrollBar* CanvasAreas::makeBar(Qt::Orientation orientation, const char* name)
 {
@@ -175,6 +173,7 @@ void CanvasAreas::viewChanged()
     showBars();
     showCursor();
     showSurfaces();
+    tellReader();
 }
 
 void CanvasAreas::viewScrolled()
@@ -188,6 +187,7 @@ void CanvasAreas::viewScrolled()
     showBars();
     showCursor();
     scrollSurfaces();
+    tellReader();
 }
 
 void CanvasAreas::progressChanged() { progress_->showProgress(canvas_.progress()); }
@@ -347,13 +347,81 @@ void CanvasAreas::paintSurface(int surface, QPainter& painter, QPointF origin, c
     if (canvas_.strSCliectRect == u"small" || !hasScale())
         return;
     passPaintThroughShowPage();
-    const auto page = pageOnSurface(canvas_.view(), canvas_.facts(), surface);
+    const std::optional<int> page = pageShownOn(surface);
     if (!page)
         return;
     const QSizeF scale = pixelsPerTwip();
     painter.translate(origin);
     painter.scale(scale.width(), scale.height());
-    replay(*page, painter, painter.transform().inverted().mapRect(QRectF(exposed)));
+    const QRectF visible = painter.transform().inverted().mapRect(QRectF(exposed));
+    painter.save();
+    replay(*page, painter, visible);
+    painter.restore();
+    if (guest_)
+        MemberCalls::endQuietly([&] { guest_->paintOver(*page, painter, visible); });
+}
+
+/// A page that stands alone stays while the current one does not exist.
+std::optional<int> CanvasAreas::pageShownOn(int surface) const
+{
+    const auto page = pageOnSurface(canvas_.view(), canvas_.facts(), surface);
+    if (!page && !canvas_.view().multiPage)
+        return pageInView(canvas_.view(), canvas_.facts());
+    return page;
+}
+
+void CanvasAreas::repaintPages()
+{
+    backScreen_->update();
+    for (const auto& [index, surface] : surfaces_)
+        surface->update();
+}
+
+QString CanvasAreas::surfaceText(int surface) const
+{
+    const std::optional<int> page = pageShownOn(surface);
+    if (!page || canvas_.isBuilding())
+        return {};
+    QString text;
+    MemberCalls::endQuietly([&] {
+        text = toQString(
+            asTable(placedTexts(canvas_.document(), *page, canvas_.platform().metrics)));
+    });
+    return text;
+}
+
+QString CanvasAreas::shownText() const
+{
+    QStringList texts;
+    for (const int surface : surfacesInView(canvas_.view(), canvas_.facts()))
+        texts.append(surfaceText(surface));
+    return texts.join(QLatin1Char('\f'));
+}
+
+/// Only where a reader listens, and only when other pages are seen.
+void CanvasAreas::tellReader()
+{
+    if (!QAccessible::isActive() || canvas_.isBuilding())
+        return;
+    std::vector<int> pages;
+    for (const int surface : surfacesInView(canvas_.view(), canvas_.facts()))
+        pages.push_back(pageShownOn(surface).value_or(-1));
+    if (pages == shownPages_ && shownDocument_ == canvas_.documentNumber())
+        return;
+    shownPages_ = std::move(pages);
+    shownDocument_ = canvas_.documentNumber();
+    QAccessibleEvent changed(&control_, QAccessible::DocumentContentChanged);
+    QAccessible::updateAccessibility(&changed);
+}
+
+bool CanvasAreas::takesMouse(int surface, const QMouseEvent& event, QPointF at)
+{
+    if (!guest_ || !hasScale())
+        return false;
+    const std::optional<int> page = pageShownOn(surface);
+    const QSizeF scale = pixelsPerTwip();
+    return page
+        && guest_->takesMouse(*page, event, { at.x() / scale.width(), at.y() / scale.height() });
 }
 
 /// Every paint outside an arrangement goes through `showPage`: the mode becomes `One`. Where the
@@ -432,11 +500,15 @@ void CanvasAreas::wheel(QWheelEvent& event)
     QScrollBar* const bar = isAcross ? Hbar_ : Vbar_;
     QWheelEvent passed(event.position(), event.globalPosition(), event.pixelDelta(), angle,
         event.buttons(), event.modifiers() & ~Qt::ShiftModifier, event.phase(), event.inverted());
-    if (bar->isEnabled())
-        bar->event(&passed);
+    if (!bar->isEnabled())
+        return;
+    // Never further than what is seen at once: a large step is a rounded number.
+    const ViewState& view = canvas_.view();
+    const double seen = (isAcross ? view.innerWidth : view.innerHeight) / ScrollStep;
+    bar->setPageStep(std::clamp(static_cast<int>(std::min(seen, 32767.0)), 1, bar->pageStep()));
+    bar->event(&passed);
 }
 
-/// The bars move the pages, so that page and bar stay in step.
 void CanvasAreas::zoomAbout(double factor, QPointF at)
 {
     const ViewState& view = canvas_.view();
@@ -446,20 +518,21 @@ void CanvasAreas::zoomAbout(double factor, QPointF at)
     const double scale = std::clamp(present * factor, SmallestScale, LargestScale);
     if ((factor > 1) != (scale > present))
         return;
-    const QPointF twips(at.x() * TwipsPerInch / control_.logicalDpiX(),
-        at.y() * TwipsPerInch / control_.logicalDpiY());
-    const QPointF onPage(twips.x() / present - view.offset.x, twips.y() / present - view.offset.y);
     MemberCalls::endQuietly([&] {
-        canvas_.setDispScale(static_cast<float>(scale));
-        const double divisor = view.divisor;
-        const QPointF moved(twips.x() * divisor - onPage.x() - view.offset.x,
-            twips.y() * divisor - onPage.y() - view.offset.y);
-        if (view.Hbar.enabled)
-            canvas_.setHbar(barValueAfter(view.Hbar, view.previousHbar, moved.x()));
-        if (view.Vbar.enabled)
-            canvas_.setVbar(barValueAfter(view.Vbar, view.previousVbar, moved.y()));
+        canvas_.zoomAbout(static_cast<float>(scale), at.x() * TwipsPerInch / control_.logicalDpiX(),
+            at.y() * TwipsPerInch / control_.logicalDpiY());
     });
-    viewChanged();
+}
+
+/// A pinch on a touch pad.
+bool CanvasAreas::gesture(QNativeGestureEvent& event)
+{
+    if (event.gestureType() != Qt::ZoomNativeGesture)
+        return false;
+    const double factor = 1 + event.value();
+    if (factor > 0 && factor != 1)
+        zoomAbout(factor, backScreen_->mapFrom(&control_, event.position()));
+    return true;
 }
 
 bool CanvasAreas::key(int key)

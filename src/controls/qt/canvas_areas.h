@@ -10,13 +10,16 @@
 
 #include <functional>
 #include <map>
+#include <optional>
 #include <vector>
 
 class QLabel;
+class QNativeGestureEvent;
 class QScrollBar;
 
 namespace pelloric::qt {
 
+class PageGuest;
 class ProgressArea;
 class QtFonts;
 class StartIcon;
@@ -48,8 +51,21 @@ public:
     /// Scrolls by the wheel; with the control key zooms about the pointer.
     void wheel(QWheelEvent& event);
 
+    /// Zooms by a pinch. @return whether the gesture has a meaning
+    bool gesture(QNativeGestureEvent& event);
+
     /// Scrolls by a key. @return whether the key has a meaning
     bool key(int key);
+
+    /// Has what is painted marked on the screen, and the mouse seen first.
+    /// @param guest  borrowed, or null
+    void setGuest(PageGuest* guest) { guest_ = guest; }
+
+    /// Paints the pages that are seen anew.
+    void repaintPages();
+
+    /// The texts of the pages of which some part is seen, in their order.
+    QString shownText() const;
 
     void viewChanged() override;
     void viewScrolled() override;
@@ -72,10 +88,13 @@ private:
 
     void paintSurface(
         int surface, QPainter& painter, QPointF origin, const QRect& exposed) override;
+    QString surfaceText(int surface) const override;
+    bool takesMouse(int surface, const QMouseEvent& event, QPointF at) override;
     void mouseMoved() override;
     void mousePressed(Qt::MouseButton button, QPointF at) override;
     void mouseReleased(Qt::MouseButton button, QPointF at) override;
 
+    void tellReader();
     QScrollBar* makeBar(Qt::Orientation orientation, const char* name);
     void setViewport();
     bool isAtStart() const;
@@ -93,6 +112,7 @@ private:
     QSizeF pixelsPerTwip() const;
     QRectF pageArea(int surface) const;
     void passPaintThroughShowPage();
+    std::optional<int> pageShownOn(int surface) const;
     void replay(int page, QPainter& painter, const QRectF& visible);
     void zoomAbout(double factor, QPointF at);
 
@@ -100,6 +120,7 @@ private:
     Canvas& canvas_;
     QtFonts& fonts_;
     RightButton rightButton_;
+    PageGuest* guest_ = nullptr;
     BackScreen* backScreen_;
     StartIcon* startIcon_;
     ProgressArea* progress_;
@@ -108,6 +129,8 @@ private:
     QScrollBar* Vbar_;
     std::map<int, PageSurface*> surfaces_; ///< those that exist; 0 is always there
     Look shownLook_;
+    std::uint32_t shownDocument_ = 0; ///< that screen readers were told of
+    std::vector<int> shownPages_; ///< that screen readers were told of
     QPoint shownCorner_; ///< of surface 0 when the surfaces were placed last: pixels
     bool isPainting_ = false;
     bool showsHand_ = false;

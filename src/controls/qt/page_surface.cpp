@@ -83,15 +83,23 @@ void PageSurface::paintEvent(QPaintEvent* event)
     host_.paintSurface(index_, painter, origin_, event->rect());
 }
 
-void PageSurface::mouseMoveEvent(QMouseEvent*) { host_.mouseMoved(); }
+void PageSurface::mouseMoveEvent(QMouseEvent* event)
+{
+    if (!host_.takesMouse(index_, *event, event->position() - origin_))
+        host_.mouseMoved();
+}
 
 void PageSurface::mousePressEvent(QMouseEvent* event)
 {
+    if (host_.takesMouse(index_, *event, event->position() - origin_))
+        return;
     host_.mousePressed(event->button(), event->position() - origin_);
 }
 
 void PageSurface::mouseReleaseEvent(QMouseEvent* event)
 {
+    if (host_.takesMouse(index_, *event, event->position() - origin_))
+        return;
     host_.mouseReleased(event->button(), event->position() - origin_);
 }
 

@@ -34,6 +34,14 @@ public:
     virtual void paintSurface(int surface, QPainter& painter, QPointF origin, const QRect& exposed)
         = 0;
 
+    /// The texts of the page that a surface shows, as rows of a table.
+    virtual QString surfaceText(int surface) const = 0;
+
+    /// Asked first when the mouse moves or a button goes.
+    /// @param at  from the page's corner: pixels
+    /// @return    true: that was all
+    virtual bool takesMouse(int surface, const QMouseEvent& event, QPointF at) = 0;
+
     /// The mouse moves over a surface.
     virtual void mouseMoved() = 0;
 
@@ -54,6 +62,9 @@ public:
 
     /// Makes this the surface of that number.
     void setIndex(int index);
+
+    /// The texts of the page that it shows, as rows of a table.
+    QString pageText() const { return host_.surfaceText(index_); }
 
     /// Puts the surface where a page lies; what it shows stays.
     void place(const PagePlace& place);

@@ -5,6 +5,7 @@
 
 #include "controls/qt/canvas_areas.h"
 #include "controls/qt/default_platform.h"
+#include "controls/qt/page_accessible.h"
 #include "controls/qt/published_values.h"
 #include "grids/qt/grid_for.h"
 #include "platform/platform.h"
@@ -81,6 +82,7 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
               [this] { emit MouseUp(RightButtonNumber); } }))
 {
     registerRecords();
+    [[maybe_unused]] static const bool isReadable = (installPageAccessibility(), true);
     canvas_.documentName = toText(QGuiApplication::applicationDisplayName());
     setObjectName(QStringLiteral("Sorvane"));
     setAccessibleName(tr("Page preview"));
@@ -89,6 +91,12 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
 }
 
 Sorvane::~Sorvane() = default;
+
+void Sorvane::setPageGuest(PageGuest* guest) { areas_->setGuest(guest); }
+
+void Sorvane::repaintPages() { areas_->repaintPages(); }
+
+QString Sorvane::shownText() const { return areas_->shownText(); }
 
 std::int16_t Sorvane::Currentpage()
 {
@@ -379,6 +387,14 @@ void Sorvane::putReSetLeftTop(const QVariant& value)
 QSize Sorvane::sizeHint() const { return { 640, 480 }; }
 
 QSize Sorvane::minimumSizeHint() const { return { 120, 90 }; }
+
+bool Sorvane::event(QEvent* event)
+{
+    if (event->type() == QEvent::NativeGesture
+        && areas_->gesture(static_cast<QNativeGestureEvent&>(*event)))
+        return true;
+    return QWidget::event(event);
+}
 
 void Sorvane::resizeEvent(QResizeEvent*) { areas_->fill(FocusEdge); }
 

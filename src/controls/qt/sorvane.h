@@ -16,6 +16,7 @@
 namespace pelloric::qt {
 
 class CanvasAreas;
+class PageGuest;
 class QtPlatform;
 
 /// The page canvas: builds pages from a grid, shows, prints, saves and opens them.
@@ -70,6 +71,15 @@ public:
     /// The canvas without its window: the published fields, and every member with its errors.
     Canvas& canvas() { return canvas_; }
     const Canvas& canvas() const { return canvas_; }
+
+    /// Has the pages marked on the screen, and the mouse over them seen first.
+    /// @param guest  borrowed, or null for none
+    void setPageGuest(PageGuest* guest);
+    /// Paints the pages that are seen anew.
+    void repaintPages();
+    /// The texts of the pages that are seen, row by row with tabs between cells, and a form feed
+    /// between pages.
+    QString shownText() const;
 
     std::int16_t Currentpage();
     void setCurrentpage(std::int16_t page);
@@ -126,6 +136,7 @@ signals:
     void MouseUp(short Button);
 
 protected:
+    bool event(QEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void changeEvent(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;

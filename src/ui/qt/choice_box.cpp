@@ -18,7 +18,30 @@ ChoiceBox::ChoiceBox(QWidget* parent)
     setInsertPolicy(NoInsert);
     setCompleter(nullptr);
     setFocusPolicy(Qt::StrongFocus);
-    connect(this, &QComboBox::textActivated, this, &ChoiceBox::chosen);
+    connect(this, &QComboBox::textActivated, this, &ChoiceBox::pick);
+}
+
+/// The arrow keys and the wheel pick, too, and go on from there.
+void ChoiceBox::pick(const QString& text)
+{
+    const bool wasOpen = isOpen_;
+    emit chosen(text);
+    if (wasOpen)
+        emit left();
+}
+
+void ChoiceBox::showPopup()
+{
+    isOpen_ = true;
+    QComboBox::showPopup();
+}
+
+/// An entry is told of after the list was closed.
+void ChoiceBox::hidePopup()
+{
+    QComboBox::hidePopup();
+    QMetaObject::invokeMethod(
+        this, [this] { isOpen_ = false; }, Qt::QueuedConnection);
 }
 
 void ChoiceBox::showText(const QString& text, int entry)
@@ -53,7 +76,7 @@ void ChoiceBox::keyPressEvent(QKeyEvent* event)
     case Qt::Key_Return:
     case Qt::Key_Enter:
         emit chosen(currentText());
-        lineEdit()->selectAll();
+        emit left();
         break;
     case Qt::Key_Escape:
         takeBack();
@@ -62,17 +85,6 @@ void ChoiceBox::keyPressEvent(QKeyEvent* event)
     default:
         QComboBox::keyPressEvent(event);
     }
-}
-
-/// Escape leaves the box; without this it would be the window's.
-bool ChoiceBox::event(QEvent* event)
-{
-    if (event->type() == QEvent::ShortcutOverride
-        && static_cast<QKeyEvent*>(event)->key() == Qt::Key_Escape) {
-        event->accept();
-        return true;
-    }
-    return QComboBox::event(event);
 }
 
 void ChoiceBox::focusOutEvent(QFocusEvent* event)

@@ -24,22 +24,26 @@ public:
     /// Puts other entries in; no change is raised, and the text stays.
     void setEntries(const QStringList& entries);
 
+    void showPopup() override;
+    void hidePopup() override;
+
 signals:
     /// A text was entered or picked.
     void chosen(const QString& text);
-    /// The user left the box by the Escape key.
+    /// The user is done with the box: by Enter, by an entry of the open list, or by Escape.
     void left();
 
 protected:
-    bool event(QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void wheelEvent(QWheelEvent* event) override;
 
 private:
+    void pick(const QString& text);
     void takeBack();
 
     QString shown_; ///< as the program put it in
+    bool isOpen_ = false; ///< the list is, or was when the entry was picked
     int entry_ = -1; ///< as the program put it in
 };
 

@@ -88,7 +88,10 @@ FileQuestion question(TextView title, bool isSave)
 
 } // namespace
 
-PreviewPrompts standardPrompts() { return { .chooseFile = chooseFile, .showAbout = showAbout }; }
+PreviewPrompts standardPrompts()
+{
+    return { .chooseFile = chooseFile, .beforeBuild = {}, .showAbout = showAbout };
+}
 
 FileQuestion openFileQuestion() { return question(OpenFileTitle, false); }
 

@@ -10,6 +10,12 @@
 
 class QWidget;
 
+namespace pelloric {
+
+class AutomationObject;
+
+} // namespace pelloric
+
 namespace pelloric::qt {
 
 /// A question for the path of a file.
@@ -27,6 +33,10 @@ struct FileQuestion {
 struct PreviewPrompts {
     /// Answers the chosen path, or an empty one for a cancelled question.
     std::function<QString(QWidget& window, const FileQuestion& question)> chooseFile;
+
+    /// The grid of the preview is about to be read, also by "ReFresh" and after a dialog; a host
+    /// may bring its column widths up to date. May be empty.
+    std::function<void(AutomationObject& grid)> beforeBuild = {};
 
     /// Shows the about box and returns when it is closed.
     std::function<void(QWidget& window)> showAbout;

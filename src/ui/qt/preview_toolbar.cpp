@@ -9,6 +9,7 @@
 #include "ui/qt/choice_box.h"
 #include "ui/qt/icon_set.h"
 #include "ui/qt/named_boxes.h"
+#include "ui/qt/tool_meanings.h"
 #include "ui/tool_table.h"
 
 #include <QAction>
@@ -46,22 +47,18 @@ constexpr int PageLetters = 11; ///< room for "   NO. 32767" but for a letter
 constexpr auto FurtherKeys = std::to_array<std::pair<ToolAction, const char*>>({
     { ToolAction::ZoomOut, "Ctrl+=" },
     { ToolAction::ShowPrintOptions, "Print" },
+    { ToolAction::FourPages, "Alt+4" },
+    { ToolAction::ManyPages, "Alt+6" },
 });
 
-/// A caption as a tip names it, without the blanks around it and the doubled ones in it.
+/// A caption without the blanks around it and the doubled ones in it.
 QString plainCaption(const PreviewTool& tool) { return toQString(tool.caption).simplified(); }
 
-QKeySequence keysOf(const PreviewTool& tool)
-{
-    return QKeySequence::fromString(toQString(tool.shortcut), QKeySequence::PortableText);
-}
-
-/// "Zoom In (Ctrl++)".
+/// What the tool does and its keys: "Larger text and columns (Ctrl+Up)".
 QString tipOf(const PreviewTool& tool)
 {
-    const QString keys = keysOf(tool).toString(QKeySequence::NativeText);
-    return keys.isEmpty() ? plainCaption(tool)
-                          : QStringLiteral("%1 (%2)").arg(plainCaption(tool), keys);
+    return QStringLiteral("%1 (%2)").arg(
+        meaningOf(tool.action), keysOf(tool).toString(QKeySequence::NativeText));
 }
 
 void describe(QObject& object, const PreviewTool& tool)
@@ -117,8 +114,18 @@ PreviewToolbar::PreviewToolbar(QWidget* parent)
     pageBox_->setEntries({ toQString(pageEntry(1)) });
     pageBox_->showText(toQString(pageBoxText(1)), 0);
     drawIcons();
+    measure();
+}
+
+/// What the tools need with their captions changes with the font and the style, and the label of
+/// the page count grows.
+void PreviewToolbar::measure()
+{
+    isMeasuring_ = true;
+    setToolButtonStyle(Qt::ToolButtonTextUnderIcon);
     widthWithTexts_ = sizeHint().width();
-    setToolButtonStyle(Qt::ToolButtonIconOnly);
+    isMeasuring_ = false;
+    chooseButtonStyle();
 }
 
 void PreviewToolbar::addTool(const PreviewTool& tool)
@@ -202,6 +209,15 @@ QToolButton* PreviewToolbar::arrow() const
     return findChild<QToolButton*>(QStringLiteral("qt_toolbar_ext_button"));
 }
 
+bool PreviewToolbar::closeFurtherRow()
+{
+    QToolButton* const button = arrow();
+    if (!button || !button->isChecked())
+        return false;
+    button->click();
+    return true;
+}
+
 /// A box that does not fit is behind the arrow, which is opened first.
 void PreviewToolbar::focusBox(ChoiceBox& box)
 {
@@ -227,7 +243,10 @@ void PreviewToolbar::showNavigation(const NavigationState& state, int currentPag
     const bool isOnEntry = currentPage >= 0 && currentPage < pageBox_->count();
     pageBox_->showText(toQString(state.pageBox), isOnEntry ? currentPage : -1);
     scaleBox_->showText(toQString(state.scale), scaleEntryOf(state.scale));
+    const int before = pageCount_->sizeHint().width();
     pageCount_->setText(toQString(state.countLabel));
+    widthWithTexts_ += pageCount_->sizeHint().width() - before;
+    chooseButtonStyle();
 }
 
 std::vector<QAction*> PreviewToolbar::contextActions() const
@@ -242,8 +261,11 @@ std::vector<QAction*> PreviewToolbar::contextActions() const
 void PreviewToolbar::changeEvent(QEvent* event)
 {
     QToolBar::changeEvent(event);
-    if (event->type() == QEvent::PaletteChange || event->type() == QEvent::StyleChange)
+    const QEvent::Type type = event->type();
+    if (type == QEvent::PaletteChange || type == QEvent::StyleChange)
         drawIcons();
+    if ((type == QEvent::FontChange || type == QEvent::StyleChange) && pageCount_)
+        measure();
 }
 
 void PreviewToolbar::drawIcons()
@@ -268,6 +290,8 @@ void PreviewToolbar::resizeEvent(QResizeEvent* event)
 /// Captions stand under the icons where there is room for all of them.
 void PreviewToolbar::chooseButtonStyle()
 {
+    if (isMeasuring_)
+        return;
     const auto style
         = width() >= widthWithTexts_ ? Qt::ToolButtonTextUnderIcon : Qt::ToolButtonIconOnly;
     if (style != toolButtonStyle())

@@ -43,6 +43,9 @@ public:
     /// Every tool that is clicked; those that are no buttons are here, too.
     const std::map<int, QAction*>& toolActions() const { return actions_; }
 
+    /// Closes the row of the tools that do not fit. @return false: it was not open
+    bool closeFurtherRow();
+
     ChoiceBox& pageBox() { return *pageBox_; }
     ChoiceBox& scaleBox() { return *scaleBox_; }
 
@@ -65,12 +68,14 @@ private:
     QToolButton* arrow() const;
     void focusBox(ChoiceBox& box);
     void drawIcons();
+    void measure();
     void chooseButtonStyle();
 
     std::map<int, QAction*> actions_; ///< by the number of the tool
     ChoiceBox* pageBox_ = nullptr;
     ChoiceBox* scaleBox_ = nullptr;
     QLabel* pageCount_ = nullptr;
+    bool isMeasuring_ = false;
     int widthWithTexts_ = 0; ///< that all tools need with their captions: pixels
 };
 

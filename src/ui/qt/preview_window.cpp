@@ -17,6 +17,8 @@
 #include "ui/qt/page_setup_dialog.h"
 #include "ui/qt/preview_toolbar.h"
 #include "ui/qt/print_options_dialog.h"
+#include "ui/qt/reader_tools.h"
+#include "ui/qt/reading_input.h"
 #include "ui/tool_table.h"
 
 #include <QCloseEvent>
@@ -24,13 +26,12 @@
 #include <QCursor>
 #include <QEventLoopLocker>
 #include <QGuiApplication>
+#include <QKeyEvent>
 #include <QMenu>
 #include <QPointer>
 #include <QProgressDialog>
 #include <QScreen>
-#include <QScrollBar>
 #include <QSettings>
-#include <QShortcut>
 #include <QTimer>
 
 #include <algorithm>
@@ -44,8 +45,6 @@ constexpr QSize FirstSize { 1180, 860 }; ///< before the user has chosen another
 constexpr short RightButtonNumber = 2;
 
 constexpr int ExitTool = 17;
-constexpr int PreviousTool = 6;
-constexpr int NextTool = 7;
 
 constexpr int CloseAgainMs = 20;
 
@@ -73,6 +72,8 @@ public:
     {
         if (--window_.running_ > 0)
             return;
+        window_.keepEscapeFromLeaving();
+        window_.tools_->viewChanged();
         window_.services_.loop().forgetCancel();
         if (window_.closesAfterwards_)
             window_.close();
@@ -102,7 +103,6 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     setContextMenuPolicy(Qt::DefaultContextMenu);
     addToolBar(toolbar_);
     canvas_->setObjectName(QStringLiteral("Sorvane1"));
-    canvas_->installEventFilter(this);
     setCentralWidget(canvas_);
     contextMenu_->setObjectName(QStringLiteral("PopMenu"));
     for (QAction* const action : toolbar_->contextActions())
@@ -110,12 +110,15 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     addSavePages();
     connectTools();
     session_.emplace(canvas_->canvas(), static_cast<PreviewHost&>(*this));
+    reading_ = std::make_unique<ReadingInput>(*canvas_, *session_, [this] { return isBusy(); });
+    tools_ = new ReaderTools({ *this, *contextMenu_, *canvas_, *session_, platform.fonts(),
+        [this] { return isBusy(); } });
     navigationChanged();
     restorePlace();
     canvas_->setFocus();
 }
 
-PreviewWindow::~PreviewWindow() { canvas_->removeEventFilter(this); }
+PreviewWindow::~PreviewWindow() { delete tools_; }
 
 void PreviewWindow::connectTools()
 {
@@ -137,8 +140,6 @@ void PreviewWindow::connectTools()
         if (button == RightButtonNumber)
             showContextMenu(QCursor::pos());
     });
-    auto* const escape = new QShortcut(QKeySequence(Qt::Key_Escape), this);
-    connect(escape, &QShortcut::activated, this, &PreviewWindow::leave);
 }
 
 void PreviewWindow::addSavePages()
@@ -183,6 +184,7 @@ void PreviewWindow::openDocument(const std::filesystem::path& path)
     if (isBusy())
         return;
     const Command command(*this);
+    session_->askForCentring();
     try {
         canvas_->canvas().OpenFile(path);
     } catch (const RunTimeError&) {
@@ -234,13 +236,33 @@ void PreviewWindow::click(int id)
     session_->click(id);
 }
 
-/// Ends a build or a print job that runs, or else the preview.
-void PreviewWindow::leave()
+/// Does the smallest thing first: lists and boxes take the key themselves, then the toolbar's
+/// further row goes, then what runs is ended, and only then the preview.
+void PreviewWindow::escape()
 {
-    if (canvas_->canvas().isBusy())
+    if (toolbar_->closeFurtherRow() || tools_->escape())
+        return;
+    if (isBusy())
         services_.loop().cancel();
-    else if (!isBusy())
+    else if (mayLeave_)
         click(ExitTool);
+}
+
+/// A key that was pressed while a command ran may arrive after it: it is no wish to leave. Input
+/// that waits is delivered before a timer of the second turn.
+void PreviewWindow::keepEscapeFromLeaving()
+{
+    mayLeave_ = false;
+    QTimer::singleShot(
+        0, this, [this] { QTimer::singleShot(0, this, [this] { mayLeave_ = running_ == 0; }); });
+}
+
+void PreviewWindow::keyPressEvent(QKeyEvent* event)
+{
+    if (event->matches(QKeySequence::Cancel))
+        escape();
+    else
+        QMainWindow::keyPressEvent(event);
 }
 
 void PreviewWindow::closeEvent(QCloseEvent* event)
@@ -271,10 +293,19 @@ void PreviewWindow::closeEvent(QCloseEvent* event)
 /// The window is still shown when the command that unloads it ends, and then closes like any other.
 void PreviewWindow::unload() { closesAfterwards_ = true; }
 
+void PreviewWindow::beforeBuild(AutomationObject& grid)
+{
+    if (prompts_.beforeBuild)
+        prompts_.beforeBuild(grid);
+}
+
 void PreviewWindow::navigationChanged()
 {
-    if (session_)
-        toolbar_->showNavigation(session_->state(), canvas_->canvas().document().currentPage);
+    if (!session_)
+        return;
+    toolbar_->showNavigation(session_->state(), canvas_->canvas().document().currentPage);
+    if (tools_)
+        tools_->viewChanged();
 }
 
 DialogEnd PreviewWindow::showGridStyle()
@@ -385,29 +416,6 @@ void PreviewWindow::contextMenuEvent(QContextMenuEvent* event)
     event->accept();
     if (event->reason() == QContextMenuEvent::Keyboard)
         showContextMenu(canvas_->mapToGlobal(canvas_->rect().center()));
-}
-
-/// Where a page cannot be scrolled on, the keys that scroll it turn the page.
-bool PreviewWindow::turnsPage(int key)
-{
-    if (key != Qt::Key_PageUp && key != Qt::Key_PageDown)
-        return false;
-    const ScrollBar& bar = canvas_->canvas().view().Vbar;
-    const bool isDown = key == Qt::Key_PageDown;
-    if (bar.enabled && bar.value != (isDown ? bar.maximum : 0))
-        return false;
-    const int tool = isDown ? NextTool : PreviousTool;
-    if (toolbar_->toolActions().at(tool)->isEnabled())
-        click(tool);
-    return true;
-}
-
-bool PreviewWindow::eventFilter(QObject* watched, QEvent* event)
-{
-    if (watched == canvas_ && event->type() == QEvent::KeyPress && !isBusy()
-        && turnsPage(static_cast<QKeyEvent*>(event)->key()))
-        return true;
-    return QMainWindow::eventFilter(watched, event);
 }
 
 void PreviewWindow::restorePlace()

@@ -23,6 +23,8 @@ namespace pelloric::qt {
 class PreviewToolbar;
 class PrintOptionsDialog;
 class QtPlatform;
+class ReaderTools;
+class ReadingInput;
 class Sorvane;
 class UsedFolders;
 struct PrintPages;
@@ -84,7 +86,7 @@ public:
 protected:
     void closeEvent(QCloseEvent* event) override;
     void contextMenuEvent(QContextMenuEvent* event) override;
-    bool eventFilter(QObject* watched, QEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
 
 private:
     class Command;
@@ -96,6 +98,7 @@ private:
     std::filesystem::path chooseFileToOpen() override;
     std::filesystem::path chooseFileToSave() override;
     void unload() override;
+    void beforeBuild(AutomationObject& grid) override;
     void navigationChanged() override;
 
     bool printPages(const PrintArguments& arguments);
@@ -105,9 +108,9 @@ private:
     void addSavePages();
     void writePages(const std::filesystem::path& path);
     void click(int id);
-    void leave();
+    void escape();
+    void keepEscapeFromLeaving();
     void showContextMenu(QPoint at);
-    bool turnsPage(int key);
     std::filesystem::path choose(const FileQuestion& question);
     void restorePlace();
     void savePlace() const;
@@ -121,9 +124,12 @@ private:
     Sorvane* canvas_;
     QMenu* contextMenu_;
     std::optional<PreviewSession> session_;
+    std::unique_ptr<ReadingInput> reading_; ///< works on the session
+    ReaderTools* tools_ = nullptr; ///< works on the session
     int running_ = 0; ///< commands that have not ended
     bool closesAfterwards_ = false;
     bool isClosed_ = false;
+    bool mayLeave_ = true; ///< false: an Escape may still be meant for what has just ended
 };
 
 } // namespace pelloric::qt

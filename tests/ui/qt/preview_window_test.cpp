@@ -4,17 +4,10 @@
 #include "ui/qt/preview_window.h"
 
 #include "controls/qt/sorvane.h"
-#include "fakes/fake_printer.h"
-#include "fakes/fake_services.h"
-#include "fakes/temp_folder.h"
-#include "grids/table_grid.h"
-#include "platform/qt/qt_platform.h"
 #include "platform/run_time_error.h"
-#include "settings/default_settings.h"
 #include "support/test_paths.h"
-#include "ui/qt/choice_box.h"
 #include "ui/qt/icon_set.h"
-#include "ui/qt/preview_opener.h"
+#include "ui/qt/preview_world.h"
 #include "ui/tool_table.h"
 
 #include <QAction>
@@ -30,7 +23,6 @@
 #include <QMenu>
 #include <QPointer>
 #include <QProcess>
-#include <QSettings>
 #include <QSignalSpy>
 #include <QTest>
 #include <QTimer>
@@ -46,6 +38,8 @@
 namespace pelloric::qt {
 
 namespace {
+
+using PreviewWindowTest = PreviewWorld;
 
 /// A button of the toolbar as it must be found.
 struct ButtonRow {
@@ -79,127 +73,6 @@ constexpr auto Buttons = std::to_array<ButtonRow>({
     { 23, "tool23", "Maximum " },
     { 24, "tool24", "Minimum" },
 });
-
-/// A preview window on services of its own.
-class PreviewWindowTest : public testing::Test {
-protected:
-    PreviewWindowTest()
-    {
-        QSettings::setPath(QSettings::IniFormat, QSettings::UserScope,
-            QString::fromStdString(folder_.path().string()));
-        platform_.folders().setSystemDirectory(folder_.path());
-        platform_.useMessages(messages_);
-        platform_.usePrinter(printer_, printers_);
-        deployDefaultSettings(platform_.record());
-    }
-
-    PreviewWindow& show()
-    {
-        PreviewWindow& window = opener_.showWindow();
-        EXPECT_TRUE(QTest::qWaitForWindowActive(&window));
-        return window;
-    }
-
-    PreviewWindow& preview(int rows)
-    {
-        opener_.openPreview(gridOf(rows));
-        EXPECT_TRUE(QTest::qWaitForWindowActive(opener_.window()));
-        return *opener_.window();
-    }
-
-    static std::unique_ptr<AutomationObject> gridOf(int rows)
-    {
-        auto grid = std::make_unique<TableGrid>(
-            std::vector<TableColumn> { { u"Number", 3000 }, { u"Square", 3000 } });
-        for (int row = 1; row <= rows; ++row) {
-            const Text number = decimal(row);
-            const Text square = decimal(row * row);
-            grid->addRow(std::array<TextView, 2> { number, square });
-        }
-        return grid;
-    }
-
-    /// A million rows.
-    static std::unique_ptr<AutomationObject> longGrid()
-    {
-        auto grid = std::make_unique<TableGrid>(std::vector<TableColumn> { { u"A", 3000 } });
-        for (int row = 0; row < 1'000'000; ++row)
-            grid->addRow(std::array<TextView, 1> { u"a text" });
-        return grid;
-    }
-
-    Canvas& canvas() { return opener_.window()->canvas().canvas(); }
-
-    QToolButton* button(int id)
-    {
-        for (QToolButton* const found : opener_.window()->findChildren<QToolButton*>()) {
-            if (found->property("toolId") == id)
-                return found;
-        }
-        return nullptr;
-    }
-
-    void click(int id) { button(id)->click(); }
-
-    /// Whether first, previous, next and last are enabled, such as "0011".
-    std::string navigation()
-    {
-        std::string states;
-        for (const int id : { 5, 6, 7, 8 })
-            states += button(id)->isEnabled() ? '1' : '0';
-        return states;
-    }
-
-    ChoiceBox* box(const char* name)
-    {
-        return opener_.window()->findChild<ChoiceBox*>(QString::fromLatin1(name));
-    }
-
-    void enter(const char* name, const QString& text)
-    {
-        box(name)->setFocus();
-        box(name)->lineEdit()->selectAll();
-        QTest::keyClicks(box(name), text);
-        QTest::keyClick(box(name), Qt::Key_Return);
-    }
-
-    /// What the window asks for a file answers this path.
-    void answerFiles(const QString& path)
-    {
-        PreviewPrompts prompts;
-        prompts.chooseFile = [this, path](QWidget&, const FileQuestion& question) {
-            asked_.push_back(question);
-            return path;
-        };
-        prompts.showAbout = [this](QWidget&) { ++aboutBoxes_; };
-        opener_.setPrompts(prompts);
-    }
-
-    QString file(const char* name) const
-    {
-        return QString::fromStdString(folder_.file(name).string());
-    }
-
-    /// Whether the program ends by itself before long.
-    static bool programEnds()
-    {
-        constexpr int TooLate = 3;
-        QTimer patience;
-        patience.setSingleShot(true);
-        QObject::connect(&patience, &QTimer::timeout, [] { QCoreApplication::exit(TooLate); });
-        patience.start(20000);
-        return QApplication::exec() == 0;
-    }
-
-    TempFolder folder_;
-    FakeMessages messages_;
-    FakePrinter printer_;
-    FakePrinterSystem printers_;
-    QtPlatform platform_;
-    QtPreviewOpener opener_ { platform_ };
-    std::vector<FileQuestion> asked_;
-    int aboutBoxes_ = 0;
-};
 
 TEST_F(PreviewWindowTest, CarriesItsNamesAndItsTitle)
 {
@@ -407,6 +280,10 @@ TEST_F(PreviewWindowTest, OpensTheContextMenuByTheRightButton)
         texts.append(action->text());
     EXPECT_EQ(texts.mid(0, 3), QStringList({ "Clear  All Pages", "Open File", "Save File" }));
     EXPECT_TRUE(texts.contains(QStringLiteral("Save as PDF")));
+    for (const QAction* const action : menu->actions().mid(3))
+        EXPECT_TRUE(
+            action->isSeparator() || !action->shortcut().isEmpty() || action->text().contains('\t'))
+            << action->text().toStdString();
     menu->actions().front()->trigger();
     menu->close();
     EXPECT_EQ(canvas().Totalpages(), 1);
@@ -433,7 +310,7 @@ TEST_F(PreviewWindowTest, WorksByKeys)
     EXPECT_EQ(canvas().DispScale(), 0.5F);
     press(Qt::Key_Minus);
     EXPECT_EQ(canvas().DispScale(), 1.0F);
-    press(Qt::Key_2);
+    press(Qt::Key_2, Qt::AltModifier);
     EXPECT_EQ(canvas().WindowPages(), 2);
     press(Qt::Key_0);
     EXPECT_EQ(canvas().WindowOrderStyle(), OrderStyle::Whole);
@@ -554,6 +431,7 @@ TEST_F(PreviewWindowTest, TheLastWindowEndsTheProgramThoughItWasClosedDuringABui
 TEST_F(PreviewWindowTest, ClosesByEscapeWhenNothingIsBuilt)
 {
     PreviewWindow& window = preview(3);
+    QTest::qWait(50);
     QTest::keyClick(&window.canvas(), Qt::Key_Escape);
     EXPECT_EQ(opener_.window(), nullptr);
 }

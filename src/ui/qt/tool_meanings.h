@@ -1,0 +1,24 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <QKeySequence>
+#include <QString>
+
+namespace pelloric {
+
+enum class ToolAction;
+struct PreviewTool;
+
+} // namespace pelloric
+
+namespace pelloric::qt {
+
+/// What a tool does, in plain words and in the user's language.
+QString meaningOf(ToolAction action);
+
+/// The keys of a tool.
+QKeySequence keysOf(const PreviewTool& tool);
+
+} // namespace pelloric::qt
