@@ -144,6 +144,14 @@ struct Order {
             throw CommandError(
                 QStringLiteral("say where to export to: -o OUT.pdf, .png, .svg or .ostl"),
                 WrongUsage);
+        if (files.size() > 1 && !isJoined && out != StandardOutput && !QFileInfo(out).isDir()
+            && findFormat(QFileInfo(out).suffix()))
+            throw CommandError(
+                QStringLiteral(
+                    "%1 is one input more; several go into a folder, or with --join into one "
+                    "file, and %2 is no folder; quote names with blanks")
+                    .arg(files.at(1), out),
+                WrongUsage);
         if (line.has("format") || isFolder() || out == StandardOutput)
             format = &formatNamed(line.has("format") ? line.value("format") : QString());
         else
