@@ -4,7 +4,7 @@
 
 # Checks of the sources and of sanitizer builds: all, or those named as arguments.
 #
-#   tools/check.sh [format] [layers] [spelling] [licences] [tidy] [asan] [fuzz]
+#   tools/check.sh [format] [layers] [spelling] [licences] [scripts] [tidy] [asan] [fuzz]
 #
 # CHECK_FUZZ_SECONDS (60) is how long each fuzzer runs; with 0 they are only built.
 
@@ -12,7 +12,7 @@ set -euo pipefail
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 . tools/packages.sh
 
-AllChecks=(format layers spelling licences tidy asan fuzz)
+AllChecks=(format layers spelling licences scripts tidy asan fuzz)
 
 cxxFiles() {
     git ls-files -z -- '*.cpp' '*.h'
@@ -41,6 +41,11 @@ checkLicences() {
     tail -n 1 build/reuse.log
 }
 
+checkScripts() {
+    needTools shellcheck
+    git ls-files -z -- '*.sh' run .ci/run | xargs -0 -r shellcheck -x
+}
+
 # Reads the compile commands of the preset dev, whose build also makes the files that Qt's tools write.
 checkTidy() {
     needTools clang-tidy-14
@@ -67,7 +72,9 @@ checkFuzz() {
     local seconds=${CHECK_FUZZ_SECONDS:-60} program name
     [ "$seconds" -gt 0 ] || return 0
     for program in build/fuzz/fuzz/fuzz_*; do
-        [ -f "$program" ] && [ -x "$program" ] || continue
+        if [ ! -f "$program" ] || [ ! -x "$program" ]; then
+            continue
+        fi
         name=${program##*/fuzz_}
         local corpus=("build/fuzz/corpus/$name")
         mkdir -p "${corpus[0]}"

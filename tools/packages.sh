@@ -1,6 +1,8 @@
 # SPDX-FileCopyrightText: The Pelloric authors
 # SPDX-License-Identifier: MIT
 # shellcheck shell=bash
+# The lists are read by the names of their groups.
+# shellcheck disable=SC2034
 
 # The Debian packages the project needs, by what they are for, and what installs those that are
 # missing. Read by other scripts; does nothing by itself.
@@ -60,6 +62,7 @@ PackagesCheck=(
     libclang-rt-14-dev
     llvm-14
     reuse
+    shellcheck
 )
 
 # Makes and judges the Debian packages.
@@ -107,8 +110,10 @@ aptGet() {
     while :; do
         status=0
         asRoot env LC_ALL=C DEBIAN_FRONTEND=noninteractive apt-get "$@" 2> "$errors" || status=$?
-        [ "$status" -ne 0 ] && grep -q 'Could not get lock\|Unable to lock\|Unable to acquire' "$errors" &&
-            [ "$SECONDS" -lt "$end" ] || break
+        if [ "$status" -eq 0 ] || [ "$SECONDS" -ge "$end" ] ||
+            ! grep -q 'Could not get lock\|Unable to lock\|Unable to acquire' "$errors"; then
+            break
+        fi
         [ "$told" = yes ] || printf 'Another package manager is at work; waiting for it.\n' >&2
         told=yes
         sleep "$LockPause"

@@ -44,7 +44,8 @@ wait_for() {
 Xvfb -noreset -displayfd 3 -screen 0 1280x1024x24 3>"$folder/display" 2>"$folder/xvfb.log" &
 started+=($!)
 wait_for "$folder/display" '[0-9]'
-export DISPLAY=:$(cat "$folder/display")
+DISPLAY=:$(cat "$folder/display")
+export DISPLAY
 export QT_QPA_PLATFORM=xcb
 unset QT_SCALE_FACTOR QT_FONT_DPI
 openbox --config-file /etc/xdg/openbox/rc.xml >"$folder/openbox.log" 2>&1 &

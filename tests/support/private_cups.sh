@@ -22,8 +22,8 @@ user=$(id -un)
 group=$(id -gn)
 if [ "$(id -u)" -eq 0 ]; then
     # The scheduler refuses to run its helpers as root.
-    user=lp
-    group=lp
+    user='lp'
+    group='lp'
     chown -R lp:lp "$folder/spool" "$folder/cache"
     chmod 755 "$folder"
 fi
