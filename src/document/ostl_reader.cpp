@@ -40,7 +40,7 @@ float singleOf(double value)
 {
     constexpr double largest = std::numeric_limits<float>::max();
     if (!(value >= -largest && value <= largest))
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(ErrorNumber::Overflow, pastSingle(value));
     return static_cast<float>(value);
 }
 
@@ -217,11 +217,28 @@ OstlResult readOstl(
     return OstlResult::Opened;
 }
 
+namespace {
+
+/// An error of a number that the file holds names the file.
+OstlResult readNamed(const TextCodec& codec, std::istream& stream, PageDocument& document,
+    PageSetup& setup, const std::filesystem::path& path)
+{
+    try {
+        return readOstl(codec, stream, document, setup);
+    } catch (const RunTimeError& error) {
+        throw RunTimeError(error.number(),
+            pathText(path) + u" is damaged: " + Text(error.detail())
+                + u"; what stands before it was read");
+    }
+}
+
+} // namespace
+
 OstlResult readOstl(const TextCodec& codec, const std::filesystem::path& path,
     PageDocument& document, PageSetup& setup)
 {
     std::ifstream stream(path, std::ios::binary);
-    const OstlResult result = readOstl(codec, stream, document, setup);
+    const OstlResult result = readNamed(codec, stream, document, setup, path);
     if (!stream.is_open() || stream.bad())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));
     return result;

@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <functional>
 #include <initializer_list>
+#include <limits>
 #include <utility>
 
 namespace pelloric {
@@ -27,6 +28,26 @@ std::size_t bits(std::int32_t value) { return static_cast<std::uint32_t>(value);
 
 } // namespace
 
+namespace {
+
+/// @param page  from 0
+RunTimeError noSuchPage(int page, int count)
+{
+    return RunTimeError(
+        ErrorNumber::SubscriptOutOfRange, noSuchItem(u"page", std::int64_t { page } + 1, count));
+}
+
+/// @param page   from 0
+/// @param index  from 0
+RunTimeError noSuchRecord(TextView what, std::size_t index, std::size_t count, int page)
+{
+    const Text place = u"on page " + decimal(std::int64_t { page } + 1) + u" " + Text(what);
+    return RunTimeError(ErrorNumber::SubscriptOutOfRange,
+        noSuchItem(place, static_cast<std::int64_t>(index) + 1, static_cast<std::int64_t>(count)));
+}
+
+} // namespace
+
 std::int16_t marginOfCentimetres(std::int16_t centimetres)
 {
     return narrowToInt16(std::int64_t { centimetres } * TwipsPerCm);
@@ -41,6 +62,8 @@ PageDocument::PageDocument()
 
 void PageDocument::newPage()
 {
+    if (Totalpages == std::numeric_limits<std::int16_t>::max())
+        throw RunTimeError(ErrorNumber::Overflow, u"a document holds at most 32767 pages");
     Totalpages = narrowToInt16(std::int64_t { Totalpages } + 1);
     Page next;
     if (!pages_.empty()) {
@@ -70,7 +93,7 @@ Lineobj PageDocument::line(int page, std::size_t index) const
 {
     const auto records = lines(page);
     if (index >= records.size())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw noSuchRecord(u"line", index, records.size(), page);
     const LineRecord record = records[index];
     const LinePen& lines = pen(record.pen);
     return { record.pt1, record.pt2, lines.LineStyle, lines.LineColor, lines.LineWidth,
@@ -81,7 +104,7 @@ Textobj PageDocument::text(int page, std::size_t index) const
 {
     const auto records = texts(page);
     if (index >= records.size())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw noSuchRecord(u"text", index, records.size(), page);
     const TextRecord record = records[index];
     const TextStyle& look = style(record.style);
     return { record.pt, Text(record.text()), look.font, look.color };
@@ -164,14 +187,14 @@ std::size_t PageDocument::StyleHash::operator()(const TextStyle& style) const
 PageDocument::Page& PageDocument::current()
 {
     if (!hasPage(currentPage))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw noSuchPage(currentPage, pageCount());
     return pages_[static_cast<std::size_t>(currentPage)];
 }
 
 const PageDocument::Page& PageDocument::pageAt(int page) const
 {
     if (!hasPage(page))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw noSuchPage(page, pageCount());
     return pages_[static_cast<std::size_t>(page)];
 }
 

@@ -23,6 +23,19 @@ Twips sum(Twips a, Twips b)
                                               : roundToInt32(static_cast<double>(exact));
 }
 
+/// The height of a line: twips.
+/// @throws RunTimeError Overflow: no text of the font can be measured
+Twips lineHeightOf(FaceMetrics& face, const Font& font)
+{
+    try {
+        return pelloric::textHeight(face, font.size);
+    } catch (const RunTimeError& error) {
+        throw RunTimeError(error.number(),
+            u"a font of " + formatSingle(font.size)
+                + u" points is too large to be measured; choose a smaller size");
+    }
+}
+
 } // namespace
 
 Recorder::Recorder(PageDocument& document, TextMetrics& metrics)
@@ -79,7 +92,7 @@ void Recorder::setLineAttributes(const LinePen& pen)
 void Recorder::setTextFont(const Font& font, Color color)
 {
     FaceMetrics& face = metrics_.face(font.name, font.bold, font.italic);
-    const MeasuredFont measured { &face, font.size, pelloric::textHeight(face, font.size) };
+    const MeasuredFont measured { &face, font.size, lineHeightOf(face, font) };
     TextStyle style { font, color };
     styleNumber_ = document_.styleNumber(style);
     style_ = std::move(style);
@@ -211,7 +224,8 @@ double Recorder::rowTextHeight(
 void Recorder::record(TextView stored)
 {
     if (stored.size() > 0xFFFFFFFFU)
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(
+            ErrorNumber::Overflow, u"a text of more than 4294967295 characters cannot be recorded");
     applyTextFont();
     document_.append(TextRecord {
         point_, stored.data(), static_cast<std::uint32_t>(stored.size()), styleNumber_ });

@@ -34,12 +34,15 @@ void TableGrid::reserve(std::size_t rows, std::size_t units)
 void TableGrid::addRow(std::span<const TextView> cells)
 {
     if (cells.size() > columns_.size())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"more cells than columns");
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            u"a row of " + decimal(static_cast<std::int64_t>(cells.size())) + u" cells; there are "
+                + decimal(columnCount()) + u" columns");
     std::uint64_t length = 0;
     for (const TextView cell : cells)
         length += cell.size();
     if (length > std::numeric_limits<std::uint32_t>::max())
-        throw RunTimeError(ErrorNumber::Overflow, u"a row is too long");
+        throw RunTimeError(ErrorNumber::Overflow,
+            u"row " + decimal(rowCount() + 1) + u" holds more than 4294967295 characters");
 
     rowStarts_.push_back(store_.size());
     std::uint32_t end = 0;
@@ -54,14 +57,19 @@ void TableGrid::addRow(std::span<const TextView> cells)
 const TableColumn& TableGrid::column(int column) const
 {
     if (column < 0 || column >= columnCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"column", std::int64_t { column } + 1, columnCount()));
     return columns_[static_cast<std::size_t>(column)];
 }
 
 TextView TableGrid::cell(std::int64_t row, int column) const
 {
-    if (row < 0 || row >= rowCount() || column < 0 || column >= columnCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    if (row < 0 || row >= rowCount())
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", row + 1, rowCount()));
+    if (column < 0 || column >= columnCount())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"column", std::int64_t { column } + 1, columnCount()));
     const auto at = static_cast<std::size_t>(row);
     const std::size_t first = at * columns_.size();
     const std::size_t cell = first + static_cast<std::size_t>(column);

@@ -202,7 +202,7 @@ std::int16_t roundToInt16(double value)
 {
     const double rounded = roundHalfEven(value);
     if (!(rounded >= -32768 && rounded <= 32767))
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(ErrorNumber::Overflow, outsideLimits(value, -32768, 32767));
     return static_cast<std::int16_t>(rounded);
 }
 
@@ -219,25 +219,35 @@ std::int32_t roundToInt32(double value)
     }
     const double rounded = roundHalfEven(value);
     if (!(rounded >= -2147483648.0 && rounded <= 2147483647.0))
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(ErrorNumber::Overflow, outsideLimits(value, -2147483648, 2147483647));
     return static_cast<std::int32_t>(rounded);
 }
 
 std::int16_t narrowToInt16(std::int64_t value)
 {
     if (value < -32768 || value > 32767)
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(
+            ErrorNumber::Overflow, outsideLimits(static_cast<double>(value), -32768, 32767));
     return static_cast<std::int16_t>(value);
 }
+
+namespace {
+
+Text notWhole(TextView text)
+{
+    return Text(u"\"").append(text).append(u"\" is no whole number between -32768 and 32767");
+}
+
+} // namespace
 
 std::int16_t strictInt16(TextView text)
 {
     const TextView number = trimmed(text);
     if (!isNumber(number))
-        throw RunTimeError(ErrorNumber::TypeMismatch, text);
+        throw RunTimeError(ErrorNumber::TypeMismatch, notWhole(text));
     const double value = leadingNumber(number);
     if (value != std::floor(value) || !(value >= -32768 && value <= 32767))
-        throw RunTimeError(ErrorNumber::TypeMismatch, text);
+        throw RunTimeError(ErrorNumber::TypeMismatch, notWhole(text));
     return static_cast<std::int16_t>(value);
 }
 

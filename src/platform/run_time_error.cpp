@@ -3,6 +3,8 @@
 
 #include "platform/run_time_error.h"
 
+#include "platform/numbers.h"
+
 namespace pelloric {
 
 namespace {
@@ -44,6 +46,26 @@ TextView errorText(ErrorNumber number)
     return u"Error";
 }
 
+Text noSuchItem(TextView what, std::int64_t number, std::int64_t count)
+{
+    Text text(what);
+    text.append(u" ").append(decimal(number)).append(u"; there ");
+    text.append(count == 1 ? TextView(u"is ") : TextView(u"are ")).append(decimal(count));
+    return text;
+}
+
+Text outsideLimits(double number, std::int64_t least, std::int64_t most)
+{
+    Text text = formatNumber(number);
+    text.append(u" is not between ").append(decimal(least));
+    return text.append(u" and ").append(decimal(most));
+}
+
+Text pastSingle(double number)
+{
+    return formatNumber(number).append(u" is past what a single-precision number holds");
+}
+
 RunTimeError::RunTimeError(ErrorNumber number)
     : RunTimeError(number, {})
 {
@@ -54,6 +76,12 @@ RunTimeError::RunTimeError(ErrorNumber number, TextView detail)
     , number_(number)
     , text_(describe(number, detail))
 {
+}
+
+TextView RunTimeError::detail() const
+{
+    const std::size_t plain = errorText(number_).size();
+    return text_.size() > plain ? TextView(text_).substr(plain + 2) : TextView();
 }
 
 } // namespace pelloric

@@ -5,6 +5,7 @@
 
 #include "platform/text.h"
 
+#include <cstdint>
 #include <stdexcept>
 
 namespace pelloric {
@@ -26,6 +27,18 @@ enum class ErrorNumber {
 /// The plain English text of an error number, without a full stop.
 TextView errorText(ErrorNumber number);
 
+/// "page 9; there are 5": the detail of an error about something that is not there.
+///
+/// @param what    in the singular, as a person calls it
+/// @param number  as a person counts it
+Text noSuchItem(TextView what, std::int64_t number, std::int64_t count);
+
+/// "40000 is not between -32768 and 32767": the detail of an error about a number past a limit.
+Text outsideLimits(double number, std::int64_t least, std::int64_t most);
+
+/// "1e+60 is past what a single-precision number holds".
+Text pastSingle(double number);
+
 /// What the core throws; nothing else leaves it on purpose.
 class RunTimeError : public std::runtime_error {
 public:
@@ -40,6 +53,9 @@ public:
 
     /// What a message box shows: the number's text, then ": " and the detail when there is one.
     const Text& text() const { return text_; }
+
+    /// What stands behind the number's text; empty when there is nothing more to say.
+    TextView detail() const;
 
 private:
     ErrorNumber number_;

@@ -117,7 +117,7 @@ double Value::toNumber() const
         return leadingNumber(text());
     case ValueKind::Object:
     case ValueKind::Rows:
-        throw RunTimeError(ErrorNumber::TypeMismatch);
+        throw RunTimeError(ErrorNumber::TypeMismatch, u"an object is no number");
     case ValueKind::Null:
     case ValueKind::Truth:
     case ValueKind::Number:
@@ -130,7 +130,7 @@ double Value::toNumber() const
 AutomationObject& Value::toObject() const
 {
     if (kind_ != ValueKind::Object)
-        throw RunTimeError(ErrorNumber::ObjectMissing);
+        throw RunTimeError(ErrorNumber::ObjectMissing, u"an object was expected");
     return *static_cast<AutomationObject*>(borrowed_);
 }
 

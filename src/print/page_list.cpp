@@ -31,7 +31,8 @@ void appendBetween(double first, double last, Text& list)
         list += decimal(roundToInt32(page));
     }
     if (list.size() > LongestList)
-        throw RunTimeError(ErrorNumber::Overflow, u"page list");
+        throw RunTimeError(
+            ErrorNumber::Overflow, u"the page list names too many pages; write fewer ranges");
 }
 
 /// Appends a piece behind the piece at its left, and the run between the two.

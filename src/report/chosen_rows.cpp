@@ -67,14 +67,16 @@ void ChosenRows::setPosition(std::int64_t position)
 Value ChosenRows::value(int field)
 {
     if (isBeforeFirst() || isAfterLast())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, recordCount()));
     return rows_.value(fieldOf(field));
 }
 
 int ChosenRows::fieldOf(int field) const
 {
     if (field < 0 || field >= fieldCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
     return fields_[static_cast<std::size_t>(field)];
 }
 

@@ -63,7 +63,8 @@ struct PrintedColumn {
 void addColumn(std::vector<PrintedColumn>& columns, const PrintedColumn& column)
 {
     if (columns.size() == MostColumns)
-        throw RunTimeError(ErrorNumber::Overflow, u"more than 32767 columns");
+        throw RunTimeError(
+            ErrorNumber::Overflow, u"more than 32767 columns are printed; leave some out");
     columns.push_back(column);
 }
 
@@ -384,7 +385,7 @@ GridTable readGrid(AutomationObject& grid, const GridRequest& request)
             table.fieldNames.emplace_back(table.rows->fieldName(field));
         return table;
     }
-    throw RunTimeError(ErrorNumber::InvalidCall, u"no such kind of grid");
+    throw RunTimeError(ErrorNumber::InvalidCall, u"m_PrintObj names no kind of grid");
 }
 
 } // namespace pelloric

@@ -91,7 +91,8 @@ bool LateBoundRows::isTrue(MemberId member) { return object_.get(member, {}).toN
 TextView LateBoundRows::fieldName(int field) const
 {
     if (field < 0 || field >= fieldCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
     return names_[static_cast<std::size_t>(field)];
 }
 
@@ -159,7 +160,8 @@ void LateBoundRows::walk(std::int64_t from, std::int64_t to)
 Value LateBoundRows::value(int field)
 {
     if (isBeforeFirst() || isAfterLast())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, records_));
     AutomationObject& fields = object_.get(fieldsMember_, {}).toObject();
     const Value index = Value::ofNumber(field);
     AutomationObject& item = fields.get(item_.of(fields), { &index, 1 }).toObject();

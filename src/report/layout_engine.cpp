@@ -6,7 +6,9 @@
 #include "platform/numbers.h"
 #include "platform/platform.h"
 #include "platform/row_set.h"
+#include "platform/run_time_error.h"
 #include "platform/services.h"
+#include "report/page_limit.h"
 #include "report/report_style.h"
 
 #include <algorithm>
@@ -315,6 +317,7 @@ void LayoutEngine::drawMergedLines(Twips rowTop, Twips rowBottom, bool pageIsFul
 void LayoutEngine::breakPage(Twips footerTop)
 {
     pageLines_.drawPageFooter(document_.currentPage + 1, footerTop);
+    requireAnotherPage();
     recorder_.newPage();
     startBand((band_ + 1) % source_.bands.size());
     if (band_ > 0) {
@@ -327,6 +330,17 @@ void LayoutEngine::breakPage(Twips footerTop)
     drawHeader();
     drawColumnTitles();
     recorder_.setCurrentX(tableLeft_);
+}
+
+/// @throws RunTimeError Overflow: the document is full; says how many rows fit
+void LayoutEngine::requireAnotherPage() const
+{
+    if (document_.Totalpages < MostPages)
+        return;
+    const bool isLastBand = band_ + 1 == source_.bands.size();
+    const auto unfinished = static_cast<std::int64_t>(isLastBand ? 0 : rowsOnPage_);
+    throw RunTimeError(
+        ErrorNumber::Overflow, tooManyPages(record_ - unfinished, source_.rows.recordCount()));
 }
 
 void LayoutEngine::drawLine(Tpoint from, Tpoint to)

@@ -93,6 +93,7 @@ private:
     std::vector<PatternLine> linesOfRow(bool hasTopLine) const;
     void drawMergedLines(Twips rowTop, Twips rowBottom, bool pageIsFull);
     void breakPage(Twips footerTop);
+    void requireAnotherPage() const;
     void drawLine(Tpoint from, Tpoint to);
     TextView textOf(int field) const { return cells_[static_cast<std::size_t>(field)].text; }
     bool isBlankedByMerging(int field);

@@ -5,6 +5,7 @@
 
 #include "document/recorder.h"
 #include "platform/numbers.h"
+#include "platform/run_time_error.h"
 #include "platform/services.h"
 #include "report/report_style.h"
 
@@ -55,6 +56,18 @@ struct SlotLine {
     Twips y; ///< twips
 };
 
+/// @throws RunTimeError Overflow: the settings hold no colour
+Color inkOf(const ColoredFont& font)
+{
+    try {
+        return roundToInt32(font.color);
+    } catch (const RunTimeError& error) {
+        throw RunTimeError(error.number(),
+            u"the colour " + formatNumber(font.color) + u" of the font " + font.font.name
+                + u" is not between 0 and 16777215");
+    }
+}
+
 /// Draws the slots that are not empty.
 /// @return whether there was one
 bool drawSlots(const SlotLine& line, const ReportStyle& style, const PageSetup& setup,
@@ -64,7 +77,7 @@ bool drawSlots(const SlotLine& line, const ReportStyle& style, const PageSetup& 
         return hasPageField(text) ? expandPageField(text, line.page, clock) : text;
     };
     const auto& [left, centre, right] = line.texts;
-    recorder.setTextFont(line.font.font, roundToInt32(line.font.color));
+    recorder.setTextFont(line.font.font, inkOf(line.font));
     if (!left.empty()) {
         recorder.moveTo({ setup.intLeft, line.y });
         recorder.printText(output(left), true);
@@ -78,7 +91,7 @@ bool drawSlots(const SlotLine& line, const ReportStyle& style, const PageSetup& 
         recorder.moveTo({ setup.intLeft + 9 * style.printableWidthTenth, line.y });
         recorder.printText(output(right), true);
     }
-    recorder.setTextFont(style.body.font, roundToInt32(style.body.color));
+    recorder.setTextFont(style.body.font, inkOf(style.body));
     return !left.empty() || !centre.empty() || !right.empty();
 }
 

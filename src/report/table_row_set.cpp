@@ -154,7 +154,8 @@ std::size_t TableRowSet::memoryBytes() const
 TextView TableRowSet::fieldName(int field) const
 {
     if (field < 0 || field >= fieldCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
     return names_[static_cast<std::size_t>(field)];
 }
 
@@ -165,8 +166,12 @@ void TableRowSet::setPosition(std::int64_t position)
 
 Value TableRowSet::value(int field)
 {
-    if (field < 0 || field >= fieldCount() || isBeforeFirst() || isAfterLast())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    if (field < 0 || field >= fieldCount())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
+    if (isBeforeFirst() || isAfterLast())
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, records_));
     const auto record = static_cast<std::size_t>(position_ - 1);
     return valueOf(cells_[record * names_.size() + static_cast<std::size_t>(field)]);
 }

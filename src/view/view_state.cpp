@@ -213,7 +213,8 @@ void showPage(ViewState& view, const PageFacts& facts)
         return;
     view.style = OrderStyle::One;
     if (!existing(facts, facts.currentPage))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"page", std::int64_t { facts.currentPage } + 1, facts.Totalpages));
     view.shownPage = facts.currentPage;
     endArrangement(view);
     view.baseVisible = true;
@@ -278,7 +279,7 @@ void zoomIn(ViewState& view, const PageFacts& facts)
 {
     const float divisor = view.divisor + view.divisor;
     if (!std::isfinite(divisor))
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(ErrorNumber::Overflow, u"the pages cannot be shown any smaller");
     view.divisor = divisor;
     layOutAgain(view, facts);
 }
@@ -292,10 +293,11 @@ void zoomOut(ViewState& view, const PageFacts& facts)
 void setDispScale(ViewState& view, const PageFacts& facts, float scale)
 {
     if (scale == 0)
-        throw RunTimeError(ErrorNumber::DivisionByZero);
+        throw RunTimeError(ErrorNumber::DivisionByZero, u"a scale of 0 shows nothing");
     const float divisor = 1 / scale;
     if (!std::isfinite(divisor))
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(
+            ErrorNumber::Overflow, u"a scale of " + formatSingle(scale) + u" is too small");
     view.divisor = divisor;
     layOutAgain(view, facts);
 }

@@ -85,7 +85,7 @@ void Kestrane::doPreview(std::unique_ptr<AutomationObject> PrintObj)
 {
     calls_.run([&] {
         if (!PrintObj)
-            throw RunTimeError(ErrorNumber::ObjectMissing);
+            throw RunTimeError(ErrorNumber::ObjectMissing, u"doPreview was given no grid");
         facade_.doPreview(std::move(PrintObj));
     });
 }
@@ -94,7 +94,7 @@ void Kestrane::doPreview(QObject* PrintObj)
 {
     calls_.run([&] {
         if (!PrintObj)
-            throw RunTimeError(ErrorNumber::ObjectMissing);
+            throw RunTimeError(ErrorNumber::ObjectMissing, u"doPreview was given no grid");
         facade_.doPreview(gridFor(*PrintObj));
     });
 }

@@ -19,7 +19,15 @@ namespace pelloric::qt {
 
 namespace {
 
-[[noreturn]] void refuseType() { throw RunTimeError(ErrorNumber::TypeMismatch); }
+/// @param wanted  what the member takes
+[[noreturn]] void refuseType(const QVariant& argument, TextView wanted)
+{
+    const bool isText = argument.typeId() == QMetaType::QString;
+    const QString given = isText ? QStringLiteral("\"%1\"").arg(argument.toString())
+                                 : QString::fromLatin1(argument.metaType().name());
+    throw RunTimeError(
+        ErrorNumber::TypeMismatch, toText(given) + u" was given where " + Text(wanted));
+}
 
 bool isScriptValue(const QVariant& argument)
 {
@@ -58,7 +66,7 @@ Value simple(const QVariant& argument, HeldValue& held)
     }
     if (value.metaType().flags() & QMetaType::IsEnumeration)
         return Value::ofNumber(value.toInt());
-    refuseType();
+    refuseType(value, u"a plain value is wanted");
 }
 
 double numberOf(const QVariant& argument)
@@ -66,7 +74,7 @@ double numberOf(const QVariant& argument)
     HeldValue held;
     const Value value = simple(argument, held);
     if (value.kind() == ValueKind::Text && !isNumber(value.text()))
-        refuseType();
+        refuseType(plain(argument), u"a number is wanted");
     return value.toNumber();
 }
 
@@ -80,7 +88,7 @@ float toSingle(const QVariant& argument)
 {
     const double number = numberOf(argument);
     if (!(std::abs(number) <= static_cast<double>(std::numeric_limits<float>::max())))
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(ErrorNumber::Overflow, pastSingle(number));
     return static_cast<float>(number);
 }
 
@@ -106,12 +114,12 @@ std::unique_ptr<AutomationObject> toGrid(const QVariant& argument, const QObject
         return scriptCaller()->object(argument, control);
     const QVariant value = plain(argument);
     if (value.typeId() == QMetaType::Nullptr)
-        throw RunTimeError(ErrorNumber::ObjectMissing);
+        throw RunTimeError(ErrorNumber::ObjectMissing, u"no grid was given");
     if (!(value.metaType().flags() & QMetaType::PointerToQObject))
-        refuseType();
+        refuseType(value, u"a grid is wanted");
     auto* const object = value.value<QObject*>();
     if (!object)
-        throw RunTimeError(ErrorNumber::ObjectMissing);
+        throw RunTimeError(ErrorNumber::ObjectMissing, u"no grid was given");
     return gridFor(*object);
 }
 

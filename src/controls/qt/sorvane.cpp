@@ -48,7 +48,7 @@ std::filesystem::path pathOf(const QString& path) { return std::filesystem::path
 QObject& objectOf(QObject* object)
 {
     if (!object)
-        throw RunTimeError(ErrorNumber::ObjectMissing);
+        throw RunTimeError(ErrorNumber::ObjectMissing, u"no grid was given");
     return *object;
 }
 

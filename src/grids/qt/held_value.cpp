@@ -28,7 +28,8 @@ double wholeIn(double number, double smallest, double largest)
 {
     const double rounded = roundHalfEven(number);
     if (!(rounded >= smallest && rounded <= largest))
-        throw RunTimeError(ErrorNumber::Overflow);
+        throw RunTimeError(
+            ErrorNumber::Overflow, formatNumber(number) + u" is past what the member holds");
     return rounded;
 }
 
@@ -65,7 +66,7 @@ QVariant plainVariant(const Value& value)
     case ValueKind::Rows:
         break;
     }
-    throw RunTimeError(ErrorNumber::TypeMismatch);
+    throw RunTimeError(ErrorNumber::TypeMismatch, u"an object is no plain value");
 }
 
 } // namespace
@@ -142,7 +143,9 @@ QVariant toVariant(const Value& value, QMetaType type)
     }
     QVariant variant = plainVariant(value);
     if (type.id() != QMetaType::QVariant && variant.metaType() != type && !variant.convert(type))
-        throw RunTimeError(ErrorNumber::TypeMismatch);
+        throw RunTimeError(ErrorNumber::TypeMismatch,
+            toText(QStringLiteral("\"%1\" is no %2")
+                       .arg(plainVariant(value).toString(), QLatin1String(type.name()))));
     return variant;
 }
 

@@ -34,7 +34,8 @@ void ModelRowSet::take(
 TextView ModelRowSet::fieldName(int field) const
 {
     if (field < 0 || field >= columns_.count())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"column", std::int64_t { field } + 1, columns_.count()));
     return viewOf(names_[field]);
 }
 
@@ -48,8 +49,12 @@ Value ModelRowSet::value(int field)
     if (!model_)
         throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid's model is gone");
     const bool isField = field >= 0 && field < columns_.count();
-    if (!isField || isBeforeFirst() || isAfterLast())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    if (!isField)
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"column", std::int64_t { field } + 1, columns_.count()));
+    if (isBeforeFirst() || isAfterLast())
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, recordCount()));
     const int row = rows_.logical(static_cast<int>(position_ - 1));
     if (row >= model_->rowCount(root_))
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the grid has lost rows");

@@ -99,7 +99,8 @@ std::optional<MemberId> ObjectClass::find(const QByteArray& name)
 const ObjectMember& ObjectClass::member(MemberId member)
 {
     if (member < 0 || static_cast<std::size_t>(member) >= members_.size())
-        throw RunTimeError(ErrorNumber::NoSuchMember);
+        throw RunTimeError(ErrorNumber::NoSuchMember,
+            noSuchItem(u"member number", member, static_cast<std::int64_t>(members_.size())));
     auto& known = members_[static_cast<std::size_t>(member)];
     if (!known)
         known = describe(nameOf(member));

@@ -45,7 +45,7 @@ public:
     {
         const auto value = argument.value<QJSValue>();
         if (value.isQObject() && value.toQObject() == nullptr)
-            throw RunTimeError(ErrorNumber::ObjectMissing);
+            throw RunTimeError(ErrorNumber::ObjectMissing, u"the object is gone");
         return objectOfScript(value, qjsEngine(&control));
     }
 

@@ -38,7 +38,8 @@ QJSValue toScript(const Value& value)
     case ValueKind::Rows:
         break;
     }
-    throw RunTimeError(ErrorNumber::TypeMismatch);
+    throw RunTimeError(
+        ErrorNumber::TypeMismatch, u"an object of the library cannot be handed to a script's grid");
 }
 
 bool isPlain(const QJSValue& value)
@@ -189,7 +190,9 @@ QJSValue ScriptObject::itemAt(const QJSValue& array, const Value& index, int fir
         throw RunTimeError(ErrorNumber::NoSuchMember, u"only an array takes an index");
     const int position = roundToInt32(index.toNumber()) - first;
     if (position < 0 || position >= array.property(QStringLiteral("length")).toInt())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"item", std::int64_t { position } + first,
+                array.property(QStringLiteral("length")).toInt()));
     return array.property(static_cast<quint32>(position));
 }
 
