@@ -4,6 +4,7 @@
 #pragma once
 
 #include "document/page_records.h"
+#include "document/page_structure.h"
 #include "document/records.h"
 #include "document/text_store.h"
 
@@ -44,6 +45,9 @@ public:
 
     /// The page that is recorded on; may point past the real pages when a host said so.
     std::int16_t currentPage = 0;
+
+    /// What the texts of the pages are, as far as it is known.
+    PageStructure structure;
 
     /// The number of pages that exist.
     int pageCount() const { return static_cast<int>(pages_.size()); }

@@ -229,6 +229,7 @@ void Recorder::record(TextView stored)
     applyTextFont();
     document_.append(TextRecord {
         point_, stored.data(), static_cast<std::uint32_t>(stored.size()), styleNumber_ });
+    document_.structure.addText(document_.currentPage);
     if (surface_ != nullptr)
         surface_->print(stored);
 }

@@ -131,6 +131,7 @@ void LayoutEngine::drawTitleTexts(Twips top)
     for (const BandColumn& column : columns_) {
         if (!column.isPrinted)
             continue;
+        document_.structure.beginCell(column.field);
         const TextView title = titles_[static_cast<std::size_t>(column.field)];
         const double left = column.left + Padding;
         const double room = column.width - CellPadding;
@@ -146,6 +147,7 @@ void LayoutEngine::drawTitleTexts(Twips top)
         recorder_.moveTo({ roundToInt32(left), below(top, Padding) });
         recorder_.printLines(rowLines_, left, column.width);
     }
+    document_.structure.endTitles(document_.currentPage);
 }
 
 /// Places the current record as a row of the band, and ends the page where it is full.
@@ -240,9 +242,13 @@ void LayoutEngine::printRow(Twips rowTop)
 {
     const Twips textTop = below(rowTop, Padding);
     for (const BandColumn& column : columns_) {
-        if (column.isPrinted && !(source_.style.GridMerge && isBlankedByMerging(column.field)))
+        if (!column.isPrinted)
+            continue;
+        document_.structure.beginCell(column.field);
+        if (!(source_.style.GridMerge && isBlankedByMerging(column.field)))
             printCell(column, textTop);
     }
+    document_.structure.endRow(document_.currentPage);
 }
 
 void LayoutEngine::printCell(const BandColumn& column, Twips textTop)
