@@ -3,19 +3,44 @@
 
 #include "view/joined_lines.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace pelloric {
 
 namespace {
 
-std::uint64_t keyOf(Tpoint point)
-{
-    return (std::uint64_t { static_cast<std::uint32_t>(point.x) } << 32U)
-        | static_cast<std::uint32_t>(point.y);
-}
+/// Ends looked at before a segment begins anew.
+constexpr std::size_t MostSteps = 64;
 
 } // namespace
+
+std::optional<std::size_t> JoinedLines::Ends::move(Tpoint end, Tpoint newEnd)
+{
+    const std::size_t steps = std::min(ends_.size(), MostSteps);
+    std::size_t at = next_;
+    for (std::size_t step = 0; step < steps; ++step, ++at) {
+        at = at < ends_.size() ? at : 0;
+        if (ends_[at].point == end) {
+            ends_[at].point = newEnd;
+            next_ = at + 1;
+            return ends_[at].segment;
+        }
+    }
+    return {};
+}
+
+void JoinedLines::Ends::add(Tpoint end, std::size_t segment)
+{
+    ends_.push_back({ end, segment });
+    next_ = ends_.size();
+}
+
+void JoinedLines::Ends::clear()
+{
+    ends_.clear();
+    next_ = 0;
+}
 
 JoinedLines::JoinedLines(DrawingSurface& target)
     : target_(target)
@@ -99,16 +124,12 @@ void JoinedLines::usePen(const Pen& pen)
 
 void JoinedLines::hold(Tpoint from, Tpoint to, Ends& ends)
 {
-    std::size_t at = held_.size();
-    const auto before = ends.find(keyOf(from));
-    if (before != ends.end()) {
-        at = before->second;
-        held_[at].to = to;
-        ends.erase(before);
-    } else {
-        held_.push_back({ from, to });
+    if (const auto before = ends.move(from, to)) {
+        held_[*before].to = to;
+        return;
     }
-    ends[keyOf(to)] = at;
+    ends.add(to, held_.size());
+    held_.push_back({ from, to });
 }
 
 void JoinedLines::beforeDrawing()

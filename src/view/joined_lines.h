@@ -6,7 +6,7 @@
 #include "platform/drawing_surface.h"
 
 #include <cstddef>
-#include <unordered_map>
+#include <optional>
 #include <vector>
 
 namespace pelloric {
@@ -56,8 +56,27 @@ private:
         Tpoint to;
     };
 
-    /// Segments by the point where they end.
-    using Ends = std::unordered_map<std::uint64_t, std::size_t>;
+    /// The points where segments end, in the order in which they came.
+    ///
+    /// The rows of a table have their lines in the same order, so that the end that is looked for
+    /// is mostly the one behind the last that was found; one far away is given up.
+    class Ends {
+    public:
+        /// The segment that ends at a point; its end is then another.
+        std::optional<std::size_t> move(Tpoint end, Tpoint newEnd);
+
+        void add(Tpoint end, std::size_t segment);
+        void clear();
+
+    private:
+        struct End {
+            Tpoint point;
+            std::size_t segment;
+        };
+
+        std::vector<End> ends_;
+        std::size_t next_ = 0;
+    };
 
     void usePen(const Pen& pen);
     void hold(Tpoint from, Tpoint to, Ends& ends);
