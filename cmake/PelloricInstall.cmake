@@ -28,7 +28,9 @@ if(TARGET pelloric)
             DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/pelloric/${room}/qt"
             FILES_MATCHING PATTERN "*.h")
     endforeach()
-    install(FILES "${PROJECT_SOURCE_DIR}/cmake/FindLibZip.cmake"
+    install(FILES "${PROJECT_SOURCE_DIR}/cmake/FindHarfBuzzSubset.cmake"
+        "${PROJECT_SOURCE_DIR}/cmake/FindLibDeflate.cmake"
+        "${PROJECT_SOURCE_DIR}/cmake/FindLibZip.cmake"
         "${PROJECT_SOURCE_DIR}/cmake/FindUchardet.cmake" DESTINATION "${PELLORIC_PACKAGE_DIR}")
 endif()
 if(TARGET pelloric_app)

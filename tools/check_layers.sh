@@ -8,7 +8,7 @@ set -euo pipefail
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
 # In the order of their dependencies.
-Rooms=(platform settings document grids tables report view print export controls ui script)
+Rooms=(platform settings document grids tables report view export print controls ui script)
 
 found=0
 

@@ -15,8 +15,10 @@ PackagesBuild=(
     fonts-dejavu-core
     g++
     libcups2-dev
+    libdeflate-dev
     libgmock-dev
     libgtest-dev
+    libharfbuzz-dev
     libpng-dev
     libqt6sql6-sqlite
     libuchardet-dev
@@ -34,11 +36,15 @@ PackagesTest=(
     cups-client
     cups-daemon
     fontconfig
+    ghostscript
     imagemagick
     librsvg2-bin
+    mupdf-tools
     openbox
     poppler-utils
     python3
+    python3-pikepdf
+    qpdf
     sqlite3
     x11-apps
     x11-utils

@@ -43,6 +43,9 @@ constexpr auto Options = std::to_array<Option>({
     { "pages", "LIST", "only these pages: 1,3,5-12" },
     { "dpi", "N", "pixels an inch of .png images (150)" },
     { "jobs", "N", "pages of .png images made at a time (one for each processor)" },
+    { "tagged", nullptr, "a .pdf file that says its tables, for readers who do not see it" },
+    { "pdfa", nullptr, "a .pdf file for archives (PDF/A-2b)" },
+    { "language", "TAG", "of the texts of a .pdf file: zh-CN (the locale's)" },
 });
 
 /// The name that stands for the standard output.
@@ -63,7 +66,11 @@ struct Export {
 
 void writePdf(const Export& job)
 {
-    qt::exportPdf(job.document, job.setup, job.platform.fonts(), job.options, job.path);
+    const qt::PdfExport made
+        = qt::exportPdf(job.document, job.setup, job.platform.fonts(), job.options, job.path);
+    if (!made.byToolkitBecause.empty())
+        tell(QStringLiteral("%1; its characters are drawn as shapes")
+                 .arg(qt::toQString(made.byToolkitBecause)));
 }
 
 void writePngs(const Export& job)
@@ -94,13 +101,14 @@ struct Format {
     void (*write)(const Export& job);
     bool takesPages;
     bool takesDpi;
+    bool isPdf;
 };
 
 constexpr auto Formats = std::to_array<Format>({
-    { "pdf", writePdf, true, false },
-    { "png", writePngs, true, true },
-    { "svg", writeSvg, true, false },
-    { "ostl", writeDocument, false, false },
+    { "pdf", writePdf, true, false, true },
+    { "png", writePngs, true, true, false },
+    { "svg", writeSvg, true, false, false },
+    { "ostl", writeDocument, false, false, false },
 });
 
 const Format* findFormat(const QString& name)
@@ -166,6 +174,12 @@ struct Order {
             throw CommandError(QStringLiteral("--jobs is for .png images"), WrongUsage);
         if (line.has("jobs"))
             jobs = static_cast<int>(numberOf("jobs", line.value("jobs"), 1, MostJobs, true));
+        for (const char* const option : { "tagged", "pdfa", "language" }) {
+            if (line.has(option) && !format->isPdf)
+                throw CommandError(
+                    QStringLiteral("--%1 is for .pdf files").arg(QLatin1String(option)),
+                    WrongUsage);
+        }
         if (line.has("dpi"))
             dpi = static_cast<int>(numberOf("dpi", line.value("dpi"), LeastDpi, MostDpi, true));
         if (out == StandardOutput && line.has("json"))
@@ -223,6 +237,9 @@ void write(const Order& order, const CommandLine& line, const Laid& laid, const 
     options.pages = pagesOf(line.value("pages"), laid.document.Totalpages);
     options.dpi = order.dpi;
     options.jobs = order.jobs;
+    options.isTagged = line.has("tagged");
+    options.isArchive = line.has("pdfa");
+    options.language = qt::toText(line.value("language"));
     options.title = qt::toText(line.has("title") ? line.value("title") : title);
     options.progress = [&](int done, int total) {
         progress.show("Writing", static_cast<double>(done) / std::max(1, total));

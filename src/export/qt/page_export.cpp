@@ -5,7 +5,7 @@
 
 #include "document/ostl_writer.h"
 #include "document/page_document.h"
-#include "export/qt/exact_page_device.h"
+#include "export/qt/export_parts.h"
 #include "export/qt/page_workers.h"
 #include "export/qt/pending_files.h"
 #include "export/qt/png_bytes.h"
@@ -25,7 +25,6 @@
 
 #include <algorithm>
 #include <memory>
-#include <numeric>
 #include <string>
 
 namespace pelloric::qt {
@@ -33,37 +32,15 @@ namespace pelloric::qt {
 namespace {
 
 constexpr double TwipsPerInch = 1440;
+constexpr Twips TwipsPerPoint = 20;
 constexpr double InchesPerMetre = 1 / 0.0254;
 
 /// A cosmetic line of a PDF is one pixel of this resolution wide: fine, and seen everywhere.
 constexpr int PdfResolution = 600;
 
-constexpr Twips LargestPaper = 288000; ///< 200 inches, which is all that a PDF page can measure
 constexpr double MostPixels = 1U << 28U;
 
 constexpr std::size_t FewestDigits = 3; ///< of the page number in a file's name
-
-void checkPaper(const PageSetup& setup)
-{
-    const auto fits = [](Twips length) { return length > 0 && length <= LargestPaper; };
-    if (!fits(setup.myWidth) || !fits(setup.myHeight))
-        throw RunTimeError(ErrorNumber::Overflow, u"the paper is no size that can be written");
-}
-
-/// The pages to put out, all of which exist.
-std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& options)
-{
-    std::vector<int> pages = options.pages;
-    if (pages.empty()) {
-        pages.resize(static_cast<std::size_t>(
-            std::clamp<int>(document.Totalpages, 0, document.pageCount())));
-        std::iota(pages.begin(), pages.end(), 0);
-    }
-    const auto isMissing = [&](int page) { return !document.hasPage(page); };
-    if (pages.empty() || std::ranges::any_of(pages, isMissing))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"there is no such page");
-    return pages;
-}
 
 /// The same, each page once.
 std::vector<int> differentPagesOf(const PageDocument& document, const ExportOptions& options)
@@ -76,12 +53,6 @@ std::vector<int> differentPagesOf(const PageDocument& document, const ExportOpti
         isTaken[static_cast<std::size_t>(page)] = true;
     }
     return pages;
-}
-
-void tell(const ExportOptions& options, std::size_t done, std::size_t total)
-{
-    if (options.progress && !options.progress(static_cast<int>(done), static_cast<int>(total)))
-        throw RunTimeError(ErrorNumber::Cancelled);
 }
 
 /// Draws pages of a document on painters.
@@ -146,10 +117,12 @@ private:
     QImage image_;
 };
 
+/// The toolkit's pages measure whole points.
+int wholePoints(Twips length) { return (length + TwipsPerPoint - 1) / TwipsPerPoint; }
+
 void setUpPdf(QPdfWriter& writer, const PageSetup& setup, const Text& title)
 {
-    const QSizeF points(
-        ExactPageDevice::wholePoints(setup.myWidth), ExactPageDevice::wholePoints(setup.myHeight));
+    const QSizeF points(wholePoints(setup.myWidth), wholePoints(setup.myHeight));
     const QPageSize size(points, QPageSize::Point, QStringLiteral("Paper"), QPageSize::ExactMatch);
     writer.setResolution(PdfResolution);
     writer.setPageLayout(QPageLayout(size, QPageLayout::Portrait, QMarginsF()));
@@ -198,7 +171,7 @@ QSize pixelsOf(const PageSetup& setup, int dpi)
 
 } // namespace
 
-void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fonts,
+void exportPdfByToolkit(const PageDocument& document, const PageSetup& setup, QtFonts& fonts,
     const ExportOptions& options, const std::filesystem::path& path)
 {
     checkPaper(setup);
@@ -206,8 +179,7 @@ void exportPdf(const PageDocument& document, const PageSetup& setup, QtFonts& fo
     const PagePainter pagePainter(document, setup, fonts);
     PendingFiles files;
     files.write(path, [&](QFile& file) {
-        ExactPageDevice device(file, setup.myWidth, setup.myHeight);
-        QPdfWriter writer(&device);
+        QPdfWriter writer(&file);
         setUpPdf(writer, setup, options.title);
         QPainter painter;
         for (std::size_t done = 0; done < pages.size(); ++done) {

@@ -7,7 +7,8 @@
 #include "platform/qt/qt_text.h"
 #include "print/qt/print_test.h"
 #include "settings/default_settings.h"
-#include "support/test_paths.h"
+#include "support/qt/pictures.h"
+#include "support/qt/sample_grids.h"
 #include "view/page_renderer.h"
 
 #include <QFile>
@@ -22,61 +23,9 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr int Dpi = 150;
-
-/// Shades that differ by less are the same ink, drawn by another anti-aliasing.
-constexpr int SameShade = 96;
-
-/// Darker than this is ink; the thinnest lines on paper are grey.
-constexpr int InkShade = 224;
-
-struct Sample {
-    const char* file;
-    QChar separator;
-};
-
 /// The margins of the printer's A4 paper: points.
 constexpr double LeftMargin = 18;
 constexpr double TopMargin = 30;
-
-std::ostream& operator<<(std::ostream& stream, const Sample& sample)
-{
-    return stream << sample.file;
-}
-
-/// The cells of a line; a cell in double quotes may hold the separator.
-std::vector<Text> cellsOf(const QString& line, QChar separator)
-{
-    std::vector<Text> cells(1);
-    bool isQuoted = false;
-    for (const QChar character : line) {
-        if (character == u'"')
-            isQuoted = !isQuoted;
-        else if (character == separator && !isQuoted)
-            cells.emplace_back();
-        else
-            cells.back().push_back(character.unicode());
-    }
-    return cells;
-}
-
-TableGrid gridOf(const Sample& sample)
-{
-    QFile file(QString::fromUtf8(PELLORIC_TESTS_DIR "/../samples/") + QLatin1String(sample.file));
-    EXPECT_TRUE(file.open(QIODevice::ReadOnly));
-    QStringList lines = QString::fromUtf8(file.readAll()).remove(u'\r').split(u'\n');
-    std::vector<TableColumn> columns;
-    for (const Text& title : cellsOf(lines.takeFirst(), sample.separator))
-        columns.push_back({ title, 1600 });
-    TableGrid grid(columns);
-    for (const QString& line : lines) {
-        if (line.isEmpty())
-            continue;
-        const std::vector<Text> cells = cellsOf(line, sample.separator);
-        grid.addRow(std::vector<TextView>(cells.begin(), cells.end()));
-    }
-    return grid;
-}
 
 /// The page as a screen of that size shows it, set in by the margins of the paper.
 QImage screenPicture(const PageDocument& document, int page, QSize size, QtFonts& fonts)
@@ -89,60 +38,6 @@ QImage screenPicture(const PageDocument& document, int page, QSize size, QtFonts
     QtDrawingSurface surface(painter, fonts);
     PageRenderer(document).replay(page, {}, surface);
     return image.convertToFormat(QImage::Format_Grayscale8);
-}
-
-QImage paperPicture(const QString& document, const QString& folder)
-{
-    const QString file = folder + QStringLiteral("/page");
-    const ProgramResult result = runProgram(QStringLiteral("pdftoppm"),
-        { QStringLiteral("-r"), QString::number(Dpi), QStringLiteral("-png"),
-            QStringLiteral("-singlefile"), document, file });
-    EXPECT_EQ(result.status, 0) << result.errors.toStdString();
-    return QImage(file + QStringLiteral(".png")).convertToFormat(QImage::Format_Grayscale8);
-}
-
-int shadeAt(const QImage& image, int x, int y) { return image.constScanLine(y)[x]; }
-
-QRect inkOf(const QImage& image)
-{
-    QRect ink;
-    for (int y = 0; y < image.height(); ++y) {
-        for (int x = 0; x < image.width(); ++x) {
-            if (shadeAt(image, x, y) < InkShade)
-                ink |= QRect(x, y, 1, 1);
-        }
-    }
-    return ink;
-}
-
-/// Whether a pixel of one picture is found in the other within a pixel's distance.
-bool isFound(const QImage& one, const QImage& other, int x, int y)
-{
-    const int shade = shadeAt(one, x, y);
-    for (int nearY = std::max(0, y - 1); nearY <= std::min(one.height() - 1, y + 1); ++nearY) {
-        for (int nearX = std::max(0, x - 1); nearX <= std::min(one.width() - 1, x + 1); ++nearX) {
-            if (std::abs(shadeAt(other, nearX, nearY) - shade) < SameShade)
-                return true;
-        }
-    }
-    return false;
-}
-
-/// The part of all pixels that one picture has and the other has not.
-double differenceOf(const QImage& one, const QImage& other)
-{
-    int different = 0;
-    for (int y = 0; y < one.height(); ++y) {
-        for (int x = 0; x < one.width(); ++x)
-            different += isFound(one, other, x, y) && isFound(other, one, x, y) ? 0 : 1;
-    }
-    return static_cast<double>(different) / (one.width() * one.height());
-}
-
-int farthestEdge(const QRect& one, const QRect& other)
-{
-    return std::max({ std::abs(one.left() - other.left()), std::abs(one.top() - other.top()),
-        std::abs(one.right() - other.right()), std::abs(one.bottom() - other.bottom()) });
 }
 
 class PreviewEqualsPrint : public PrintTest, public testing::WithParamInterface<Sample> {

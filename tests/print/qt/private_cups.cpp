@@ -20,7 +20,6 @@ namespace pelloric::qt {
 namespace {
 
 constexpr int StartMs = 10000;
-constexpr int LongestRunMs = 60000;
 constexpr int JobsMs = 60000;
 constexpr int PauseMs = 30;
 
@@ -40,16 +39,6 @@ SpooledJob jobOf(const QString& line)
 }
 
 } // namespace
-
-ProgramResult runProgram(const QString& program, const QStringList& arguments)
-{
-    QProcess process;
-    process.start(program, arguments);
-    if (!process.waitForFinished(LongestRunMs) || process.exitStatus() != QProcess::NormalExit)
-        return { -1, {}, program + QStringLiteral(": ") + process.errorString() };
-    return { process.exitCode(), QString::fromUtf8(process.readAllStandardOutput()),
-        QString::fromUtf8(process.readAllStandardError()) };
-}
 
 PrivateCups::PrivateCups(int fileKib)
 {

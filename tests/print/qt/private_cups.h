@@ -4,26 +4,15 @@
 #pragma once
 
 #include "fakes/temp_folder.h"
+#include "support/qt/run_program.h"
 
 #include <QByteArray>
 #include <QProcess>
-#include <QString>
-#include <QStringList>
 
 #include <string>
 #include <vector>
 
 namespace pelloric::qt {
-
-/// What a program that has ended left behind.
-struct ProgramResult {
-    int status = -1; ///< exit status; -1: it did not run to its end
-    QString output; ///< standard output
-    QString errors; ///< standard error
-};
-
-/// Runs a program to its end, a minute at most.
-ProgramResult runProgram(const QString& program, const QStringList& arguments);
 
 /// A job as the scheduler logged it.
 struct SpooledJob {

@@ -1,0 +1,292 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "export/pdf_surface.h"
+
+#include "export/pdf_hatches.h"
+#include "export/pdf_pictures.h"
+#include "export/pdf_tags.h"
+#include "platform/text_metrics.h"
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+namespace pelloric::pdf {
+
+namespace {
+
+constexpr double TwipsPerPoint = 20;
+constexpr std::int64_t Hundred = 100;
+
+/// Past this an em tells nothing on any paper.
+constexpr double LargestEm = 1e6;
+
+constexpr Color White = rgb(255, 255, 255);
+
+constexpr std::int16_t NoPen = 5;
+
+constexpr auto Dashes = std::to_array<std::uint8_t>({ 4, 2 });
+constexpr auto Dots = std::to_array<std::uint8_t>({ 1, 2 });
+constexpr auto DashDots = std::to_array<std::uint8_t>({ 4, 2, 1, 2 });
+constexpr auto DashDotDots = std::to_array<std::uint8_t>({ 4, 2, 1, 2, 1, 2 });
+
+/// By draw style.
+constexpr auto DashPatterns = std::to_array<std::span<const std::uint8_t>>(
+    { {}, Dashes, Dots, DashDots, DashDotDots, {}, {} });
+
+std::int64_t hundredths(double twips)
+{
+    return static_cast<std::int64_t>(std::nearbyint(twips * Hundred));
+}
+
+double emOf(float size)
+{
+    const double em = static_cast<double>(size) * TwipsPerPoint;
+    return em > 0 ? std::min(em, LargestEm) : 0;
+}
+
+} // namespace
+
+PdfSurface::PdfSurface(
+    PdfContent& content, GlyphFaces& faces, PdfFonts& fonts, PdfPictures& pictures)
+    : content_(content)
+    , faces_(faces)
+    , fonts_(fonts)
+    , pictures_(pictures)
+{
+}
+
+void PdfSurface::setFontName(TextView name)
+{
+    if (fontName_ == name)
+        return;
+    fontName_ = name;
+    isFontStale_ = true;
+}
+
+void PdfSurface::setFontSize(float size)
+{
+    isFontStale_ = isFontStale_ || fontSize_ != size;
+    fontSize_ = size;
+}
+
+void PdfSurface::setFontBold(bool bold)
+{
+    isFontStale_ = isFontStale_ || bold_ != bold;
+    bold_ = bold;
+}
+
+void PdfSurface::setFontItalic(bool italic)
+{
+    isFontStale_ = isFontStale_ || italic_ != italic;
+    italic_ = italic;
+}
+
+/// A line without length is a dot as wide as the pen; readers leave out what has no length at all.
+void PdfSurface::line(Tpoint from, Tpoint to)
+{
+    current_ = to;
+    if (!hasPen())
+        return;
+    announceShape();
+    ContentPen pen = penOf(foreColor_);
+    ContentPoint end = pointOf(to);
+    if (from == to) {
+        pen.dashes = {};
+        --end.y;
+    }
+    content_.line(pointOf(from), end, pen);
+}
+
+void PdfSurface::box(Tpoint corner, Tpoint opposite, Color outline)
+{
+    current_ = opposite;
+    const ContentPen pen = penOf(outline);
+    const ContentPen* const outlined = hasPen() ? &pen : nullptr;
+    announceShape();
+    if (fillStyle_ != TransparentFill)
+        content_.box(
+            pointOf(corner), pointOf(opposite), fillColor_, hatchName(fillStyle_), outlined);
+    else if (outlined)
+        content_.frame(pointOf(corner), pointOf(opposite), pen);
+}
+
+void PdfSurface::print(TextView text)
+{
+    takeFont();
+    if (tags_)
+        tags_->beforeText();
+    if (!text.empty() && em_ > 0)
+        drawText(text);
+    constexpr std::int64_t Lowest = std::numeric_limits<Twips>::max();
+    const std::int64_t below
+        = current_.y + std::int64_t { lineHeight_ } * static_cast<std::int64_t>(lineCount(text));
+    current_ = { 0, static_cast<Twips>(std::min(below, Lowest)) };
+}
+
+void PdfSurface::picture(TextView filePath, Tpoint topLeft, Tpoint size)
+{
+    if (size.x <= 0 || size.y <= 0)
+        return;
+    const std::string_view name = pictures_.nameOf(filePath);
+    if (name.empty())
+        return;
+    announceShape();
+    content_.object(
+        name, pointOf({ topLeft.x, topLeft.y + size.y }), { size.x * Hundred, size.y * Hundred });
+}
+
+void PdfSurface::announceShape()
+{
+    if (tags_)
+        tags_->beforeShape();
+}
+
+void PdfSurface::takeFont()
+{
+    if (!isFontStale_)
+        return;
+    isFontStale_ = false;
+    GlyphFace& face = faces_.face(fontName_, bold_, italic_);
+    face_ = &codes_.try_emplace(&face, face, fonts_).first->second;
+    em_ = emOf(fontSize_);
+    ascent_ = hundredths(face.ascent() / TwipsPerPoint * em_);
+    lineHeight_
+        = static_cast<Twips>(std::nearbyint(face.metrics().lineHeight() / TwipsPerPoint * em_));
+}
+
+ContentPoint PdfSurface::pointOf(Tpoint point) const
+{
+    return { (std::int64_t { point.x } + place_.origin.x) * Hundred,
+        (std::int64_t { place_.height } - place_.origin.y - point.y) * Hundred };
+}
+
+/// @param line      of the text, from 0
+/// @param fromLeft  of the text: twips
+ContentPoint PdfSurface::baselineAt(std::size_t line, double fromLeft) const
+{
+    const ContentPoint topLeft = pointOf(current_);
+    const std::int64_t lines = std::int64_t { lineHeight_ } * static_cast<std::int64_t>(line);
+    return { topLeft.x + hundredths(fromLeft), topLeft.y - lines * Hundred - ascent_ };
+}
+
+ContentPen PdfSurface::penOf(Color color) const
+{
+    const auto style = static_cast<std::size_t>(drawStyle_);
+    const bool isKnown = drawStyle_ >= 0 && style < DashPatterns.size();
+    return { .color = color,
+        .width = std::max<int>(1, drawWidth_) * place_.pixel,
+        .dashes = isKnown ? DashPatterns[style] : std::span<const std::uint8_t>() };
+}
+
+bool PdfSurface::hasPen() const { return drawStyle_ != NoPen; }
+
+/// Nearly all texts hold nothing but plain characters.
+void PdfSurface::drawText(TextView text)
+{
+    if (!isFontTransparent_) {
+        announceShape();
+        fillBehind(text);
+        if (tags_)
+            tags_->resumeText();
+    }
+    const auto isPlain = [&](char16_t unit) { return face_->unit(unit).code != 0; };
+    if (std::all_of(text.begin(), text.end(), isPlain)) {
+        drawPlain({ .text = text });
+    } else {
+        cutIntoRuns(text, face_->face().metrics(), runs_);
+        for (const TextRun& run : runs_)
+            drawRun(run);
+    }
+    content_.endText();
+}
+
+void PdfSurface::drawRun(const TextRun& run)
+{
+    if (tags_ && run.kind == RunKind::Box)
+        tags_->beforeShape();
+    else if (tags_)
+        tags_->resumeText();
+    switch (run.kind) {
+    case RunKind::Plain:
+        drawPlain(run);
+        break;
+    case RunKind::Shaped:
+        drawShaped(run);
+        break;
+    case RunKind::Box:
+        drawBox(run);
+        break;
+    }
+    content_.endText();
+}
+
+void PdfSurface::drawPlain(const TextRun& run)
+{
+    const TextState state { .em = em_, .stretch = 1, .color = foreColor_ };
+    content_.moveTo(baselineAt(run.line, toTwips(run.left)));
+    std::uint16_t use = 0;
+    bool isSlanted = false;
+    for (std::size_t at = 0; at < run.text.size();) {
+        const std::size_t here = at;
+        const char16_t unit = run.text[at];
+        const GlyphCode code = isHalfPair(unit) ? face_->character(nextCodePoint(run.text, at))
+                                                : face_->unit(run.text[at++]);
+        if (here == 0 || code.use != use) {
+            // A slant counts from where its text begins.
+            const bool leans = fonts_.use(code.use).drawn.isItalicMadeUp;
+            if (here > 0 && leans != isSlanted) {
+                const double before = face_->face().metrics().advanceOf(run.text.substr(0, here));
+                content_.moveTo(baselineAt(run.line, toTwips(run.left + before)));
+            }
+            isSlanted = leans;
+            use = code.use;
+        }
+        content_.glyph(code, state);
+    }
+}
+
+/// A shaped run keeps within the width that it was measured with.
+void PdfSurface::drawShaped(const TextRun& run)
+{
+    const ShapedText& shaped = face_->face().shaped(run.text);
+    const double width = toTwips(run.advance);
+    const double wanted = shaped.advance * em_;
+    const double stretch = width > 0 && wanted > width ? width / wanted : 1;
+    const TextState state { .em = em_, .stretch = stretch, .color = foreColor_ };
+    for (const ShapedGlyph& glyph : shaped.glyphs) {
+        const GlyphCode code = fonts_.code(glyph.font, glyph.glyph, glyph.meaning);
+        ContentPoint point = baselineAt(run.line, toTwips(run.left) + glyph.x * stretch * em_);
+        point.y += hundredths(glyph.y * em_);
+        content_.moveTo(point);
+        content_.glyph(code, state);
+    }
+}
+
+/// Two rectangles, one within the other, of which only the space between is filled.
+void PdfSurface::drawBox(const TextRun& run)
+{
+    const HollowBox box = hollowBox(toTwips(run.advance), em_);
+    const ContentPoint baseline = baselineAt(run.line, toTwips(run.left));
+    const auto corner = [&](double x, double y) {
+        return ContentPoint { baseline.x + hundredths(x), baseline.y - hundredths(y) };
+    };
+    content_.ring(corner(box.left, box.bottom), corner(box.right, box.top), hundredths(box.stroke),
+        foreColor_);
+}
+
+void PdfSurface::fillBehind(TextView text)
+{
+    const double width = toTwips(longestLineAdvance(text, face_->face().metrics()));
+    const std::int64_t height
+        = std::int64_t { lineHeight_ } * static_cast<std::int64_t>(lineCount(text));
+    const ContentPoint corner = pointOf(current_);
+    content_.box(
+        corner, { corner.x + hundredths(width), corner.y - height * Hundred }, White, {}, nullptr);
+}
+
+/// @param advance  at size 1
+double PdfSurface::toTwips(double advance) const { return advance / TwipsPerPoint * em_; }
+
+} // namespace pelloric::pdf
