@@ -7,40 +7,13 @@
 #include "platform/printer.h"
 #include "platform/run_time_error.h"
 #include "print/page_list.h"
+#include "view/page_renderer.h"
 
 #include <vector>
 
 namespace pelloric {
 
 namespace {
-
-void printLine(const LineRecord& line, const LinePen& pen, Printer& printer)
-{
-    printer.setDrawWidth(pen.LineWidth);
-    printer.setDrawStyle(pen.LineStyle);
-    printer.setForeColor(pen.LineColor);
-    if (pen.FillStyle == TransparentFill) {
-        printer.setFillStyle(TransparentFill);
-        printer.line(line.pt1, line.pt2);
-        return;
-    }
-    printer.setFillColor(pen.FillColor);
-    printer.setFillStyle(pen.FillStyle);
-    printer.box(line.pt1, line.pt2, pen.FillColor);
-}
-
-void printText(const TextRecord& text, const TextStyle& style, TextView filled, Printer& printer)
-{
-    printer.setFontTransparent(true);
-    printer.setFontBold(style.font.bold);
-    printer.setFontItalic(style.font.italic);
-    printer.setFontName(style.font.name);
-    printer.setFontSize(style.font.size);
-    printer.setForeColor(style.color);
-    printer.setCurrentX(text.pt.x);
-    printer.setCurrentY(text.pt.y);
-    printer.print(filled);
-}
 
 void applySettings(Printer& printer, std::int16_t paperSize, std::int16_t orientation)
 {
@@ -112,18 +85,7 @@ std::int64_t printCopies(
 
 void printPage(const PageDocument& document, int page, const Font& defaultFont, Printer& printer)
 {
-    const auto lines = document.lines(page);
-    const auto texts = document.texts(page);
-    printer.setFontName(defaultFont.name);
-    printer.setFontSize(defaultFont.size);
-    for (const LineRecord line : lines)
-        printLine(line, document.pen(line.pen), printer);
-    printer.setFillStyle(TransparentFill);
-    Text buffer;
-    for (const TextRecord text : texts) {
-        const TextView filled = withPageCount(text.text(), document.Totalpages, buffer);
-        printText(text, document.style(text.style), filled, printer);
-    }
+    PageRenderer(document).replay(page, paperReplay(defaultFont), printer);
     printer.endDoc();
 }
 

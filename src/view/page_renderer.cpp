@@ -53,6 +53,16 @@ void drawPicture(const MapLocation& place, DrawingSurface& surface)
 
 } // namespace
 
+ReplayOptions paperReplay(const Font& font)
+{
+    return { .reportFontName = font.name,
+        .reportFontSize = font.size,
+        .isCleared = false,
+        .hasPicture = false,
+        .resetsFill = true,
+        .makesTextsTransparent = true };
+}
+
 PageRenderer::PageRenderer(const PageDocument& document)
     : document_(document)
 {
@@ -62,16 +72,20 @@ void PageRenderer::replay(int page, const ReplayOptions& options, DrawingSurface
 {
     const auto lines = document_.lines(page);
     const auto texts = document_.texts(page);
-    surface.clear();
+    if (options.isCleared)
+        surface.clear();
     surface.setFontName(options.reportFontName);
     surface.setFontSize(options.reportFontSize / options.divisor);
-    if (const MapLocation* place = document_.picture(page))
+    const MapLocation* const place = document_.picture(page);
+    if (place != nullptr && options.hasPicture)
         drawPicture(*place, surface);
     for (const LineRecord line : lines) {
         const LinePen& pen = document_.pen(line.pen);
         if (mayShow(line, pen.LineWidth, options))
             drawLine(line, pen, surface);
     }
+    if (options.resetsFill)
+        surface.setFillStyle(TransparentFill);
     Text buffer;
     for (const TextRecord text : texts) {
         if (mayShow(text, document_.style(text.style).font.size, options))
@@ -100,6 +114,8 @@ void PageRenderer::drawText(const TextRecord& text, const ReplayOptions& options
     DrawingSurface& surface, Text& buffer) const
 {
     const TextStyle& style = document_.style(text.style);
+    if (options.makesTextsTransparent)
+        surface.setFontTransparent(true);
     surface.setFontBold(style.font.bold);
     surface.setFontItalic(style.font.italic);
     surface.setFontName(style.font.name);

@@ -11,6 +11,7 @@
 namespace pelloric {
 
 class DrawingSurface;
+struct Font;
 class PageDocument;
 struct LinePen;
 struct LineRecord;
@@ -27,7 +28,7 @@ struct PageRect {
     bool operator==(const PageRect&) const = default;
 };
 
-/// What differs between the screen, a page window and an image.
+/// What differs between the screen, a page window, an image and paper.
 struct ReplayOptions {
     float divisor = 1; ///< page twips per screen twip, > 0; divides font sizes (points)
     bool fillPageCount = true; ///< replace "[Pages]" by the page count; false in a page window
@@ -35,7 +36,15 @@ struct ReplayOptions {
     float reportFontSize = 20; ///< points, divided like every size
     std::optional<PageRect> visible
         = std::nullopt; ///< the only part that is seen; nothing: all of the page
+    bool isCleared = true; ///< the surface is made blank first
+    bool hasPicture = true; ///< the page's picture is painted
+    bool resetsFill = false; ///< the fill style is transparent again behind the lines
+    bool makesTextsTransparent = false; ///< every text is told to leave what is behind it visible
 };
+
+/// What a printer's page is replayed with: its paper is blank, and pictures are not printed.
+/// @param font  of the printer before the first record
+ReplayOptions paperReplay(const Font& font);
 
 /// Replays the records of a page on a drawing surface: every line, then every text.
 ///
@@ -45,7 +54,7 @@ public:
     /// @param document  the pages to replay; borrowed, must outlive the renderer
     explicit PageRenderer(const PageDocument& document);
 
-    /// Clears the surface and draws one page.
+    /// Draws one page.
     ///
     /// Records that lie outside the visible part altogether may be left out.
     /// @param page     zero-based index
