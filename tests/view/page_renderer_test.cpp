@@ -136,7 +136,7 @@ TEST(PageRenderer, OnPaperClearsNothingPaintsNoPictureAndResetsTheFill)
 {
     PageDocument document;
     addSampleRecords(document);
-    document.placePicture(0, { .strFilePath = u"a.png" });
+    document.placePicture(0, { .nFJBH = {}, .strFilePath = u"a.png" });
     EXPECT_EQ(replayed(document, 0, paperReplay({ .name = u"Face", .size = 11 })),
         "font name Face\nfont size 11\n" + SampleLines + "fill style 1\ntransparent 1\n"
             + SampleText + "print Page 2 of 1, 1\n");
