@@ -161,9 +161,8 @@ void PageDocument::shareStore(std::shared_ptr<TextStore> store)
 
 std::size_t PageDocument::memoryBytes() const
 {
-    std::size_t bytes
-        = pages_.capacity() * sizeof(Page) + patterns_.memoryBytes() + store_->capacityBytes()
-        + structure.memoryBytes();
+    std::size_t bytes = pages_.capacity() * sizeof(Page) + patterns_.memoryBytes()
+        + store_->capacityBytes() + structure.memoryBytes();
     for (const auto& store : earlierStores_)
         bytes += store->capacityBytes();
     for (const Page& page : pages_) {
