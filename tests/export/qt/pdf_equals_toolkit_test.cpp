@@ -125,8 +125,8 @@ public:
     PageSetup setup()
     {
         PageSetup setup;
-        // Whole points, as the toolkit rounds pages up: what stands outside a page is no text.
-        setup.myWidth = 20 * (below(600) + 200);
+        // Whole points, as the toolkit rounds pages up.
+        setup.myWidth = 20 * (below(300) + 700);
         setup.myHeight = 20 * (below(600) + 200);
         return setup;
     }
@@ -142,7 +142,7 @@ public:
             for (int count = 0; count < 6; ++count)
                 addBox(document, setup);
             for (int count = 0; count < 25; ++count)
-                addText(document, point(setup), Texts[pick(Texts.size())], style());
+                addText(document, textPoint(setup), Texts[pick(Texts.size())], style());
         }
         return document;
     }
@@ -152,6 +152,14 @@ private:
     std::size_t pick(std::size_t count) { return random_() % count; }
 
     Tpoint point(const PageSetup& setup) { return { below(setup.myWidth), below(setup.myHeight) }; }
+
+    /// Readers leave out what stands outside of a page, and disagree about its very edge.
+    Tpoint textPoint(const PageSetup& setup)
+    {
+        constexpr Twips LongestText = 11000;
+        constexpr Twips HighestText = 1000;
+        return { below(setup.myWidth - LongestText), below(setup.myHeight - HighestText) };
+    }
 
     Color color() { return rgb(below(256), below(256), below(256)); }
 

@@ -142,7 +142,9 @@ INSTANTIATE_TEST_SUITE_P(Files, TaggedSamples,
 TEST_F(PdfTagsTest, PagesThatWereNotBuiltAreParagraphs)
 {
     PageDocument document;
-    addSampleRecords(document);
+    addLine(document, { 0, 0 }, { 500, 0 });
+    addText(
+        document, { 500, 300 }, u"Page 2 of [Pages], [Pages]", { .font = { .name = Text(Uming) } });
     document.newPage();
     addText(document, { 1000, 1000 }, u"a missing \u0E00 character",
         { .font = { .name = Text(Uming) } });
@@ -189,7 +191,7 @@ TEST_F(PdfTagsTest, AFileForArchivesSaysSoAndHoldsAllItNeeds)
 TEST_F(PdfTagsTest, ThePlainFileHasNoTree)
 {
     PageDocument document;
-    addSampleRecords(document);
+    addText(document, { 500, 300 }, u"plain", { .font = { .name = Text(Uming) } });
     const QString path = write(document, {});
     EXPECT_FALSE(elementsOf(path).contains(QStringLiteral("Document")));
 }
