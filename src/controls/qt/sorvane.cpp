@@ -52,6 +52,14 @@ QObject& objectOf(QObject* object)
     return *object;
 }
 
+/// Has screen readers know the canvas and its pages before the first of them is made: what is asked
+/// for once is kept for good.
+QWidget* madeReadable(QWidget* parent)
+{
+    [[maybe_unused]] static const bool isReadable = (installPageAccessibility(), true);
+    return parent;
+}
+
 } // namespace
 
 /// What works without the window.
@@ -73,7 +81,7 @@ Sorvane::Sorvane(QWidget* parent)
 }
 
 Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
-    : SorvaneCalls(parent)
+    : SorvaneCalls(madeReadable(parent))
     , parts_(std::make_shared<Parts>(platform))
     , canvas_(parts_->canvas)
     , calls_(*this, parts_, parts_->platform, [this] { areas_->viewChanged(); })
@@ -82,7 +90,6 @@ Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
               [this] { emit MouseUp(RightButtonNumber); } }))
 {
     registerRecords();
-    [[maybe_unused]] static const bool isReadable = (installPageAccessibility(), true);
     canvas_.documentName = toText(QGuiApplication::applicationDisplayName());
     setObjectName(QStringLiteral("Sorvane"));
     setAccessibleName(tr("Page preview"));

@@ -44,7 +44,7 @@ protected:
     {
         PrintTest::SetUp();
         auto grid = std::make_unique<TableGrid>(std::vector<TableColumn> { { u"Number", 3000 } });
-        for (int row = 1; row <= 1500; ++row) {
+        for (int row = 1; row <= 4000; ++row) {
             const Text number = decimal(row);
             grid->addRow(std::array<TextView, 1> { number });
         }
