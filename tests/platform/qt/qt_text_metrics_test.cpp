@@ -102,7 +102,8 @@ TEST_F(QtTextMetricsTest, ATabIsAsWideAsFourBlanksAndOtherControlCharactersAreNo
     for (const TextView name : { Uming, TextView(u"DejaVu Sans") }) {
         FaceMetrics& face = metrics_.face(name, false, false);
         EXPECT_EQ(face.unitAdvance(u'\t'), static_cast<float>(4 * face.unitAdvance(u' ')));
-        for (const char16_t unit : { 0x00, 0x01, 0x0D, 0x1B, 0x7F, 0x85, 0xAD, 0x200B, 0xFEFF })
+        for (const char16_t unit :
+            { u'\0', u'\x01', u'\r', u'\x1B', u'\x7F', u'\x85', u'\xAD', u'\x200B', u'\xFEFF' })
             EXPECT_EQ(face.unitAdvance(unit), 0) << static_cast<int>(unit);
     }
 }
