@@ -483,7 +483,7 @@ class LateEvent {
 public:
     LateEvent(QObject& receiver, QEvent* event)
         : thread_([&receiver, event] {
-            std::this_thread::sleep_for(std::chrono::milliseconds(300));
+            std::this_thread::sleep_for(std::chrono::milliseconds(200));
             QCoreApplication::postEvent(&receiver, event);
         })
     {

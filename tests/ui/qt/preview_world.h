@@ -66,12 +66,14 @@ protected:
         return grid;
     }
 
-    /// A million rows.
+    /// A million rows of four columns: their build takes longer than a person needs for a key.
     static std::unique_ptr<AutomationObject> longGrid()
     {
-        auto grid = std::make_unique<TableGrid>(std::vector<TableColumn> { { u"A", 3000 } });
-        for (int row = 0; row < 1'000'000; ++row)
-            grid->addRow(std::array<TextView, 1> { u"a text" });
+        const std::array<TextView, 4> row { u"a text", u"another", u"a third", u"a fourth" };
+        auto grid = std::make_unique<TableGrid>(std::vector<TableColumn> {
+            { u"A", 2000 }, { u"B", 2000 }, { u"C", 2000 }, { u"D", 2000 } });
+        for (int count = 0; count < 1'000'000; ++count)
+            grid->addRow(row);
         return grid;
     }
 
