@@ -76,9 +76,10 @@ TEST(TableGrid, TakesWidthsAsTheyArePut)
 TEST(TableGrid, RefusesIndexesOutsideTheTable)
 {
     TableGrid grid = fruits();
-    for (const auto& [row, column] : { std::pair(-1, 0), { 4, 0 }, { 0, 3 }, { 1, -1 } }) {
-        EXPECT_EQ(errorOf([&] { cellOf(grid, row, column); }), ErrorNumber::SubscriptOutOfRange)
-            << row << ", " << column;
+    for (const auto& cell : { std::pair(-1, 0), { 4, 0 }, { 0, 3 }, { 1, -1 } }) {
+        EXPECT_EQ(errorOf([&] { cellOf(grid, cell.first, cell.second); }),
+            ErrorNumber::SubscriptOutOfRange)
+            << cell.first << ", " << cell.second;
     }
     EXPECT_EQ(errorOf([&] { widthOf(grid, 3); }), ErrorNumber::SubscriptOutOfRange);
 }
