@@ -4,7 +4,7 @@
 
 # Checks of the sources and of sanitizer builds: all, or those named as arguments.
 #
-#   tools/check.sh [format] [layers] [spelling] [licences] [scripts] [tidy] [asan] [fuzz]
+#   tools/check.sh [format] [layers] [spelling] [licences] [scripts] [translations] [tidy] [asan] [fuzz]
 #
 # CHECK_FUZZ_SECONDS (60) is how long each fuzzer runs; with 0 they are only built.
 
@@ -12,7 +12,7 @@ set -euo pipefail
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 . tools/packages.sh
 
-AllChecks=(format layers spelling licences scripts tidy asan fuzz)
+AllChecks=(format layers spelling licences scripts translations tidy asan fuzz)
 
 cxxFiles() {
     git ls-files -z -- '*.cpp' '*.h'
@@ -44,6 +44,10 @@ checkLicences() {
 checkScripts() {
     needTools shellcheck
     git ls-files -z -- '*.sh' run .ci/run | xargs -0 -r shellcheck -x
+}
+
+checkTranslations() {
+    tools/update_translations.sh --check
 }
 
 # Reads the compile commands of the preset dev, whose build also makes the files that Qt's tools write.

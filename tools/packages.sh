@@ -27,6 +27,7 @@ PackagesBuild=(
     nlohmann-json3-dev
     qt6-base-dev
     qt6-declarative-dev
+    qt6-l10n-tools
     qt6-svg-dev
     qt6-tools-dev
 )

@@ -47,6 +47,7 @@ QString previewDetails();
 
 /// `pelloric open`: a saved document in the preview window.
 int runOpen(const Invocation& invocation);
+OptionTables openOptions();
 QString openDetails();
 
 /// `pelloric export`: a table or a document as PDF, images or a document file; needs no display.

@@ -69,6 +69,7 @@ private:
 int walk(const Invocation& invocation, const CommandLine& line)
 {
     const HeadlessWidgets application(invocation);
+    chooseLanguage(line);
     qt::QtPlatform& platform = qt::defaultPlatform();
     const DemoSettings settings(platform);
     qt::QtPreviewOpener& opener = qt::installPreviewWindow();
@@ -85,6 +86,7 @@ int runDemo(const Invocation& invocation)
     if (line.has("walk"))
         return walk(invocation, line);
     WindowedApplication application(invocation);
+    chooseLanguage(line);
     qt::QtPlatform& platform = qt::defaultPlatform();
     const DemoSettings settings(platform);
     qt::QtPreviewOpener& opener = qt::installPreviewWindow();
@@ -104,6 +106,6 @@ QString demoDetails()
         "your own can be opened beside them. What its dialogs change is forgotten.\n");
 }
 
-OptionTables demoOptions() { return { Options }; }
+OptionTables demoOptions() { return { Options, windowOptions() }; }
 
 } // namespace pelloric::app

@@ -21,7 +21,7 @@ constexpr auto Commands = std::to_array<Command>({
     { "demo", "", "Shows all kinds of grids on sample tables", runDemo, demoOptions, demoDetails },
     { "preview", "FILE", "Shows a table in the preview window", runPreview, previewOptions,
         previewDetails },
-    { "open", "FILE.ostl", "Shows a saved document in the preview window", runOpen, nullptr,
+    { "open", "FILE.ostl", "Shows a saved document in the preview window", runOpen, openOptions,
         openDetails },
     { "export", "FILE... -o OUT", "Writes tables as PDF, PNG, SVG or a document file", runExport,
         exportOptions, exportDetails },

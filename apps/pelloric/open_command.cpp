@@ -15,11 +15,12 @@ namespace pelloric::app {
 
 int runOpen(const Invocation& invocation)
 {
-    const CommandLine line(invocation.arguments, {}, 1);
+    const CommandLine line(invocation.arguments, openOptions(), 1);
     const QString file = line.file(0);
     if (!QFileInfo(file).isFile())
         throw CommandError(QStringLiteral("%1: there is no such file").arg(file));
     WindowedApplication application(invocation);
+    chooseLanguage(line);
     qt::QtPreviewOpener& opener = qt::installPreviewWindow();
     prepareSettings(qt::defaultPlatform().record());
     opener.showWindow().openDocument(pathOf(file));
@@ -31,5 +32,7 @@ QString openDetails()
     return QStringLiteral("FILE is a document file (.ostl) that the preview window or\n"
                           "\"pelloric export\" has saved.\n");
 }
+
+OptionTables openOptions() { return { windowOptions() }; }
 
 } // namespace pelloric::app

@@ -10,6 +10,7 @@
 #include "tables/qt/csv_table.h"
 #include "tables/qt/sqlite_table.h"
 
+#include <QCoreApplication>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QInputDialog>
@@ -21,7 +22,11 @@ namespace pelloric::app {
 
 namespace {
 
-QString words(const char* text) { return QCoreApplication::translate("OwnTable", text); }
+constexpr char Context[] = "pelloric::app::OwnTable";
+
+constexpr const char* Title = QT_TRANSLATE_NOOP("pelloric::app::OwnTable", "Open Your Own Table");
+
+QString words(const char* text) { return QCoreApplication::translate(Context, text); }
 
 /// The tables and views of a database.
 QStringList tablesOf(const QString& file)
@@ -46,8 +51,9 @@ std::optional<OwnTable> readDatabase(QWidget& window, const QString& file)
     QString table = tables.value(0);
     if (tables.size() > 1) {
         bool isChosen = false;
-        table = QInputDialog::getItem(&window, words("Open Your Own Table"),
-            words("Table of the database:"), tables, 0, false, &isChosen);
+        table = QInputDialog::getItem(&window, words(Title),
+            words(QT_TRANSLATE_NOOP("pelloric::app::OwnTable", "Table of the database:")), tables,
+            0, false, &isChosen);
         if (!isChosen)
             return std::nullopt;
     }
@@ -66,7 +72,7 @@ std::optional<OwnTable> openOwnTable(QWidget& window, const QString& file)
             return readDatabase(window, file);
         return OwnTable { plainName(file), qt::readCsv(pathOf(file), {}) };
     } catch (const RunTimeError& error) {
-        QMessageBox::warning(&window, words("Open Your Own Table"),
+        QMessageBox::warning(&window, words(Title),
             QFileInfo(file).fileName() + QStringLiteral(": ") + detailOf(error));
     }
     return std::nullopt;
@@ -74,9 +80,10 @@ std::optional<OwnTable> openOwnTable(QWidget& window, const QString& file)
 
 std::optional<OwnTable> askOwnTable(QWidget& window)
 {
-    const QString file = QFileDialog::getOpenFileName(&window, words("Open Your Own Table"),
+    const QString file = QFileDialog::getOpenFileName(&window, words(Title),
         QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation),
-        words("Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)"));
+        words(QT_TRANSLATE_NOOP("pelloric::app::OwnTable",
+            "Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)")));
     if (file.isEmpty())
         return std::nullopt;
     return openOwnTable(window, file);

@@ -43,6 +43,7 @@ int runPreview(const Invocation& invocation)
                                .arg(line.file(0)),
             WrongUsage);
     WindowedApplication application(invocation);
+    chooseLanguage(line);
     qt::QtPreviewOpener& opener = qt::installPreviewWindow();
     qt::QtPlatform& platform = qt::defaultPlatform();
     std::unique_ptr<TableGrid> grid;
@@ -79,7 +80,8 @@ QString previewDetails()
 
 OptionTables previewOptions()
 {
-    return { sourceOptions(), selectionOptions(), reportOptions(), shapeOptions() };
+    return { sourceOptions(), selectionOptions(), reportOptions(), shapeOptions(),
+        windowOptions() };
 }
 
 } // namespace pelloric::app

@@ -3,15 +3,58 @@
 
 #include "windows.h"
 
-#include "command_line.h"
 #include "platform/run_time_error.h"
 #include "settings/default_settings.h"
+#include "ui/qt/translation.h"
 
+#include <QCoreApplication>
+#include <QLibraryInfo>
+#include <QLocale>
+#include <QTranslator>
 #include <QWidget>
 
 #include <algorithm>
+#include <array>
+#include <memory>
 
 namespace pelloric::app {
+
+namespace {
+
+constexpr auto Options = std::to_array<Option>({
+    { "language", "LANG",
+        "of hints, tips and further menus: de, en, zh_CN, or system; the rest has one wording" },
+});
+
+/// The toolkit's own texts, such as those of its file dialogs, where its catalogues are installed.
+void translateToolkit(const QLocale& locale)
+{
+    auto catalogue = std::make_unique<QTranslator>(QCoreApplication::instance());
+    if (catalogue->load(locale, QStringLiteral("qtbase"), QStringLiteral("_"),
+            QLibraryInfo::path(QLibraryInfo::TranslationsPath)))
+        QCoreApplication::installTranslator(catalogue.release());
+}
+
+} // namespace
+
+OptionTable windowOptions() { return Options; }
+
+void chooseLanguage(const CommandLine& line)
+{
+    if (!line.has("language"))
+        return;
+    const QString name = line.value("language");
+    const bool isSystem = name == QLatin1String("system");
+    const QLocale locale = isSystem ? QLocale::system() : QLocale(name);
+    const bool isKnown = qt::installTranslation(locale);
+    qt::installTranslation(locale, QStringLiteral("pelloric_program"));
+    if (isKnown)
+        translateToolkit(locale);
+    else if (!isSystem)
+        throw CommandError(
+            QStringLiteral("--language %1: there are de, en, zh_CN, and system").arg(name),
+            WrongUsage);
+}
 
 bool hasDisplay()
 {

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "command_line.h"
 #include "commands.h"
 
 #include <QApplication>
@@ -17,6 +18,14 @@ namespace pelloric::app {
 
 /// Whether windows can be shown here.
 bool hasDisplay();
+
+/// The options of every command with windows.
+OptionTable windowOptions();
+
+/// Shows windows in the language that the option names, as far as their texts are not published;
+/// without the option they are English. There is an application object.
+/// @throws CommandError WrongUsage: there is no such language
+void chooseLanguage(const CommandLine& line);
 
 /// The application object of a command with windows.
 class WindowedApplication {

@@ -16,6 +16,7 @@
 #include "view/page_texts.h"
 
 #include <QAccessible>
+#include <QCoreApplication>
 #include <QCursor>
 #include <QLabel>
 #include <QPainter>
@@ -107,15 +108,20 @@ CanvasAreas::CanvasAreas(QWidget& control, Canvas& canvas, QtFonts& fonts, Right
     , backScreen_(new BackScreen(*this, &control))
     , startIcon_(new StartIcon(&control))
     , progress_(new ProgressArea(&control))
-    , hand_(makeHolder(control, "imgPan", QObject::tr("Hand cursor")))
+    , hand_(makeHolder(control, "imgPan",
+          QCoreApplication::translate("pelloric::qt::CanvasAreas", "Hand cursor")))
     , Hbar_(makeBar(Qt::Horizontal, "Hbar"))
     , Vbar_(makeBar(Qt::Vertical, "Vbar"))
 {
-    makeHolder(control, "PicHouse", QObject::tr("Picture"));
-    makeHolder(control, "PicIcon", QObject::tr("Picture"));
+    makeHolder(
+        control, "PicHouse", QCoreApplication::translate("pelloric::qt::CanvasAreas", "Picture"));
+    makeHolder(
+        control, "PicIcon", QCoreApplication::translate("pelloric::qt::CanvasAreas", "Picture"));
     hand_->setPixmap(handPicture(control.devicePixelRatioF()));
-    Hbar_->setAccessibleName(QObject::tr("Horizontal scroll bar"));
-    Vbar_->setAccessibleName(QObject::tr("Vertical scroll bar"));
+    Hbar_->setAccessibleName(
+        QCoreApplication::translate("pelloric::qt::CanvasAreas", "Horizontal scroll bar"));
+    Vbar_->setAccessibleName(
+        QCoreApplication::translate("pelloric::qt::CanvasAreas", "Vertical scroll bar"));
     auto* const base = new PageSurface(*this, backScreen_);
     base->hide();
     surfaces_[0] = base;

@@ -7,6 +7,7 @@
 #include "ui/qt/icon_set.h"
 #include "ui/tool_table.h"
 
+#include <QCoreApplication>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMessageBox>
@@ -67,13 +68,14 @@ void showAbout(QWidget& window)
 {
     QMessageBox box(&window);
     box.setObjectName(QStringLiteral("frmAbout"));
-    box.setWindowTitle(QObject::tr("About"));
+    box.setWindowTitle(QCoreApplication::translate("pelloric::qt::AboutBox", "About"));
     box.setIconPixmap(
         libraryIcon(QStringLiteral("print"), window.palette())
             .pixmap(QSize(AboutPictureSize, AboutPictureSize), window.devicePixelRatioF()));
     box.setTextFormat(Qt::PlainText);
     box.setText(QStringLiteral("Pelloric " PELLORIC_VERSION));
-    box.setInformativeText(QObject::tr("Print preview and printing of grids."));
+    box.setInformativeText(QCoreApplication::translate(
+        "pelloric::qt::AboutBox", "Print preview and printing of grids."));
     box.setStandardButtons(QMessageBox::Ok);
     box.exec();
 }

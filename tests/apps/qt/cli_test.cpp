@@ -93,6 +93,13 @@ bool has(const std::string& text, std::string_view part)
 
 } // namespace
 
+TEST_F(Program, RefusesALanguageThatItHasNoCatalogueFor)
+{
+    const Ended refused = run({ "demo", "--walk", "out", "--language", "fi" });
+    EXPECT_EQ(refused.status, 2);
+    EXPECT_EQ(refused.errors, "pelloric: --language fi: there are de, en, zh_CN, and system\n");
+}
+
 TEST_F(Program, ExportsATableAsPdf)
 {
     folder_.write("towns.csv", "城市,n\n北京,1\n上海,2\n");

@@ -1,0 +1,110 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="zh_CN" sourcelanguage="en">
+<context>
+    <name>pelloric::app::DemoWindow</name>
+    <message>
+        <source>Pelloric Demonstration</source>
+        <translation>Pelloric 演示</translation>
+    </message>
+    <message>
+        <source>&amp;Flex Grid</source>
+        <translation>表格(&amp;F)</translation>
+    </message>
+    <message>
+        <source>A table widget: 178 wines in 15 columns, more than one sheet is wide.</source>
+        <translation>表格控件：178 种葡萄酒，15 列，比一张纸宽。</translation>
+    </message>
+    <message>
+        <source>&amp;List View</source>
+        <translation>列表视图(&amp;L)</translation>
+    </message>
+    <message>
+        <source>A tree widget in report mode: the countries of the world in English and Chinese.</source>
+        <translation>报表模式的树形控件：世界各国的中英文名称。</translation>
+    </message>
+    <message>
+        <source>&amp;Data Grid</source>
+        <translation>数据表格(&amp;D)</translation>
+    </message>
+    <message>
+        <source>A table view on an SQL table: time zones and their places.</source>
+        <translation>SQL 表的表格视图：各时区及其地点。</translation>
+    </message>
+    <message>
+        <source>Choose a table, say how it is to look, and preview it.</source>
+        <translation>选择一个表格，设定外观，然后预览。</translation>
+    </message>
+    <message>
+        <source>&amp;Open your own table…</source>
+        <translation>打开自己的表格(&amp;O)…</translation>
+    </message>
+    <message>
+        <source>A CSV or TSV file, or a table of an SQLite database</source>
+        <translation>CSV 或 TSV 文件，或 SQLite 数据库中的表</translation>
+    </message>
+    <message>
+        <source>Report</source>
+        <translation>报表</translation>
+    </message>
+    <message>
+        <source>Column &amp;titles</source>
+        <translation>列标题(&amp;T)</translation>
+    </message>
+    <message>
+        <source>&amp;Merge equal cells</source>
+        <translation>合并相同的单元格(&amp;M)</translation>
+    </message>
+    <message>
+        <source>Of the flex grid; row 0 holds its titles</source>
+        <translation>适用于表格；第 0 行是标题</translation>
+    </message>
+    <message>
+        <source>First &amp;row:</source>
+        <translation>起始行(&amp;R)：</translation>
+    </message>
+    <message>
+        <source>Foot&amp;er:</source>
+        <translation>页脚(&amp;E)：</translation>
+    </message>
+    <message>
+        <source>&amp;Preview</source>
+        <translation>预览(&amp;P)</translation>
+    </message>
+    <message>
+        <source>Host code:</source>
+        <translation>宿主代码：</translation>
+    </message>
+    <message>
+        <source>Host code</source>
+        <translation>宿主代码</translation>
+    </message>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>复制(&amp;C)</translation>
+    </message>
+    <message>
+        <source>Copies the code to the clipboard</source>
+        <translation>将代码复制到剪贴板</translation>
+    </message>
+    <message>
+        <source>A table of your own: %1.</source>
+        <translation>自己的表格：%1。</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::app::OwnTable</name>
+    <message>
+        <source>Open Your Own Table</source>
+        <translation>打开自己的表格</translation>
+    </message>
+    <message>
+        <source>Table of the database:</source>
+        <translation>数据库中的表：</translation>
+    </message>
+    <message>
+        <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
+        <translation>表格 (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;所有文件 (*)</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,39 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/qt/translation.h"
+
+#include <QCoreApplication>
+#include <QTranslator>
+
+#include <memory>
+
+/// The catalogues are part of a library that may be linked statically; the macro works outside
+/// namespaces only.
+static void initCatalogues() { Q_INIT_RESOURCE(pelloric_catalogues); }
+
+namespace pelloric::qt {
+
+bool installTranslation(const QLocale& locale)
+{
+    initCatalogues();
+    return installTranslation(locale, QStringLiteral("pelloric"));
+}
+
+bool installTranslation(const QLocale& locale, const QString& name)
+{
+    QCoreApplication* const application = QCoreApplication::instance();
+    if (!application)
+        return false;
+    const QString object = QStringLiteral("translation of ") + name;
+    delete application->findChild<QTranslator*>(object, Qt::FindDirectChildrenOnly);
+    auto catalogue = std::make_unique<QTranslator>();
+    if (!catalogue->load(
+            locale, name, QStringLiteral("_"), QStringLiteral(":/pelloric/translations")))
+        return false;
+    catalogue->setObjectName(object);
+    catalogue->setParent(application);
+    return QCoreApplication::installTranslator(catalogue.release());
+}
+
+} // namespace pelloric::qt

@@ -1,0 +1,594 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="zh_CN" sourcelanguage="en">
+<context>
+    <name>KeysWindow</name>
+    <message>
+        <source>Read on, at the end the next page</source>
+        <translation>向下阅读，到页尾时转到下一页</translation>
+    </message>
+    <message>
+        <source>Read back, at the top the page before</source>
+        <translation>向上阅读，到页首时转到上一页</translation>
+    </message>
+    <message>
+        <source>Scroll a little</source>
+        <translation>滚动少许</translation>
+    </message>
+    <message>
+        <source>Top and bottom of the page</source>
+        <translation>页首和页尾</translation>
+    </message>
+    <message>
+        <source>Scale under the pointer</source>
+        <translation>以指针处为中心缩放</translation>
+    </message>
+    <message>
+        <source>Scroll sideways</source>
+        <translation>左右滚动</translation>
+    </message>
+    <message>
+        <source>Select texts</source>
+        <translation>选择文字</translation>
+    </message>
+    <message>
+        <source>Menu of the pages</source>
+        <translation>页面菜单</translation>
+    </message>
+    <message>
+        <source>Close what is open, end what runs, then leave</source>
+        <translation>关闭打开的部分，结束正在进行的操作，然后退出</translation>
+    </message>
+    <message>
+        <source>Keys</source>
+        <translation>快捷键</translation>
+    </message>
+    <message>
+        <source>What they do</source>
+        <translation>作用</translation>
+    </message>
+</context>
+<context>
+    <name>ToolMeanings</name>
+    <message>
+        <source>Fonts, colours and grid lines of the report</source>
+        <translation>报表的字体、颜色和网格线</translation>
+    </message>
+    <message>
+        <source>Read the table again</source>
+        <translation>重新读取表格</translation>
+    </message>
+    <message>
+        <source>Show the pages twice as large</source>
+        <translation>将页面放大一倍显示</translation>
+    </message>
+    <message>
+        <source>Show the pages half as large</source>
+        <translation>将页面缩小一半显示</translation>
+    </message>
+    <message>
+        <source>Go to the first page</source>
+        <translation>转到首页</translation>
+    </message>
+    <message>
+        <source>Go back a page</source>
+        <translation>转到上一页</translation>
+    </message>
+    <message>
+        <source>Go on to the next page</source>
+        <translation>转到下一页</translation>
+    </message>
+    <message>
+        <source>Go to the last page</source>
+        <translation>转到末页</translation>
+    </message>
+    <message>
+        <source>Show all pages, or six of a long report</source>
+        <translation>显示所有页面，长报表则显示六页</translation>
+    </message>
+    <message>
+        <source>Show one page</source>
+        <translation>显示一页</translation>
+    </message>
+    <message>
+        <source>Drag the pages with the mouse</source>
+        <translation>用鼠标拖动页面</translation>
+    </message>
+    <message>
+        <source>Print all pages or some</source>
+        <translation>打印全部或部分页面</translation>
+    </message>
+    <message>
+        <source>Paper, margins, header and footer</source>
+        <translation>纸张、页边距、页眉和页脚</translation>
+    </message>
+    <message>
+        <source>Fill the window with one page</source>
+        <translation>用一页填满窗口</translation>
+    </message>
+    <message>
+        <source>Show two pages</source>
+        <translation>显示两页</translation>
+    </message>
+    <message>
+        <source>Scale of the pages: pick one or type it</source>
+        <translation>页面比例：选择或输入</translation>
+    </message>
+    <message>
+        <source>Go to a page: pick one or type its number</source>
+        <translation>转到某页：选择或输入页码</translation>
+    </message>
+    <message>
+        <source>Close the preview</source>
+        <translation>关闭预览</translation>
+    </message>
+    <message>
+        <source>Show four pages</source>
+        <translation>显示四页</translation>
+    </message>
+    <message>
+        <source>Name and version</source>
+        <translation>名称和版本</translation>
+    </message>
+    <message>
+        <source>Open saved pages</source>
+        <translation>打开已保存的页面</translation>
+    </message>
+    <message>
+        <source>Save the pages to a file</source>
+        <translation>将页面保存到文件</translation>
+    </message>
+    <message>
+        <source>Throw all pages away</source>
+        <translation>清除所有页面</translation>
+    </message>
+    <message>
+        <source>Larger text and columns</source>
+        <translation>放大文字和列</translation>
+    </message>
+    <message>
+        <source>Smaller text and columns</source>
+        <translation>缩小文字和列</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::AboutBox</name>
+    <message>
+        <source>About</source>
+        <translation>关于</translation>
+    </message>
+    <message>
+        <source>Print preview and printing of grids.</source>
+        <translation>表格的打印预览与打印。</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::BackScreen</name>
+    <message>
+        <source>Pages</source>
+        <translation>页面</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::CanvasAreas</name>
+    <message>
+        <source>Hand cursor</source>
+        <translation>手形光标</translation>
+    </message>
+    <message>
+        <source>Picture</source>
+        <translation>图片</translation>
+    </message>
+    <message>
+        <source>Horizontal scroll bar</source>
+        <translation>水平滚动条</translation>
+    </message>
+    <message>
+        <source>Vertical scroll bar</source>
+        <translation>垂直滚动条</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::FindBar</name>
+    <message>
+        <source>Previous place (Shift+F3)</source>
+        <translation>上一处 (Shift+F3)</translation>
+    </message>
+    <message>
+        <source>Next place (F3)</source>
+        <translation>下一处 (F3)</translation>
+    </message>
+    <message>
+        <source>Close (Esc)</source>
+        <translation>关闭 (Esc)</translation>
+    </message>
+    <message>
+        <source>Find</source>
+        <translation>查找</translation>
+    </message>
+    <message>
+        <source>Text to find</source>
+        <translation>要查找的文字</translation>
+    </message>
+    <message>
+        <source>Find on the pages</source>
+        <translation>在页面中查找</translation>
+    </message>
+    <message>
+        <source>Not found</source>
+        <translation>未找到</translation>
+    </message>
+    <message>
+        <source>Searching…</source>
+        <translation>正在查找…</translation>
+    </message>
+    <message>
+        <source>%L1 found</source>
+        <translation>找到 %L1 处</translation>
+    </message>
+    <message>
+        <source>%L1 of %L2</source>
+        <translation>第 %L1 处，共 %L2 处</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::FontChooser</name>
+    <message>
+        <source>Font</source>
+        <translation>字体</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>确定</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+    <message>
+        <source>Font:</source>
+        <translation>字体：</translation>
+    </message>
+    <message>
+        <source>Size:</source>
+        <translation>大小：</translation>
+    </message>
+    <message>
+        <source>Effects</source>
+        <translation>效果</translation>
+    </message>
+    <message>
+        <source>Bold</source>
+        <translation>粗体</translation>
+    </message>
+    <message>
+        <source>Italic</source>
+        <translation>斜体</translation>
+    </message>
+    <message>
+        <source>Strikeout</source>
+        <translation>删除线</translation>
+    </message>
+    <message>
+        <source>Underline</source>
+        <translation>下划线</translation>
+    </message>
+    <message>
+        <source>Color:</source>
+        <translation>颜色：</translation>
+    </message>
+    <message>
+        <source>Sample</source>
+        <translation>示例</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::GridStyleDialog</name>
+    <message>
+        <source>Fonts</source>
+        <translation>字体</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::Kestrane</name>
+    <message>
+        <source>Print preview</source>
+        <translation>打印预览</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PageFiles</name>
+    <message>
+        <source>PDF document</source>
+        <translation>PDF 文档</translation>
+    </message>
+    <message>
+        <source>PNG pictures</source>
+        <translation>PNG 图片</translation>
+    </message>
+    <message>
+        <source>SVG drawings</source>
+        <translation>SVG 图形</translation>
+    </message>
+    <message>
+        <source>report</source>
+        <translation>报表</translation>
+    </message>
+    <message>
+        <source>Save as PDF</source>
+        <translation>另存为 PDF</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PageSetupDialog</name>
+    <message>
+        <source>Papers</source>
+        <translation>纸张</translation>
+    </message>
+    <message>
+        <source>These are the standard papers: %1.</source>
+        <translation>以下是标准纸张：%1。</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PageSketch</name>
+    <message>
+        <source>Sketch of the page with its margins</source>
+        <translation>页面及页边距示意图</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PageStrip</name>
+    <message>
+        <source>Page %1</source>
+        <translation>第 %1 页</translation>
+    </message>
+    <message>
+        <source>Pictures of the pages</source>
+        <translation>页面缩略图</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PageSurface</name>
+    <message>
+        <source>Page surface %1</source>
+        <translation>页面区域 %1</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PageTextsTab</name>
+    <message>
+        <source>Left</source>
+        <translation>左</translation>
+    </message>
+    <message>
+        <source>Center</source>
+        <translation>中</translation>
+    </message>
+    <message>
+        <source>Right</source>
+        <translation>右</translation>
+    </message>
+    <message>
+        <source>Header left</source>
+        <translation>页眉左侧</translation>
+    </message>
+    <message>
+        <source>Header center</source>
+        <translation>页眉中间</translation>
+    </message>
+    <message>
+        <source>Header right</source>
+        <translation>页眉右侧</translation>
+    </message>
+    <message>
+        <source>Footer left</source>
+        <translation>页脚左侧</translation>
+    </message>
+    <message>
+        <source>Footer center</source>
+        <translation>页脚中间</translation>
+    </message>
+    <message>
+        <source>Footer right</source>
+        <translation>页脚右侧</translation>
+    </message>
+    <message>
+        <source>Header font</source>
+        <translation>页眉字体</translation>
+    </message>
+    <message>
+        <source>Footer font</source>
+        <translation>页脚字体</translation>
+    </message>
+    <message>
+        <source>Change the header font</source>
+        <translation>更改页眉字体</translation>
+    </message>
+    <message>
+        <source>Change the footer font</source>
+        <translation>更改页脚字体</translation>
+    </message>
+    <message>
+        <source>The Menu key or Alt+Down opens the fields</source>
+        <translation>按菜单键或 Alt+向下键打开字段列表</translation>
+    </message>
+    <message>
+        <source>Put in a field</source>
+        <translation>插入字段</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PreviewToolbar</name>
+    <message>
+        <source>Tools</source>
+        <translation>工具</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PreviewWindow</name>
+    <message>
+        <source>Save as PDF</source>
+        <translation>另存为 PDF</translation>
+    </message>
+    <message>
+        <source>Printing was ended: %1 of %2 pages were sent.</source>
+        <translation>打印已结束：共 %2 页，已发送 %1 页。</translation>
+    </message>
+    <message>
+        <source>Saving the pages…</source>
+        <translation>正在保存页面…</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::PrintOptionsDialog</name>
+    <message>
+        <source>No page is named yet, so nothing would be printed.</source>
+        <translation>尚未指定页码，不会打印任何内容。</translation>
+    </message>
+    <message>
+        <source>None of these pages exists: the last one is %1.</source>
+        <translation>这些页都不存在：最后一页是第 %1 页。</translation>
+    </message>
+    <message>
+        <source>This names no page, so nothing would be printed.</source>
+        <translation>没有指定任何页，不会打印任何内容。</translation>
+    </message>
+    <message>
+        <source>These are more pages than can be printed.</source>
+        <translation>页数超出可打印的范围。</translation>
+    </message>
+    <message>
+        <source>Without a copy nothing would be printed.</source>
+        <translation>份数为零，不会打印任何内容。</translation>
+    </message>
+    <message>
+        <source>These are more copies than can be printed.</source>
+        <translation>份数超出可打印的范围。</translation>
+    </message>
+    <message>
+        <source>Save as PDF instead...</source>
+        <translation>改为另存为 PDF...</translation>
+    </message>
+    <message>
+        <source>There is no printer.</source>
+        <translation>没有打印机。</translation>
+    </message>
+    <message>
+        <source>No printers can be listed: %1.</source>
+        <translation>无法列出打印机：%1。</translation>
+    </message>
+    <message>
+        <source>Page range</source>
+        <translation>页码范围</translation>
+    </message>
+    <message>
+        <source>Pages sent</source>
+        <translation>已发送的页</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+    <message>
+        <source>Ends printing after the page that is being sent (Escape)</source>
+        <translation>发送完当前页后结束打印 (Esc)</translation>
+    </message>
+    <message>
+        <source>%1 of %2 pages sent</source>
+        <translation>已发送 %1 页，共 %2 页</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::ProgressArea</name>
+    <message>
+        <source>Progress area</source>
+        <translation>进度区域</translation>
+    </message>
+    <message>
+        <source>Progress</source>
+        <translation>进度</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::ReaderTools</name>
+    <message>
+        <source>Page Width</source>
+        <translation>页宽</translation>
+    </message>
+    <message>
+        <source>Page in View</source>
+        <translation>整页</translation>
+    </message>
+    <message>
+        <source>Fill the Window</source>
+        <translation>填满窗口</translation>
+    </message>
+    <message>
+        <source>One Page</source>
+        <translation>一页</translation>
+    </message>
+    <message>
+        <source>Two Pages</source>
+        <translation>两页</translation>
+    </message>
+    <message>
+        <source>Four Pages</source>
+        <translation>四页</translation>
+    </message>
+    <message>
+        <source>More Pages</source>
+        <translation>多页</translation>
+    </message>
+    <message>
+        <source>Find…</source>
+        <translation>查找…</translation>
+    </message>
+    <message>
+        <source>Next Place</source>
+        <translation>下一处</translation>
+    </message>
+    <message>
+        <source>Previous Place</source>
+        <translation>上一处</translation>
+    </message>
+    <message>
+        <source>Select Page</source>
+        <translation>选择整页</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>复制</translation>
+    </message>
+    <message>
+        <source>Pictures of the Pages</source>
+        <translation>页面缩略图</translation>
+    </message>
+    <message>
+        <source>Keys</source>
+        <translation>快捷键</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::Sorvane</name>
+    <message>
+        <source>Page preview</source>
+        <translation>页面预览</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::StartIcon</name>
+    <message>
+        <source>No document</source>
+        <translation>没有文档</translation>
+    </message>
+    <message>
+        <source>Nothing to preview yet</source>
+        <translation>暂无预览内容</translation>
+    </message>
+</context>
+</TS>
