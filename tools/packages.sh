@@ -72,6 +72,11 @@ PackagesCheck=(
     shellcheck
 )
 
+# Makes the site of the guides and the reference.
+PackagesDocs=(
+    doxygen
+)
+
 # Makes and judges the Debian packages.
 PackagesPackage=(
     desktop-file-utils
@@ -130,7 +135,7 @@ aptGet() {
     return "$status"
 }
 
-# needPackages GROUP...: installs what is missing of the groups build, test, bench, check, package.
+# needPackages GROUP...: installs what is missing of the groups build, test, bench, check, docs, package.
 needPackages() {
     local group list package missing=()
     for group in "$@"; do

@@ -6,6 +6,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 namespace pelloric {
 
 namespace {
@@ -25,13 +27,34 @@ std::string between(const std::string& text, std::string_view first, std::string
     return rest.substr(0, rest.find(second));
 }
 
+/// The code of an example, without the lines of its licence.
+std::string codeOf(const char* path)
+{
+    const std::string example = fileOf(path);
+    return example.substr(example.find("#include"));
+}
+
 } // namespace
 
 TEST(Readme, ShowsTheExampleLineForLine)
 {
-    const std::string example = fileOf("examples/stock_list/main.cpp");
     const std::string code = between(fileOf("README.md"), "```cpp\n", "```");
-    EXPECT_EQ(code, example.substr(example.find("#include")));
+    EXPECT_EQ(code, codeOf("examples/stock_list/main.cpp"));
+}
+
+TEST(Guides, StartWithTheExampleOfATableLineForLine)
+{
+    const std::string code = between(fileOf("docs/guide/quick_start.md"), "```cpp\n", "```");
+    EXPECT_EQ(code, codeOf("examples/table/main.cpp"));
+}
+
+TEST(Examples, OfEachKindOfGridTakeThirtyLinesAtMost)
+{
+    for (const char* const example :
+        { "examples/table/main.cpp", "examples/tree/main.cpp", "examples/sql/main.cpp" }) {
+        const std::string code = fileOf(example);
+        EXPECT_LE(std::ranges::count(code, '\n'), 30) << example;
+    }
 }
 
 } // namespace pelloric

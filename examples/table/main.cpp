@@ -1,0 +1,24 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include <controls/qt/kestrane.h>
+#include <ui/qt/preview_opener.h>
+
+#include <QtWidgets>
+
+int main(int count, char** arguments)
+{
+    QApplication application(count, arguments);
+    pelloric::qt::installPreviewWindow();
+
+    QTableWidget table(60, 3);
+    table.setHorizontalHeaderLabels({ "Number", "Square", "Cube" });
+    for (int row = 0; row < table.rowCount(); ++row) {
+        for (int column = 0; column < table.columnCount(); ++column)
+            table.setItem(row, column, new QTableWidgetItem(QString::number(pow(row, column + 1))));
+    }
+
+    pelloric::qt::Kestrane preview;
+    preview.doPreview(&table);
+    return QApplication::exec();
+}
