@@ -3,26 +3,24 @@
 
 #include "print/qt/qt_printer.h"
 
-#include "platform/qt/qt_drawing_surface.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "print/qt/paper_sizes.h"
 #include "print/qt/qt_printer_system.h"
 #include "print/qt/spooler.h"
+#include "view/held_drawing.h"
 
 #include <QDir>
-#include <QPagedPaintDevice>
-#include <QPainter>
 #include <QPrinterInfo>
 #include <QStorageInfo>
 
 #include <optional>
+#include <vector>
 
 namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerInch = 1440;
 /// A document is sent over networks, too; its window lives meanwhile.
 constexpr std::chrono::milliseconds HandOverPatience { 30000 };
 
@@ -63,18 +61,18 @@ Welcome welcomeOf(const QString& printer, const std::optional<PaperRequest>& pag
 
 } // namespace
 
-/// One job; its parts end in the reverse order.
+/// One job.
 struct QtPrinter::Document {
     std::shared_ptr<SpoolDocument> spool; ///< outlives this where it is handed over late
     QString printer;
     bool asksForPassword = false;
-    QPainter painter;
-    std::optional<QtDrawingSurface> surface;
+    std::vector<HeldDrawing> pages = std::vector<HeldDrawing>(1);
 };
 
 QtPrinter::QtPrinter(const QtPrinterSystem& system, QtFonts& fonts)
     : system_(system)
     , fonts_(fonts)
+    , faces_(fonts)
 {
 }
 
@@ -225,11 +223,9 @@ void QtPrinter::setDocumentTitle(TextView title)
 void QtPrinter::newPage()
 {
     drawing();
-    if (!document_->spool->device().newPage()) {
-        document_.reset();
-        refuse(toQString(deviceName()), QStringLiteral("the page could not be ended"));
-    }
-    document_->surface->clear();
+    HeldDrawing& page = document_->pages.emplace_back();
+    applyAttributes(page);
+    page.clear();
 }
 
 void QtPrinter::endDoc()
@@ -238,8 +234,7 @@ void QtPrinter::endDoc()
         return;
     const std::unique_ptr<Document> document = std::move(document_);
     attributes_.current = {};
-    document->surface.reset();
-    if (!document->painter.end() || !document->spool->close())
+    if (!document->spool->draw(document->pages, { fonts_, faces_ }))
         refuse(document->printer, QStringLiteral("the document could not be ended"));
     const QString error = handOver(*document);
     if (!error.isEmpty())
@@ -261,7 +256,7 @@ DrawingSurface& QtPrinter::drawing()
 {
     if (!document_)
         begin();
-    return *document_->surface;
+    return document_->pages.back();
 }
 
 /// The surface on which an attribute takes effect at once; null: it waits for a document.
@@ -269,7 +264,7 @@ DrawingSurface* QtPrinter::attributeSurface()
 {
     if (!document_ && isAnnounced_)
         begin();
-    return document_ ? &*document_->surface : nullptr;
+    return document_ ? &document_->pages.back() : nullptr;
 }
 
 /// 0: none.
@@ -317,12 +312,9 @@ void QtPrinter::begin()
     document->printer = printer;
     document->asksForPassword = place_->asksForPassword;
     document->spool = newSpoolDocument({ printer, toQString(title_), place_->sheet });
-    if (!document->spool || !document->painter.begin(&document->spool->device()))
+    if (!document->spool)
         refuse(printer, QStringLiteral("the document could not be begun"));
-    const double scale = document->spool->device().logicalDpiX() / TwipsPerInch;
-    document->painter.scale(scale, scale);
-    document->surface.emplace(document->painter, fonts_);
-    applyAttributes(*document->surface);
+    applyAttributes(document->pages.back());
     document_ = std::move(document);
 }
 

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "export/qt/qt_glyph_faces.h"
 #include "platform/printer.h"
 #include "print/qt/sheet.h"
 
@@ -11,7 +12,6 @@
 
 namespace pelloric::qt {
 
-class QtDrawingSurface;
 class QtFonts;
 class QtPrinterSystem;
 
@@ -22,7 +22,8 @@ class QtPrinterSystem;
 /// own: paper, orientation, one-sided, one copy; the printer's defaults are never touched. Before a
 /// document begins the print system is asked whether it takes one, and when it ends, whether it
 /// took it. A print system that stays silent is an error after a few seconds. A document that is
-/// open when the object goes is dropped.
+/// open when the object goes is dropped. Pages are held until their document ends, for only then it
+/// is known whether all fonts that they need can be sent along.
 class QtPrinter final : public Printer {
 public:
     /// @param system  says which printer is the current one; borrowed
@@ -95,6 +96,7 @@ private:
 
     const QtPrinterSystem& system_;
     QtFonts& fonts_;
+    QtGlyphFaces faces_;
     Attributes attributes_;
     Text title_;
     bool isAnnounced_ = false; ///< a title was set and no document has begun since

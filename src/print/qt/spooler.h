@@ -4,14 +4,17 @@
 #pragma once
 
 #include "print/qt/sheet.h"
+#include "view/held_drawing.h"
 
 #include <QString>
 
 #include <memory>
-
-class QPagedPaintDevice;
+#include <vector>
 
 namespace pelloric::qt {
+
+class QtFonts;
+class QtGlyphFaces;
 
 /// Makes the present thread one that may call the print system without a person before it.
 void prepareCallingThread();
@@ -38,17 +41,21 @@ struct SpoolOrder {
     Sheet sheet;
 };
 
-/// A document on its way to a printer: drawn, closed, handed over.
+/// What its pages are drawn with.
+struct SpoolFonts {
+    QtFonts& fonts;
+    QtGlyphFaces& faces;
+};
+
+/// A document on its way to a printer: drawn, then handed over.
 class SpoolDocument {
 public:
     virtual ~SpoolDocument() = default;
 
-    /// Draws pages; its origin is the corner of the printable area.
-    virtual QPagedPaintDevice& device() = 0;
-
-    /// Closes what was drawn; nothing is drawn afterwards.
-    /// @return  false: it could not be kept
-    virtual bool close() = 0;
+    /// Draws all pages; called once.
+    /// @param pages  their origin is the corner of the printable area
+    /// @return       false: they could not be kept
+    virtual bool draw(const std::vector<HeldDrawing>& pages, const SpoolFonts& fonts) = 0;
 
     /// Gives it to the print system; may be called on another thread.
     /// @return  why it was not taken, in plain English; empty: nothing is known against it

@@ -3,6 +3,12 @@
 
 #include "print/qt/spooler.h"
 
+#include "export/qt/qt_glyph_faces.h"
+#include "export/qt/qt_pdf_writer.h"
+#include "platform/qt/qt_text.h"
+#include "print/qt/held_pages.h"
+#include "view/joined_lines.h"
+
 #include <QApplication>
 #include <QDir>
 #include <QFile>
@@ -25,6 +31,9 @@ constexpr int AnswerMs = 2500;
 
 /// Fine enough that the thinnest line is 0.12 points wide, and coarse enough that it is seen.
 constexpr int Resolution = 600;
+constexpr double Pixel = 1440.0 / Resolution; ///< twips
+
+constexpr int TwipsPerPoint = 20;
 
 struct FreeDestination {
     void operator()(cups_dest_t* destination) const { cupsFreeDests(1, destination); }
@@ -101,37 +110,28 @@ private:
 };
 
 /// Drawn as PDF into a file of its own, which is sent when it is complete.
+///
+/// A font that must not be sent along leaves the drawing to the toolkit, which draws its characters
+/// as shapes.
 class PdfDocument final : public SpoolDocument {
 public:
     explicit PdfDocument(const SpoolOrder& order)
         : order_(order)
-        , file_(std::make_unique<QTemporaryFile>(
-              QDir::tempPath() + QStringLiteral("/pelloric-XXXXXX.pdf")))
+        , file_(QDir::tempPath() + QStringLiteral("/pelloric"))
     {
     }
 
-    bool open()
-    {
-        // Without such a folder the name would be one of the root.
-        if (QDir::tempPath().isEmpty() || !file_->open())
-            return false;
-        writer_ = std::make_unique<QPdfWriter>(file_.get());
-        writer_->setResolution(Resolution);
-        writer_->setTitle(order_.title);
-        writer_->setPageLayout(QPageLayout(order_.sheet.paper, order_.sheet.orientation,
-            order_.sheet.edges, QPageLayout::Point, QMarginsF()));
-        return true;
-    }
+    /// Without a folder of temporary files the name would be one of the root.
+    bool open() { return !QDir::tempPath().isEmpty() && file_.open(); }
 
-    QPagedPaintDevice& device() override { return *writer_; }
-
-    bool close() override
+    bool draw(const std::vector<HeldDrawing>& pages, const SpoolFonts& fonts) override
     {
-        writer_.reset();
-        const bool isWhole = file_->flush() && file_->error() == QFileDevice::NoError;
-        waiting_ = std::make_unique<WaitingFile>(file_->fileName());
-        file_->setAutoRemove(false);
-        file_.reset();
+        const bool isWhole
+            = drawInto(pages, fonts) && file_.flush() && file_.error() == QFileDevice::NoError;
+        // It is sent from another thread, which a file object must not go to.
+        waiting_ = std::make_unique<WaitingFile>(file_.fileName());
+        file_.setAutoRemove(false);
+        file_.close();
         return isWhole;
     }
 
@@ -154,9 +154,52 @@ public:
     }
 
 private:
+    bool drawInto(const std::vector<HeldDrawing>& pages, const SpoolFonts& fonts)
+    {
+        try {
+            return drawByStreams(pages, fonts.faces);
+        } catch (const pdf::CannotEmbed&) {
+            return file_.resize(0) && file_.seek(0) && drawByToolkit(pages, fonts.fonts);
+        }
+    }
+
+    /// @throws CannotEmbed
+    bool drawByStreams(const std::vector<HeldDrawing>& pages, QtGlyphFaces& faces)
+    {
+        const QPageLayout sheet = layout();
+        const QSize size = sheet.fullRectPoints().size() * TwipsPerPoint;
+        const QPointF origin = sheet.paintRect(QPageLayout::Point).topLeft() * TwipsPerPoint;
+        const pdf::Paper paper { .width = size.width(),
+            .height = size.height(),
+            .origin = { qRound(origin.x()), qRound(origin.y()) } };
+        const auto write = [&](pdf::PdfWriter& writer) {
+            for (const HeldDrawing& page : pages) {
+                JoinedLines joined(writer.beginPage(paper));
+                page.drawOn(joined);
+                joined.finish();
+                writer.endPage();
+            }
+        };
+        return writePdf(file_, faces, pdfInfoOfNow(toText(order_.title)), Pixel, write);
+    }
+
+    bool drawByToolkit(const std::vector<HeldDrawing>& pages, QtFonts& fonts)
+    {
+        QPdfWriter writer(&file_);
+        writer.setResolution(Resolution);
+        writer.setTitle(order_.title);
+        writer.setPageLayout(layout());
+        return paintHeldPages(pages, writer, fonts);
+    }
+
+    QPageLayout layout() const
+    {
+        return QPageLayout(order_.sheet.paper, order_.sheet.orientation, order_.sheet.edges,
+            QPageLayout::Point, QMarginsF());
+    }
+
     SpoolOrder order_;
-    std::unique_ptr<QTemporaryFile> file_;
-    std::unique_ptr<QPdfWriter> writer_;
+    QTemporaryFile file_;
     std::unique_ptr<WaitingFile> waiting_;
 };
 

@@ -3,6 +3,8 @@
 
 #include "print/qt/spooler.h"
 
+#include "print/qt/held_pages.h"
+
 #include <QPrinter>
 #include <QPrinterInfo>
 
@@ -30,8 +32,11 @@ public:
         printer_.setCopyCount(1);
     }
 
-    QPagedPaintDevice& device() override { return printer_; }
-    bool close() override { return true; }
+    bool draw(const std::vector<HeldDrawing>& pages, const SpoolFonts& fonts) override
+    {
+        return paintHeldPages(pages, printer_, fonts.fonts);
+    }
+
     QString handOver() override { return {}; }
 
 private:

@@ -8,6 +8,7 @@
 #include "print/paper_names.h"
 #include "print/print_job.h"
 #include "print/qt/print_test.h"
+#include "support/qt/font_copies.h"
 
 #include <QRectF>
 #include <QRegularExpression>
@@ -77,6 +78,13 @@ QString pageSizeOf(const QString& path)
     return QStringLiteral("%1 x %2")
         .arg(std::lround(match.captured(1).toDouble()))
         .arg(std::lround(match.captured(2).toDouble()));
+}
+
+/// The program that made a PDF file.
+QString producerOf(const QString& path)
+{
+    static const QRegularExpression pattern(QStringLiteral("Producer: +([^\n]+)"));
+    return pattern.match(runProgram(QStringLiteral("pdfinfo"), { path }).output).captured(1);
 }
 
 std::int16_t codeNamed(const std::vector<PaperForm>& forms, TextView name)
@@ -157,6 +165,50 @@ TEST_F(QtPrinterTest, SendsThreeCopiesOfTwoPagesAsSixJobsInOrder)
         ASSERT_FALSE(words.empty());
         EXPECT_EQ(words.back().text, i % 2 == 0 ? QStringLiteral("first") : QStringLiteral("2"));
     }
+}
+
+TEST_F(QtPrinterTest, SendsWhatTheWriterOfFilesMakes)
+{
+    doPrint(twoPages(), jobOf(1), DefaultFont, printing.printer());
+    for (const int job : { 1, 2 }) {
+        EXPECT_EQ(producerOf(cups.documentOf(job)), QStringLiteral("Pelloric"));
+        const ProgramResult check = runProgram(
+            QStringLiteral("qpdf"), { QStringLiteral("--check"), cups.documentOf(job) });
+        EXPECT_EQ(check.status, 0) << check.output.toStdString() << check.errors.toStdString();
+    }
+}
+
+TEST_F(QtPrinterTest, LeavesADocumentWhoseFontMayNotBeSentAlongToTheToolkit)
+{
+    ASSERT_TRUE(loadLockedFont());
+    PageDocument document;
+    addText(document, { 1000, 1000 }, u"sent along");
+    addText(document, { 1000, 2000 }, u"drawn", { .font = { .name = u"Locked Sans", .size = 12 } });
+    doPrint(document, jobOf(1), DefaultFont, printing.printer());
+    ASSERT_EQ(cups.jobs().size(), 1U);
+    EXPECT_TRUE(producerOf(cups.documentOf(1)).startsWith(QStringLiteral("Qt")));
+    EXPECT_EQ(pageSizeOf(cups.documentOf(1)), QStringLiteral("595 x 842"));
+    EXPECT_EQ(wordsOf(cups.documentOf(1)).front().text, QStringLiteral("sent"));
+}
+
+TEST_F(QtPrinterTest, SendsSeveralPagesOfOneDocumentWithTheAttributesThatWereSet)
+{
+    Printer& printer = printing.printer();
+    printer.setFontName(u"宋体");
+    printer.setFontSize(10);
+    for (const TextView text : { u"one", u"two", u"three" }) {
+        if (text != u"one")
+            printer.newPage();
+        printer.setCurrentX(500);
+        printer.setCurrentY(500);
+        printer.print(text);
+    }
+    printer.endDoc();
+    ASSERT_EQ(cups.jobs().size(), 1U);
+    const std::vector<Word> words = wordsOf(cups.documentOf(1));
+    ASSERT_EQ(words.size(), 3U);
+    EXPECT_EQ(words[2].text, QStringLiteral("three"));
+    EXPECT_EQ(words[2].topLeft, words[0].topLeft);
 }
 
 TEST_F(QtPrinterTest, SendsEachJobWithPaperAndOrientationOfItsOwn)
