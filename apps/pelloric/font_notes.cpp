@@ -23,7 +23,8 @@ void requireFonts()
 void tellFonts(const PageDocument& document, qt::QtPlatform& platform)
 {
     // Counting asks for every face of the document, so the notes are whole behind it.
-    const Text missing = missingGlyphsText(missingGlyphs(document, platform.record().metrics));
+    const Text missing = missingGlyphsText(
+        missingGlyphs(document, platform.record().metrics, &platform.record().loop));
     for (const qt::FontNote& font : platform.fonts().notes())
         note(QStringLiteral("the font %1 is not installed; %2 is taken instead")
                  .arg(qt::toQString(font.asked), qt::toQString(font.taken)));

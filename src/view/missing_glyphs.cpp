@@ -4,10 +4,12 @@
 #include "view/missing_glyphs.h"
 
 #include "document/page_document.h"
+#include "platform/services.h"
 #include "platform/text_metrics.h"
 
 #include <algorithm>
 #include <array>
+#include <optional>
 
 namespace pelloric {
 
@@ -118,13 +120,22 @@ void countIn(TextView text, FaceMetrics& face, std::vector<MissingScript>& scrip
 
 } // namespace
 
-std::vector<MissingScript> missingGlyphs(const PageDocument& document, TextMetrics& metrics)
+std::vector<MissingScript> missingGlyphs(
+    const PageDocument& document, TextMetrics& metrics, MessageLoop* loop)
 {
     std::vector<MissingScript> scripts;
+    std::optional<std::uint32_t> style;
+    FaceMetrics* face = nullptr;
     for (int page = 0; page < document.pageCount(); ++page) {
+        if (loop)
+            loop->keepAlive();
         for (const TextRecord& text : document.texts(page)) {
-            const Font& font = document.style(text.style).font;
-            countIn(text.text(), metrics.face(font.name, font.bold, font.italic), scripts);
+            if (style != text.style) {
+                const Font& font = document.style(text.style).font;
+                face = &metrics.face(font.name, font.bold, font.italic);
+                style = text.style;
+            }
+            countIn(text.text(), *face, scripts);
         }
     }
     std::ranges::stable_sort(scripts, std::greater(), &MissingScript::count);

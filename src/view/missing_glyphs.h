@@ -9,6 +9,7 @@
 
 namespace pelloric {
 
+class MessageLoop;
 class PageDocument;
 class TextMetrics;
 
@@ -22,7 +23,11 @@ struct MissingScript {
 };
 
 /// Counts the characters of a document that no installed face has, the most frequent script first.
-std::vector<MissingScript> missingGlyphs(const PageDocument& document, TextMetrics& metrics);
+///
+/// @param loop  lets windows live meanwhile; null: nothing does
+/// @throws RunTimeError Cancelled: the loop said so
+std::vector<MissingScript> missingGlyphs(
+    const PageDocument& document, TextMetrics& metrics, MessageLoop* loop = nullptr);
 
 /// What a person is told about them, in one sentence; empty: nothing is missing.
 Text missingGlyphsText(const std::vector<MissingScript>& scripts);

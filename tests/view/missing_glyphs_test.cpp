@@ -5,6 +5,8 @@
 
 #include "document/page_document.h"
 #include "fakes/fake_metrics.h"
+#include "fakes/fake_services.h"
+#include "support/errors.h"
 #include "support/recorded_pages.h"
 
 #include <gtest/gtest.h>
@@ -62,6 +64,18 @@ TEST(MissingGlyphs, AreNoneInAPlainDocument)
     addText(document, { 0, 0 }, u"Total 汉字", {});
     FakeMetrics metrics;
     EXPECT_TRUE(missingGlyphs(document, metrics).empty());
+}
+
+TEST(MissingGlyphs, AreCountedNoFurtherOnceTheUserEndsIt)
+{
+    PageDocument document;
+    for (int page = 1; page < 5; ++page)
+        document.newPage();
+    FakeMetrics metrics;
+    FakeMessageLoop loop;
+    loop.cancelAtBeat = 3;
+    EXPECT_EQ(errorOf([&] { missingGlyphs(document, metrics, &loop); }), ErrorNumber::Cancelled);
+    EXPECT_EQ(loop.beats, 3);
 }
 
 } // namespace pelloric
