@@ -23,7 +23,8 @@ int indexArgument(std::span<const Value> arguments, std::size_t position, int fi
         throw RunTimeError(ErrorNumber::NoSuchMember, u"an index is missing");
     const double index = roundHalfEven(arguments[position].toNumber());
     if (!(index >= first && index <= last))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, formatNumber(index));
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, u"index " + outsideLimits(index, first, last));
     return static_cast<int>(index);
 }
 

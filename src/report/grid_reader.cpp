@@ -133,8 +133,10 @@ void setWidths(GridTable& result, std::vector<double> gridWidths, const GridRequ
     narrowToInt16(static_cast<std::int64_t>(gridWidths.size()));
     if (request.keptWidths) {
         if (request.keptWidths->size() != gridWidths.size())
-            throw RunTimeError(
-                ErrorNumber::SubscriptOutOfRange, u"the grid has another number of columns now");
+            throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+                u"the grid prints " + decimal(std::ssize(gridWidths))
+                    + u" columns now, the report was built with "
+                    + decimal(std::ssize(*request.keptWidths)) + u"; preview it anew");
         gridWidths.assign(request.keptWidths->begin(), request.keptWidths->end());
     }
     result.ColumnWidths = std::move(gridWidths);

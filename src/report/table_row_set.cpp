@@ -3,6 +3,7 @@
 
 #include "report/table_row_set.h"
 
+#include "platform/numbers.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -169,18 +170,26 @@ Value TableRowSet::value(int field)
     if (field < 0 || field >= fieldCount())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
             noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
+    requireRecord();
+    const auto record = static_cast<std::size_t>(position_ - 1);
+    return valueOf(cells_[record * names_.size() + static_cast<std::size_t>(field)]);
+}
+
+void TableRowSet::requireRecord() const
+{
     if (isBeforeFirst() || isAfterLast())
         throw RunTimeError(
             ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, records_));
-    const auto record = static_cast<std::size_t>(position_ - 1);
-    return valueOf(cells_[record * names_.size() + static_cast<std::size_t>(field)]);
 }
 
 void TableRowSet::values(int first, std::span<Value> into)
 {
     const auto end = static_cast<std::size_t>(first) + into.size();
-    if (first < 0 || end > names_.size() || isBeforeFirst() || isAfterLast())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+    if (first < 0 || end > names_.size())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"fields " + decimal(std::int64_t { first } + 1) + u" to",
+                static_cast<std::int64_t>(end), fieldCount()));
+    requireRecord();
     const auto record = static_cast<std::size_t>(position_ - 1);
     const Cell* cell = cells_.data() + record * names_.size() + first;
     for (Value& value : into)

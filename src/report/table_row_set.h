@@ -59,6 +59,8 @@ private:
         TextView text;
     };
 
+    /// @throws RunTimeError SubscriptOutOfRange: the position is on no record
+    void requireRecord() const;
     Cell cellOf(const Value& value);
     Cell cellOfDate(double milliseconds);
     Cell cellOfText(TextView text);

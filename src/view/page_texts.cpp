@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "document/text_search.h"
+#include "platform/numbers.h"
 #include "platform/run_time_error.h"
 #include "platform/text_metrics.h"
 
@@ -76,7 +77,10 @@ PageRect areaOf(
 {
     const auto records = document.texts(page);
     if (match.text >= records.size())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            noSuchItem(u"on page " + decimal(page + 1) + u" text",
+                static_cast<std::int64_t>(match.text) + 1,
+                static_cast<std::int64_t>(records.size())));
     const TextRecord& record = records[match.text];
     const ShownText text = shown(document, record, metrics);
     const std::size_t begin = std::min(match.begin, text.text.size());

@@ -4,6 +4,7 @@
 #include "export/qt/export_parts.h"
 
 #include "document/page_document.h"
+#include "platform/numbers.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -21,7 +22,10 @@ void checkPaper(const PageSetup& setup)
 {
     const auto fits = [](Twips length) { return length > 0 && length <= LargestPaper; };
     if (!fits(setup.myWidth) || !fits(setup.myHeight))
-        throw RunTimeError(ErrorNumber::Overflow, u"the paper is no size that can be written");
+        throw RunTimeError(ErrorNumber::Overflow,
+            u"paper of " + decimal(setup.myWidth) + u" by " + decimal(setup.myHeight)
+                + u" twips cannot be written; each side is 1 to " + decimal(LargestPaper)
+                + u" twips (200 inches)");
 }
 
 std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& options)
@@ -32,9 +36,13 @@ std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& opti
             std::clamp<int>(document.Totalpages, 0, document.pageCount())));
         std::iota(pages.begin(), pages.end(), 0);
     }
-    const auto isMissing = [&](int page) { return !document.hasPage(page); };
-    if (pages.empty() || std::ranges::any_of(pages, isMissing))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"there is no such page");
+    if (pages.empty())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the document has no page to write");
+    for (const int page : pages) {
+        if (!document.hasPage(page))
+            throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+                noSuchItem(u"page", std::int64_t { page } + 1, document.pageCount()));
+    }
     return pages;
 }
 

@@ -93,8 +93,9 @@ public:
         , image_(size, QImage::Format_RGB32)
     {
         if (image_.isNull())
-            throw RunTimeError(
-                ErrorNumber::Overflow, u"there is no memory for an image this large");
+            throw RunTimeError(ErrorNumber::Overflow,
+                u"there is no memory for an image of " + decimal(size.width()) + u" by "
+                    + decimal(size.height()) + u" pixels; choose a lower resolution");
         const int dotsPerMetre = roundToInt32(dpi * InchesPerMetre);
         image_.setDotsPerMeterX(dotsPerMetre);
         image_.setDotsPerMeterY(dotsPerMetre);
@@ -165,7 +166,10 @@ QSize pixelsOf(const PageSetup& setup, int dpi)
     const double width = roundHalfEven(setup.myWidth / TwipsPerInch * dpi);
     const double height = roundHalfEven(setup.myHeight / TwipsPerInch * dpi);
     if (dpi < 1 || width < 1 || height < 1 || width * height > MostPixels)
-        throw RunTimeError(ErrorNumber::Overflow, u"no image can be made at this resolution");
+        throw RunTimeError(ErrorNumber::Overflow,
+            u"an image of " + formatNumber(width) + u" by " + formatNumber(height) + u" pixels ("
+                + decimal(dpi) + u" per inch) cannot be made; it has 1 to "
+                + formatNumber(MostPixels) + u", so choose another resolution");
     return QSize(roundToInt32(width), roundToInt32(height));
 }
 
