@@ -131,6 +131,12 @@ const Format& formatNamed(const QString& name)
     return *format;
 }
 
+bool isFolderName(const QString& name)
+{
+    std::error_code ignored;
+    return std::filesystem::is_directory(pathOf(name), ignored);
+}
+
 const Format& formatOf(const QString& out)
 {
     const Format* const format = findFormat(QFileInfo(out).suffix());
@@ -152,7 +158,7 @@ struct Order {
             throw CommandError(
                 QStringLiteral("say where to export to: -o OUT.pdf, .png, .svg or .ostl"),
                 WrongUsage);
-        if (files.size() > 1 && !isJoined && out != StandardOutput && !QFileInfo(out).isDir()
+        if (files.size() > 1 && !isJoined && out != StandardOutput && !isFolderName(out)
             && findFormat(QFileInfo(out).suffix()))
             throw CommandError(
                 QStringLiteral(
@@ -191,7 +197,7 @@ struct Order {
     bool isFolder() const
     {
         return !isJoined
-            && (files.size() > 1 || out.endsWith(QLatin1Char('/')) || QFileInfo(out).isDir());
+            && (files.size() > 1 || out.endsWith(QLatin1Char('/')) || isFolderName(out));
     }
 
     QStringList files;
@@ -281,7 +287,8 @@ QString placeIn(
 void exportEach(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
     ProgressLine& progress, const Outcome& outcome)
 {
-    if (order.isFolder() && !QDir().mkpath(order.out))
+    std::error_code error;
+    if (order.isFolder() && !std::filesystem::create_directories(pathOf(order.out), error) && error)
         throw CommandError(QStringLiteral("%1: the folder cannot be made").arg(order.out));
     QStringList taken;
     for (const QString& file : order.files) {

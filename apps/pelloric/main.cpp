@@ -4,10 +4,10 @@
 #include "command_line.h"
 #include "commands.h"
 #include "interruption.h"
+#include "platform/qt/file_names.h"
 #include "platform/run_time_error.h"
 
 #include <QCoreApplication>
-#include <QFile>
 
 #include <algorithm>
 #include <array>
@@ -79,7 +79,7 @@ QStringList argumentsOf(int argc, char** argv)
 {
     QStringList arguments;
     for (int at = 1; at < argc; ++at)
-        arguments.append(QFile::decodeName(argv[at]));
+        arguments.append(qt::fileNameOf(argv[at]));
     return arguments;
 }
 

@@ -9,15 +9,14 @@
 #include "ui/qt/preview_window.h"
 #include "windows.h"
 
-#include <QFileInfo>
-
 namespace pelloric::app {
 
 int runOpen(const Invocation& invocation)
 {
     const CommandLine line(invocation.arguments, openOptions(), 1);
     const QString file = line.file(0);
-    if (!QFileInfo(file).isFile())
+    std::error_code ignored;
+    if (!std::filesystem::is_regular_file(pathOf(file), ignored))
         throw CommandError(QStringLiteral("%1: there is no such file").arg(file));
     WindowedApplication application(invocation);
     chooseLanguage(line);

@@ -5,6 +5,7 @@
 
 #include "interruption.h"
 #include "outcome.h"
+#include "platform/file_bytes.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "progress_line.h"
@@ -19,6 +20,7 @@
 #include <QTemporaryFile>
 
 #include <array>
+#include <fstream>
 #include <optional>
 #include <vector>
 
@@ -48,12 +50,13 @@ struct DatabaseName {
 
 DatabaseName splitName(const QString& name)
 {
-    if (QFileInfo::exists(name))
+    std::error_code ignored;
+    if (std::filesystem::exists(pathOf(name), ignored))
         return { name, {} };
     for (auto colon = name.lastIndexOf(QLatin1Char(':')); colon > 0;
          colon = name.lastIndexOf(QLatin1Char(':'), colon - 1)) {
         const QString file = name.left(colon);
-        if (QFileInfo(file).isFile())
+        if (std::filesystem::is_regular_file(pathOf(file), ignored))
             return { file, name.mid(colon + 1) };
     }
     return { name, {} };
@@ -61,16 +64,15 @@ DatabaseName splitName(const QString& name)
 
 void checkReadable(const QString& name)
 {
-    const QFileInfo info(name);
-    if (!info.exists())
-        throw CommandError(QStringLiteral("%1: there is no such file").arg(name));
-    if (info.isDir())
-        throw CommandError(QStringLiteral("%1 is a folder; name a file in it").arg(name));
     std::error_code ignored;
     const auto type = std::filesystem::status(pathOf(name), ignored).type();
+    if (type == std::filesystem::file_type::not_found || type == std::filesystem::file_type::none)
+        throw CommandError(QStringLiteral("%1: there is no such file").arg(name));
+    if (type == std::filesystem::file_type::directory)
+        throw CommandError(QStringLiteral("%1 is a folder; name a file in it").arg(name));
     if (type == std::filesystem::file_type::character || type == std::filesystem::file_type::block)
         throw CommandError(QStringLiteral("%1 is a device; name a file").arg(name));
-    if (!info.isReadable())
+    if (type == std::filesystem::file_type::regular && !std::ifstream(pathOf(name)))
         throw CommandError(QStringLiteral("%1: you may not read this file").arg(name));
 }
 /// What a pipe hands over, in a file that can be read twice.
@@ -142,10 +144,8 @@ bool isJson(const QString& name)
     }
     if (extension == QLatin1String("csv") || extension == QLatin1String("tsv"))
         return false;
-    constexpr qint64 SniffedBytes = 4096;
-    QFile file(name);
-    return file.open(QIODevice::ReadOnly) && !file.isSequential()
-        && qt::looksLikeJson(file.read(SniffedBytes).toStdString());
+    constexpr std::size_t SniffedBytes = 4096;
+    return qt::looksLikeJson(firstFileBytes(pathOf(name), SniffedBytes));
 }
 
 /// @param shown  what the file is called in warnings
@@ -177,13 +177,9 @@ TableGrid readValues(
 
 OptionTable sourceOptions() { return Options; }
 
-std::filesystem::path pathOf(const QString& name) { return qt::toText(name); }
-
 bool isDatabase(const QString& name)
 {
-    QFile file(name);
-    return QFileInfo(name).isFile() && file.open(QIODevice::ReadOnly)
-        && file.read(sizeof DatabaseMark - 1) == DatabaseMark;
+    return firstFileBytes(pathOf(name), sizeof DatabaseMark - 1) == DatabaseMark;
 }
 
 bool isDocumentName(const QString& name)

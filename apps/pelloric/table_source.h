@@ -5,8 +5,7 @@
 
 #include "command_line.h"
 #include "grids/table_grid.h"
-
-#include <filesystem>
+#include "platform/qt/file_names.h"
 
 namespace pelloric::app {
 
@@ -15,8 +14,7 @@ class ProgressLine;
 /// The options that say what is read of a file, for every command that reads tables.
 OptionTable sourceOptions();
 
-/// A path as the person wrote it.
-std::filesystem::path pathOf(const QString& name);
+using qt::pathOf;
 
 /// Whether a file is an SQLite database.
 bool isDatabase(const QString& name);

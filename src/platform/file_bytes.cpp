@@ -52,6 +52,18 @@ std::string readFileBytes(const std::filesystem::path& path, std::size_t most)
     return bytes;
 }
 
+std::string firstFileBytes(const std::filesystem::path& path, std::size_t most)
+{
+    std::error_code ignored;
+    if (!std::filesystem::is_regular_file(path, ignored))
+        return {};
+    std::ifstream stream(path, std::ios::binary);
+    std::string bytes(most, '\0');
+    stream.read(bytes.data(), static_cast<std::streamsize>(most));
+    bytes.resize(static_cast<std::size_t>(stream.gcount()));
+    return bytes;
+}
+
 bool createFile(const std::filesystem::path& path, std::string_view bytes)
 {
     std::ofstream stream(path, std::ios::binary | std::ios::trunc);

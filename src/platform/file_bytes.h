@@ -20,6 +20,10 @@ Text pathText(const std::filesystem::path& path);
 ///         the path: it is larger, or endless
 std::string readFileBytes(const std::filesystem::path& path, std::size_t most = std::string::npos);
 
+/// The first bytes of a file; none of what is no ordinary file, for reading takes them out of a
+/// pipe.
+std::string firstFileBytes(const std::filesystem::path& path, std::size_t most);
+
 /// Creates a file; a failure leaves none behind.
 /// @return  whether all bytes were written
 bool createFile(const std::filesystem::path& path, std::string_view bytes);

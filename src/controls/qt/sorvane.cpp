@@ -9,6 +9,7 @@
 #include "controls/qt/published_values.h"
 #include "grids/qt/grid_for.h"
 #include "platform/platform.h"
+#include "platform/qt/file_names.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -42,8 +43,6 @@ static_assert(Sorvane::MSHFlexGrid == static_cast<int>(CoreKind::MSHFlexGrid)
 constexpr short RightButtonNumber = 2;
 
 constexpr int FocusEdge = 2; ///< shows whether the control has the focus: pixels
-
-std::filesystem::path pathOf(const QString& path) { return std::filesystem::path(toText(path)); }
 
 QObject& objectOf(QObject* object)
 {

@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "controls/member_table.h"
 #include "platform/numbers.h"
+#include "platform/qt/file_names.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -17,7 +18,6 @@
 #include <QCoreApplication>
 #include <QDeadlineTimer>
 #include <QEventLoop>
-#include <QFile>
 #include <QMap>
 
 #include <algorithm>
@@ -25,7 +25,9 @@
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
+#include <fstream>
 #include <functional>
+#include <iterator>
 
 namespace pelloric::qt {
 
@@ -164,13 +166,14 @@ ScriptHost::~ScriptHost() = default;
 
 int ScriptHost::run(const QString& path, const QStringList& arguments)
 {
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
+    std::ifstream file(pathOf(path), std::ios::binary);
+    const std::string bytes { std::istreambuf_iterator<char>(file), {} };
+    if (!file.is_open() || file.bad()) {
         std::fprintf(stderr, "pelloric: cannot read the script %s: %s\n", qPrintable(path),
-            qPrintable(file.errorString()));
+            std::strerror(errno));
         return 1;
     }
-    return runText(QString::fromUtf8(file.readAll()), path, arguments);
+    return runText(QString::fromStdString(bytes), path, arguments);
 }
 
 int ScriptHost::runText(const QString& text, const QString& name, const QStringList& arguments)

@@ -3,12 +3,13 @@
 
 #include "tables/qt/office_table.h"
 
+#include "platform/file_bytes.h"
+#include "platform/qt/file_names.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "tables/qt/sheet_cells.h"
 #include "tables/qt/zip_entries.h"
 
-#include <QFile>
 #include <QFileInfo>
 #include <QProcess>
 #include <QStandardPaths>
@@ -27,15 +28,14 @@ constexpr char OldOfficeMark[] = "\xD0\xCF\x11\xE0";
 
 [[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::TypeMismatch, what); }
 
-QByteArray startOf(const std::filesystem::path& path)
+std::string startOf(const std::filesystem::path& path)
 {
-    QFile file(path);
-    return file.open(QIODevice::ReadOnly) ? file.read(4) : QByteArray();
+    return firstFileBytes(path, sizeof ZipMark - 1);
 }
 
 QString extensionOf(const std::filesystem::path& path)
 {
-    return QString::fromStdU16String(path.extension().u16string()).toLower();
+    return toQString(pathText(path.extension())).toLower();
 }
 
 /// Converts an office file of another kind.
@@ -46,29 +46,32 @@ std::filesystem::path converted(const std::filesystem::path& path, const QTempor
     if (program.isEmpty())
         refuse(u"this office file has to be converted by LibreOffice, which is not installed; "
                u"install libreoffice-calc, or save the file as .xlsx, .ods or CSV");
+    // Under a name of our own, for LibreOffice takes a name that begins with "-" for an option.
+    const QString name = folder.filePath(QStringLiteral("table")) + extensionOf(path);
+    std::error_code error;
+    if (!std::filesystem::copy_file(path, pathOf(name), error))
+        refuse(u"the file cannot be copied to convert it");
     QProcess process;
-    const QString name = QString::fromStdU16String(path.u16string());
     process.start(program,
         { QStringLiteral("--headless"), QStringLiteral("--convert-to"), QStringLiteral("xlsx"),
             QStringLiteral("--outdir"), folder.path(), name });
     const bool hasEnded = process.waitForFinished(ConversionTime);
-    const QString made
-        = folder.filePath(QFileInfo(name).completeBaseName() + QStringLiteral(".xlsx"));
+    const QString made = folder.filePath(QStringLiteral("table.xlsx"));
     if (!hasEnded || process.exitCode() != 0 || !QFileInfo::exists(made))
         refuse(u"LibreOffice could not convert this file; save it as .xlsx, .ods or CSV");
-    return toText(made);
+    return pathOf(made);
 }
 
 } // namespace
 
 bool isOfficeFile(const std::filesystem::path& path)
 {
-    const QByteArray start = startOf(path);
+    const std::string start = startOf(path);
     const QString extension = extensionOf(path);
-    if (start == QByteArray(OldOfficeMark))
+    if (start == OldOfficeMark)
         return true;
     constexpr const char* Zipped[] = { ".xlsx", ".xlsm", ".ods", ".xltx" };
-    return start == QByteArray(ZipMark) && std::ranges::any_of(Zipped, [&](const char* zipped) {
+    return start == ZipMark && std::ranges::any_of(Zipped, [&](const char* zipped) {
         return extension == QLatin1String(zipped);
     });
 }
@@ -76,7 +79,7 @@ bool isOfficeFile(const std::filesystem::path& path)
 TableGrid readOffice(const OfficeSource& source)
 {
     const QTemporaryDir folder;
-    const bool isOld = startOf(source.path) == QByteArray(OldOfficeMark);
+    const bool isOld = startOf(source.path) == OldOfficeMark;
     const std::filesystem::path path = isOld ? converted(source.path, folder) : source.path;
     const ZipEntries file(path);
     const SheetCells cells = file.has("content.xml") ? readOdsSheet(file, source.sheet)

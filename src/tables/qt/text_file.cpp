@@ -3,16 +3,17 @@
 
 #include "tables/qt/text_file.h"
 
+#include "platform/file_bytes.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
 #include <QByteArray>
-#include <QFile>
 #include <QStringDecoder>
 
 #include <uchardet/uchardet.h>
 
 #include <algorithm>
+#include <fstream>
 #include <memory>
 #include <vector>
 
@@ -20,7 +21,7 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr qint64 ChunkBytes = 1 << 20;
+constexpr qsizetype ChunkBytes = 1 << 20;
 
 /// More tells nothing new about the letters of a text.
 constexpr std::size_t DetectedBytes = 1U << 22U;
@@ -35,25 +36,27 @@ Text named(const QByteArray& encoding) { return toText(QString::fromLatin1(encod
 
 QByteArray readAll(const std::filesystem::path& path, const TextFileOptions& options)
 {
-    QFile file(path);
-    std::error_code ignored;
-    if (std::filesystem::is_directory(path, ignored) || !file.open(QIODevice::ReadOnly))
-        throw RunTimeError(ErrorNumber::FileNotFound, toText(file.fileName()));
+    std::error_code none;
+    std::ifstream file;
+    if (!std::filesystem::is_directory(path, none))
+        file.open(path, std::ios::binary);
+    if (!file.is_open())
+        throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));
+    const auto size = std::filesystem::file_size(path, none);
+    const qsizetype whole = none ? 0 : static_cast<qsizetype>(size);
     QByteArray bytes;
-    bytes.reserve(file.size());
-    while (true) {
-        const QByteArray chunk = file.read(ChunkBytes);
-        if (chunk.isEmpty())
-            break;
-        bytes += chunk;
-        const double part = file.size() > 0
-            ? static_cast<double>(bytes.size()) / static_cast<double>(file.size())
-            : 0;
+    bytes.reserve(whole);
+    std::string chunk(ChunkBytes, '\0');
+    while (file) {
+        file.read(chunk.data(), ChunkBytes);
+        bytes.append(chunk.data(), file.gcount());
+        const double part
+            = whole > 0 ? static_cast<double>(bytes.size()) / static_cast<double>(whole) : 0;
         if (options.progress && !options.progress(std::min(1.0, part)))
             throw RunTimeError(ErrorNumber::Cancelled);
     }
-    if (file.error() != QFileDevice::NoError)
-        throw RunTimeError(ErrorNumber::FileNotFound, toText(file.errorString()));
+    if (file.bad())
+        throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));
     return bytes;
 }
 
@@ -63,17 +66,29 @@ struct Decoded {
     bool isWhole = true; ///< all bytes are text
 };
 
+/// @param held  the first half of a pair whose second half comes with the next piece
+void append(Decoded& decoded, QString& held, QString piece)
+{
+    piece.prepend(held);
+    held.clear();
+    if (!piece.isEmpty() && piece.back().isHighSurrogate()) {
+        held = piece.last(1);
+        piece.chop(1);
+    }
+    decoded.isWhole = decoded.isWhole && piece.isValidUtf16();
+    decoded.text += piece.toUtf8().toStdString();
+}
+
 Decoded decode(QByteArrayView bytes, const QByteArray& encoding)
 {
     QStringDecoder decoder(encoding.constData());
     Decoded decoded;
-    for (qsizetype at = 0; at < bytes.size() && !decoder.hasError(); at += ChunkBytes) {
-        const QString piece = decoder(bytes.sliced(at, std::min(ChunkBytes, bytes.size() - at)));
-        decoded.text += piece.toUtf8().toStdString();
-    }
+    QString held;
+    for (qsizetype at = 0; at < bytes.size() && !decoder.hasError(); at += ChunkBytes)
+        append(decoded, held, decoder(bytes.sliced(at, std::min(ChunkBytes, bytes.size() - at))));
     // A character that the file's end cuts off is an error only once something follows it.
     const QString ignored = decoder(QByteArrayView("\n", 1));
-    decoded.isWhole = !decoder.hasError();
+    decoded.isWhole = decoded.isWhole && held.isEmpty() && !decoder.hasError();
     return decoded;
 }
 

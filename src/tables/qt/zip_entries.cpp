@@ -5,8 +5,6 @@
 
 #include "platform/run_time_error.h"
 
-#include <QFile>
-
 #include <zip.h>
 
 namespace pelloric::qt {
@@ -33,8 +31,8 @@ void ZipEntries::Discard::operator()(zip* archive) const { zip_discard(archive);
 ZipEntries::ZipEntries(const std::filesystem::path& path)
 {
     int error = 0;
-    const QByteArray name = QFile::encodeName(QString::fromStdU16String(path.u16string()));
-    archive_.reset(zip_open(name.constData(), ZIP_RDONLY, &error));
+    const std::u8string name = path.u8string();
+    archive_.reset(zip_open(reinterpret_cast<const char*>(name.c_str()), ZIP_RDONLY, &error));
     if (!archive_)
         refuse();
 }

@@ -49,6 +49,34 @@ struct ReadCase {
 
 } // namespace
 
+TEST(CsvTable, KeepsCharactersThatLieAcrossTwoPiecesOfAFile)
+{
+    constexpr std::size_t Piece = 1U << 20U; // that is read at once
+    const Text face = u"\U0001F600";
+    for (std::size_t before = Piece - 12; before <= Piece; before += 2) {
+        Text text = u"\uFEFFa\n";
+        text.resize(before / 2, u'x');
+        const Text whole = text + face + u"\n";
+        const std::string bytes(
+            reinterpret_cast<const char*>(whole.data()), whole.size() * sizeof(char16_t));
+        const std::string result = read("pieces.csv", bytes);
+        EXPECT_TRUE(result.ends_with("x\xF0\x9F\x98\x80|")) << before;
+    }
+}
+
+TEST(CsvTable, RefusesHalvesOfCharactersThatAMarkSaysAreText)
+{
+    const Text half = u"\uFEFFa\n\xD83Dx\n";
+    const std::string bytes(
+        reinterpret_cast<const char*>(half.data()), half.size() * sizeof(char16_t));
+    EXPECT_EQ(read("half.csv", bytes),
+        "Type mismatch: bytes that are no UTF-16LE, which the file's mark says it is");
+}
+
+#if defined(__unix__)
+TEST(CsvTable, ReadsAFileWhoseNameIsNoText) { EXPECT_EQ(read("n\xFF.csv", "a\n1\n"), "a|/1|"); }
+#endif
+
 TEST(CsvTable, ReadsTitlesAndCells)
 {
     const ReadCase cases[] = {
