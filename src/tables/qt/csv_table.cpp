@@ -47,14 +47,21 @@ struct Sizes {
     std::size_t bytes = 0; ///< of all cells; there are never more code units
     std::vector<std::int64_t> gluedLines {}; ///< where rows begin that look glued
     std::size_t glued = 0;
+    std::size_t ragged = 0; ///< rows with another number of values than the titles, not glued
+    std::int64_t raggedLine = 0; ///< where the first of them begins
 };
 
 /// A line break in a value whose row does not have as many values as the titles is most likely a
 /// quote that somebody forgot to close.
-void noteGlued(const SeparatedValues& row, std::size_t titles, Sizes& sizes)
+void noteOddRow(const SeparatedValues& row, std::size_t titles, Sizes& sizes)
 {
-    if (!row.hasLineBreak() || row.valueCount() == titles)
+    if (row.valueCount() == titles)
         return;
+    if (!row.hasLineBreak()) {
+        if (sizes.ragged++ == 0)
+            sizes.raggedLine = row.line();
+        return;
+    }
     ++sizes.glued;
     if (sizes.gluedLines.size() < MostNamedRows)
         sizes.gluedLines.push_back(row.line());
@@ -75,7 +82,7 @@ Sizes countSizes(std::string_view text, ValuesDialect dialect, const CsvOptions&
         if (sizes.rows++ == 0)
             titles = count;
         else
-            noteGlued(values, titles, sizes);
+            noteOddRow(values, titles, sizes);
         sizes.columns = std::max(sizes.columns, count);
         if (sizes.rows % RowsOfAStep == 0)
             tell(options,
@@ -166,6 +173,18 @@ Text gluedNote(const Sizes& sizes)
           u"row has not as many values as the titles";
 }
 
+Text raggedNote(const Sizes& sizes, char delimiter)
+{
+    const Text between = delimiter == '\t'
+        ? Text(u"a tab")
+        : Text(u"\"") + Text(1, static_cast<char16_t>(delimiter)) + u"\"";
+    return decimal(static_cast<std::int64_t>(sizes.ragged)) + u" of "
+        + decimal(static_cast<std::int64_t>(sizes.rows - 1))
+        + u" rows have not as many values as the titles, the first at line "
+        + decimal(sizes.raggedLine) + u"; is this a table with " + between
+        + u" between its values?";
+}
+
 } // namespace
 
 TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
@@ -187,6 +206,8 @@ TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
             + u"; name another one if letters look wrong");
     if (options.notes != nullptr && sizes.glued > 0)
         options.notes->push_back(gluedNote(sizes));
+    if (options.notes != nullptr && sizes.ragged > 0)
+        options.notes->push_back(raggedNote(sizes, dialect.delimiter));
     return grid;
 }
 

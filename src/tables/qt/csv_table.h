@@ -19,7 +19,7 @@ struct CsvOptions {
     std::optional<char> delimiter {}; ///< an ASCII character; nothing: found out
     bool hasQuotes = true; ///< false: a quote is a character like any other
     /// Gets sentences that the user should read: an encoding that was guessed, rows that look glued
-    /// together. May be null; borrowed.
+    /// together, rows with another number of values than the titles. May be null; borrowed.
     std::vector<Text>* notes = nullptr;
 };
 

@@ -240,14 +240,14 @@ void parse(std::string_view text, TableReceiver& receiver, std::int64_t firstLin
     refuse(atLine(firstLine, receiver.refusal()));
 }
 
-/// Parses all of a file: an array as a whole, and anything else line by line.
-void parseAll(std::string_view text, Names& names, TableGrid* grid)
+/// Parses all of a file: an array or one object as a whole, and anything else line by line.
+void parseAll(std::string_view text, bool isOne, Names& names, TableGrid* grid)
 {
     const std::size_t first = text.find_first_not_of(Blanks);
     if (first == std::string_view::npos)
         refuse(u"the file is empty");
-    if (text[first] == '[') {
-        TableReceiver receiver(names, grid, false);
+    if (isOne || text[first] == '[') {
+        TableReceiver receiver(names, grid, isOne);
         parse(text, receiver, 1);
         return;
     }
@@ -264,16 +264,45 @@ void parseAll(std::string_view text, Names& names, TableGrid* grid)
     }
 }
 
-/// A file that is one object over several lines is no table, and fails in its first line.
-void refuseOneObject(std::string_view text)
+/// What takes the first array of objects out of an object, as jq writes it.
+Text pathOfRows(const nlohmann::json& object)
+{
+    const auto isRows = [](const nlohmann::json& value) {
+        return value.is_array() && !value.empty() && value.front().is_object();
+    };
+    const auto isWord = [](char letter) {
+        return letter == '_' || (letter >= '0' && letter <= '9') || (letter >= 'a' && letter <= 'z')
+            || (letter >= 'A' && letter <= 'Z');
+    };
+    for (const auto& [name, value] : object.items()) {
+        if (isRows(value) && !name.empty() && std::ranges::all_of(name, isWord))
+            return u"." + fromUtf8(name);
+    }
+    return u".NAME";
+}
+
+/// Whether a text is one object alone.
+bool isOneObject(std::string_view text)
 {
     const std::size_t first = text.find_first_not_of(Blanks);
-    if (first == std::string_view::npos || text[first] != '{')
-        return;
-    const std::string_view line = text.substr(0, text.find('\n', first));
-    if (!nlohmann::json::accept(line) && nlohmann::json::accept(text))
+    return first != std::string_view::npos && text[first] == '{' && nlohmann::json::accept(text);
+}
+
+/// One object alone is a row where its values are plain ones. With arrays or objects in it, it is
+/// something that holds tables, unless the file's name says that its lines are rows.
+void refuseNestedObject(std::string_view text)
+{
+    const nlohmann::json object = nlohmann::json::parse(text);
+    const auto isPlain = [](const nlohmann::json& value) { return value.is_primitive(); };
+    if (!std::ranges::all_of(object, isPlain))
         refuse(u"the file is one object; " + Text(WantedShape)
-            + u"; take the array out of it, for example with: jq .NAME");
+            + u"; take the array out of it, for example with: jq " + pathOfRows(object));
+}
+
+bool hasLineName(const std::filesystem::path& path)
+{
+    const auto extension = path.extension();
+    return extension == ".jsonl" || extension == ".ndjson";
 }
 
 } // namespace
@@ -296,14 +325,16 @@ bool looksLikeJson(std::string_view start)
 TableGrid readJson(const std::filesystem::path& path, const TextFileOptions& options)
 {
     const TextFile file = readTextFile(path, options);
-    refuseOneObject(file.text);
+    const bool isOne = isOneObject(file.text);
+    if (isOne && !hasLineName(path))
+        refuseNestedObject(file.text);
     Names names;
-    parseAll(file.text, names, nullptr);
+    parseAll(file.text, isOne, names, nullptr);
     std::vector<TableColumn> columns;
     for (const std::string& name : names.all())
         columns.push_back({ .title = fromUtf8(name), .width = -1 });
     TableGrid grid(std::move(columns));
-    parseAll(file.text, names, &grid);
+    parseAll(file.text, isOne, names, &grid);
     return grid;
 }
 

@@ -62,6 +62,17 @@ std::filesystem::path converted(const std::filesystem::path& path, const QTempor
     return pathOf(made);
 }
 
+/// Whether an archive is an office file whatever its name, as one that came through a pipe.
+bool holdsSheets(const std::filesystem::path& path)
+{
+    try {
+        const ZipEntries file(path);
+        return file.has("xl/workbook.xml") || file.read("mimetype").contains("spreadsheet");
+    } catch (const RunTimeError&) {
+        return false;
+    }
+}
+
 } // namespace
 
 bool isOfficeFile(const std::filesystem::path& path)
@@ -70,8 +81,10 @@ bool isOfficeFile(const std::filesystem::path& path)
     const QString extension = extensionOf(path);
     if (start == OldOfficeMark)
         return true;
+    if (start != ZipMark)
+        return false;
     constexpr const char* Zipped[] = { ".xlsx", ".xlsm", ".ods", ".xltx" };
-    return start == ZipMark && std::ranges::any_of(Zipped, [&](const char* zipped) {
+    return holdsSheets(path) || std::ranges::any_of(Zipped, [&](const char* zipped) {
         return extension == QLatin1String(zipped);
     });
 }

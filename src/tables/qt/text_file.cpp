@@ -6,6 +6,7 @@
 #include "platform/file_bytes.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "tables/file_kinds.h"
 
 #include <QByteArray>
 #include <QStringDecoder>
@@ -206,6 +207,9 @@ Text atLine(std::int64_t line, TextView what)
 TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options)
 {
     const QByteArray bytes = readAll(path, options);
+    const TextView kind = notATable({ bytes.constData(), static_cast<std::size_t>(bytes.size()) });
+    if (!kind.empty())
+        refuse(Text(kind));
     if (!options.encoding.isEmpty()) {
         const QByteArray encoding = options.encoding.toLatin1();
         if (!QStringDecoder(encoding.constData()).isValid())

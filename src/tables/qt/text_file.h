@@ -30,7 +30,8 @@ struct TextFileOptions {
 /// Reads a text file of any encoding.
 ///
 /// @throws RunTimeError FileNotFound: it is missing or cannot be read, with the path; TypeMismatch,
-///         naming the line where there is one: an unknown encoding, or bytes that are no text;
+///         naming the line where there is one: an unknown encoding, bytes that are no text, or a
+///         file that begins as no table does, see `notATable`;
 ///         Cancelled: the progress said so
 TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options);
 

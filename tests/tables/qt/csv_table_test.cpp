@@ -176,6 +176,21 @@ TEST(CsvTable, SaysWhichEncodingWasGuessedAndWhichRowsLookGlued)
             u"line break, and the row has not as many values as the titles" }));
 }
 
+TEST(CsvTable, SaysHowManyRowsHaveNotAsManyValuesAsTheTitles)
+{
+    const TempFolder folder;
+    std::vector<Text> notes;
+    const auto ragged = folder.write("a.csv", "a;b\n1;2\n3\n4;5;6\n7;8\n");
+    EXPECT_EQ(dump(readCsv(ragged, { .notes = &notes })), u"a|b||/1|2||/3|||/4|5|6|/7|8||");
+    ASSERT_EQ(notes.size(), 1U);
+    EXPECT_EQ(toUtf8(notes[0]),
+        "2 of 4 rows have not as many values as the titles, the first at line 3; is this a table "
+        "with \";\" between its values?");
+    notes.clear();
+    readCsv(folder.write("b.csv", "a,b\n1,2\n\n3,4\n"), { .notes = &notes });
+    EXPECT_TRUE(notes.empty());
+}
+
 TEST(CsvTable, RefusesAnUnknownEncodingAndAMissingFile)
 {
     EXPECT_EQ(read("a.csv", "a\n", QStringLiteral("no-such")).substr(0, 40),

@@ -53,6 +53,7 @@ TEST(JsonTable, ReadsArraysOfObjectsAndLines)
             "a|b|/[1,\"x\",{\"k\":null,\"l\":[]}]|{\"c\":2}|" },
         { "[{\"城市\":\"北京\\n\\u5317\"}]", "城市|/北京\n北|" },
         { "\xEF\xBB\xBF[{\"a\":1}]", "a|/1|" },
+        { "{\n\"a\":1,\n\"b\":\"x\"\n}", "a|b|/1|x|" },
         { "[]", "" },
         { "[{}]", "/" },
     };
@@ -69,10 +70,23 @@ TEST(JsonTable, NamesTheLineOfWhatItCannotReadAndWhatATableIs)
     EXPECT_EQ(read("[1,2]"), "Type mismatch: line 1: " + std::string(Shape));
     EXPECT_EQ(read("[[1],[2]]"), "Type mismatch: line 1: " + std::string(Shape));
     EXPECT_EQ(read("{\"a\":1}\n3\n"), "Type mismatch: line 2: " + std::string(Shape));
-    EXPECT_EQ(read("{\n\"data\": [{\"a\":1}]\n}"),
+    for (const char* const object :
+        { "{\n\"data\": [{\"a\":1}]\n}", "{\"n\":[1],\"data\":[{\"a\":1}]}" })
+        EXPECT_EQ(read(object),
+            "Type mismatch: the file is one object; " + std::string(Shape)
+                + "; take the array out of it, for example with: jq .data");
+    EXPECT_EQ(read("{\"a b\":[{\"a\":1}]}"),
         "Type mismatch: the file is one object; " + std::string(Shape)
             + "; take the array out of it, for example with: jq .NAME");
     EXPECT_EQ(read(" \n"), "Type mismatch: the file is empty");
+}
+
+TEST(JsonTable, TakesOneNestedObjectForARowWhereTheNameSaysSo)
+{
+    const TempFolder folder;
+    const TableGrid grid = readJson(folder.write("a.jsonl", "{\"a\":[{\"b\":1}]}\n"), {});
+    EXPECT_EQ(grid.rowCount(), 1);
+    EXPECT_EQ(toUtf8(Text(grid.cell(0, 0))), "[{\"b\":1}]");
 }
 
 TEST(JsonTable, EndsForDeepNesting)

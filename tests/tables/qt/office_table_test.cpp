@@ -73,6 +73,16 @@ TEST(OfficeTable, SaysWhatIsWrongWithOtherFiles)
         "installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV");
 }
 
+TEST(OfficeTable, IsKnownByItsContentWhereTheNameDoesNotTell)
+{
+    const TempFolder folder;
+    for (const char* const name : { "sales.xlsx", "sales.ods" }) {
+        const auto piped = folder.write("piped", TempFolder::bytesOf(sample(name)));
+        EXPECT_TRUE(isOfficeFile(piped)) << name;
+    }
+    EXPECT_FALSE(isOfficeFile(folder.write("packed", "PK\x03\x04 and then nothing")));
+}
+
 TEST(OfficeTable, LetsLibreOfficeConvertOlderFiles)
 {
     const TempFolder folder;
