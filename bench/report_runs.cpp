@@ -11,6 +11,7 @@
 #include "document/ostl_writer.h"
 #include "export/qt/page_export.h"
 #include "platform/qt/qt_platform.h"
+#include "platform/safe_file.h"
 #include "platform/services.h"
 #include "report/layout_engine.h"
 #include "settings/default_settings.h"
@@ -283,7 +284,8 @@ private:
         const fs::path path = fs::path(folder_.path().toStdString()) / "report.ostl";
         const OstlEncoding encoding { record_->codec, u'.' };
         const StopWatch writing;
-        writeOstl(canvas.document(), canvas.page, encoding, {}, path);
+        writeOstl(
+            canvas.document(), canvas.page, encoding, {}, SafeFile(canvas.platform().files, path));
         const double written = writing.seconds();
         print("document file: write", rows, written, "(131 pages at most)");
         repeatPages(path, canvas.document().pageCount() / (LastSavedPage + 1));
@@ -307,7 +309,8 @@ private:
             return;
         const fs::path path = fs::path(folder_.path().toStdString()) / "report.pdf";
         const StopWatch watch;
-        qt::exportPdf(canvas.document(), canvas.page, platform_.fonts(), {}, path);
+        qt::exportPdf(canvas.document(), canvas.page, platform_.fonts(), {},
+            SafeFile(canvas.platform().files, path));
         const double seconds = watch.seconds();
         print("PDF export", rows, seconds, "");
         const double pages = canvas.document().pageCount();

@@ -6,6 +6,7 @@
 #include "platform/no_printer.h"
 #include "platform/platform.h"
 #include "platform/services.h"
+#include "platform/std_files.h"
 #include "platform/text_codec.h"
 #include "platform/text_metrics.h"
 
@@ -110,10 +111,11 @@ struct FuzzPlatform {
     NoLoop loop;
     FixedClock clock;
     ProcessFolder folders;
+    StdFiles files;
     NoPrinter printer;
     NoPrinters printers;
     LibraryState library;
-    Platform services { metrics, codec, messages, loop, clock, folders, printer, printers,
+    Platform services { metrics, codec, messages, loop, clock, folders, files, printer, printers,
         library };
 };
 

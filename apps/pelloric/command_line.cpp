@@ -32,7 +32,9 @@ struct Advice {
 };
 
 constexpr auto Advices = std::to_array<Advice>({
-    { ErrorNumber::WriteFailed, "; check that the folder exists, can be written and has room" },
+    { ErrorNumber::WriteFailed, "; check that the folder exists and takes files" },
+    { ErrorNumber::DiskFull, "; make room on the disk, or choose another one" },
+    { ErrorNumber::PermissionDenied, "; check your rights to the file and its folder" },
     { ErrorNumber::FileNotFound, "; check the name and that you may read it" },
 });
 

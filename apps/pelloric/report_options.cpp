@@ -275,7 +275,7 @@ void changeTexts(const CommandLine& line, Changes& changes)
 }
 
 /// The user's settings text, or the default one where there is none and none can be made.
-std::string settingsBytes(const Platform& platform)
+Text privateSettings(const Platform& platform)
 {
     const std::filesystem::path path = settingsPath(platform);
     std::error_code ignored;
@@ -283,12 +283,10 @@ std::string settingsBytes(const Platform& platform)
         try {
             deployDefaultSettings(platform);
         } catch (const RunTimeError&) {
-            std::string bytes;
-            platform.codec.encode(defaultSettingsText(), bytes);
-            return bytes;
+            return defaultSettingsText();
         }
     }
-    return readFileBytes(path);
+    return platform.codec.decode(readFileBytes(path));
 }
 
 } // namespace
@@ -307,14 +305,13 @@ const char* firstReportOption(const CommandLine& line)
 PrivateSettings::PrivateSettings(qt::QtPlatform& platform, const CommandLine& line)
     : platform_(platform)
 {
-    const std::string bytes = settingsBytes(platform.record());
+    const Text content = privateSettings(platform.record());
     if (!folder_.isValid())
         throw CommandError(QStringLiteral("no temporary folder: %1").arg(folder_.errorString()));
     const std::filesystem::path folder = qt::toText(folder_.path());
     platform_.folders().setSystemDirectory(folder);
     const Platform record = platform_.record();
-    if (!createFile(settingsPath(record), bytes))
-        throw RunTimeError(ErrorNumber::WriteFailed, pathText(settingsPath(record)));
+    replaceSettings(record, content);
     Changes changes(record);
     if (line.has("no-headers"))
         changes.add(u"ShowHeaders", QStringLiteral("0"));

@@ -3,17 +3,13 @@
 
 #include "command_line.h"
 #include "commands.h"
-#include "export/qt/pending_files.h"
 #include "headless.h"
 #include "platform/file_bytes.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
-#include "platform/text_codec.h"
 #include "settings/default_settings.h"
 #include "settings/settings_file.h"
-
-#include <QFile>
 
 #include <array>
 
@@ -25,17 +21,6 @@ constexpr auto Options = std::to_array<Option>({
     { "path", nullptr, "only say where the file is" },
     { "reset", nullptr, "put the default settings back" },
 });
-
-void reset(const Platform& platform)
-{
-    std::string bytes;
-    platform.codec.encode(defaultSettingsText(), bytes);
-    qt::PendingFiles files;
-    const auto size = static_cast<qint64>(bytes.size());
-    files.write(settingsPath(platform),
-        [&](QFile& file) { return file.write(bytes.data(), size) == size; });
-    files.putInPlace();
-}
 
 QString settingsText(const Platform& platform)
 {
@@ -59,7 +44,7 @@ int runSettings(const Invocation& invocation)
     }
     deployDefaultSettings(record);
     if (line.has("reset"))
-        reset(record);
+        resetSettings(record);
     else
         print(settingsText(record));
     return Done;

@@ -11,6 +11,7 @@
 #include "platform/numbers.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
+#include "platform/safe_file.h"
 #include "platform/services.h"
 #include "print/paper_names.h"
 #include "print/print_job.h"
@@ -276,7 +277,8 @@ bool Canvas::SaveFile(const std::filesystem::path& path)
     };
     bool written = true;
     try {
-        writeOstl(document_, page, { platform_.codec, platform_.decimalSeparator }, report, path);
+        writeOstl(document_, page, { platform_.codec, platform_.decimalSeparator }, report,
+            SafeFile(platform_.files, path));
     } catch (const RunTimeError&) {
         written = false; // saving is silent; the file that was there is still whole
     }

@@ -5,13 +5,13 @@
 
 #include "platform/text.h"
 
-#include <filesystem>
 #include <functional>
 #include <iosfwd>
 
 namespace pelloric {
 
 class PageDocument;
+class SafeFile;
 class TextCodec;
 struct PageSetup;
 
@@ -34,13 +34,12 @@ using OstlProgress = std::function<void(int page, int last)>;
 void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
     const OstlProgress& progress, std::ostream& stream);
 
-/// Saves a document to a file, replacing any file there.
+/// Saves a document to a file and puts it into its place.
 ///
-/// The file is written under another name beside its place and put there when it is whole, so a
-/// save that fails, or that `progress` ends with an error, changes nothing. A file in a folder
-/// that takes no new one is rewritten in place.
-/// @throws RunTimeError WriteFailed, with the path
+/// A save that fails, or that `progress` ends with an error, changes nothing.
+/// @param file  takes the bytes; write `SafeFile(files, path)`
+/// @throws RunTimeError WriteFailed, DiskFull or PermissionDenied, with the path
 void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
-    const OstlProgress& progress, const std::filesystem::path& path);
+    const OstlProgress& progress, SafeFile file);
 
 } // namespace pelloric

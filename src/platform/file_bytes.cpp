@@ -10,24 +10,6 @@
 
 namespace pelloric {
 
-namespace {
-
-/// Nothing is truncated before the new bytes stand, so that no moment leaves an empty file.
-bool overwrite(const std::filesystem::path& path, std::string_view bytes)
-{
-    std::fstream stream(path, std::ios::binary | std::ios::in | std::ios::out);
-    stream.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
-    stream.close();
-    if (!stream)
-        return false;
-    std::error_code error;
-    if (std::filesystem::file_size(path, error) != bytes.size())
-        std::filesystem::resize_file(path, bytes.size(), error);
-    return !error;
-}
-
-} // namespace
-
 Text pathText(const std::filesystem::path& path)
 {
     const std::u8string bytes = path.u8string();
@@ -62,29 +44,6 @@ std::string firstFileBytes(const std::filesystem::path& path, std::size_t most)
     stream.read(bytes.data(), static_cast<std::streamsize>(most));
     bytes.resize(static_cast<std::size_t>(stream.gcount()));
     return bytes;
-}
-
-bool createFile(const std::filesystem::path& path, std::string_view bytes)
-{
-    std::ofstream stream(path, std::ios::binary | std::ios::trunc);
-    if (!stream)
-        return false;
-    stream.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
-    stream.close();
-    if (stream)
-        return true;
-    std::error_code ignored;
-    std::filesystem::remove(path, ignored);
-    return false;
-}
-
-bool rewriteFile(
-    const std::filesystem::path& path, std::string_view bytes, std::string_view oldBytes)
-{
-    if (overwrite(path, bytes))
-        return true;
-    overwrite(path, oldBytes);
-    return false;
 }
 
 } // namespace pelloric

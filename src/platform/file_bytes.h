@@ -24,14 +24,4 @@ std::string readFileBytes(const std::filesystem::path& path, std::size_t most = 
 /// pipe.
 std::string firstFileBytes(const std::filesystem::path& path, std::size_t most);
 
-/// Creates a file; a failure leaves none behind.
-/// @return  whether all bytes were written
-bool createFile(const std::filesystem::path& path, std::string_view bytes);
-
-/// Rewrites an existing file in place; after a failure it holds `oldBytes` again where the disk
-/// allows it.
-/// @return  whether all bytes were written
-bool rewriteFile(
-    const std::filesystem::path& path, std::string_view bytes, std::string_view oldBytes);
-
 } // namespace pelloric

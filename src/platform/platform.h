@@ -8,6 +8,7 @@
 namespace pelloric {
 
 class Clock;
+class FileSystem;
 class MessageLoop;
 class MessageService;
 class Printer;
@@ -29,6 +30,7 @@ struct Platform {
     MessageLoop& loop;
     Clock& clock;
     SystemFolders& folders;
+    FileSystem& files;
     Printer& printer;
     PrinterSystem& printers;
     LibraryState& library;

@@ -22,6 +22,8 @@ constexpr ErrorRow Errors[] = {
     { ErrorNumber::TypeMismatch, u"Type mismatch" },
     { ErrorNumber::FileNotFound, u"File not found" },
     { ErrorNumber::WriteFailed, u"The file cannot be written" },
+    { ErrorNumber::DiskFull, u"Disk full" },
+    { ErrorNumber::PermissionDenied, u"Permission denied" },
     { ErrorNumber::ObjectMissing, u"Object variable not set" },
     { ErrorNumber::NoSuchMember, u"Object doesn't support this property or method" },
     { ErrorNumber::Cancelled, u"Cancel was selected" },

@@ -19,6 +19,8 @@ enum class ErrorNumber {
     TypeMismatch = 13,
     FileNotFound = 53,
     WriteFailed = 57,
+    DiskFull = 61,
+    PermissionDenied = 70,
     ObjectMissing = 91,
     NoSuchMember = 438,
     Cancelled = 32755,

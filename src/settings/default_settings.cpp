@@ -140,19 +140,19 @@ bool deployDefaultSettings(const Platform& platform)
 void replaceByDefaultSettings(const Platform& platform, std::span<const SettingChange> values)
 {
     const std::filesystem::path path = settingsPath(platform);
-    std::string bytes;
-    platform.codec.encode(settingsTextWith(values), bytes);
     std::error_code error;
-    bool isWritten = false;
-    if (std::filesystem::exists(path, error)) {
-        keepBeside(path);
-        isWritten = rewriteFile(path, bytes, readableBytes(path).value_or(std::string()));
-    } else {
+    if (!std::filesystem::exists(path, error))
         std::filesystem::create_directories(path.parent_path(), error);
-        isWritten = createFile(path, bytes);
-    }
-    if (!isWritten)
-        throw RunTimeError(ErrorNumber::WriteFailed, pathText(path));
+    const auto lock = lockSettings(platform);
+    if (std::filesystem::exists(path, error))
+        keepBeside(path);
+    replaceSettings(platform, settingsTextWith(values));
+}
+
+void resetSettings(const Platform& platform)
+{
+    const auto lock = lockSettings(platform);
+    replaceSettings(platform, defaultSettingsText());
 }
 
 } // namespace pelloric

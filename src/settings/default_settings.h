@@ -35,14 +35,18 @@ Text settingsTextWith(std::span<const SettingChange> values);
 /// its place. Any other file, and one that cannot be read, is never touched.
 ///
 /// @return  whether the default file was put in place
-/// @throws RunTimeError WriteFailed, with the path: the folder or a file cannot be written; nothing
-///         is lost
+/// @throws RunTimeError WriteFailed, DiskFull or PermissionDenied, with the path: the folder or a
+///         file cannot be written; nothing is lost
 bool deployDefaultSettings(const Platform& platform);
 
 /// Puts the default file in place, with other values for some keys; a file that was there is kept
 /// beside as `deployDefaultSettings` does.
 ///
-/// @throws RunTimeError WriteFailed, with the path; nothing is lost
+/// @throws RunTimeError as `deployDefaultSettings`; nothing is lost
 void replaceByDefaultSettings(const Platform& platform, std::span<const SettingChange> values);
+
+/// Puts the default file into the place of the one that is there, in a folder that exists.
+/// @throws RunTimeError as `deployDefaultSettings`
+void resetSettings(const Platform& platform);
 
 } // namespace pelloric

@@ -6,6 +6,7 @@
 #include "platform/file_bytes.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
+#include "platform/safe_file.h"
 #include "platform/services.h"
 #include "platform/text_codec.h"
 
@@ -91,15 +92,16 @@ OldFile readOldFile(const std::filesystem::path& path)
     }
 }
 
-SaveOutcome save(const Platform& platform, const std::filesystem::path& path, TextView text,
-    const std::optional<std::string>& oldBytes)
+SaveOutcome save(const Platform& platform, TextView text)
 {
     Text quoted(1, Quote);
     quoted.append(text).append(1, Quote).append(LineEnd);
-    std::string bytes;
-    platform.codec.encode(quoted, bytes);
-    const bool written = oldBytes ? rewriteFile(path, bytes, *oldBytes) : createFile(path, bytes);
-    return written ? SaveOutcome::Written : SaveOutcome::WriteFailed;
+    try {
+        replaceSettings(platform, quoted);
+    } catch (const RunTimeError&) {
+        return SaveOutcome::WriteFailed;
+    }
+    return SaveOutcome::Written;
 }
 
 } // namespace
@@ -107,6 +109,22 @@ SaveOutcome save(const Platform& platform, const std::filesystem::path& path, Te
 std::filesystem::path settingsPath(const Platform& platform)
 {
     return platform.folders.systemDirectory() / "OstlConfig.ini";
+}
+
+std::unique_ptr<FolderLock> lockSettings(const Platform& platform)
+{
+    std::error_code error;
+    const auto path = std::filesystem::weakly_canonical(settingsPath(platform), error);
+    return platform.files.lock(path.parent_path());
+}
+
+void replaceSettings(const Platform& platform, TextView content)
+{
+    std::string bytes;
+    platform.codec.encode(content, bytes);
+    SafeFile file(platform.files, settingsPath(platform));
+    file.write(bytes);
+    file.putInPlace();
 }
 
 Text readSetting(const Platform& platform, TextView key)
@@ -140,8 +158,8 @@ SaveOutcome writeSetting(const Platform& platform, TextView key, TextView value)
 SaveOutcome batchWrite(
     const Platform& platform, std::span<const SettingChange> changes, FailurePolicy policy)
 {
-    const std::filesystem::path path = settingsPath(platform);
-    const OldFile old = readOldFile(path);
+    const auto lock = lockSettings(platform);
+    const OldFile old = readOldFile(settingsPath(platform));
     const bool stops = policy == FailurePolicy::StopAtFirst;
     if (stops && !old.bytes)
         return SaveOutcome::NothingWritten;
@@ -156,7 +174,7 @@ SaveOutcome batchWrite(
                 return SaveOutcome::NothingWritten;
         }
     }
-    return save(platform, path, text, old.bytes);
+    return save(platform, text);
 }
 
 SettingsSnapshot::SettingsSnapshot(const Platform& platform)

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "platform/files.h"
 #include "platform/text.h"
 
 #include <filesystem>
@@ -21,6 +22,18 @@ inline constexpr std::size_t MostSettingsBytes = 1U << 24U;
 /// the first and the last line are a lone double quote each. There is no cache of it, and the
 /// system never adds a key.
 std::filesystem::path settingsPath(const Platform& platform);
+
+/// Keeps other programs from changing the settings until it is given back.
+/// @return  null where there is no folder or no lock in reasonable time; the settings are changed
+///          without it then
+std::unique_ptr<FolderLock> lockSettings(const Platform& platform);
+
+/// Replaces the file's whole content; a link is followed.
+///
+/// At every moment the file holds the old content or the new one.
+/// @param content  as it is to stand in the file
+/// @throws RunTimeError WriteFailed, DiskFull or PermissionDenied, with the path
+void replaceSettings(const Platform& platform, TextView content);
 
 /// The trimmed value of a key: what follows the first "=" of the first line that holds the key
 /// anywhere, letter case told apart.

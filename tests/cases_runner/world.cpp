@@ -47,7 +47,7 @@ Json jsonOf(const Message& message)
 
 World::World(const std::filesystem::path& directory, TextCodec& codec)
     : codec(codec)
-    , platform { metrics, codec, messages, loop, clock, folders, printer, printers, library }
+    , platform { metrics, codec, messages, loop, clock, folders, files, printer, printers, library }
     , facade(platform, window)
     , canvas(platform)
     , directory_(directory)

@@ -11,6 +11,7 @@
 #include "platform/platform.h"
 #include "platform/printer.h"
 #include "platform/services.h"
+#include "platform/std_files.h"
 #include "platform/text_codec.h"
 
 #include <filesystem>
@@ -172,6 +173,7 @@ public:
     CaseLoop loop;
     CaseClock clock;
     CaseFolders folders;
+    StdFiles files;
     CasePrinter printer;
     CasePrinters printers;
     LibraryState library;

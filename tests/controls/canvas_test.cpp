@@ -82,7 +82,7 @@ struct CanvasTest : ::testing::Test, ReportWorld {
     struct Busy {
         explicit Busy(FakePlatform& world)
             : platform { world.metrics, world.codec, world.messages, loop, world.clock,
-                world.folders, world.printer, world.printers, world.library }
+                world.folders, world.files, world.printer, world.printers, world.library }
             , canvas(platform)
         {
         }
@@ -408,7 +408,7 @@ TEST_F(CanvasTest, PrintsALateBoundRowSetInBandsAndMergedByItsStepsAlone)
 TEST_F(CanvasTest, RefusesANestedBuildWithoutAWord)
 {
     BusyLoop busy;
-    Platform platform { metrics, codec, messages, busy, clock, folders, printer, printers,
+    Platform platform { metrics, codec, messages, busy, clock, folders, files, printer, printers,
         library };
     Canvas other(platform);
     TableGrid inner = gridOf({ { u"inner", 1000 } }, {});
@@ -429,7 +429,7 @@ TEST_F(CanvasTest, RefusesANestedBuildWithoutAWord)
 TEST_F(CanvasTest, KeepsTheDocumentOfABuildFromItsHostWhileItRuns)
 {
     BusyLoop busy;
-    Platform platform { metrics, codec, messages, busy, clock, folders, printer, printers,
+    Platform platform { metrics, codec, messages, busy, clock, folders, files, printer, printers,
         library };
     Canvas other(platform);
     TableGrid grid = gridOf({ { u"title", 1000 } }, { { u"row" } });
@@ -642,8 +642,8 @@ TEST_F(CanvasTest, RefusesMembersThatChangeTheDocumentWhileItPrints)
         std::function<void()> action;
     };
     PrintingLoop printing;
-    Platform platform { metrics, codec, messages, printing, clock, folders, printer, printers,
-        library };
+    Platform platform { metrics, codec, messages, printing, clock, folders, files, printer,
+        printers, library };
     Canvas other(platform);
     addPages(other.document(), 2);
     TableGrid grid = small();
@@ -733,7 +733,7 @@ TEST_F(CanvasTest, HidesTheProgressBarWhenThePrinterFails)
         void endDoc() override { throw RunTimeError(ErrorNumber::InvalidCall); }
     };
     FailingPrinter failing;
-    Platform platform { metrics, codec, messages, loop, clock, folders, failing, printers,
+    Platform platform { metrics, codec, messages, loop, clock, folders, files, failing, printers,
         library };
     Canvas other(platform);
     EXPECT_EQ(errorOf([&] { other.doPrint(true, u"", 1); }), ErrorNumber::InvalidCall);

@@ -7,6 +7,8 @@
 #include "document/page_document.h"
 #include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
+#include "platform/safe_file.h"
+#include "platform/std_files.h"
 #include "support/errors.h"
 
 #include <gtest/gtest.h>
@@ -280,7 +282,8 @@ TEST(OstlReader, BringsBackWhatWasSavedButTheFontNames)
     PageDocument document;
     PageSetup setup;
     EXPECT_EQ(readOstl(codec, folder.file("a.ostl"), document, setup), OstlResult::Opened);
-    writeOstl(document, setup, { codec }, {}, folder.file("b.ostl"));
+    StdFiles files;
+    writeOstl(document, setup, { codec }, {}, SafeFile(files, folder.file("b.ostl")));
     EXPECT_EQ(folder.read("b.ostl"), bytes);
 }
 

@@ -8,6 +8,7 @@
 #include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
 #include "platform/platform.h"
+#include "platform/std_files.h"
 
 namespace pelloric {
 
@@ -25,12 +26,14 @@ struct FakePlatform {
     FakeMessageLoop loop;
     FakeClock clock;
     FakeFolders folders;
+    StdFiles files;
     FakePrinter printer;
     FakePrinterSystem printers;
     LibraryState library;
 
 private:
-    Platform record_ { metrics, codec, messages, loop, clock, folders, printer, printers, library };
+    Platform record_ { metrics, codec, messages, loop, clock, folders, files, printer, printers,
+        library };
 };
 
 } // namespace pelloric

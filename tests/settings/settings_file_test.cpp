@@ -109,7 +109,7 @@ TEST(ReadSetting, SearchesTheDecodedTextAndNotItsBytes)
     TwoByteCodec codec;
     const Platform& other = world.services();
     const Platform platform { other.metrics, codec, other.messages, other.loop, other.clock,
-        other.folders, other.printer, other.printers, other.library };
+        other.folders, other.files, other.printer, other.printers, other.library };
     EXPECT_EQ(readSetting(platform, u"Top"), u"7");
     EXPECT_EQ(readSetting(platform, u"HeaderLeft"), u"乀op");
 }

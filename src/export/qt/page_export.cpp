@@ -12,9 +12,11 @@
 #include "export/qt/svg_page.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_drawing_surface.h"
+#include "platform/qt/qt_files.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "platform/safe_file.h"
 #include "view/joined_lines.h"
 #include "view/page_renderer.h"
 
@@ -239,7 +241,8 @@ void exportOstl(const PageDocument& document, const PageSetup& setup, const Ostl
     const auto step = [&](int page, int last) {
         tell(options, static_cast<std::size_t>(page), static_cast<std::size_t>(last) + 1);
     };
-    writeOstl(document, setup, encoding, step, path);
+    QtFiles files;
+    writeOstl(document, setup, encoding, step, SafeFile(files, path));
 }
 
 } // namespace pelloric::qt

@@ -3,7 +3,8 @@
 
 #pragma once
 
-#include <QFile>
+#include "platform/qt/qt_files.h"
+#include "platform/safe_file.h"
 
 #include <filesystem>
 #include <functional>
@@ -11,35 +12,27 @@
 
 namespace pelloric::qt {
 
-/// Files written under other names beside their places, put there together once all are whole.
+/// Files that are put into their places together once all are whole.
 ///
-/// What is not put into place is removed again, so that a failure leaves the files there were. A
-/// place that is no plain file, such as a pipe, is written to directly.
+/// What is not put into place is removed again, so that a failure leaves the files there were.
 class PendingFiles {
 public:
     /// Writes one file; is told the open file, and answers whether all went well.
     using Writer = std::function<bool(QFile& file)>;
 
-    PendingFiles() = default;
-    ~PendingFiles();
-    PendingFiles(const PendingFiles&) = delete;
-    PendingFiles& operator=(const PendingFiles&) = delete;
-
     /// Writes a file that is to stand at a path.
-    /// @throws RunTimeError WriteFailed, with the path; or what the writer throws
+    /// @throws RunTimeError WriteFailed, DiskFull or PermissionDenied, with the path; or what the
+    ///         writer throws
     void write(const std::filesystem::path& path, const Writer& writer);
 
-    /// Puts all files into their places, replacing any files there.
-    /// @throws RunTimeError WriteFailed, with the path: it and those behind it are as they were
+    /// Puts all files into their places, the last one first, replacing any files there.
+    /// @throws RunTimeError as `write`: that file and those before it are as they were
     void putInPlace();
 
 private:
-    struct Pending {
-        std::filesystem::path target; ///< links followed
-        std::filesystem::path written;
-    };
-
-    std::vector<Pending> files_;
+    QtFiles system_;
+    SavingGroup group_;
+    std::vector<SafeFile> files_; ///< put into place from the last one on
 };
 
 } // namespace pelloric::qt

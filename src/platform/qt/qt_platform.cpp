@@ -33,6 +33,7 @@ Platform QtPlatform::record()
         .loop = loop_,
         .clock = clock_,
         .folders = folders_,
+        .files = files_,
         .printer = *printer_,
         .printers = *printers_,
         .library = library_,

@@ -5,6 +5,7 @@
 
 #include "platform/no_printer.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_files.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_services.h"
 #include "platform/qt/qt_text_codec.h"
@@ -42,6 +43,7 @@ private:
     QtMessageLoop loop_;
     QtClock clock_;
     QtSystemFolders folders_;
+    QtFiles files_;
     NoPrinter noPrinter_;
     NoPrinters noPrinters_;
     LibraryState library_;

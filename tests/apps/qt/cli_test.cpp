@@ -314,8 +314,7 @@ TEST_F(Program, SaysInOneLineThatAPictureCannotBeWritten)
     const Ended ended = run(words("export t.csv -o full.png"));
     EXPECT_EQ(ended.status, 1);
     EXPECT_EQ(ended.errors,
-        "pelloric: The file cannot be written: full.png; check that the folder exists, can be "
-        "written and has room\n");
+        "pelloric: Disk full: full.png; make room on the disk, or choose another one\n");
 }
 
 #endif

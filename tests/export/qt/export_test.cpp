@@ -5,10 +5,12 @@
 
 #include "document/ostl_writer.h"
 #include "fakes/temp_folder.h"
+#include "platform/qt/qt_files.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text_codec.h"
 #include "platform/qt/uming.h"
 #include "platform/run_time_error.h"
+#include "platform/safe_file.h"
 #include "support/errors.h"
 #include "support/recorded_pages.h"
 
@@ -261,7 +263,8 @@ TEST_F(PageExport, ADocumentFileIsTheSavedOne)
 {
     addThreePages();
     const QtTextCodec codec;
-    writeOstl(document_, setup_, { codec }, {}, folder_.file("saved.ostl"));
+    QtFiles files;
+    writeOstl(document_, setup_, { codec }, {}, SafeFile(files, folder_.file("saved.ostl")));
     exportOstl(document_, setup_, { codec }, {}, folder_.file("exported.ostl"));
     EXPECT_EQ(folder_.read("exported.ostl"), folder_.read("saved.ostl"));
 }

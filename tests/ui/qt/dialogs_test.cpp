@@ -1057,7 +1057,7 @@ struct LateWorld : DialogWorld {
     {
         const Platform& known = services();
         return { known.metrics, known.codec, known.messages, known.loop, known.clock, known.folders,
-            known.printer, late, known.library };
+            known.files, known.printer, late, known.library };
     }
 };
 
