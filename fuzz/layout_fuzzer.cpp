@@ -11,7 +11,7 @@
 #include "document/ostl_writer.h"
 #include "grids/table_grid.h"
 #include "platform/run_time_error.h"
-#include "settings/default_settings.h"
+#include "settings/settings_table.h"
 
 #include <sstream>
 
@@ -39,11 +39,11 @@ TableGrid gridOf(fuzz::Bytes& bytes)
 Text settingsOf(fuzz::Bytes& bytes)
 {
     Text settings;
-    for (const DefaultSetting& setting : defaultSettings()) {
-        settings.append(setting.key).append(u"= ");
+    for (const Setting& setting : settingsTable()) {
+        settings.append(setting.name).append(u"= ");
         const unsigned kind = bytes.byte();
         if (kind < 200)
-            settings.append(setting.value);
+            settings.append(setting.start);
         else if (kind < 240)
             settings.append(decimal(bytes.atMost(400)));
         else

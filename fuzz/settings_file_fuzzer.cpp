@@ -8,7 +8,7 @@
 #include "platform/run_time_error.h"
 #include "report/report_style.h"
 #include "settings/settings_file.h"
-#include "settings/settings_keys.h"
+#include "settings/settings_table.h"
 
 using namespace pelloric;
 
@@ -41,7 +41,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     platform.folders.write(FileName, bytes);
     const SettingsSnapshot snapshot(platform.services);
     const std::size_t turn = size == 0 ? 0 : data[size - 1];
-    for (const TextView key : { SettingsKeys[turn % SettingsKeys.size()], TextView(u"a") })
+    for (const TextView key :
+        { settingsTable()[turn % settingsTable().size()].name, TextView(u"a") })
         fuzz::require(snapshot.value(key) == readSetting(platform.services, key));
     ReportStyle style;
     PageSetup setup;
@@ -51,7 +52,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         fuzz::require(
             error.number() == ErrorNumber::Overflow || error.number() == ErrorNumber::TypeMismatch);
     }
-    const TextView key = SettingsKeys[turn % SettingsKeys.size()];
+    const TextView key = settingsTable()[turn % settingsTable().size()].name;
     const bool found = canBeWritten(key, readSettingsText(platform.services));
     const auto outcome = writeSetting(platform.services, key, u"v");
     fuzz::require(outcome == SaveOutcome::Written);

@@ -225,9 +225,9 @@ Laid layOut(
     }
     auto grid = std::make_unique<TableGrid>(readTable(file, line, progress));
     const auto rows = static_cast<qint64>(grid->rowCount());
-    const PrivateSettings settings(platform, line);
     Platform record = platform.record();
     Canvas canvas(record);
+    canvas.useSettings(settingsFor(line, record));
     buildReport(canvas, *grid, line, progress);
     const QJsonObject facts { { QStringLiteral("rows"), rows },
         { QStringLiteral("columns"), grid->columnCount() },

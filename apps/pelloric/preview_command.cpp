@@ -26,9 +26,13 @@ namespace pelloric::app {
 namespace {
 
 /// The widths are those of the settings in force.
-void prepareWidths(TableGrid& grid, const CommandLine& line, Platform platform)
+/// @param own  of the window; null: those of the settings file
+void prepareWidths(
+    TableGrid& grid, const CommandLine& line, Platform platform, const ReportSettings* own)
 {
     Canvas canvas(platform);
+    if (own != nullptr)
+        canvas.useSettings(*own);
     canvas.loadReportStyle();
     setColumnWidths(grid, line, canvas);
 }
@@ -53,17 +57,22 @@ int runPreview(const Invocation& invocation)
         grid = std::make_unique<TableGrid>(readTable(line.file(0), line, progress));
     }
     // What the dialogs change is kept, unless options say how this one report looks.
-    std::optional<PrivateSettings> settings;
+    std::optional<ReportSettings> settings;
     if (firstReportOption(line) != nullptr)
-        settings.emplace(platform, line);
+        settings = settingsFor(line, platform.record());
     else
         prepareSettings(platform.record());
+    opener.setSettings(settings);
     // Before every build: a dialog may have chosen another font or paper.
     TableGrid& table = *grid;
+    Canvas* shown = nullptr;
     qt::PreviewPrompts prompts;
-    prompts.beforeBuild = [&](AutomationObject&) { prepareWidths(table, line, platform.record()); };
+    prompts.beforeBuild = [&](AutomationObject&) {
+        prepareWidths(table, line, platform.record(), shown->ownSettings());
+    };
     opener.setPrompts(prompts);
-    opener.showWindow().canvas().canvas().options = shapeOf(line);
+    shown = &opener.showWindow().canvas().canvas();
+    shown->options = shapeOf(line);
     opener.openPreview(std::move(grid));
     return application.run();
 }

@@ -156,9 +156,9 @@ void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& pla
     qt::QtPrinting& printing, ProgressLine& progress, const Outcome& outcome)
 {
     auto grid = std::make_unique<TableGrid>(readTable(order.file, line, progress));
-    const PrivateSettings settings(platform, line);
     Platform record = platform.record();
     Canvas canvas(record);
+    canvas.useSettings(settingsFor(line, record));
     buildReport(canvas, *grid, line, progress);
     grid.reset();
     tellFonts(canvas.document(), platform);

@@ -4,25 +4,18 @@
 #include "report_options.h"
 
 #include "lengths.h"
-#include "outcome.h"
-#include "platform/file_bytes.h"
-#include "platform/numbers.h"
 #include "platform/platform.h"
-#include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
-#include "platform/text_codec.h"
 #include "print/paper_names.h"
 #include "settings/default_settings.h"
 #include "settings/settings_file.h"
-
-#include <QRegularExpression>
+#include "settings/settings_table.h"
 
 #include <array>
 #include <cmath>
 #include <optional>
 #include <utility>
-#include <vector>
 
 namespace pelloric::app {
 
@@ -47,42 +40,19 @@ constexpr auto Options = std::to_array<Option>({
     { "widths", "N,N,...", "widths of the columns: twips (1440 an inch); 0 leaves one out" },
 });
 
-/// An option whose value is a setting as it stands.
+/// An option whose value is a text of the report.
 struct TextOption {
     const char* option;
-    TextView key;
+    SettingKey key;
 };
 
-/// The last of the file comes first, so that no value is taken for the line of a later key.
 constexpr auto TextOptions = std::to_array<TextOption>({
-    { "footer-right", u"FooterRight" },
-    { "footer-center", u"FooterCenter" },
-    { "footer-left", u"FooterLeft" },
-    { "header-right", u"HeaderRight" },
-    { "header-center", u"HeaderCenter" },
-    { "header-left", u"HeaderLeft" },
-});
-
-constexpr TextView FontNameKeys[] = { u"FontName", u"HeaderFontName", u"FooterFontName" };
-
-struct Paper {
-    const char* name;
-    double widthMm;
-    double heightMm;
-};
-
-constexpr auto Papers = std::to_array<Paper>({
-    { "A2", 420, 594 },
-    { "A3", 297, 420 },
-    { "A4", 210, 297 },
-    { "A5", 148, 210 },
-    { "A6", 105, 148 },
-    { "B5", 182, 257 },
-    { "Letter", 215.9, 279.4 },
-    { "Legal", 215.9, 355.6 },
-    { "Tabloid", 279.4, 431.8 },
-    { "8k", 270, 390 },
-    { "16k", 197, 273 },
+    { "header-left", SettingKey::HeaderLeft },
+    { "header-center", SettingKey::HeaderCenter },
+    { "header-right", SettingKey::HeaderRight },
+    { "footer-left", SettingKey::FooterLeft },
+    { "footer-center", SettingKey::FooterCenter },
+    { "footer-right", SettingKey::FooterRight },
 });
 
 constexpr double LeastPaperMm = 30;
@@ -96,23 +66,16 @@ constexpr double TitleFactor = 1.5; ///< of a title's size to that of the cells
 QString paperNames()
 {
     QStringList names;
-    for (const Paper& paper : Papers)
-        names.append(QString::fromLatin1(paper.name));
+    for (const PaperForm& paper : papersToChoose())
+        names.append(qt::toQString(paper.name));
     return names.join(QStringLiteral(", "));
 }
 
-struct PaperChoice {
-    QString name;
-    double widthMm = 0;
-    double heightMm = 0;
-};
-
-PaperChoice paperOf(const QString& text)
+PaperForm paperOf(const QString& text)
 {
-    for (const Paper& paper : Papers) {
-        const QString name = QString::fromLatin1(paper.name);
-        if (name.compare(text, Qt::CaseInsensitive) == 0)
-            return { name, paper.widthMm, paper.heightMm };
+    for (const PaperForm& paper : papersToChoose()) {
+        if (qt::toQString(paper.name).compare(text, Qt::CaseInsensitive) == 0)
+            return paper;
     }
     const std::optional<SizeMm> size = sizeOf(text);
     if (!size)
@@ -129,95 +92,63 @@ PaperChoice paperOf(const QString& text)
                 WrongUsage);
         return mm;
     };
-    return { text, held(size->width), held(size->height) };
+    return { qt::toText(text), held(size->width), held(size->height) };
 }
 
 /// The place of a paper in the list of forms, from 1; 0, which is no form, for any other size.
-std::size_t formNumber(const PaperChoice& paper)
+std::int16_t formNumber(const PaperForm& paper)
 {
     const auto forms = standardPaperForms();
     const auto isNear = [](double one, double other) { return std::abs(one - other) < 0.5; };
     for (std::size_t at = 0; at < forms.size(); ++at) {
         if (isNear(forms[at].widthMm, paper.widthMm) && isNear(forms[at].heightMm, paper.heightMm))
-            return at + 1;
+            return static_cast<std::int16_t>(at + 1);
     }
     return 0;
 }
 
-/// Settings to be written over the user's, in order.
-class Changes {
-public:
-    explicit Changes(const Platform& platform)
-        : present_(platform)
-    {
-    }
+/// An option's value as a text of the report, which stands on one line.
+Text textOf(const CommandLine& line, const char* option)
+{
+    return Text(trimmed(onOneLine(qt::toText(line.value(option)))));
+}
 
-    Text present(TextView key) const { return present_.value(key); }
-
-    void add(TextView key, const QString& value)
-    {
-        QString line = value;
-        line.replace(QRegularExpression(QStringLiteral("[\\r\\n]+")), QStringLiteral(" "));
-        add(key, qt::toText(line));
-    }
-
-    void add(TextView key, Text value) { changes_.emplace_back(key, std::move(value)); }
-
-    void write(const Platform& platform) const
-    {
-        std::vector<SettingChange> changes;
-        for (const auto& [key, value] : changes_)
-            changes.push_back({ key, value });
-        const SaveOutcome outcome = batchWrite(platform, changes, FailurePolicy::StopAtFirst);
-        if (outcome == SaveOutcome::NothingWritten)
-            throw CommandError(QStringLiteral("the settings file lacks a key; restore it with "
-                                              "\"pelloric settings --reset\""));
-        if (outcome == SaveOutcome::WriteFailed)
-            throw RunTimeError(ErrorNumber::WriteFailed, pathText(settingsPath(platform)));
-    }
-
-private:
-    SettingsSnapshot present_;
-    std::vector<std::pair<TextView, Text>> changes_;
-};
-
-void changePaper(const CommandLine& line, Changes& changes)
+void changePaper(const CommandLine& line, ReportSettings& settings)
 {
     if (!line.has("paper") && !line.has("landscape") && !line.has("portrait"))
         return;
     if (line.has("landscape") && line.has("portrait"))
         throw CommandError(
             QStringLiteral("take either --landscape or --portrait, not both"), WrongUsage);
-    double width = leadingNumber(changes.present(u"PagerWidth"));
-    double height = leadingNumber(changes.present(u"PagerHeight"));
+    double& width = settings.paperWidthMm;
+    double& height = settings.paperHeightMm;
     bool isLandscape = line.has("landscape");
     if (line.has("paper")) {
-        const PaperChoice paper = paperOf(line.value("paper"));
+        const PaperForm paper = paperOf(line.value("paper"));
         width = paper.widthMm;
         height = paper.heightMm;
-        changes.add(u"PagerSize", paper.name);
-        changes.add(u"PagerSizeValue", QString::number(formNumber(paper)));
+        settings.paperName = paper.name;
+        settings.paperCode = formNumber(paper);
         isLandscape = isLandscape || (width > height && !line.has("portrait"));
     }
     if (isLandscape == (width < height))
         std::swap(width, height);
-    changes.add(u"PagerWidth", formatNumber(width));
-    changes.add(u"PagerHeight", formatNumber(height));
-    changes.add(u"PagerOrientation", QString::number(isLandscape ? 2 : 1));
+    settings.orientation = isLandscape ? 2 : 1;
 }
 
-/// The keys of the margins, in the order of the option.
-constexpr TextView MarginKeys[] = { u"Top", u"Right", u"Buttom", u"Left" };
+/// In the order of the option.
+constexpr double ReportSettings::*Margins[] = { &ReportSettings::topMm, &ReportSettings::rightMm,
+    &ReportSettings::bottomMm, &ReportSettings::leftMm };
 
 /// A margin of nothing would be taken for the usual one.
 constexpr double LeastMarginMm = 1;
 
-void changeMargins(const CommandLine& line, Changes& changes)
+void changeMargins(const CommandLine& line, ReportSettings& settings)
 {
     if (!line.has("margins"))
         return;
     const QStringList parts = line.value("margins").split(QLatin1Char(','));
-    for (std::size_t margin = 0; margin < std::size(MarginKeys); ++margin) {
+    for (std::size_t margin = 0; margin < std::size(Margins); ++margin) {
         const bool isOne = parts.size() == 1;
         const auto at = isOne ? 0 : static_cast<qsizetype>(margin);
         const std::optional<double> mm = millimetresOf(parts.value(at));
@@ -228,65 +159,52 @@ void changeMargins(const CommandLine& line, Changes& changes)
                     .arg(LeastMarginMm)
                     .arg(line.value("margins")),
                 WrongUsage);
-        changes.add(MarginKeys[margin], formatNumber(*mm));
+        settings.*Margins[margin] = *mm;
     }
 }
 
-void changeFonts(const CommandLine& line, Changes& changes)
+void changeFonts(const CommandLine& line, ReportSettings& settings)
 {
     if (line.has("font")) {
         const QString name = line.value("font");
         if (name.trimmed().isEmpty())
             throw CommandError(QStringLiteral("--font needs the name of a face"), WrongUsage);
-        for (const TextView key : FontNameKeys)
-            changes.add(key, name);
+        for (FontSettings* const font : { &settings.body, &settings.header, &settings.footer })
+            font->name = textOf(line, "font");
     }
-    if (line.has("font-size")) {
-        const double size
+    if (line.has("font-size"))
+        settings.body.size
             = numberOf("font-size", line.value("font-size"), LeastFontSize, MostFontSize, false);
-        changes.add(u"FontSize", formatNumber(size));
-        // Lines of the same text are changed along; these two keep what they had.
-        for (const TextView key : { u"HeaderFontSize", u"FooterFontSize" })
-            changes.add(key, changes.present(key));
+}
+
+void changeTexts(const CommandLine& line, ReportSettings& settings)
+{
+    if (line.has("title") && !line.has("header-center")) {
+        // A title is larger than the cells, unless the header font is already.
+        if (settings.header.size <= settings.body.size) {
+            settings.header.size = settings.body.size * TitleFactor;
+            settings.header.bold = true;
+        }
+        setSetting(settings, SettingKey::HeaderCenter, textOf(line, "title"));
     }
-}
-
-/// A title is larger than the cells, unless the header font is already.
-void enlargeTitle(const CommandLine& line, Changes& changes)
-{
-    const double body = line.has("font-size") ? line.value("font-size").toDouble()
-                                              : leadingNumber(changes.present(u"FontSize"));
-    if (leadingNumber(changes.present(u"HeaderFontSize")) > body)
-        return;
-    changes.add(u"HeaderFontSize", formatNumber(body * TitleFactor));
-    changes.add(u"HeaderFontBold", QStringLiteral("1"));
-}
-
-void changeTexts(const CommandLine& line, Changes& changes)
-{
-    if (line.has("title") && !line.has("header-center"))
-        enlargeTitle(line, changes);
     for (const TextOption& row : TextOptions) {
         if (line.has(row.option))
-            changes.add(row.key, line.value(row.option));
-        else if (row.key == u"HeaderCenter" && line.has("title"))
-            changes.add(row.key, line.value("title"));
+            setSetting(settings, row.key, textOf(line, row.option));
     }
 }
 
-/// The user's settings text, or the default one where there is none and none can be made.
-Text privateSettings(const Platform& platform)
+/// The user's settings, or the default ones where there are none and none can be made.
+ReportSettings presentSettings(const Platform& platform)
 {
-    const std::filesystem::path path = settingsPath(platform);
     std::error_code ignored;
-    if (!std::filesystem::exists(path, ignored)) {
+    if (!std::filesystem::exists(settingsPath(platform), ignored)) {
         try {
             deployDefaultSettings(platform);
         } catch (const RunTimeError&) {
-            return defaultSettingsText();
+            return {};
         }
     }
-    return platform.codec.decode(readFileBytes(path));
+    return readReportSettings(platform);
 }
 
 } // namespace
@@ -302,28 +220,18 @@ const char* firstReportOption(const CommandLine& line)
     return nullptr;
 }
 
-PrivateSettings::PrivateSettings(qt::QtPlatform& platform, const CommandLine& line)
-    : platform_(platform)
+ReportSettings settingsFor(const CommandLine& line, const Platform& platform)
 {
-    const Text content = privateSettings(platform.record());
-    if (!folder_.isValid())
-        throw CommandError(QStringLiteral("no temporary folder: %1").arg(folder_.errorString()));
-    const std::filesystem::path folder = qt::toText(folder_.path());
-    platform_.folders().setSystemDirectory(folder);
-    const Platform record = platform_.record();
-    replaceSettings(record, content);
-    Changes changes(record);
+    ReportSettings settings = presentSettings(platform);
     if (line.has("no-headers"))
-        changes.add(u"ShowHeaders", QStringLiteral("0"));
+        settings.showHeaders = false;
     if (line.has("merge"))
-        changes.add(u"GridMerge", QStringLiteral("1"));
-    changeFonts(line, changes);
-    changePaper(line, changes);
-    changeMargins(line, changes);
-    changeTexts(line, changes);
-    changes.write(record);
+        settings.mergeCells = true;
+    changeFonts(line, settings);
+    changePaper(line, settings);
+    changeMargins(line, settings);
+    changeTexts(line, settings);
+    return settings;
 }
-
-PrivateSettings::~PrivateSettings() { platform_.folders().setSystemDirectory({}); }
 
 } // namespace pelloric::app

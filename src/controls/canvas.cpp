@@ -135,7 +135,13 @@ void Canvas::newPage()
     notifyView();
 }
 
-void Canvas::loadReportStyle() { pelloric::loadReportStyle(style_, page, platform_); }
+void Canvas::loadReportStyle()
+{
+    if (settings_)
+        applySettings(*settings_, style_, page);
+    else
+        pelloric::loadReportStyle(style_, page, platform_);
+}
 
 void Canvas::doPreview(AutomationObject& grid)
 {

@@ -9,6 +9,7 @@
 #include "report/layout_engine.h"
 #include "report/report_options.h"
 #include "report/report_style.h"
+#include "settings/report_settings.h"
 #include "view/view_state.h"
 
 #include <filesystem>
@@ -96,7 +97,14 @@ public:
     /// @throws RunTimeError Overflow: there are 32767 pages
     void newPage();
 
-    /// Loads paper, margins and style from the settings file.
+    /// Gives reports settings of their own, which the dialogs change: the settings file is neither
+    /// read nor written for them. Nothing: the file's hold again.
+    void useSettings(std::optional<ReportSettings> settings) { settings_ = std::move(settings); }
+
+    /// The settings of its own, or null.
+    ReportSettings* ownSettings() { return settings_ ? &*settings_ : nullptr; }
+
+    /// Loads paper, margins and style from its own settings or the settings file.
     /// @throws RunTimeError see `pelloric::loadReportStyle`
     void loadReportStyle();
 
@@ -234,6 +242,7 @@ private:
     Platform& platform_;
     PageDocument document_;
     Recorder recorder_;
+    std::optional<ReportSettings> settings_;
     ReportStyle style_;
     ViewState view_;
     std::optional<GridTable> table_;

@@ -7,6 +7,7 @@
 #include "platform/platform.h"
 #include "platform/services.h"
 #include "settings/settings_file.h"
+#include "settings/settings_table.h"
 
 #include <utility>
 
@@ -14,25 +15,19 @@ namespace pelloric {
 
 namespace {
 
-TextView slotName(std::int32_t location)
+/// The key of a slot; the three of a line stand together.
+SettingKey slotKey(SettingKey left, std::int32_t location)
 {
-    if (location == static_cast<std::int32_t>(AlignmentType::LocLeft))
-        return u"Left";
-    if (location == static_cast<std::int32_t>(AlignmentType::LocCenter))
-        return u"Center";
-    return u"Right";
+    const bool isSlot = location == static_cast<std::int32_t>(AlignmentType::LocLeft)
+        || location == static_cast<std::int32_t>(AlignmentType::LocCenter);
+    const auto slot = isSlot ? location : static_cast<std::int32_t>(AlignmentType::LocRight);
+    return static_cast<SettingKey>(static_cast<std::int32_t>(left) + slot);
 }
 
-/// A setting is one line of its file.
-Text onOneLine(TextView text)
-{
-    Text line = replaceAll(text, u"\r\n", u" ");
-    for (char16_t& unit : line) {
-        if (unit == u'\r' || unit == u'\n')
-            unit = u' ';
-    }
-    return line;
-}
+static_assert(
+    static_cast<int>(SettingKey::HeaderRight) == static_cast<int>(SettingKey::HeaderLeft) + 2);
+static_assert(
+    static_cast<int>(SettingKey::FooterRight) == static_cast<int>(SettingKey::FooterLeft) + 2);
 
 TextView switchText(bool on) { return on ? TextView(u"1") : TextView(u"0"); }
 
@@ -53,18 +48,18 @@ void Facade::doPreview(std::unique_ptr<AutomationObject> grid)
 
 void Facade::AddHeader(TextView strHeader, std::int32_t Location)
 {
-    writeSlot(u"Header", strHeader, Location);
+    writeSlot(slotKey(SettingKey::HeaderLeft, Location), strHeader);
 }
 
 void Facade::AddFooter(TextView strFooter, std::int32_t Location)
 {
-    writeSlot(u"Footer", strFooter, Location);
+    writeSlot(slotKey(SettingKey::FooterLeft, Location), strFooter);
 }
 
 void Facade::setShowHeader(bool show)
 {
     showHeader_ = show;
-    writeSetting(platform_, u"ShowHeaders", switchText(show));
+    writeSetting(platform_, settingName(SettingKey::ShowHeaders), switchText(show));
 }
 
 std::int32_t Facade::MarvenStartRow() const { return platform_.library.MarvenStartRow; }
@@ -74,13 +69,12 @@ void Facade::setMarvenStartRow(std::int32_t row) { platform_.library.MarvenStart
 void Facade::setMergeGrid(bool merge)
 {
     mergeGrid_ = merge;
-    writeSetting(platform_, u"GridMerge", switchText(merge));
+    writeSetting(platform_, settingName(SettingKey::GridMerge), switchText(merge));
 }
 
-void Facade::writeSlot(TextView line, TextView text, std::int32_t location)
+void Facade::writeSlot(SettingKey key, TextView text)
 {
-    const Text key = Text(line).append(slotName(location));
-    writeSetting(platform_, key, onOneLine(text));
+    writeSetting(platform_, settingName(key), onOneLine(text));
 }
 
 } // namespace pelloric

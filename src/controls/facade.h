@@ -11,6 +11,7 @@
 namespace pelloric {
 
 class AutomationObject;
+enum class SettingKey;
 struct Platform;
 
 /// The slots of a header or footer line.
@@ -61,7 +62,7 @@ public:
     void setMergeGrid(bool merge);
 
 private:
-    void writeSlot(TextView line, TextView text, std::int32_t location);
+    void writeSlot(SettingKey key, TextView text);
 
     Platform& platform_;
     PreviewOpener& opener_;

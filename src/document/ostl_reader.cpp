@@ -14,7 +14,6 @@
 #include <algorithm>
 #include <charconv>
 #include <fstream>
-#include <limits>
 
 namespace pelloric {
 
@@ -34,14 +33,6 @@ double numberIn(std::string_view line)
     if (result.ec == std::errc() && result.ptr == end)
         return whole;
     return leadingNumber(line);
-}
-
-float singleOf(double value)
-{
-    constexpr double largest = std::numeric_limits<float>::max();
-    if (!(value >= -largest && value <= largest))
-        throw RunTimeError(ErrorNumber::Overflow, pastSingle(value));
-    return static_cast<float>(value);
 }
 
 std::string_view trimmedBytes(std::string_view line)
@@ -173,7 +164,7 @@ private:
         style_.font.name = formatNumber(numberIn(line_));
         if (!nextNumber(size))
             return;
-        style_.font.size = singleOf(size);
+        style_.font.size = toSingle(size);
         const bool whole
             = next(style_.color) && next(record.pt.x) && next(record.pt.y) && lines_.next(line_);
         if (!whole)

@@ -275,4 +275,12 @@ Text formatSingle(float value, char16_t separator)
     return generalForm({ buffer, end.ptr }, separator);
 }
 
+float toSingle(double value, TextView what)
+{
+    if (!(std::abs(value) <= static_cast<double>(std::numeric_limits<float>::max())))
+        throw RunTimeError(ErrorNumber::Overflow,
+            what.empty() ? pastSingle(value) : Text(what) + u"= " + pastSingle(value));
+    return static_cast<float>(value);
+}
+
 } // namespace pelloric

@@ -41,6 +41,11 @@ std::int16_t narrowToInt16(std::int64_t value);
 /// @throws RunTimeError TypeMismatch: anything else, or outside 16 bits
 std::int16_t strictInt16(TextView text);
 
+/// A number as a single-precision one.
+/// @param what  names the number in the error; may be empty
+/// @throws RunTimeError Overflow: past its range, or no number at all
+float toSingle(double value, TextView what = {});
+
 /// General form: at most 15 significant digits, no trailing zeros, no exponent below 1e15.
 ///
 /// @param separator  stands between whole part and fraction

@@ -167,4 +167,14 @@ Text decimal(std::int64_t number)
     return { digits, end };
 }
 
+Text onOneLine(TextView text)
+{
+    Text line = replaceAll(text, u"\r\n", u" ");
+    for (char16_t& unit : line) {
+        if (unit == u'\r' || unit == u'\n')
+            unit = u' ';
+    }
+    return line;
+}
+
 } // namespace pelloric

@@ -46,4 +46,7 @@ std::string toUtf8(TextView text);
 /// Plain decimal, "-" in front when negative.
 Text decimal(std::int64_t number);
 
+/// A text with a blank for every line break.
+Text onOneLine(TextView text);
+
 } // namespace pelloric

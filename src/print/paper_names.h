@@ -24,4 +24,7 @@ bool applyPaperName(TextView name, PageSetup& setup, bool portrait);
 /// The standard papers in the order of their usual codes: the first is code 1, A4 is code 9.
 std::vector<PaperForm> standardPaperForms();
 
+/// The papers that people choose by their usual names: "A3", "B5", "Letter" and so on.
+std::vector<PaperForm> papersToChoose();
+
 } // namespace pelloric

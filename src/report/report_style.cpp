@@ -4,87 +4,50 @@
 #include "report/report_style.h"
 
 #include "platform/numbers.h"
-#include "platform/platform.h"
 #include "platform/run_time_error.h"
 #include "settings/settings_file.h"
-
-#include <limits>
+#include "settings/settings_table.h"
 
 namespace pelloric {
 
 namespace {
 
-/// Reads one key after the other as the type that its value has.
-class StyleReader {
-public:
-    explicit StyleReader(const Platform& platform)
-        : settings_(platform)
-    {
-    }
-
-    Text text(TextView key) const { return settings_.value(key); }
-    double number(TextView key) const { return leadingNumber(text(key)); }
-    bool truth(TextView key) const { return number(key) != 0; }
-    Color color(TextView key) const { return roundToInt32(number(key)); }
-
-    float single(TextView key) const
-    {
-        const double value = number(key);
-        if (!(value <= std::numeric_limits<float>::max()
-                && value >= std::numeric_limits<float>::lowest()))
-            throw RunTimeError(ErrorNumber::Overflow, key);
-        return static_cast<float>(value);
-    }
-
-private:
-    SettingsSnapshot settings_;
-};
-
-/// The keys of a font all begin with the same word.
-void loadFont(const StyleReader& read, const Text& prefix, ColoredFont& target)
+void applyFont(const FontSettings& settings, ReportFont which, ColoredFont& target)
 {
     target.font = {};
-    target.font.name = read.text(prefix + u"FontName");
-    target.font.size = read.single(prefix + u"FontSize");
-    target.font.bold = read.truth(prefix + u"FontBold");
-    target.font.italic = read.truth(prefix + u"FontItalic");
-    target.font.strikethrough = read.truth(prefix + u"FontStrikethru");
-    target.font.underline = read.truth(prefix + u"FontUnderline");
-    target.color = read.number(prefix + u"FontColor");
+    target.font.name = settings.name;
+    target.font.size = toSingle(settings.size, settingName(fontKey(which, SettingKey::FontSize)));
+    target.font.bold = settings.bold;
+    target.font.italic = settings.italic;
+    target.font.strikethrough = settings.strikethrough;
+    target.font.underline = settings.underline;
+    target.color = settings.color;
 }
 
 struct MarginRow {
-    TextView key;
+    double ReportSettings::*millimetres;
     double factor; ///< how much larger than stored the margin is printed
     std::int16_t PageSetup::*field;
 };
 
 constexpr MarginRow Margins[] = {
-    { u"Top", 1.6, &PageSetup::intTop },
-    { u"Buttom", 1.8, &PageSetup::intButtom },
-    { u"Left", 1.2, &PageSetup::intLeft },
-    { u"Right", 1.2, &PageSetup::intRight },
+    { &ReportSettings::topMm, 1.6, &PageSetup::intTop },
+    { &ReportSettings::bottomMm, 1.8, &PageSetup::intButtom },
+    { &ReportSettings::leftMm, 1.2, &PageSetup::intLeft },
+    { &ReportSettings::rightMm, 1.2, &PageSetup::intRight },
 };
 
 constexpr std::int16_t DefaultMargin = 2 * TwipsPerCm;
 
-void loadPaper(const StyleReader& read, PageSetup& setup)
+void applyPaper(const ReportSettings& settings, PageSetup& setup)
 {
     for (const MarginRow& row : Margins) {
-        const double twips = read.number(row.key) * row.factor * TwipsPerCm / 10;
+        const double twips = settings.*row.millimetres * row.factor * TwipsPerCm / 10;
         const std::int16_t margin = roundToInt16(twips);
         setup.*row.field = margin == 0 ? DefaultMargin : margin;
     }
-    setup.myWidth = roundToInt32(TwipsPerCm * read.number(u"PagerWidth") / 10);
-    setup.myHeight = roundToInt32(TwipsPerCm * read.number(u"PagerHeight") / 10);
-}
-
-constexpr TextView SlotNames[] = { u"Left", u"Center", u"Right" };
-
-void loadSlots(const StyleReader& read, const Text& prefix, SlotTexts& slots)
-{
-    for (std::size_t slot = 0; slot < slots.size(); ++slot)
-        slots[slot] = read.text(prefix + Text(SlotNames[slot]));
+    setup.myWidth = roundToInt32(TwipsPerCm * settings.paperWidthMm / 10);
+    setup.myHeight = roundToInt32(TwipsPerCm * settings.paperHeightMm / 10);
 }
 
 } // namespace
@@ -99,25 +62,31 @@ void setPrintableTenths(ReportStyle& style, const PageSetup& setup)
     style.printableHeightTenth = heightTenth;
 }
 
+void applySettings(const ReportSettings& settings, ReportStyle& style, PageSetup& setup)
+{
+    style.ShowHeaders = settings.showHeaders;
+    style.GridHor = settings.horizontalLines;
+    style.GridVer = settings.verticalLines;
+    style.GridMerge = settings.mergeCells;
+    style.HeaderColor = roundToInt32(settings.headerColor);
+    style.GridLineColor = roundToInt32(settings.gridLineColor);
+    applyFont(settings.body, ReportFont::Body, style.body);
+    applyFont(settings.header, ReportFont::Header, style.header);
+    applyFont(settings.footer, ReportFont::Footer, style.footer);
+    style.PagerSize = settings.paperName;
+    style.PagerOrientation = roundToInt16(settings.orientation);
+    if (!settings.paperCode)
+        throw RunTimeError(ErrorNumber::TypeMismatch, settingName(SettingKey::PagerSizeValue));
+    style.PagerSizeValue = *settings.paperCode;
+    applyPaper(settings, setup);
+    setPrintableTenths(style, setup);
+    style.headerTexts = settings.headerTexts;
+    style.footerTexts = settings.footerTexts;
+}
+
 void loadReportStyle(ReportStyle& style, PageSetup& setup, const Platform& platform)
 {
-    const StyleReader read(platform);
-    style.ShowHeaders = read.truth(u"ShowHeaders");
-    style.GridHor = read.truth(u"GridHor");
-    style.GridVer = read.truth(u"GridVer");
-    style.GridMerge = read.truth(u"GridMerge");
-    style.HeaderColor = read.color(u"HeaderColor");
-    style.GridLineColor = read.color(u"GridLineColor");
-    loadFont(read, u"", style.body);
-    loadFont(read, u"Header", style.header);
-    loadFont(read, u"Footer", style.footer);
-    style.PagerSize = read.text(u"PagerSize");
-    style.PagerOrientation = roundToInt16(read.number(u"PagerOrientation"));
-    style.PagerSizeValue = strictInt16(read.text(u"PagerSizeValue"));
-    loadPaper(read, setup);
-    setPrintableTenths(style, setup);
-    loadSlots(read, u"Header", style.headerTexts);
-    loadSlots(read, u"Footer", style.footerTexts);
+    applySettings(readReportSettings(platform), style, setup);
 }
 
 } // namespace pelloric

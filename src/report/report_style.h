@@ -11,6 +11,7 @@
 namespace pelloric {
 
 struct Platform;
+struct ReportSettings;
 
 /// A font with its colour, which is kept as the number that the settings hold.
 struct ColoredFont {
@@ -49,12 +50,16 @@ struct ReportStyle {
 /// @throws RunTimeError Overflow: past 16 bits; nothing has changed
 void setPrintableTenths(ReportStyle& style, const PageSetup& setup);
 
-/// Fills style and page set-up from the settings file, key by key.
+/// Fills style and page set-up from settings.
 ///
 /// Millimetres become twips; the margins are enlarged on the way by 1.6 (top), 1.8 (bottom) and
 /// 1.2 (left and right), and one of 0 becomes two centimetres.
-/// @throws RunTimeError FileNotFound: no settings file; Overflow: a number past its type;
-///         TypeMismatch: a paper code that is no whole number. What was read before stays set.
+/// @throws RunTimeError Overflow: a number past its type; TypeMismatch: there is no paper code.
+///         What was set before stays set.
+void applySettings(const ReportSettings& settings, ReportStyle& style, PageSetup& setup);
+
+/// The same from the settings file.
+/// @throws RunTimeError FileNotFound: no settings file; or as `applySettings`
 void loadReportStyle(ReportStyle& style, PageSetup& setup, const Platform& platform);
 
 } // namespace pelloric

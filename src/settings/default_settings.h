@@ -5,21 +5,9 @@
 
 #include "settings/settings_file.h"
 
-#include <span>
-
 namespace pelloric {
 
 struct Platform;
-
-/// A key of the default file with its value.
-struct DefaultSetting {
-    TextView key;
-    TextView value;
-};
-
-/// Every key in the order of the default file's lines: a key stands above every other line that
-/// contains it, and the header and footer texts, which may hold any word, stand last.
-std::span<const DefaultSetting> defaultSettings();
 
 /// The default file's text, in the form in which the program saves a settings file.
 Text defaultSettingsText();

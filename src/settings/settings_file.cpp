@@ -9,6 +9,7 @@
 #include "platform/safe_file.h"
 #include "platform/services.h"
 #include "platform/text_codec.h"
+#include "settings/settings_table.h"
 
 #include <optional>
 
@@ -183,5 +184,14 @@ SettingsSnapshot::SettingsSnapshot(const Platform& platform)
 }
 
 Text SettingsSnapshot::value(TextView key) const { return valueOf(key, text_); }
+
+ReportSettings readReportSettings(const Platform& platform)
+{
+    const SettingsSnapshot snapshot(platform);
+    ReportSettings settings;
+    for (const Setting& row : settingsTable())
+        setSetting(settings, row.key, snapshot.value(row.name));
+    return settings;
+}
 
 } // namespace pelloric

@@ -12,6 +12,7 @@
 namespace pelloric {
 
 struct Platform;
+struct ReportSettings;
 
 /// A settings file of more bytes is refused before it is read to its end.
 inline constexpr std::size_t MostSettingsBytes = 1U << 24U;
@@ -98,5 +99,9 @@ public:
 private:
     Text text_;
 };
+
+/// All settings as the file holds them.
+/// @throws RunTimeError FileNotFound: the file is missing or cannot be read
+ReportSettings readReportSettings(const Platform& platform);
 
 } // namespace pelloric

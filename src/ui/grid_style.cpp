@@ -14,24 +14,26 @@ namespace pelloric {
 namespace {
 
 /// The switches' keys, in the order of `GridSwitch`.
-constexpr auto SwitchKeys
-    = std::to_array<TextView>({ u"ShowHeaders", u"GridHor", u"GridVer", u"GridMerge" });
+constexpr auto SwitchKeys = std::to_array<SettingKey>(
+    { SettingKey::ShowHeaders, SettingKey::GridHor, SettingKey::GridVer, SettingKey::GridMerge });
 
-/// What the keys of the fonts begin with, in the order of `GridFont`.
-constexpr auto FontPrefixes = std::to_array<TextView>({ u"", u"Header", u"Footer" });
+/// The fonts, in the order of `GridFont`.
+constexpr auto Fonts
+    = std::to_array<ReportFont>({ ReportFont::Body, ReportFont::Header, ReportFont::Footer });
 
 } // namespace
 
-GridStyleState::GridStyleState(const Platform& platform)
+GridStyleState::GridStyleState(const Platform& platform, ReportSettings* own)
     : platform_(platform)
+    , own_(own)
 {
-    const LenientSettings settings(platform);
+    const LenientSettings settings(platform, own);
     for (std::size_t which = 0; which < SwitchKeys.size(); ++which)
         switches_[which] = settings.number(SwitchKeys[which]).value_or(0) != 0 ? 1 : 0;
-    headerColor = settings.number(u"HeaderColor").value_or(0);
-    gridLineColor = settings.number(u"GridLineColor").value_or(0);
-    for (std::size_t which = 0; which < FontPrefixes.size(); ++which)
-        fonts_[which] = settings.font(FontPrefixes[which]);
+    headerColor = settings.number(SettingKey::HeaderColor).value_or(0);
+    gridLineColor = settings.number(SettingKey::GridLineColor).value_or(0);
+    for (std::size_t which = 0; which < Fonts.size(); ++which)
+        fonts_[which] = settings.font(Fonts[which]);
 }
 
 Text GridStyleState::description(GridFont which) const { return fontDescription(font(which).font); }
@@ -60,13 +62,13 @@ void GridStyleState::setChosenFont(const ColoredFont& answer)
 
 SaveOutcome GridStyleState::save() const
 {
-    SettingChanges changes(platform_);
+    SettingChanges changes(platform_, own_);
     for (std::size_t which = 0; which < SwitchKeys.size(); ++which)
         changes.addNumber(SwitchKeys[which], switches_[which]);
-    changes.addNumber(u"HeaderColor", headerColor);
-    changes.addNumber(u"GridLineColor", gridLineColor);
-    for (std::size_t which = 0; which < FontPrefixes.size(); ++which)
-        changes.addFont(FontPrefixes[which], fonts_[which]);
+    changes.addNumber(SettingKey::HeaderColor, headerColor);
+    changes.addNumber(SettingKey::GridLineColor, gridLineColor);
+    for (std::size_t which = 0; which < Fonts.size(); ++which)
+        changes.addFont(Fonts[which], fonts_[which]);
     return changes.save(FailurePolicy::SkipStep);
 }
 

@@ -36,7 +36,8 @@ class GridStyleState {
 public:
     /// Loads switches, colours and fonts; what cannot be read is passed over.
     /// @param platform  outlives the dialog
-    explicit GridStyleState(const Platform& platform);
+    /// @param own  shown and changed instead of the settings file; null: the file
+    explicit GridStyleState(const Platform& platform, ReportSettings* own = nullptr);
 
     double headerColor = 0; ///< 0x00BBGGRR
     double gridLineColor = 0; ///< 0x00BBGGRR
@@ -78,6 +79,7 @@ private:
     std::optional<std::size_t> selectedFont() const;
 
     const Platform& platform_;
+    ReportSettings* own_;
     std::array<std::int16_t, 4> switches_ {};
     std::array<ColoredFont, 3> fonts_;
     Text selectedRow_;

@@ -20,59 +20,61 @@ constexpr TextView SizeUnit = u"mm";
 constexpr TextView MarginUnit = u" mm";
 
 /// The keys of the six boxes, in the order of the boxes.
-constexpr auto FormatKeys = std::to_array<TextView>({
-    u"HeaderLeft",
-    u"HeaderCenter",
-    u"HeaderRight",
-    u"FooterLeft",
-    u"FooterCenter",
-    u"FooterRight",
+constexpr auto FormatKeys = std::to_array<SettingKey>({
+    SettingKey::HeaderLeft,
+    SettingKey::HeaderCenter,
+    SettingKey::HeaderRight,
+    SettingKey::FooterLeft,
+    SettingKey::FooterCenter,
+    SettingKey::FooterRight,
 });
 static_assert(FormatKeys.size() == PageSetupState::FormatBoxes);
 constexpr std::size_t FooterBox = 3; ///< index of the first footer box
 
 struct MarginKey {
-    TextView key;
+    SettingKey key;
     Margin margin;
 };
 
 /// In the order in which the margins are loaded and saved.
 constexpr auto MarginKeys = std::to_array<MarginKey>({
-    { u"Top", Margin::Top },
-    { u"Buttom", Margin::Bottom },
-    { u"Left", Margin::Left },
-    { u"Right", Margin::Right },
+    { SettingKey::Top, Margin::Top },
+    { SettingKey::Buttom, Margin::Bottom },
+    { SettingKey::Left, Margin::Left },
+    { SettingKey::Right, Margin::Right },
 });
 
 Text marginText(double millimetres) { return formatNumber(millimetres).append(MarginUnit); }
 
 /// Adds what stands before "mm" in a size box; an empty box leaves its key alone.
 /// @throws RunTimeError InvalidCall: the box holds something, but no "mm"
-void addSize(SettingChanges& changes, TextView key, TextView box)
+void addSize(SettingChanges& changes, SettingKey key, TextView box)
 {
     if (box.empty())
         return;
     const std::size_t unit = box.find(SizeUnit);
     if (unit == TextView::npos)
-        throw RunTimeError(ErrorNumber::InvalidCall, key);
+        throw RunTimeError(ErrorNumber::InvalidCall, settingName(key));
     changes.addText(key, box.substr(0, unit));
 }
 
 } // namespace
 
-PageSetupState::PageSetupState(const Platform& platform)
-    : PageSetupState(platform, platform.printers.forms())
+PageSetupState::PageSetupState(const Platform& platform, ReportSettings* own)
+    : PageSetupState(platform, platform.printers.forms(), own)
 {
 }
 
-PageSetupState::PageSetupState(const Platform& platform, const std::vector<PaperForm>& forms)
+PageSetupState::PageSetupState(
+    const Platform& platform, const std::vector<PaperForm>& forms, ReportSettings* own)
     : platform_(platform)
+    , own_(own)
     , rows_(pelloric::paperRows(forms))
 {
     restoreMargins();
-    const LenientSettings settings(platform);
-    headerFont = settings.font(u"Header");
-    footerFont = settings.font(u"Footer");
+    const LenientSettings settings(platform, own);
+    headerFont = settings.font(ReportFont::Header);
+    footerFont = settings.font(ReportFont::Footer);
     loadTexts(settings);
     loadPaper(settings);
     loadMargins(settings);
@@ -91,17 +93,18 @@ void PageSetupState::loadTexts(const LenientSettings& settings)
 
 void PageSetupState::loadPaper(const LenientSettings& settings)
 {
-    paper.paperName = settings.text(u"PagerSize").value_or(Text());
+    paper.paperName = settings.text(SettingKey::PagerSize).value_or(Text());
     try {
-        paper.paperCode = strictInt16(settings.text(u"PagerSizeValue").value_or(u"0"));
+        paper.paperCode = strictInt16(settings.text(SettingKey::PagerSizeValue).value_or(u"0"));
     } catch (const RunTimeError&) {
         paper.paperCode = 0; // no form has this code
     }
-    if (const auto width = settings.text(u"PagerWidth"))
+    if (const auto width = settings.text(SettingKey::PagerWidth))
         paper.widthBox = *width + Text(SizeUnit);
-    if (const auto height = settings.text(u"PagerHeight"))
+    if (const auto height = settings.text(SettingKey::PagerHeight))
         paper.heightBox = *height + Text(SizeUnit);
-    chooseOrientation(roundHalfEven(settings.number(u"PagerOrientation").value_or(1)) == 1);
+    chooseOrientation(
+        roundHalfEven(settings.number(SettingKey::PagerOrientation).value_or(1)) == 1);
 }
 
 void PageSetupState::loadMargins(const LenientSettings& settings)
@@ -184,22 +187,22 @@ Text PageSetupState::footerFontText() const { return fontDescription(footerFont.
 
 SaveOutcome PageSetupState::save() const
 {
-    SettingChanges changes(platform_);
-    changes.addText(u"PagerSize", paper.paperName);
+    SettingChanges changes(platform_, own_);
+    changes.addText(SettingKey::PagerSize, paper.paperName);
     try {
-        addSize(changes, u"PagerWidth", paper.widthBox);
-        addSize(changes, u"PagerHeight", paper.heightBox);
+        addSize(changes, SettingKey::PagerWidth, paper.widthBox);
+        addSize(changes, SettingKey::PagerHeight, paper.heightBox);
     } catch (const RunTimeError&) {
         return SaveOutcome::NothingWritten;
     }
-    changes.addNumber(u"PagerOrientation", paper.orientation);
-    changes.addNumber(u"PagerSizeValue", paper.paperCode);
+    changes.addNumber(SettingKey::PagerOrientation, paper.orientation);
+    changes.addNumber(SettingKey::PagerSizeValue, paper.paperCode);
     for (const MarginKey& row : MarginKeys)
         changes.addNumber(row.key, toMillimetres(sketch_.margin(row.margin)));
-    changes.addFont(u"Header", headerFont);
+    changes.addFont(ReportFont::Header, headerFont);
     for (std::size_t box = 0; box < FooterBox; ++box)
         changes.addText(FormatKeys[box], trimmed(formatTexts[box]));
-    changes.addFont(u"Footer", footerFont);
+    changes.addFont(ReportFont::Footer, footerFont);
     for (std::size_t box = FooterBox; box < formatTexts.size(); ++box)
         changes.addText(FormatKeys[box], trimmed(formatTexts[box]));
     return changes.save(FailurePolicy::StopAtFirst);

@@ -43,10 +43,12 @@ public:
 
     /// Loads fonts, texts, paper and margins, in this order; what cannot be read is passed over.
     /// @param platform  outlives the dialog
-    explicit PageSetupState(const Platform& platform);
+    /// @param own       shown and changed instead of the settings file; null: the file
+    explicit PageSetupState(const Platform& platform, ReportSettings* own = nullptr);
 
     /// As above, with papers that are known already.
-    PageSetupState(const Platform& platform, const std::vector<PaperForm>& forms);
+    PageSetupState(const Platform& platform, const std::vector<PaperForm>& forms,
+        ReportSettings* own = nullptr);
 
     PaperChoice paper;
     ColoredFont headerFont;
@@ -114,6 +116,7 @@ private:
     void sizeSketch();
 
     const Platform& platform_;
+    ReportSettings* own_;
     std::vector<PaperRow> rows_;
     MarginSketch sketch_;
     std::array<Text, 4> boxes_;

@@ -17,26 +17,27 @@ namespace pelloric {
 namespace {
 
 struct StyleKey {
-    TextView key;
+    SettingKey key;
     bool Font::*style;
 };
 
 /// In the order in which the styles are saved.
 constexpr auto StyleKeys = std::to_array<StyleKey>({
-    { u"FontBold", &Font::bold },
-    { u"FontItalic", &Font::italic },
-    { u"FontStrikethru", &Font::strikethrough },
-    { u"FontUnderline", &Font::underline },
+    { SettingKey::FontBold, &Font::bold },
+    { SettingKey::FontItalic, &Font::italic },
+    { SettingKey::FontStrikethru, &Font::strikethrough },
+    { SettingKey::FontUnderline, &Font::underline },
 });
-
-Text prefixed(TextView prefix, TextView key) { return Text(prefix).append(key); }
 
 bool fitsSingle(double value) { return std::fabs(value) <= std::numeric_limits<float>::max(); }
 
 } // namespace
 
-LenientSettings::LenientSettings(const Platform& platform)
+LenientSettings::LenientSettings(const Platform& platform, const ReportSettings* own)
+    : own_(own)
 {
+    if (own_ != nullptr)
+        return;
     try {
         settings_.emplace(platform);
     } catch (const RunTimeError&) {
@@ -44,14 +45,16 @@ LenientSettings::LenientSettings(const Platform& platform)
     }
 }
 
-std::optional<Text> LenientSettings::text(TextView key) const
+std::optional<Text> LenientSettings::text(SettingKey key) const
 {
+    if (own_ != nullptr)
+        return settingText(*own_, key, u'.');
     if (!settings_)
         return std::nullopt;
-    return settings_->value(key);
+    return settings_->value(settingName(key));
 }
 
-std::optional<double> LenientSettings::number(TextView key) const
+std::optional<double> LenientSettings::number(SettingKey key) const
 {
     const auto found = text(key);
     if (!found)
@@ -60,54 +63,55 @@ std::optional<double> LenientSettings::number(TextView key) const
     return std::isfinite(value) ? std::optional(value) : std::nullopt;
 }
 
-ColoredFont LenientSettings::font(TextView prefix) const
+ColoredFont LenientSettings::font(ReportFont which) const
 {
     ColoredFont result;
-    if (const auto name = text(prefixed(prefix, u"FontName")))
+    if (const auto name = text(fontKey(which, SettingKey::FontName)))
         result.font.name = *name;
-    if (const auto size = number(prefixed(prefix, u"FontSize")); size && fitsSingle(*size))
+    if (const auto size = number(fontKey(which, SettingKey::FontSize)); size && fitsSingle(*size))
         result.font.size = static_cast<float>(*size);
     for (const StyleKey& row : StyleKeys)
-        result.font.*row.style = number(prefixed(prefix, row.key)).value_or(0) != 0;
-    result.color = number(prefixed(prefix, u"FontColor")).value_or(0);
+        result.font.*row.style = number(fontKey(which, row.key)).value_or(0) != 0;
+    result.color = number(fontKey(which, SettingKey::FontColor)).value_or(0);
     return result;
 }
 
-SettingChanges::SettingChanges(const Platform& platform)
+SettingChanges::SettingChanges(const Platform& platform, ReportSettings* own)
     : platform_(platform)
+    , own_(own)
+    , decimalSeparator_(own != nullptr ? u'.' : platform.decimalSeparator)
 {
 }
 
-void SettingChanges::addText(TextView key, TextView value)
+void SettingChanges::addText(SettingKey key, TextView value)
 {
-    Text line = replaceAll(value, u"\r\n", u" ");
-    for (char16_t& unit : line) {
-        if (unit == u'\r' || unit == u'\n')
-            unit = u' ';
-    }
-    entries_.push_back({ Text(key), std::move(line) });
+    entries_.push_back({ key, onOneLine(value) });
 }
 
-void SettingChanges::addNumber(TextView key, double value)
+void SettingChanges::addNumber(SettingKey key, double value)
 {
-    addText(key, formatNumber(value, platform_.decimalSeparator));
+    addText(key, formatNumber(value, decimalSeparator_));
 }
 
-void SettingChanges::addFont(TextView prefix, const ColoredFont& font)
+void SettingChanges::addFont(ReportFont which, const ColoredFont& font)
 {
-    addText(prefixed(prefix, u"FontName"), font.font.name);
-    addText(
-        prefixed(prefix, u"FontSize"), formatSingle(font.font.size, platform_.decimalSeparator));
+    addText(fontKey(which, SettingKey::FontName), font.font.name);
+    addText(fontKey(which, SettingKey::FontSize), formatSingle(font.font.size, decimalSeparator_));
     for (const StyleKey& row : StyleKeys)
-        addText(prefixed(prefix, row.key), font.font.*row.style ? u"1" : u"0");
-    addNumber(prefixed(prefix, u"FontColor"), font.color);
+        addText(fontKey(which, row.key), font.font.*row.style ? u"1" : u"0");
+    addNumber(fontKey(which, SettingKey::FontColor), font.color);
 }
 
 SaveOutcome SettingChanges::save(FailurePolicy policy) const
 {
+    if (own_ != nullptr) {
+        for (const Entry& entry : entries_)
+            setSetting(*own_, entry.key, trimmed(entry.value));
+        return SaveOutcome::Written;
+    }
     std::vector<SettingChange> changes;
     for (const Entry& entry : entries_)
-        changes.push_back({ entry.key, entry.value });
+        changes.push_back({ settingName(entry.key), entry.value });
     return batchWrite(platform_, changes, policy);
 }
 

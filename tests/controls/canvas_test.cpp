@@ -757,4 +757,24 @@ TEST_F(CanvasTest, TellsItsObserverOfWhatAFailedMemberLeft)
     EXPECT_EQ(observer.paper.size(), 1U);
 }
 
+TEST(Canvas, WithSettingsOfItsOwnReadsNoFileAndTakesItsChanges)
+{
+    ReportWorld world;
+    std::filesystem::remove(world.folder.file("OstlConfig.ini"));
+    ReportSettings settings;
+    settings.body.name = u"Sans";
+    settings.topMm = 20;
+    world.canvas.useSettings(settings);
+    TableGrid grid = gridOf({ { u"A", 1000 } }, numberedRows(3, 1));
+    world.canvas.doPreview(grid);
+    EXPECT_EQ(world.canvas.style().body.font.name, u"Sans");
+    EXPECT_EQ(world.canvas.page.intTop, 1814);
+    world.canvas.ownSettings()->topMm = 10;
+    world.canvas.doPreview(grid);
+    EXPECT_EQ(world.canvas.page.intTop, 907);
+    EXPECT_EQ(world.folder.names().size(), 0U);
+    world.canvas.useSettings(std::nullopt);
+    EXPECT_EQ(errorOf([&] { world.canvas.doPreview(grid); }), ErrorNumber::FileNotFound);
+}
+
 } // namespace pelloric

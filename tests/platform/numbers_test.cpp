@@ -120,4 +120,12 @@ TEST(FormatSingle, WritesTheShortestFormThatReadsBackAsTheSame)
         EXPECT_EQ(static_cast<float>(leadingNumber(TextView(formatSingle(value)))), value);
 }
 
+TEST(ToSingle, OverflowsPastSinglePrecision)
+{
+    EXPECT_EQ(toSingle(0.1), 0.1F);
+    EXPECT_EQ(toSingle(-3.4e38), -3.4e38F);
+    for (const double bad : { 1e39, -1e39, std::nan("") })
+        EXPECT_EQ(errorOf([&] { toSingle(bad); }), ErrorNumber::Overflow) << bad;
+}
+
 } // namespace pelloric

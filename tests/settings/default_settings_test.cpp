@@ -6,46 +6,32 @@
 #include "fakes/fake_platform.h"
 #include "platform/numbers.h"
 #include "settings/settings_file.h"
-#include "settings/settings_keys.h"
+#include "settings/settings_table.h"
 #include "support/errors.h"
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
-
 namespace pelloric {
-
-TEST(DefaultSettings, HoldEveryKeyOnce)
-{
-    for (const TextView key : SettingsKeys) {
-        const auto rows = defaultSettings();
-        EXPECT_EQ(std::count_if(rows.begin(), rows.end(),
-                      [&](const DefaultSetting& row) { return row.key == key; }),
-            1)
-            << toUtf8(key);
-    }
-    EXPECT_EQ(defaultSettings().size(), SettingsKeys.size());
-}
 
 TEST(DefaultSettings, HoldNoKeyBelowALineThatContainsIt)
 {
-    const auto rows = defaultSettings();
+    const auto rows = settingsTable();
     for (std::size_t line = 0; line < rows.size(); ++line) {
         for (std::size_t above = 0; above < line; ++above) {
-            EXPECT_FALSE(contains(rows[above].key, rows[line].key)
-                || contains(rows[above].value, rows[line].key))
-                << toUtf8(rows[line].key) << " stands below " << toUtf8(rows[above].key);
+            EXPECT_FALSE(contains(rows[above].name, rows[line].name)
+                || contains(rows[above].start, rows[line].name))
+                << toUtf8(rows[line].name) << " stands below " << toUtf8(rows[above].name);
         }
     }
 }
 
 TEST(DefaultSettings, HaveTheHeaderAndFooterTextsLast)
 {
-    const auto rows = defaultSettings();
+    const auto rows = settingsTable();
     const TextView last[] = { u"HeaderLeft", u"HeaderCenter", u"HeaderRight", u"FooterLeft",
         u"FooterCenter", u"FooterRight" };
     for (std::size_t at = 0; at < std::size(last); ++at)
-        EXPECT_EQ(rows[rows.size() - std::size(last) + at].key, last[at]);
+        EXPECT_EQ(rows[rows.size() - std::size(last) + at].name, last[at]);
 }
 
 TEST(DefaultSettings, ReadBackWhatTheirTableSays)
@@ -53,8 +39,8 @@ TEST(DefaultSettings, ReadBackWhatTheirTableSays)
     FakePlatform platform;
     deployDefaultSettings(platform.services());
     const SettingsSnapshot file(platform.services());
-    for (const DefaultSetting& setting : defaultSettings())
-        EXPECT_EQ(file.value(setting.key), setting.value) << toUtf8(setting.key);
+    for (const Setting& setting : settingsTable())
+        EXPECT_EQ(file.value(setting.name), setting.start) << toUtf8(setting.name);
     EXPECT_EQ(strictInt16(file.value(u"PagerSizeValue")), 9);
 }
 

@@ -6,7 +6,7 @@
 #include "controls/canvas.h"
 #include "fakes/fake_platform.h"
 #include "grids/table_grid.h"
-#include "settings/default_settings.h"
+#include "settings/settings_table.h"
 
 #include <initializer_list>
 #include <utility>
@@ -51,13 +51,13 @@ public:
     void set(Settings changes)
     {
         Text text;
-        for (const DefaultSetting& setting : defaultSettings()) {
-            Text value(setting.key == u"FooterCenter" ? TextView() : setting.value);
+        for (const Setting& setting : settingsTable()) {
+            Text value(setting.key == SettingKey::FooterCenter ? TextView() : setting.start);
             for (const auto& [key, changed] : changes) {
-                if (key == setting.key)
+                if (key == setting.name)
                     value = changed;
             }
-            text.append(setting.key).append(u"= ").append(value).append(u"\r\n");
+            text.append(setting.name).append(u"= ").append(value).append(u"\r\n");
         }
         folder.write("OstlConfig.ini", toUtf8(text));
     }

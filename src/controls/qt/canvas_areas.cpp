@@ -34,8 +34,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerInch = 1440;
-
 constexpr double ScrollStep = 100; ///< what one step of a bar moves: page twips
 
 /// So many page surfaces are widgets; the toolkit takes long to move thousands of them.

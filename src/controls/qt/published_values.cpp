@@ -12,9 +12,6 @@
 
 #include <QObject>
 
-#include <cmath>
-#include <limits>
-
 namespace pelloric::qt {
 
 namespace {
@@ -84,13 +81,7 @@ std::int16_t toInt16(const QVariant& argument) { return roundToInt16(numberOf(ar
 
 std::int32_t toInt32(const QVariant& argument) { return roundToInt32(numberOf(argument)); }
 
-float toSingle(const QVariant& argument)
-{
-    const double number = numberOf(argument);
-    if (!(std::abs(number) <= static_cast<double>(std::numeric_limits<float>::max())))
-        throw RunTimeError(ErrorNumber::Overflow, pastSingle(number));
-    return static_cast<float>(number);
-}
+float toSingle(const QVariant& argument) { return pelloric::toSingle(numberOf(argument)); }
 
 bool toTruth(const QVariant& argument)
 {

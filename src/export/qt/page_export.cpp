@@ -33,7 +33,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerInch = 1440;
 constexpr Twips TwipsPerPoint = 20;
 constexpr double InchesPerMetre = 1 / 0.0254;
 

@@ -12,8 +12,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerInch = 1440;
-
 } // namespace
 
 SectionMap::SectionMap(int count)

@@ -57,10 +57,10 @@ protected:
 
 } // namespace
 
-GridStyleDialog::GridStyleDialog(const Platform& platform, QWidget* parent)
+GridStyleDialog::GridStyleDialog(const Platform& platform, QWidget* parent, ReportSettings* own)
     : QDialog(parent)
     , platform_(platform)
-    , state_(platform_)
+    , state_(platform_, own)
 {
     setWindowTitle(toQString(GridStyleTitle));
     setModal(true);

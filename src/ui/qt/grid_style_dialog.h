@@ -25,7 +25,9 @@ class GridStyleDialog final : public QDialog {
 public:
     /// Loads the settings.
     /// @param platform  its services outlive the dialog
-    explicit GridStyleDialog(const Platform& platform, QWidget* parent = nullptr);
+    /// @param own       shown and changed instead of the settings file; null: the file
+    explicit GridStyleDialog(
+        const Platform& platform, QWidget* parent = nullptr, ReportSettings* own = nullptr);
 
     /// Replaces the font dialog.
     void useFontDialog(ChooseFont choose) { chooseFont_ = std::move(choose); }

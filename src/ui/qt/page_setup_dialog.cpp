@@ -65,11 +65,11 @@ QFrame* bareFrame(const QString& name, QWidget* parent)
 
 } // namespace
 
-PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent)
+PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent, ReportSettings* own)
     : QDialog(parent)
     , platform_(platform)
     , inquiry_(platform_.printers.inquire({}))
-    , state_(platform_, formsOf(inquiry_->facts(BeforeOpening)))
+    , state_(platform_, formsOf(inquiry_->facts(BeforeOpening)), own)
     , answerTimer_(new QTimer(this))
 {
     setWindowTitle(toQString(PageSetupTitle));

@@ -39,7 +39,9 @@ class PageSetupDialog final : public QDialog {
 public:
     /// Loads the settings.
     /// @param platform  its services outlive the dialog
-    explicit PageSetupDialog(const Platform& platform, QWidget* parent = nullptr);
+    /// @param own       shown and changed instead of the settings file; null: the file
+    explicit PageSetupDialog(
+        const Platform& platform, QWidget* parent = nullptr, ReportSettings* own = nullptr);
 
     /// Replaces the font dialog.
     void useFontDialog(ChooseFont choose);

@@ -5,6 +5,7 @@
 
 #include "controls/qt/default_platform.h"
 #include "controls/qt/kestrane.h"
+#include "controls/qt/sorvane.h"
 #include "platform/automation_object.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/run_time_error.h"
@@ -72,6 +73,7 @@ PreviewWindow& QtPreviewOpener::showWindow()
         window_ = new PreviewWindow(platform_);
         window_->setPrompts(prompts_);
         window_->useFolders(folders_);
+        window_->canvas().canvas().useSettings(settings_);
     }
     if (!showing_)
         return *window_;

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "controls/facade.h"
+#include "settings/report_settings.h"
 #include "ui/qt/preview_prompts.h"
 
 #include <QPointer>
@@ -29,6 +30,9 @@ public:
 
     /// Whether windows come to the screen, as they do at first; else pages are built unseen.
     void setShowing(bool showing) { showing_ = showing; }
+    /// The settings of the reports in windows that are made from now on; nothing: those of the
+    /// settings file.
+    void setSettings(std::optional<ReportSettings> settings) { settings_ = std::move(settings); }
 
     /// Shows the window, then has it preview the grid.
     /// @throws RunTimeError as `PreviewWindow::preview`
@@ -45,6 +49,7 @@ private:
     PreviewPrompts prompts_;
     bool showing_ = true;
     std::shared_ptr<UsedFolders> folders_;
+    std::optional<ReportSettings> settings_;
     QPointer<PreviewWindow> window_;
 };
 

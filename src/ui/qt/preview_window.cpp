@@ -310,13 +310,13 @@ void PreviewWindow::navigationChanged()
 
 DialogEnd PreviewWindow::showGridStyle()
 {
-    GridStyleDialog dialog(platform_, this);
+    GridStyleDialog dialog(platform_, this, canvas_->canvas().ownSettings());
     return dialog.exec() == QDialog::Accepted ? DialogEnd::Accepted : DialogEnd::Cancelled;
 }
 
 DialogEnd PreviewWindow::showPageSetup()
 {
-    PageSetupDialog dialog(platform_, this);
+    PageSetupDialog dialog(platform_, this, canvas_->canvas().ownSettings());
     return dialog.exec() == QDialog::Accepted ? DialogEnd::Accepted : DialogEnd::Cancelled;
 }
 
