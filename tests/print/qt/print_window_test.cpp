@@ -6,9 +6,9 @@
 #include "fakes/temp_folder.h"
 #include "grids/table_grid.h"
 #include "platform/run_time_error.h"
-#include "print/qt/beside.h"
 #include "print/qt/print_test.h"
 #include "settings/default_settings.h"
+#include "support/qt/beside.h"
 #include "ui/qt/preview_window.h"
 #include "ui/qt/print_options_dialog.h"
 
