@@ -206,10 +206,16 @@ void PreviewSession::openFile()
     try {
         canvas_.OpenFile(path);
     } catch (const RunTimeError&) {
-        refreshNavigation(); // the canvas holds other pages than before
+        documentOpened();
         throw;
     }
-    refreshNavigation();
+    documentOpened();
+}
+
+void PreviewSession::documentOpened()
+{
+    state_.rebuild = grid_ != nullptr;
+    refresh(false);
 }
 
 void PreviewSession::askForCentring()
@@ -481,6 +487,7 @@ void PreviewSession::refresh(bool rebuild)
     askForCentring();
     host_.beforeBuild(grid);
     canvas_.doPreview(grid);
+    state_.rebuild = true;
     centre();
     refreshNavigation();
 }

@@ -63,6 +63,7 @@ struct NavigationState {
     int pageEntries = 0; ///< the page combo lists pages 1 to this
     Text scale; ///< text of the scale combo
     Text countLabel; ///< beside the page combo
+    bool rebuild = true; ///< "ReFresh", "Maximum " and "Minimum" are enabled
 
     bool operator==(const NavigationState&) const = default;
 };
@@ -132,6 +133,11 @@ public:
     /// @param page  zero-based
     /// @return      the surface that shows it, or nothing where there is no such page
     std::optional<int> showPage(int page);
+
+    /// The canvas has opened a document, or has lost its pages in the attempt: shows what it holds.
+    ///
+    /// What builds pages again is disabled while there is no grid to build them from.
+    void documentOpened();
 
     /// Builds again from the kept grid, or else takes the layout anew; then the navigation.
     /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build

@@ -340,6 +340,21 @@ TEST(PreviewNavigation, BuildsRefreshesAndZoomsAGrid)
     fixture.click({ 2, 23, 24 });
 }
 
+TEST(PreviewNavigation, RebuildsNoDocumentThatWasOpenedWithoutAGrid)
+{
+    Fixture fixture(2);
+    deployDefaultSettings(fixture.platform.services());
+    fixture.host.path = fixture.platform.folder.file("pages.ostl");
+    EXPECT_TRUE(fixture.session().state().rebuild);
+    fixture.click({ 21, 20 });
+    EXPECT_FALSE(fixture.session().state().rebuild);
+    TableGrid grid({ { u"a", 1000 } });
+    fixture.session().open(grid);
+    EXPECT_TRUE(fixture.session().state().rebuild);
+    fixture.click({ 20 });
+    EXPECT_TRUE(fixture.session().state().rebuild);
+}
+
 TEST(PreviewNavigation, RefreshesAfterOkAndNotAfterCancel)
 {
     Fixture fixture(5);

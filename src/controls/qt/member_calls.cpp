@@ -6,12 +6,14 @@
 #include "controls/messages.h"
 #include "controls/qt/script_caller.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_services.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 
 #include <QObject>
 #include <QPointer>
+#include <QWidget>
 
 namespace pelloric::qt {
 
@@ -29,6 +31,8 @@ void MemberCalls::run(const std::function<void()>& member)
 {
     const std::shared_ptr<void> alive = parts_;
     const QPointer<QObject> control(&control_);
+    if (auto* const widget = qobject_cast<QWidget*>(&control_))
+        setMessageSubject(widget->window());
     try {
         member();
     } catch (const RunTimeError& error) {

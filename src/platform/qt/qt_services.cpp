@@ -10,6 +10,7 @@
 #include <QKeyEvent>
 #include <QLocale>
 #include <QMessageBox>
+#include <QPointer>
 #include <QStandardPaths>
 
 #ifdef Q_OS_WIN
@@ -92,6 +93,21 @@ private:
 
     QtMessageLoop& loop_;
 };
+
+QPointer<QWidget>& messageSubject()
+{
+    static QPointer<QWidget> subject;
+    return subject;
+}
+
+/// A modal dialog lets no other window's box be answered.
+QWidget* boxOwner()
+{
+    if (QWidget* const dialog = QApplication::activeModalWidget())
+        return dialog;
+    QWidget* const subject = messageSubject();
+    return subject != nullptr && subject->isVisible() ? subject : QApplication::activeWindow();
+}
 
 QMessageBox::Icon boxIcon(MessageIcon icon)
 {
@@ -195,9 +211,11 @@ void QtMessageLoop::endWhenCancelled()
 
 void keepAnswering(QObject& widget) { widget.setProperty(AnsweringProperty, true); }
 
+void setMessageSubject(QWidget* window) { messageSubject() = window; }
+
 void BoxMessages::show(const Message& message)
 {
-    QMessageBox box(QApplication::activeWindow());
+    QMessageBox box(boxOwner());
     box.setIcon(boxIcon(message.icon));
     box.setWindowTitle(
         message.title ? toQString(*message.title) : QGuiApplication::applicationDisplayName());

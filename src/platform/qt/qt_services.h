@@ -14,6 +14,7 @@
 
 class QLocale;
 class QObject;
+class QWidget;
 
 namespace pelloric::qt {
 
@@ -66,7 +67,12 @@ private:
 /// that ends it.
 void keepAnswering(QObject& widget);
 
-/// Shows each message in a box over the active window.
+/// Says which window the next message box is about, so that the box belongs to it and brings no
+/// other window forward.
+/// @param window  borrowed; null: nobody knows
+void setMessageSubject(QWidget* window);
+
+/// Shows each message in a box over the window that it is about, or over the active one.
 class BoxMessages final : public MessageService {
 public:
     void show(const Message& message) override;

@@ -64,7 +64,9 @@ QtPreviewOpener::~QtPreviewOpener() { delete window_; }
 
 void QtPreviewOpener::openPreview(std::unique_ptr<AutomationObject> grid)
 {
-    showWindow().preview(std::move(grid));
+    PreviewWindow& window = showWindow();
+    setMessageSubject(&window);
+    window.preview(std::move(grid));
 }
 
 PreviewWindow& QtPreviewOpener::showWindow()

@@ -231,7 +231,8 @@ void PreviewToolbar::focusBox(ChoiceBox& box)
 void PreviewToolbar::showNavigation(const NavigationState& state, int currentPage)
 {
     const std::pair<int, bool> enabled[]
-        = { { 5, state.first }, { 6, state.previous }, { 7, state.next }, { 8, state.last } };
+        = { { 5, state.first }, { 6, state.previous }, { 7, state.next }, { 8, state.last },
+              { 2, state.rebuild }, { 23, state.rebuild }, { 24, state.rebuild } };
     for (const auto& [id, isEnabled] : enabled)
         actions_.at(id)->setEnabled(isEnabled);
     if (pageBox_->count() != state.pageEntries) {

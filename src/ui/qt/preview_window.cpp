@@ -51,7 +51,7 @@ constexpr int CloseAgainMs = 20;
 /// Where size and place of the window are kept.
 QSettings placeSettings()
 {
-    return QSettings(QSettings::IniFormat, QSettings::UserScope, QStringLiteral("Pelloric"),
+    return QSettings(QSettings::IniFormat, QSettings::UserScope, QStringLiteral("pelloric"),
         QStringLiteral("PreviewWindow"));
 }
 
@@ -66,6 +66,7 @@ public:
         : window_(window)
     {
         ++window_.running_;
+        setMessageSubject(&window_);
     }
 
     ~Command()
@@ -188,10 +189,10 @@ void PreviewWindow::openDocument(const std::filesystem::path& path)
     try {
         canvas_->canvas().OpenFile(path);
     } catch (const RunTimeError&) {
-        session_->refresh(false); // the canvas holds other pages than before
+        session_->documentOpened();
         throw;
     }
-    session_->refresh(false);
+    session_->documentOpened();
 }
 
 void PreviewWindow::refresh(bool rebuild)

@@ -85,6 +85,30 @@ TEST_F(PreviewWindowTest, CarriesItsNamesAndItsTitle)
     EXPECT_EQ(canvas().strSCliectRect, u"full");
 }
 
+TEST_F(PreviewWindowTest, DisablesWhatRebuildsADocumentThatWasOpenedWithoutAGrid)
+{
+    preview(3);
+    canvas().SaveFile(folder_.file("saved.ostl"));
+    opener_.window()->close();
+    show().openDocument(folder_.file("saved.ostl"));
+    for (const int id : { 2, 23, 24 })
+        EXPECT_FALSE(button(id)->isEnabled()) << id;
+    opener_.openPreview(gridOf(3));
+    for (const int id : { 2, 23, 24 })
+        EXPECT_TRUE(button(id)->isEnabled()) << id;
+}
+
+TEST_F(PreviewWindowTest, KeepsItsPlaceBesideTheSettings)
+{
+    PreviewWindow& window = show();
+    const QSettings beside(QSettings::IniFormat, QSettings::UserScope, QStringLiteral("pelloric"),
+        QStringLiteral("PreviewWindow"));
+    EXPECT_FALSE(QFile::exists(beside.fileName()));
+    window.close();
+    EXPECT_TRUE(QFile::exists(beside.fileName()));
+    EXPECT_FALSE(QDir(file("Pelloric")).exists());
+}
+
 TEST_F(PreviewWindowTest, HasEveryToolWithNumberNameAndCaption)
 {
     show();
