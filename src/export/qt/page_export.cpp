@@ -150,12 +150,11 @@ std::vector<std::filesystem::path> exportEach(const PageDocument& document,
     const ExportOptions& options, const std::filesystem::path& path, const FileWriter& write)
 {
     const std::vector<int> pages = differentPagesOf(document, options);
-    std::vector<std::filesystem::path> paths;
+    const std::vector<std::filesystem::path> paths = pageFilePaths(document, options, path);
     PendingFiles files;
-    for (const int page : pages) {
-        tell(options, paths.size(), pages.size());
-        paths.push_back(pages.size() == 1 ? path : numberedPath(path, page, document));
-        files.write(paths.back(), [&](QFile& file) { return write(page, file); });
+    for (std::size_t done = 0; done < pages.size(); ++done) {
+        tell(options, done, pages.size());
+        files.write(paths[done], [&](QFile& file) { return write(pages[done], file); });
     }
     tell(options, pages.size(), pages.size());
     files.putInPlace();
@@ -175,6 +174,19 @@ QSize pixelsOf(const PageSetup& setup, int dpi)
 }
 
 } // namespace
+
+std::vector<std::filesystem::path> pageFilePaths(
+    const PageDocument& document, const ExportOptions& options, const std::filesystem::path& path)
+{
+    const std::vector<int> pages = differentPagesOf(document, options);
+    if (pages.size() == 1)
+        return { path };
+    std::vector<std::filesystem::path> paths;
+    paths.reserve(pages.size());
+    for (const int page : pages)
+        paths.push_back(numberedPath(path, page, document));
+    return paths;
+}
 
 void exportPdfByToolkit(const PageDocument& document, const PageSetup& setup, QtFonts& fonts,
     const ExportOptions& options, const std::filesystem::path& path)

@@ -64,9 +64,15 @@ PdfExport exportPdf(const PageDocument& document, const PageSetup& setup, QtFont
 void exportPdfByToolkit(const PageDocument& document, const PageSetup& setup, QtFonts& fonts,
     const ExportOptions& options, const std::filesystem::path& path);
 
-/// Writes one PNG image on white for each page, "name-001.png" for page 1 at "name.png".
+/// The files that exports of one file a page write, in the order of the pages: "name-001.png" for
+/// page 1 at "name.png", or the path itself for a single page. A page that is asked for twice has
+/// one file.
+/// @throws RunTimeError SubscriptOutOfRange: no such page
+std::vector<std::filesystem::path> pageFilePaths(
+    const PageDocument& document, const ExportOptions& options, const std::filesystem::path& path);
+
+/// Writes one PNG image on white for each page, named as `pageFilePaths` says.
 ///
-/// A single page is written to the path itself. A page that is asked for twice is written once.
 /// @return  the files in the order of the pages
 /// @throws RunTimeError as `exportPdf`; Overflow: also an image of more pixels than can be held
 std::vector<std::filesystem::path> exportPngs(const PageDocument& document, const PageSetup& setup,

@@ -14,7 +14,9 @@
 #include <QFileInfo>
 #include <QStandardPaths>
 
+#include <algorithm>
 #include <array>
+#include <utility>
 
 namespace pelloric::qt {
 
@@ -26,6 +28,7 @@ constexpr int MostFolders = 8; ///< in the side bar
 struct PageFile {
     const char* suffix;
     const char* description;
+    bool isOnePerPage;
     void (*write)(const Canvas& canvas, QtFonts& fonts, const ExportOptions& options,
         const std::filesystem::path& path);
 };
@@ -50,9 +53,9 @@ void writeSvgs(const Canvas& canvas, QtFonts& fonts, const ExportOptions& option
 
 /// The first is the one that is offered.
 constexpr auto PageFiles = std::to_array<PageFile>({
-    { "pdf", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "PDF document"), writePdf },
-    { "png", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "PNG pictures"), writePngs },
-    { "svg", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "SVG drawings"), writeSvgs },
+    { "pdf", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "PDF document"), false, writePdf },
+    { "png", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "PNG pictures"), true, writePngs },
+    { "svg", QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "SVG drawings"), true, writeSvgs },
 });
 
 QString words(const char* text)
@@ -69,6 +72,15 @@ QString nameAfter(const QString& title)
             character = QLatin1Char('-');
     }
     return name.isEmpty() ? words(QT_TRANSLATE_NOOP("pelloric::qt::PageFiles", "report")) : name;
+}
+
+/// What a path's ending stands for; null: nothing that pages can be saved as.
+const PageFile* kindOf(const std::filesystem::path& path)
+{
+    const QString suffix = QFileInfo(toQString(pathText(path))).suffix().toLower();
+    const auto kind = std::ranges::find_if(
+        PageFiles, [&](const PageFile& file) { return suffix == QLatin1String(file.suffix); });
+    return kind != PageFiles.end() ? &*kind : nullptr;
 }
 
 } // namespace
@@ -91,18 +103,29 @@ FileQuestion savePagesQuestion(const QString& title, const QString& folder)
     return question;
 }
 
+std::vector<std::filesystem::path> filesInTheWay(
+    const Canvas& canvas, const std::filesystem::path& path)
+{
+    const PageFile* const kind = kindOf(path);
+    std::vector<std::filesystem::path> files;
+    if (kind == nullptr || !kind->isOnePerPage)
+        return files;
+    for (std::filesystem::path& file : pageFilePaths(canvas.document(), {}, path)) {
+        if (file != path && QFileInfo::exists(toQString(pathText(file))))
+            files.push_back(std::move(file));
+    }
+    return files;
+}
+
 void savePages(Canvas& canvas, QtFonts& fonts, const std::filesystem::path& path,
     const std::function<bool(int done, int total)>& mayGoOn)
 {
-    const QString suffix = QFileInfo(toQString(pathText(path))).suffix().toLower();
-    for (const PageFile& file : PageFiles) {
-        if (suffix != QLatin1String(file.suffix))
-            continue;
-        const ExportOptions options { .title = canvas.documentTitle(), .progress = mayGoOn };
-        return canvas.keepDocument([&] { file.write(canvas, fonts, options, path); });
-    }
-    throw RunTimeError(
-        ErrorNumber::InvalidCall, pathText(path) + u": the name must end in .pdf, .png or .svg");
+    const PageFile* const kind = kindOf(path);
+    if (kind == nullptr)
+        throw RunTimeError(ErrorNumber::InvalidCall,
+            pathText(path) + u": the name must end in .pdf, .png or .svg");
+    const ExportOptions options { .title = canvas.documentTitle(), .progress = mayGoOn };
+    canvas.keepDocument([&] { kind->write(canvas, fonts, options, path); });
 }
 
 void UsedFolders::use(const QString& file)

@@ -9,6 +9,7 @@
 
 #include <filesystem>
 #include <functional>
+#include <vector>
 
 namespace pelloric {
 class Canvas;
@@ -23,6 +24,11 @@ struct FileQuestion;
 /// @param title   of the document, which the name is proposed after; may be empty
 /// @param folder  shown first
 FileQuestion savePagesQuestion(const QString& title, const QString& folder);
+
+/// The files that saving the pages of a canvas would replace without the person having been asked:
+/// pictures of several pages go to numbered files beside the name that was chosen.
+std::vector<std::filesystem::path> filesInTheWay(
+    const Canvas& canvas, const std::filesystem::path& path);
 
 /// Writes the pages of a canvas as the path's ending says: .pdf, .png or .svg, the pictures one
 /// file a page as the exports name them.

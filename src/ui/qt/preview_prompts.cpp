@@ -5,13 +5,18 @@
 
 #include "platform/qt/qt_text.h"
 #include "ui/qt/icon_set.h"
+#include "ui/qt/named_boxes.h"
 #include "ui/tool_table.h"
 
+#include <QComboBox>
 #include <QCoreApplication>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QPushButton>
 #include <QUrl>
+
+#include <utility>
 
 namespace pelloric::qt {
 
@@ -64,6 +69,32 @@ QString chooseFile(QWidget& window, const FileQuestion& question)
     return {};
 }
 
+bool mayReplace(QWidget& window, const QStringList& files)
+{
+    const auto words = [](const char* text) {
+        return QCoreApplication::translate("pelloric::qt::ReplaceBox", text);
+    };
+    const QString name = QFileInfo(files.front()).fileName();
+    QMessageBox box(&window);
+    box.setObjectName(QStringLiteral("frmReplace"));
+    box.setIcon(QMessageBox::Warning);
+    box.setWindowTitle(words(QT_TRANSLATE_NOOP("pelloric::qt::ReplaceBox", "Replace Files")));
+    box.setTextFormat(Qt::PlainText);
+    box.setText(files.size() == 1
+            ? words(QT_TRANSLATE_NOOP("pelloric::qt::ReplaceBox", "%1 already exists.")).arg(name)
+            : words(QT_TRANSLATE_NOOP(
+                        "pelloric::qt::ReplaceBox", "%1 files already exist, such as %2."))
+                  .arg(files.size())
+                  .arg(name));
+    box.setInformativeText(words(QT_TRANSLATE_NOOP("pelloric::qt::ReplaceBox",
+        "Every page becomes a file of its own. Do you want to replace what is there?")));
+    QPushButton* const replace = box.addButton(
+        words(QT_TRANSLATE_NOOP("pelloric::qt::ReplaceBox", "&Replace")), QMessageBox::AcceptRole);
+    box.setDefaultButton(box.addButton(QMessageBox::Cancel));
+    box.exec();
+    return box.clickedButton() == replace;
+}
+
 void showAbout(QWidget& window)
 {
     QMessageBox box(&window);
@@ -92,7 +123,10 @@ FileQuestion question(TextView title, bool isSave)
 
 PreviewPrompts standardPrompts()
 {
-    return { .chooseFile = chooseFile, .beforeBuild = {}, .showAbout = showAbout };
+    return { .chooseFile = chooseFile,
+        .beforeBuild = {},
+        .mayReplace = mayReplace,
+        .showAbout = showAbout };
 }
 
 FileQuestion openFileQuestion() { return question(OpenFileTitle, false); }

@@ -38,6 +38,10 @@ struct PreviewPrompts {
     /// may bring its column widths up to date. May be empty.
     std::function<void(AutomationObject& grid)> beforeBuild = {};
 
+    /// Asks whether files that exist may be replaced, one or more: full paths. A refusal ends what
+    /// would have replaced them.
+    std::function<bool(QWidget& window, const QStringList& files)> mayReplace = {};
+
     /// Shows the about box and returns when it is closed.
     std::function<void(QWidget& window)> showAbout;
 };

@@ -6,6 +6,7 @@
 #include "controls/messages.h"
 #include "controls/qt/sorvane.h"
 #include "platform/automation_object.h"
+#include "platform/file_bytes.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -161,6 +162,8 @@ void PreviewWindow::setPrompts(PreviewPrompts prompts)
         prompts_.chooseFile = standard.chooseFile;
     if (!prompts_.showAbout)
         prompts_.showAbout = standard.showAbout;
+    if (!prompts_.mayReplace)
+        prompts_.mayReplace = standard.mayReplace;
 }
 
 bool PreviewWindow::isBusy() const { return running_ > 0 || canvas_->canvas().isBusy(); }
@@ -385,11 +388,22 @@ void PreviewWindow::savePages()
     const Command command(*this);
     const QString title = toQString(canvas_->canvas().documentTitle());
     try {
-        writePages(choose(savePagesQuestion(title, folders_->last())));
+        const std::filesystem::path path = choose(savePagesQuestion(title, folders_->last()));
+        if (mayWritePages(path))
+            writePages(path);
     } catch (const RunTimeError& error) {
         if (error.number() != ErrorNumber::Cancelled)
             platform_.messages.show(messageOf(error));
     }
+}
+
+/// Numbered files beside the chosen name are replaced only when the person says so.
+bool PreviewWindow::mayWritePages(const std::filesystem::path& path)
+{
+    QStringList files;
+    for (const std::filesystem::path& file : filesInTheWay(canvas_->canvas(), path))
+        files.append(toQString(pathText(file)));
+    return files.isEmpty() || prompts_.mayReplace(*this, files);
 }
 
 /// The dialog comes up when it takes a while.

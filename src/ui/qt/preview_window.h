@@ -106,6 +106,7 @@ private:
     QString printFrom(PrintOptionsDialog& dialog, const PrintArguments& arguments);
     void connectTools();
     void addSavePages();
+    bool mayWritePages(const std::filesystem::path& path);
     void writePages(const std::filesystem::path& path);
     void click(int id);
     void escape();

@@ -21,8 +21,10 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenu>
+#include <QMessageBox>
 #include <QPointer>
 #include <QProcess>
+#include <QPushButton>
 #include <QSignalSpy>
 #include <QTest>
 #include <QTimer>
@@ -661,6 +663,63 @@ TEST_F(PreviewWindowTest, SavesThePagesAsThePathsEndingSays)
     answer = folder + QStringLiteral("/missing/d.pdf");
     QTest::keyClick(&window, Qt::Key_E, Qt::ControlModifier);
     EXPECT_EQ(messages_.take().size(), 1U);
+}
+
+TEST_F(PreviewWindowTest, ReplacesNumberedFilesOnlyWhenThePersonSaysSo)
+{
+    QString answer = file("page.png");
+    std::vector<QStringList> asked;
+    bool mayReplace = false;
+    PreviewPrompts prompts;
+    prompts.chooseFile = [&](QWidget&, const FileQuestion&) { return answer; };
+    prompts.mayReplace = [&](QWidget&, const QStringList& files) {
+        asked.push_back(files);
+        return mayReplace;
+    };
+    opener_.setPrompts(prompts);
+    PreviewWindow& window = preview(60);
+    ASSERT_EQ(canvas().Totalpages(), 2);
+    folder_.write("page-002.png", "mine");
+    folder_.write("page-003.png", "of another report");
+    const auto save = [&] { QTest::keyClick(&window, Qt::Key_E, Qt::ControlModifier); };
+    save();
+    EXPECT_THAT(asked, testing::ElementsAre(QStringList(file("page-002.png"))));
+    EXPECT_EQ(folder_.read("page-002.png"), "mine");
+    EXPECT_FALSE(QFile::exists(file("page-001.png")));
+    mayReplace = true;
+    save();
+    EXPECT_EQ(asked.size(), 2U);
+    EXPECT_TRUE(QFile::exists(file("page-001.png")));
+    EXPECT_NE(folder_.read("page-002.png"), "mine");
+    EXPECT_EQ(folder_.read("page-003.png"), "of another report");
+    answer = file("page.svg");
+    save();
+    answer = file("page.pdf");
+    save();
+    save();
+    EXPECT_EQ(asked.size(), 2U); // new files, and one that the file dialog has asked about
+}
+
+TEST_F(PreviewWindowTest, AsksInABoxBeforeNumberedFilesAreReplaced)
+{
+    QWidget window;
+    const auto answer = [&](const char* button) {
+        QTimer::singleShot(0, [button] {
+            auto* const box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+            ASSERT_NE(box, nullptr);
+            EXPECT_EQ(box->text(), "3 files already exist, such as page-001.png.");
+            EXPECT_EQ(box->defaultButton()->text().remove(u'&'), "Cancel");
+            for (QAbstractButton* const found : box->buttons()) {
+                if (found->text().remove(u'&') == QLatin1String(button))
+                    found->click();
+            }
+        });
+        return standardPrompts().mayReplace(window,
+            { QStringLiteral("/a/page-001.png"), QStringLiteral("/a/page-002.png"),
+                QStringLiteral("/a/page-003.png") });
+    };
+    EXPECT_FALSE(answer("Cancel"));
+    EXPECT_TRUE(answer("Replace"));
 }
 
 TEST_F(PreviewWindowTest, OpenAndSaveKeepTheirFolderAndOfferThoseOfTheSession)

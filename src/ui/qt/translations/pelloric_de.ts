@@ -574,6 +574,29 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::ReplaceBox</name>
+    <message>
+        <source>Replace Files</source>
+        <translation>Dateien ersetzen</translation>
+    </message>
+    <message>
+        <source>%1 already exists.</source>
+        <translation>%1 ist schon vorhanden.</translation>
+    </message>
+    <message>
+        <source>%1 files already exist, such as %2.</source>
+        <translation>%1 Dateien sind schon vorhanden, zum Beispiel %2.</translation>
+    </message>
+    <message>
+        <source>Every page becomes a file of its own. Do you want to replace what is there?</source>
+        <translation>Jede Seite wird eine eigene Datei. Soll ersetzt werden, was da ist?</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>&amp;Ersetzen</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::Sorvane</name>
     <message>
         <source>Page preview</source>

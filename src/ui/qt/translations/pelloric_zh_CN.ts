@@ -574,6 +574,29 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::ReplaceBox</name>
+    <message>
+        <source>Replace Files</source>
+        <translation>替换文件</translation>
+    </message>
+    <message>
+        <source>%1 already exists.</source>
+        <translation>%1 已存在。</translation>
+    </message>
+    <message>
+        <source>%1 files already exist, such as %2.</source>
+        <translation>已有 %1 个文件，例如 %2。</translation>
+    </message>
+    <message>
+        <source>Every page becomes a file of its own. Do you want to replace what is there?</source>
+        <translation>每一页将成为一个单独的文件。要替换已有的文件吗？</translation>
+    </message>
+    <message>
+        <source>&amp;Replace</source>
+        <translation>替换(&amp;R)</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::Sorvane</name>
     <message>
         <source>Page preview</source>
