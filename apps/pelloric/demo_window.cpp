@@ -14,6 +14,7 @@
 #include "table_source.h"
 #include "tables/qt/csv_table.h"
 #include "ui/qt/icon_set.h"
+#include "ui/qt/named_boxes.h"
 
 #include <QCheckBox>
 #include <QClipboard>
@@ -29,6 +30,7 @@
 #include <QPlainTextEdit>
 #include <QPushButton>
 #include <QRegularExpression>
+#include <QScreen>
 #include <QSpinBox>
 #include <QSplitter>
 #include <QSqlTableModel>
@@ -118,6 +120,7 @@ DemoWindow::DemoWindow(qt::QtPlatform& platform, const QString& samples)
     , pages_(new QTabWidget)
 {
     setObjectName(QStringLiteral("frmDemo"));
+    pages_->setAccessibleName(tr("Tables"));
     setWindowTitle(tr("Pelloric Demonstration"));
     setWindowIcon(qt::libraryIcon(QStringLiteral("whole-page"), palette()));
     auto* const body = new QWidget(this);
@@ -144,7 +147,7 @@ DemoWindow::DemoWindow(qt::QtPlatform& platform, const QString& samples)
                 tr("A table view on an SQL table: time zones and their places."), "data_grid.cpp",
                 [=, this] { previewQuery(*facade_, *view, footer_->text()); } },
         view);
-    resize(FirstSize);
+    resize(FirstSize.boundedTo(screen()->availableSize() * 9 / 10));
 }
 
 DemoWindow::~DemoWindow()
@@ -191,6 +194,7 @@ QWidget* DemoWindow::makeReportBox()
     startRow_->setObjectName(QStringLiteral("MarvenStartRow"));
     startRow_->setRange(1, LastStartRow);
     startRow_->setToolTip(tr("Of the flex grid; row 0 holds its titles"));
+    qt::nameBox(*startRow_, tr("First row"));
     footer_ = new QLineEdit(QStringLiteral("[Page # of Pages #]"));
     footer_->setObjectName(QStringLiteral("Footer"));
     auto* const rowLabel = new QLabel(tr("First &row:"));

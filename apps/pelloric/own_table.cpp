@@ -9,7 +9,9 @@
 #include "table_source.h"
 #include "tables/qt/csv_table.h"
 #include "tables/qt/sqlite_table.h"
+#include "ui/qt/named_boxes.h"
 
+#include <QComboBox>
 #include <QCoreApplication>
 #include <QFileDialog>
 #include <QFileInfo>
@@ -45,17 +47,30 @@ QStringList tablesOf(const QString& file)
 }
 
 /// @return  nothing: the person has chosen none
+std::optional<QString> chooseTable(QWidget& window, const QStringList& tables)
+{
+    QInputDialog dialog(&window);
+    dialog.setWindowTitle(words(Title));
+    dialog.setLabelText(
+        words(QT_TRANSLATE_NOOP("pelloric::app::OwnTable", "Table of the database:")));
+    dialog.setComboBoxItems(tables);
+    qt::nameBox(*dialog.findChild<QComboBox*>(),
+        words(QT_TRANSLATE_NOOP("pelloric::app::OwnTable", "Table of the database")));
+    if (dialog.exec() != QDialog::Accepted)
+        return std::nullopt;
+    return dialog.textValue();
+}
+
+/// @return  nothing: the person has chosen none
 std::optional<OwnTable> readDatabase(QWidget& window, const QString& file)
 {
     const QStringList tables = tablesOf(file);
     QString table = tables.value(0);
     if (tables.size() > 1) {
-        bool isChosen = false;
-        table = QInputDialog::getItem(&window, words(Title),
-            words(QT_TRANSLATE_NOOP("pelloric::app::OwnTable", "Table of the database:")), tables,
-            0, false, &isChosen);
-        if (!isChosen)
+        const std::optional<QString> chosen = chooseTable(window, tables);
+        if (!chosen)
             return std::nullopt;
+        table = *chosen;
     }
     qt::SqliteSource source;
     source.path = pathOf(file);

@@ -91,6 +91,14 @@
         <source>A table of your own: %1.</source>
         <translation>Eine eigene Tabelle: %1.</translation>
     </message>
+    <message>
+        <source>Tables</source>
+        <translation>Tabellen</translation>
+    </message>
+    <message>
+        <source>First row</source>
+        <translation>Erste Zeile</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::OwnTable</name>
@@ -105,6 +113,10 @@
     <message>
         <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
         <translation>Tabellen (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <source>Table of the database</source>
+        <translation>Tabelle der Datenbank</translation>
     </message>
 </context>
 </TS>

@@ -91,6 +91,14 @@
         <source>A table of your own: %1.</source>
         <translation>A table of your own: %1.</translation>
     </message>
+    <message>
+        <source>Tables</source>
+        <translation>Tables</translation>
+    </message>
+    <message>
+        <source>First row</source>
+        <translation>First row</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::OwnTable</name>
@@ -105,6 +113,10 @@
     <message>
         <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
         <translation>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</translation>
+    </message>
+    <message>
+        <source>Table of the database</source>
+        <translation>Table of the database</translation>
     </message>
 </context>
 </TS>

@@ -91,6 +91,14 @@
         <source>A table of your own: %1.</source>
         <translation>自己的表格：%1。</translation>
     </message>
+    <message>
+        <source>Tables</source>
+        <translation>表格</translation>
+    </message>
+    <message>
+        <source>First row</source>
+        <translation>起始行</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::OwnTable</name>
@@ -105,6 +113,10 @@
     <message>
         <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
         <translation>表格 (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;所有文件 (*)</translation>
+    </message>
+    <message>
+        <source>Table of the database</source>
+        <translation>数据库中的表</translation>
     </message>
 </context>
 </TS>

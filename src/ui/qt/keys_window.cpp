@@ -10,6 +10,8 @@
 #include <QCoreApplication>
 #include <QDialog>
 #include <QHeaderView>
+#include <QScreen>
+#include <QScrollBar>
 #include <QTreeWidget>
 #include <QVBoxLayout>
 
@@ -38,7 +40,14 @@ constexpr auto ReadingKeys = std::to_array<ReadingKey>({
     { "Esc", QT_TRANSLATE_NOOP("KeysWindow", "Close what is open, end what runs, then leave") },
 });
 
-constexpr QSize FirstSize { 560, 620 }; ///< pixels
+/// As large as the list, as far as the screen goes.
+QSize firstSize(const QTreeWidget& list)
+{
+    const int lines = list.topLevelItemCount() + 1;
+    const QSize whole(list.header()->length() + list.verticalScrollBar()->sizeHint().width(),
+        list.header()->sizeHint().height() + lines * list.sizeHintForRow(0));
+    return whole.boundedTo(list.screen()->availableSize() * 9 / 10);
+}
 
 /// Key names in the user's language, where the toolkit knows them.
 QString nativeKeys(const QString& keys)
@@ -96,7 +105,7 @@ void showKeys(QWidget& parent, const std::vector<KeyLine>& keys)
         auto* const layout = new QVBoxLayout(dialog);
         layout->setContentsMargins(0, 0, 0, 0);
         layout->addWidget(list);
-        dialog->resize(FirstSize);
+        dialog->resize(firstSize(*list));
     }
     dialog->show();
     dialog->raise();

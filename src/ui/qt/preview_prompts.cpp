@@ -32,6 +32,19 @@ bool endsInOneOf(const QString& path, const QStringList& suffixes)
     return suffixes.isEmpty() || suffixes.contains(QFileInfo(path).suffix(), Qt::CaseInsensitive);
 }
 
+/// The toolkit tells its boxes by their values.
+void nameBoxes(QFileDialog& dialog)
+{
+    const std::pair<const char*, const char*> names[] = {
+        { "lookInCombo", QT_TRANSLATE_NOOP("pelloric::qt::FileBox", "Folder") },
+        { "fileTypeCombo", QT_TRANSLATE_NOOP("pelloric::qt::FileBox", "Kind of files") },
+    };
+    for (const auto& [box, name] : names) {
+        if (auto* const combo = dialog.findChild<QComboBox*>(QLatin1String(box)))
+            nameBox(*combo, QCoreApplication::translate("pelloric::qt::FileBox", name));
+    }
+}
+
 /// The toolkit's own dialog, which has a side bar for the places.
 void prepare(QFileDialog& dialog, const FileQuestion& question)
 {
@@ -45,6 +58,7 @@ void prepare(QFileDialog& dialog, const FileQuestion& question)
             places.append(url);
     }
     dialog.setSidebarUrls(places);
+    nameBoxes(dialog);
     if (!question.name.isEmpty())
         dialog.selectFile(question.name);
     if (question.suffixes.isEmpty())

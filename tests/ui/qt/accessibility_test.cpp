@@ -1,14 +1,17 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
+#include "controls/qt/sorvane.h"
 #include "fakes/fake_platform.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "print/paper_names.h"
 #include "settings/default_settings.h"
+#include "support/qt/accessible_walk.h"
 #include "ui/qt/font_chooser.h"
 #include "ui/qt/grid_style_dialog.h"
 #include "ui/qt/page_setup_dialog.h"
+#include "ui/qt/preview_prompts.h"
 #include "ui/qt/preview_window.h"
 #include "ui/qt/print_options_dialog.h"
 
@@ -22,6 +25,7 @@
 #include <QTabBar>
 #include <QTabWidget>
 #include <QTest>
+#include <QTimer>
 
 #include <gtest/gtest.h>
 
@@ -31,35 +35,6 @@
 namespace pelloric::qt {
 
 namespace {
-
-QString nameOf(QObject* object)
-{
-    QAccessibleInterface* const told = QAccessible::queryAccessibleInterface(object);
-    return told ? told->text(QAccessible::Name) : QString();
-}
-
-std::string labelOf(const QWidget& widget)
-{
-    return std::string(widget.metaObject()->className()) + " " + widget.objectName().toStdString();
-}
-
-/// The controls of a window that the keyboard can be in, as the Tab key walks them now.
-std::vector<QWidget*> tabStops(QWidget& window)
-{
-    std::vector<QWidget*> stops;
-    for (QWidget* widget = window.nextInFocusChain(); widget != &window;
-         widget = widget->nextInFocusChain()) {
-        if ((widget->focusPolicy() & Qt::TabFocus) != 0 && widget->isVisible()
-            && widget->isEnabled() && !widget->focusProxy() && widget->window() == &window)
-            stops.push_back(widget);
-    }
-    return stops;
-}
-
-QRect placeOf(const QWidget& widget)
-{
-    return { widget.mapTo(widget.window(), QPoint()), widget.size() };
-}
 
 /// The Alt keys that are shown now, in capitals.
 QString shownKeys(const QWidget& window)
@@ -119,22 +94,6 @@ protected:
     std::vector<std::unique_ptr<QDialog>> dialogs;
 };
 
-void expectNames(QWidget& window)
-{
-    int controls = 0;
-    for (QWidget* const widget : window.findChildren<QWidget*>()) {
-        if (widget->focusPolicy() == Qt::NoFocus)
-            continue;
-        ++controls;
-        const QString name = nameOf(widget);
-        EXPECT_FALSE(name.isEmpty()) << labelOf(window) << ": " << labelOf(*widget);
-        if (const auto* const box = qobject_cast<QComboBox*>(widget)) {
-            EXPECT_NE(name, box->currentText()) << labelOf(*widget);
-        }
-    }
-    EXPECT_GT(controls, 4);
-}
-
 } // namespace
 
 TEST_F(WindowsTest, HaveANameForEveryControlThatTakesTheFocus)
@@ -144,6 +103,36 @@ TEST_F(WindowsTest, HaveANameForEveryControlThatTakesTheFocus)
     QtPlatform platform;
     PreviewWindow preview(platform);
     expectNames(preview);
+}
+
+TEST_F(WindowsTest, HaveANameForEveryControlOfTheBoxesThatThePreviewShows)
+{
+    QtPlatform platform;
+    PreviewWindow preview(platform);
+    show(preview);
+    QTest::keyClick(&preview.canvas(), Qt::Key_F1);
+    auto* const keys = preview.findChild<QDialog*>(QStringLiteral("frmKeys"));
+    ASSERT_NE(keys, nullptr);
+    expectNames(*keys);
+    const PreviewPrompts prompts = standardPrompts();
+    const std::function<void()> boxes[] = {
+        [&] { prompts.showAbout(preview); },
+        [&] { prompts.mayReplace(preview, { QStringLiteral("/page-001.png") }); },
+        [&] { prompts.chooseFile(preview, openFileQuestion()); },
+        [&] { prompts.chooseFile(preview, saveFileQuestion()); },
+    };
+    for (const auto& show : boxes) {
+        int seen = 0;
+        QTimer::singleShot(0, &preview, [&seen] {
+            QWidget* const box = QApplication::activeModalWidget();
+            ASSERT_NE(box, nullptr);
+            expectNames(*box);
+            ++seen;
+            box->close();
+        });
+        show();
+        EXPECT_EQ(seen, 1);
+    }
 }
 
 TEST_F(WindowsTest, TellComboBoxesByNameAndValue)
@@ -168,21 +157,7 @@ TEST_F(WindowsTest, TabWalksTheControlsAsTheEyeReads)
 {
     for (const auto& dialog : dialogs) {
         show(*dialog);
-        withEachTab(*dialog, [&] {
-            const std::vector<QWidget*> stops = tabStops(*dialog);
-            ASSERT_GT(stops.size(), 2U);
-            for (std::size_t at = 1; at < stops.size(); ++at) {
-                const QRect before = placeOf(*stops[at - 1]);
-                const QRect after = placeOf(*stops[at]);
-                const bool isAbove = after.bottom() < before.top();
-                const bool isLeft = after.right() < before.left();
-                const bool isBelow = after.top() > before.bottom();
-                EXPECT_FALSE(isAbove && after.left() < before.right())
-                    << labelOf(*stops[at - 1]) << " before " << labelOf(*stops[at]);
-                EXPECT_FALSE(isLeft && !isBelow)
-                    << labelOf(*stops[at - 1]) << " before " << labelOf(*stops[at]);
-            }
-        });
+        withEachTab(*dialog, [&] { expectTabOrder(*dialog); });
         dialog->hide();
     }
 }

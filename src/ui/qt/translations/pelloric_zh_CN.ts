@@ -189,6 +189,17 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::FileBox</name>
+    <message>
+        <source>Folder</source>
+        <translation>文件夹</translation>
+    </message>
+    <message>
+        <source>Kind of files</source>
+        <translation>文件类型</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::FindBar</name>
     <message>
         <source>Previous place (Shift+F3)</source>
