@@ -7,6 +7,7 @@
 #include "controls/qt/kestrane.h"
 #include "controls/qt/sorvane.h"
 #include "platform/automation_object.h"
+#include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/run_time_error.h"
 #include "print/qt/qt_printing.h"
@@ -15,6 +16,7 @@
 #include "ui/qt/preview_window.h"
 
 #include <QCoreApplication>
+#include <QtGlobal>
 
 #include <memory>
 
@@ -42,6 +44,14 @@ void deploySettings(const Platform& platform)
     } catch (const RunTimeError&) {
         // A folder that cannot be written is no reason to end a host; the preview tells of it.
     }
+}
+
+/// A window without letters cannot say why, so the host's log does.
+void tellMissingFonts()
+{
+    if (!QtFonts::hasAny())
+        qWarning("Pelloric: no font is installed, so no text can be drawn; on Debian install "
+                 "fonts-dejavu-core, and fonts-arphic-uming for Chinese texts");
 }
 
 /// Windows and printers must not outlive the application.
@@ -94,6 +104,7 @@ PreviewWindow* QtPreviewOpener::window() const
 QtPreviewOpener& installPreviewWindow(QtPlatform& platform)
 {
     deploySettings(platform.record());
+    tellMissingFonts();
     Installed& now = installed();
     if (!now.opener)
         qAddPostRoutine(uninstall);
