@@ -10,7 +10,9 @@
 
 namespace pelloric {
 
+enum class SettingKey;
 struct Platform;
+struct SettingsSource;
 struct ReportSettings;
 
 /// A font with its colour, which is kept as the number that the settings hold.
@@ -46,6 +48,10 @@ struct ReportStyle {
     bool operator==(const ReportStyle&) const = default;
 };
 
+/// How much larger than stored a margin is printed.
+/// @param margin  `Top`, `Buttom`, `Left` or `Right`; any other is printed as it is stored
+double marginFactor(SettingKey margin);
+
 /// Sets the tenths of the area between the margins.
 /// @throws RunTimeError Overflow: past 16 bits; nothing has changed
 void setPrintableTenths(ReportStyle& style, const PageSetup& setup);
@@ -54,9 +60,11 @@ void setPrintableTenths(ReportStyle& style, const PageSetup& setup);
 ///
 /// Millimetres become twips; the margins are enlarged on the way by 1.6 (top), 1.8 (bottom) and
 /// 1.2 (left and right), and one of 0 becomes two centimetres.
-/// @throws RunTimeError Overflow: a number past its type; TypeMismatch: there is no paper code.
-///         What was set before stays set.
-void applySettings(const ReportSettings& settings, ReportStyle& style, PageSetup& setup);
+/// @param source  named in the texts of errors; null: the settings come from nowhere
+/// @throws RunTimeError Overflow: a number past its type; TypeMismatch: there is no paper code. The
+///         text names key, value, limit and remedy. What was set before stays set.
+void applySettings(const ReportSettings& settings, ReportStyle& style, PageSetup& setup,
+    const SettingsSource* source = nullptr);
 
 /// The same from the settings file.
 /// @throws RunTimeError FileNotFound: no settings file; or as `applySettings`

@@ -11,7 +11,7 @@
 #include "settings/settings_table.h"
 
 #include <algorithm>
-#include <optional>
+#include <string>
 
 namespace pelloric {
 
@@ -50,14 +50,34 @@ void keepBeside(const std::filesystem::path& path)
     throw RunTimeError(ErrorNumber::WriteFailed, pathText(copy));
 }
 
-/// The bytes of a file; nothing when it cannot be read.
-std::optional<std::string> readableBytes(const std::filesystem::path& path)
+/// Whether there is a file that must be left alone: one that holds settings or cannot be read.
+bool isTaken(const Platform& platform)
 {
+    const std::filesystem::path path = settingsPath(platform);
+    std::error_code error;
+    if (!std::filesystem::exists(path, error))
+        return false;
     try {
-        return readFileBytes(path, MostSettingsBytes);
+        return holdsSettings(platform.codec.decode(readFileBytes(path, MostSettingsBytes)));
     } catch (const RunTimeError&) {
-        return std::nullopt;
+        return true;
     }
+}
+
+/// Under the lock.
+void replace(const Platform& platform, std::span<const SettingChange> values)
+{
+    const std::filesystem::path path = settingsPath(platform);
+    std::error_code error;
+    if (std::filesystem::exists(path, error))
+        keepBeside(path);
+    replaceSettings(platform, settingsTextWith(values));
+}
+
+void createFolder(const Platform& platform)
+{
+    std::error_code error;
+    std::filesystem::create_directories(settingsPath(platform).parent_path(), error);
 }
 
 } // namespace
@@ -77,27 +97,21 @@ Text settingsTextWith(std::span<const SettingChange> values)
 
 bool deployDefaultSettings(const Platform& platform)
 {
-    const std::filesystem::path path = settingsPath(platform);
-    std::error_code error;
-    if (std::filesystem::exists(path, error)) {
-        const std::optional<std::string> present = readableBytes(path);
-        if (!present || holdsSettings(platform.codec.decode(*present)))
-            return false;
-    }
-    replaceByDefaultSettings(platform, {});
+    if (isTaken(platform))
+        return false;
+    createFolder(platform);
+    const auto lock = lockSettings(platform);
+    if (isTaken(platform))
+        return false;
+    replace(platform, {});
     return true;
 }
 
 void replaceByDefaultSettings(const Platform& platform, std::span<const SettingChange> values)
 {
-    const std::filesystem::path path = settingsPath(platform);
-    std::error_code error;
-    if (!std::filesystem::exists(path, error))
-        std::filesystem::create_directories(path.parent_path(), error);
+    createFolder(platform);
     const auto lock = lockSettings(platform);
-    if (std::filesystem::exists(path, error))
-        keepBeside(path);
-    replaceSettings(platform, settingsTextWith(values));
+    replace(platform, values);
 }
 
 void resetSettings(const Platform& platform)

@@ -29,8 +29,7 @@ bool deployDefaultSettings(const Platform& platform);
 
 /// Puts the default file in place, with other values for some keys; a file that was there is kept
 /// beside as `deployDefaultSettings` does.
-///
-/// @throws RunTimeError as `deployDefaultSettings`; nothing is lost
+/// @throws RunTimeError as `deployDefaultSettings`
 void replaceByDefaultSettings(const Platform& platform, std::span<const SettingChange> values);
 
 /// Puts the default file into the place of the one that is there, in a folder that exists.

@@ -187,7 +187,11 @@ Text SettingsSnapshot::value(TextView key) const { return valueOf(key, text_); }
 
 ReportSettings readReportSettings(const Platform& platform)
 {
-    const SettingsSnapshot snapshot(platform);
+    return readReportSettings(SettingsSnapshot(platform));
+}
+
+ReportSettings readReportSettings(const SettingsSnapshot& snapshot)
+{
     ReportSettings settings;
     for (const Setting& row : settingsTable())
         setSetting(settings, row.key, snapshot.value(row.name));

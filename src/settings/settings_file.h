@@ -8,6 +8,7 @@
 
 #include <filesystem>
 #include <span>
+#include <utility>
 
 namespace pelloric {
 
@@ -92,13 +93,23 @@ public:
     /// Reads the file once.
     /// @throws RunTimeError FileNotFound: the file is missing or cannot be read
     explicit SettingsSnapshot(const Platform& platform);
+    /// A settings text that is held already.
+    explicit SettingsSnapshot(Text text)
+        : text_(std::move(text))
+    {
+    }
 
     /// What `readSetting` answers for the key.
     Text value(TextView key) const;
 
+    const Text& text() const { return text_; }
+
 private:
     Text text_;
 };
+
+/// All settings as a file held them.
+ReportSettings readReportSettings(const SettingsSnapshot& snapshot);
 
 /// All settings as the file holds them.
 /// @throws RunTimeError FileNotFound: the file is missing or cannot be read

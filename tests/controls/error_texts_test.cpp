@@ -10,6 +10,7 @@
 #include "platform/file_bytes.h"
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
+#include "platform/safe_file.h"
 #include "platform/value.h"
 #include "print/page_list.h"
 #include "report/table_row_set.h"
@@ -45,7 +46,11 @@ struct World {
         grid.addRow(std::vector<TextView> { u"1", u"2" });
     }
 
-    void set(TextView key, TextView value) { writeSetting(platform.services(), key, value); }
+    void set(TextView key, TextView value)
+    {
+        const SettingChange change { key, value };
+        platform.folder.write("OstlConfig.ini", toUtf8(settingsTextWith({ &change, 1 })));
+    }
 
     /// Previews with another value of a setting.
     void previewWith(TextView key, TextView value)
@@ -160,6 +165,18 @@ TEST(ErrorTexts, NameTheObjectTheLimitAndTheWayOut)
             },
             ErrorNumber::Overflow,
             { world.path("bad.ostl"), "is damaged", "99999999999 is not between" } },
+        { "a file that cannot be written",
+            [&] {
+                SafeFile(
+                    world.platform.services().files, world.platform.folder.file("none") / "a.ostl");
+            },
+            ErrorNumber::WriteFailed, { world.path("none") } },
+        { "a margin", [&] { world.previewWith(u"Top", u"4000"); }, ErrorNumber::Overflow,
+            { "Top= 4000", world.path("OstlConfig.ini"), "at most 361 mm", "Page Setup",
+                "restore the defaults" } },
+        { "a paper code", [&] { world.previewWith(u"PagerSizeValue", u""); },
+            ErrorNumber::TypeMismatch,
+            { "PagerSizeValue= ", world.path("OstlConfig.ini"), "a whole number", "Page Setup" } },
         { "a text size", [&] { world.previewWith(u"FontSize", u"200000000"); },
             ErrorNumber::Overflow,
             { "a font of 200000000 points is too large to be measured", "choose a smaller" } },
@@ -185,6 +202,12 @@ TEST(ErrorTexts, NameTheObjectTheLimitAndTheWayOut)
                 world.canvas.doPreview(world.grid);
             },
             ErrorNumber::InvalidCall, { "m_PrintObj names no kind of grid" } },
+        { "a missing settings file",
+            [&] {
+                std::filesystem::remove(world.platform.folder.file("OstlConfig.ini"));
+                world.canvas.doPreview(world.grid);
+            },
+            ErrorNumber::FileNotFound, { world.path("OstlConfig.ini"), "restore the defaults" } },
     };
     for (const ErrorRow& row : rows)
         expectError(row);
