@@ -218,17 +218,13 @@ private:
     void report(std::int64_t rows)
     {
         std::printf("\n%lld rows x 8 columns\n", static_cast<long long>(rows));
-        // The texts are the table's, too: what is left of it when it is gone belongs to the pages.
+        TableGrid table = bench::sampleTable(rows);
         const double before = heapBytes();
-        auto gone = std::make_unique<TableGrid>(bench::sampleTable(rows));
         auto canvas = std::make_unique<Canvas>(*record_);
         const StopWatch watch;
-        canvas->doPreview(*gone);
+        canvas->doPreview(table);
         print("preview: read, lay out, show", rows, watch.seconds(), "");
-        gone.reset();
-        const double bytes = heapBytes() - before;
-        TableGrid table = bench::sampleTable(rows);
-        memory(*canvas, table, bytes);
+        memory(*canvas, table, heapBytes() - before);
         layout(table, *canvas);
         files(*canvas, rows);
         pdf(table, *canvas);

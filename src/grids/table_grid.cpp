@@ -7,7 +7,6 @@
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
 
-#include <algorithm>
 #include <limits>
 
 namespace pelloric {
@@ -22,28 +21,14 @@ constexpr TextView Names[] = { u"Cols", u"Rows", u"ColWidth", u"TextMatrix" };
 
 TableGrid::TableGrid(std::vector<TableColumn> columns)
     : columns_(std::move(columns))
-    , store_(std::make_shared<TextStore>())
 {
 }
 
-void TableGrid::reserve(std::size_t rows)
+void TableGrid::reserve(std::size_t rows, std::size_t units)
 {
+    store_.reserve(units);
     rowStarts_.reserve(rows);
     cellEnds_.reserve(rows * columns_.size());
-}
-
-void TableGrid::widen(std::size_t count, const TableColumn& column)
-{
-    const std::size_t before = columns_.size();
-    std::vector<std::uint32_t> ends;
-    ends.reserve(rowStarts_.capacity() * count);
-    for (std::size_t row = 0; row < rowStarts_.size(); ++row) {
-        const auto first = cellEnds_.begin() + static_cast<std::ptrdiff_t>(row * before);
-        ends.insert(ends.end(), first, first + static_cast<std::ptrdiff_t>(before));
-        ends.resize((row + 1) * count, before > 0 ? ends.back() : 0);
-    }
-    cellEnds_ = std::move(ends);
-    columns_.resize(count, column);
 }
 
 void TableGrid::addRow(std::span<const TextView> cells)
@@ -59,11 +44,10 @@ void TableGrid::addRow(std::span<const TextView> cells)
         throw RunTimeError(ErrorNumber::Overflow,
             u"row " + decimal(rowCount() + 1) + u" holds more than 4294967295 characters");
 
-    char16_t* const texts = store_->room(length);
-    rowStarts_.push_back(texts);
+    rowStarts_.push_back(store_.size());
     std::uint32_t end = 0;
     for (const TextView cell : cells) {
-        std::copy(cell.begin(), cell.end(), texts + end);
+        store_.append(cell);
         end += static_cast<std::uint32_t>(cell.size());
         cellEnds_.push_back(end);
     }
@@ -90,20 +74,7 @@ TextView TableGrid::cell(std::int64_t row, int column) const
     const std::size_t first = at * columns_.size();
     const std::size_t cell = first + static_cast<std::size_t>(column);
     const std::size_t begin = cell == first ? 0 : cellEnds_[cell - 1];
-    return TextView(rowStarts_[at] + begin, cellEnds_[cell] - begin);
-}
-
-void TableGrid::rowTexts(std::int32_t row, std::span<TextView> into) const
-{
-    if (row < 1 || row > rowCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", row, rowCount()));
-    const auto at = static_cast<std::size_t>(row - 1);
-    const std::uint32_t* end = cellEnds_.data() + at * columns_.size();
-    std::uint32_t begin = 0;
-    for (TextView& text : into) {
-        text = TextView(rowStarts_[at] + begin, *end - begin);
-        begin = *end++;
-    }
+    return TextView(store_.data() + rowStarts_[at] + begin, cellEnds_[cell] - begin);
 }
 
 std::optional<MemberId> TableGrid::findMember(TextView name) { return findMemberName(Names, name); }

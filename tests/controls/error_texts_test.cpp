@@ -182,6 +182,12 @@ TEST(ErrorTexts, NameTheObjectTheLimitAndTheWayOut)
             { "a font of 200000000 points is too large to be measured", "choose a smaller" } },
         { "a text colour", [&] { world.previewWith(u"FontColor", u"1e10"); }, ErrorNumber::Overflow,
             { "the colour 10000000000", "not between 0 and 16777215" } },
+        { "a missing settings file",
+            [&] {
+                std::filesystem::remove(world.platform.folder.file("OstlConfig.ini"));
+                world.canvas.doPreview(world.grid);
+            },
+            ErrorNumber::FileNotFound, { world.path("OstlConfig.ini"), "restore the defaults" } },
         { "another build", [&] { Canvas(world.platform.services()).ReDrawZoom(world.grid); },
             ErrorNumber::ObjectMissing, { "no report was built yet" } },
         { "a scale", [&] { world.canvas.setDispScale(0); }, ErrorNumber::DivisionByZero,

@@ -7,9 +7,6 @@
 
 #include <gtest/gtest.h>
 
-#include <memory>
-#include <vector>
-
 namespace pelloric {
 
 namespace {
@@ -64,52 +61,6 @@ TEST(TableGrid, RefusesARowWithMoreCellsThanColumnsAndKeepsTheOthers)
     const TextView cells[] = { u"1", u"2", u"3", u"4" };
     EXPECT_EQ(errorOf([&] { grid.addRow(cells); }), ErrorNumber::SubscriptOutOfRange);
     EXPECT_EQ(grid.rowCount(), 3);
-}
-
-TEST(TableGrid, HandsOutTheTextsOfARowAsTheyAreKept)
-{
-    const TableGrid grid = fruits();
-    std::vector<TextView> texts(3);
-    for (std::int32_t row = 1; row <= grid.rowCount(); ++row) {
-        grid.rowTexts(row, texts);
-        for (int column = 0; column < 3; ++column) {
-            const TextView cell = grid.cell(row - 1, column);
-            EXPECT_EQ(texts[static_cast<std::size_t>(column)], cell);
-            EXPECT_EQ(texts[static_cast<std::size_t>(column)].data(), cell.data());
-        }
-    }
-    for (const std::int32_t row : { 0, 4 })
-        EXPECT_EQ(errorOf([&] { grid.rowTexts(row, texts); }), ErrorNumber::SubscriptOutOfRange);
-}
-
-TEST(TableGrid, LeavesTextsWhereTheyAreWhenRowsAreAddedAndWhenItGoes)
-{
-    auto grid = std::make_unique<TableGrid>(fruits());
-    const std::shared_ptr<const TextStore> kept = grid->keptTexts();
-    const TextView first = grid->cell(0, 0);
-    const Text before(first);
-    for (int row = 0; row < 10000; ++row) {
-        const TextView cells[] = { u"a text that needs room" };
-        grid->addRow(cells);
-    }
-    EXPECT_EQ(grid->cell(0, 0).data(), first.data());
-    grid.reset();
-    EXPECT_EQ(first, before);
-}
-
-TEST(TableGrid, HasEmptyCellsWhereItIsWidened)
-{
-    TableGrid grid = fruits();
-    const Text last(grid.cell(2, 2));
-    grid.widen(5, { .title = u"more", .width = -1 });
-    const TextView cells[] = { u"1", u"2", u"3", u"4", u"5" };
-    grid.addRow(cells);
-    EXPECT_EQ(grid.columnCount(), 5);
-    EXPECT_EQ(grid.column(4).title, u"more");
-    EXPECT_EQ(grid.cell(2, 2), last);
-    EXPECT_EQ(grid.cell(2, 3), u"");
-    EXPECT_EQ(grid.cell(0, 4), u"");
-    EXPECT_EQ(grid.cell(3, 4), u"5");
 }
 
 TEST(TableGrid, TakesWidthsAsTheyArePut)
