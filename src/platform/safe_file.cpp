@@ -143,7 +143,8 @@ void SafeFile::open(const SavingGroup& group)
     std::error_code ignored;
     const auto status = fs::status(target_, ignored);
     exists_ = fs::exists(status);
-    if (fs::is_directory(status) || target_.filename().empty())
+    const bool isEndless = fs::is_symlink(fs::symlink_status(target_, ignored));
+    if (fs::is_directory(status) || target_.filename().empty() || isEndless)
         refuse(FileFault::Other);
     isDevice_ = exists_ && !fs::is_regular_file(status);
     if (!isDevice_) {

@@ -214,14 +214,15 @@ TEST(SafeFile, FollowsALinkEvenToAFileThatIsNotThereYet)
     EXPECT_EQ(folder.names().size(), 3U);
 }
 
-TEST(SafeFile, EndsAtARingOfLinks)
+TEST(SafeFile, RefusesARingOfLinks)
 {
     const TempFolder folder;
     fs::create_symlink("b", folder.file("a"));
     fs::create_symlink("a", folder.file("b"));
     StdFiles files;
-    save(files, folder.file("a"), "new");
-    EXPECT_EQ(folder.read("a"), "new");
+    EXPECT_EQ(errorOf([&] { save(files, folder.file("a"), "new"); }), ErrorNumber::WriteFailed);
+    EXPECT_TRUE(fs::is_symlink(folder.file("a")));
+    EXPECT_EQ(folder.names().size(), 2U);
 }
 
 TEST(SafeFile, ChangesNothingWhenTheDiskIsFull)
