@@ -10,6 +10,7 @@
 #include "platform/text_metrics.h"
 
 #include <algorithm>
+#include <limits>
 
 namespace pelloric {
 
@@ -30,12 +31,21 @@ ShownText shown(const PageDocument& document, const TextRecord& record, TextMetr
         metrics.face(font.name, font.bold, font.italic), font.size };
 }
 
+/// A place past the largest is the largest: files hold texts anywhere.
+Twips moved(Twips place, Twips by)
+{
+    using Limits = std::numeric_limits<Twips>;
+    return static_cast<Twips>(
+        std::clamp<std::int64_t>(std::int64_t { place } + by, Limits::min(), Limits::max()));
+}
+
 PageRect partOf(const ShownText& shown, Tpoint at, std::size_t begin, std::size_t length)
 {
     const TextView text = shown.text;
     const Twips left = textWidth(shown.face.advanceOf(text.substr(0, begin)), shown.size);
     const Twips right = textWidth(shown.face.advanceOf(text.substr(0, begin + length)), shown.size);
-    return { at.x + left, at.y, at.x + right, at.y + textHeight(shown.face, shown.size) };
+    return { moved(at.x, left), at.y, moved(at.x, right),
+        moved(at.y, textHeight(shown.face, shown.size)) };
 }
 
 Twips middle(const PageRect& area) { return area.top + (area.bottom - area.top) / 2; }

@@ -46,6 +46,15 @@ TEST_F(PageTexts, KnowsTheRectangleOfEachText)
     EXPECT_TRUE(placedTexts(document, 2, metrics).empty());
 }
 
+TEST_F(PageTexts, HoldRectanglesWithinWhatNumbersHold)
+{
+    constexpr Twips Most = 2147483647;
+    document.append(TextRecord {
+        { Most - 200, Most - 100 }, u"abc", 3, document.styleNumber({ { .size = 10 }, 0 }) });
+    EXPECT_EQ(placedTexts(document, 0, metrics).front().area,
+        (PageRect { Most - 200, Most - 100, Most, Most }));
+}
+
 TEST_F(PageTexts, KnowsTheRectangleOfAPartOfAText)
 {
     print(1000, 500, u"abcde");
