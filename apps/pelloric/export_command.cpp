@@ -227,7 +227,7 @@ Laid layOut(
     const auto rows = static_cast<qint64>(grid->rowCount());
     Platform record = platform.record();
     Canvas canvas(record);
-    canvas.useSettings(settingsFor(line, record));
+    canvas.useSettings(settingsFor(line, record, SettingsBase::Defaults));
     buildReport(canvas, *grid, line, progress);
     const QJsonObject facts { { QStringLiteral("rows"), rows },
         { QStringLiteral("columns"), grid->columnCount() },
@@ -374,6 +374,7 @@ QString exportDetails()
         "FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
         ".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
         "--query), or a saved document (.ostl).\n"
+        "Pages look as the default settings and the options say; --settings takes others.\n"
         "Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
         "FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
         "file each in the folder OUT, or with --join one file.\n");

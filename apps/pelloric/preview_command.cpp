@@ -59,7 +59,7 @@ int runPreview(const Invocation& invocation)
     // What the dialogs change is kept, unless options say how this one report looks.
     std::optional<ReportSettings> settings;
     if (firstReportOption(line) != nullptr)
-        settings = settingsFor(line, platform.record());
+        settings = settingsFor(line, platform.record(), SettingsBase::Users);
     else
         prepareSettings(platform.record());
     opener.setSettings(settings);
@@ -83,8 +83,9 @@ QString previewDetails()
                           "file, an .xlsx or\n"
                           ".ods file (file.xlsx:Sheet), or an SQLite database (db.sqlite:table, or "
                           "db.sqlite with\n"
-                          "--query). With one of the options for headers,\n"
-                          "paper and so on, what the window's dialogs change is not kept.\n");
+                          "--query). Pages look as your settings say, which the window's dialogs\n"
+                          "change; --defaults does without them. With one of the options for\n"
+                          "headers, paper and so on, what the dialogs change is not kept.\n");
 }
 
 OptionTables previewOptions()

@@ -158,7 +158,7 @@ void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& pla
     auto grid = std::make_unique<TableGrid>(readTable(order.file, line, progress));
     Platform record = platform.record();
     Canvas canvas(record);
-    canvas.useSettings(settingsFor(line, record));
+    canvas.useSettings(settingsFor(line, record, SettingsBase::Defaults));
     buildReport(canvas, *grid, line, progress);
     grid.reset();
     tellFonts(canvas.document(), platform);
@@ -198,6 +198,7 @@ QString printDetails()
         "FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
         ".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
         "--query), or a saved document (.ostl).\n"
+        "Pages look as the default settings and the options say; --settings takes others.\n"
         "Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
 }
 

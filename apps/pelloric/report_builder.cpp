@@ -31,18 +31,6 @@ void setWidth(TableGrid& grid, int column, Twips width)
     grid.put(memberOf(grid, u"ColWidth"), { &index, 1 }, Value::ofNumber(width));
 }
 
-/// Errors of the settings file say how to get a good one.
-void loadSettings(Canvas& canvas)
-{
-    try {
-        canvas.loadReportStyle();
-    } catch (const RunTimeError& error) {
-        throw CommandError(describe(error)
-            + QStringLiteral("; check the settings file, or restore it with \"pelloric settings "
-                             "--reset\""));
-    }
-}
-
 } // namespace
 
 void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
@@ -71,7 +59,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
 void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress)
 {
     requireFonts();
-    loadSettings(canvas);
+    canvas.loadReportStyle();
     setColumnWidths(grid, line, canvas);
     const LayoutProgress watched(canvas, progress);
     canvas.options = shapeOf(line);
@@ -99,8 +87,7 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
     } catch (const RunTimeError& error) {
         if (error.number() != ErrorNumber::Overflow)
             throw;
-        throw CommandError(
-            QStringLiteral("%1 is damaged: it holds a number that is out of range").arg(file));
+        throw CommandError(detailOf(error));
     }
     return saved;
 }

@@ -4,10 +4,14 @@
 #include "report_options.h"
 
 #include "lengths.h"
+#include "platform/file_bytes.h"
 #include "platform/platform.h"
+#include "platform/qt/file_names.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "platform/text_codec.h"
 #include "print/paper_names.h"
+#include "report/settings_check.h"
 #include "settings/default_settings.h"
 #include "settings/settings_file.h"
 #include "settings/settings_table.h"
@@ -22,6 +26,8 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
+    { "defaults", nullptr, "the default settings, whatever the user's are" },
+    { "settings", "FILE", "the settings of this file; the default ones for those it lacks" },
     { "title", "TEXT", "title of the file, and centred above every page" },
     { "header-left", "TEXT", "header texts; they may hold one of the fields" },
     { "header-center", "TEXT", "[Date Printed], [Time Printed], [Date & Time Printed]," },
@@ -193,18 +199,65 @@ void changeTexts(const CommandLine& line, ReportSettings& settings)
     }
 }
 
-/// The user's settings, or the default ones where there are none and none can be made.
-ReportSettings presentSettings(const Platform& platform)
+/// Tells what is wrong with settings.
+/// @throws CommandError no page can be built by them
+void check(const ReportSettings& settings, const SettingsSource& source)
 {
-    std::error_code ignored;
-    if (!std::filesystem::exists(settingsPath(platform), ignored)) {
-        try {
-            deployDefaultSettings(platform);
-        } catch (const RunTimeError&) {
-            return {};
-        }
+    for (const SettingProblem& problem : settingProblems(settings, &source)) {
+        if (problem.isRefused)
+            throw CommandError(qt::toQString(problem.text)
+                + QStringLiteral(" Correct it in the file, or do without: --defaults"));
+        if (problem.key)
+            tell(qt::toQString(problem.text));
     }
-    return readReportSettings(platform);
+}
+
+/// The settings of a file, with the default ones for those that it lacks.
+/// @throws CommandError it is no settings file, or its settings cannot be used
+ReportSettings settingsOfFile(const QString& file, const Platform& platform)
+{
+    Text text;
+    try {
+        text = platform.codec.decode(readFileBytes(qt::pathOf(file), MostSettingsBytes));
+    } catch (const RunTimeError& error) {
+        throw CommandError(describe(error));
+    }
+    const std::vector<SettingChange> values = settingsIn(text);
+    if (values.empty())
+        throw CommandError(
+            QStringLiteral("%1 holds no setting; \"pelloric settings --path\" names yours")
+                .arg(file));
+    const SettingsSnapshot snapshot(settingsTextWith(values));
+    const ReportSettings settings = readReportSettings(snapshot);
+    check(settings, { qt::toText(file), snapshot });
+    return settings;
+}
+
+/// The user's settings, or the default ones where there are none and none can be made.
+ReportSettings settingsOfUser(const Platform& platform)
+{
+    std::optional<SettingsSnapshot> snapshot;
+    try {
+        deployDefaultSettings(platform);
+        snapshot.emplace(platform);
+    } catch (const RunTimeError&) {
+        return {};
+    }
+    const ReportSettings settings = readReportSettings(*snapshot);
+    check(settings, { pathText(settingsPath(platform)), *snapshot });
+    return settings;
+}
+
+ReportSettings presentSettings(const CommandLine& line, const Platform& platform, SettingsBase base)
+{
+    if (line.has("defaults") && line.has("settings"))
+        throw CommandError(
+            QStringLiteral("take either --defaults or --settings, not both"), WrongUsage);
+    if (line.has("settings"))
+        return settingsOfFile(line.value("settings"), platform);
+    if (line.has("defaults") || base == SettingsBase::Defaults)
+        return {};
+    return settingsOfUser(platform);
 }
 
 } // namespace
@@ -220,9 +273,9 @@ const char* firstReportOption(const CommandLine& line)
     return nullptr;
 }
 
-ReportSettings settingsFor(const CommandLine& line, const Platform& platform)
+ReportSettings settingsFor(const CommandLine& line, const Platform& platform, SettingsBase base)
 {
-    ReportSettings settings = presentSettings(platform);
+    ReportSettings settings = presentSettings(line, platform, base);
     if (line.has("no-headers"))
         settings.showHeaders = false;
     if (line.has("merge"))

@@ -18,11 +18,17 @@ OptionTable reportOptions();
 /// The first of these options that was given; null when none was.
 const char* firstReportOption(const CommandLine& line);
 
-/// The user's settings with the options of a command written over them; the user's file is read
-/// and never written.
+/// What the options of a command are written over, unless "--defaults" or "--settings" says.
+enum class SettingsBase {
+    Defaults, ///< so that no other program's settings change a page
+    Users,
+};
+
+/// Settings with the options of a command written over them; files are read and never written.
 ///
-/// Where the user has no settings file yet, the default one is put there once, if that is possible.
-/// @throws CommandError a value that cannot be used; RunTimeError the file cannot be read
-ReportSettings settingsFor(const CommandLine& line, const Platform& platform);
+/// Where the user's are asked for and there are none, the default ones are put there once, if that
+/// is possible. What is wrong with a file's settings, short of an error, is told.
+/// @throws CommandError a value or a settings file that cannot be used
+ReportSettings settingsFor(const CommandLine& line, const Platform& platform, SettingsBase base);
 
 } // namespace pelloric::app

@@ -11,7 +11,6 @@
 #include "print/qt/qt_printing.h"
 #include "report/content_widths.h"
 #include "script/qt/script_host.h"
-#include "settings/default_settings.h"
 #include "table_source.h"
 #include "tables/qt/csv_table.h"
 #include "tables/qt/sqlite_table.h"
@@ -105,7 +104,7 @@ int runScript(const Invocation& invocation)
     qt::QtPlatform platform;
     const qt::QtPrinting printing(platform);
     const Platform record = platform.record();
-    deployDefaultSettings(record);
+    prepareSettings(record);
     Tables tables(record.metrics);
     qt::ScriptHost host(
         platform, tables, isWindowed ? qt::ScriptWindows::Shown : qt::ScriptWindows::Hidden);

@@ -119,6 +119,70 @@ TEST_F(Program, LeavesTheUsersSettingsAlone)
     EXPECT_EQ(settings(), before);
 }
 
+TEST_F(Program, ExportsByTheDefaultSettingsUnlessASettingsFileIsNamed)
+{
+    run(words("settings"));
+    std::string left = settings();
+    left.replace(left.find("HeaderCenter= "), 14, "HeaderCenter= by another program");
+    folder_.write("config/pelloric/OstlConfig.ini", left);
+    folder_.write("partial.ini", "HeaderRight= partly\r\n");
+    folder_.write("t.csv", "a\n1\n");
+    struct Row {
+        const char* options;
+        bool isOthers;
+        bool isPartial;
+    };
+    const Row rows[] = { { "", false, false }, { " --defaults", false, false },
+        { " --settings config/pelloric/OstlConfig.ini", true, false },
+        { " --settings partial.ini", false, true } };
+    for (const Row& row : rows) {
+        const Ended ended
+            = run(words((std::string("export t.csv -o t.pdf") + row.options).c_str()));
+        EXPECT_EQ(ended.status, 0) << ended.errors;
+        const std::string text = pdfText("t.pdf");
+        EXPECT_EQ(has(text, "by another program"), row.isOthers) << row.options << '\n' << text;
+        EXPECT_EQ(has(text, "partly"), row.isPartial) << row.options << '\n' << text;
+        EXPECT_TRUE(has(text, "1 of 1")) << row.options << '\n' << text;
+    }
+    EXPECT_EQ(settings(), left);
+}
+
+TEST_F(Program, TellsOfSettingsByWhichNothingCanBeRead)
+{
+    folder_.write("t.csv", "a\n1\n");
+    folder_.write("small.ini", "FontSize= 0\r\n");
+    const Ended ended = run(words("export t.csv -o t.pdf --settings small.ini"));
+    EXPECT_EQ(ended.status, 0);
+    EXPECT_EQ(ended.errors,
+        "pelloric: FontSize= 0 in small.ini: a font size is a number of points above 0, at most "
+        "16000.\n");
+}
+
+TEST_F(Program, RefusesSettingsThatCannotBeUsed)
+{
+    folder_.write("t.csv", "a\n1\n");
+    folder_.write("bad.ini", "Top= 4000\r\n");
+    struct Row {
+        const char* arguments;
+        int status;
+        const char* message;
+    };
+    const Row rows[] = {
+        { "export t.csv -o t.pdf --defaults --settings bad.ini", 2, "not both" },
+        { "export t.csv -o t.pdf --settings none.ini", 1, "none.ini" },
+        { "export t.csv -o t.pdf --settings t.csv", 1, "t.csv holds no setting" },
+        { "export t.csv -o t.pdf --settings bad.ini", 1,
+            "Top= 4000 in bad.ini: this margin is at most 361 mm" },
+        { "export t.ostl -o t.pdf --defaults", 2, "--defaults does not apply" },
+    };
+    for (const Row& row : rows) {
+        const Ended ended = run(words(row.arguments));
+        EXPECT_EQ(ended.status, row.status) << row.arguments;
+        EXPECT_TRUE(has(ended.errors, row.message)) << row.arguments << '\n' << ended.errors;
+    }
+    EXPECT_EQ(folder_.names().size(), 2U);
+}
+
 TEST_F(Program, ShowsAndRestoresTheSettings)
 {
     const Ended path = run(words("settings --path"));
@@ -252,7 +316,23 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
     }
     EXPECT_EQ(folder_.read("kept.pdf"), "old");
     EXPECT_EQ(folder_.read("table.svg"), "a\n1\n");
-    EXPECT_EQ(folder_.names().size(), 9U); // the files above and the settings
+    EXPECT_EQ(folder_.names().size(), 8U); // the files above
+}
+
+TEST_F(Program, SaysOfADamagedDocumentThatItOpensWhatItSaysWhenItExportsIt)
+{
+    folder_.write("large.ostl",
+        "##Release2004-10-23\n##Release2004-10-23PageWidth=1e12\n"
+        "##Release2004-10-23PageHeight=1\n");
+    surround = [](QProcess&, QProcessEnvironment& environment) {
+        environment.insert(QStringLiteral("QT_QPA_PLATFORM"), QStringLiteral("offscreen"));
+    };
+    for (const char* arguments : { "open large.ostl", "export large.ostl -o t.pdf" }) {
+        const Ended ended = run(words(arguments));
+        EXPECT_EQ(ended.status, 1) << arguments;
+        EXPECT_TRUE(has(ended.errors, "large.ostl is damaged: 1000000000000 is not between "))
+            << ended.errors;
+    }
 }
 
 TEST_F(Program, SaysWhatADocumentFileCannotHold)
@@ -278,7 +358,7 @@ TEST_F(Program, EndsCleanlyWhenInterrupted)
     QProcess process;
     start(process, words("export long.csv -o long.pdf"));
     // The file that is being written shows that the work is under way.
-    for (int wait = 0; wait < 600 && folder_.names().size() < 4; ++wait)
+    for (int wait = 0; wait < 600 && folder_.names().size() < 3; ++wait)
         process.waitForFinished(50);
     ASSERT_EQ(process.state(), QProcess::Running);
     kill(static_cast<pid_t>(process.processId()), SIGINT);
@@ -286,7 +366,7 @@ TEST_F(Program, EndsCleanlyWhenInterrupted)
     EXPECT_EQ(ended.status, 130);
     EXPECT_EQ(ended.errors, "");
     EXPECT_EQ(folder_.read("long.pdf"), "old");
-    EXPECT_EQ(folder_.names().size(), 3U); // the table, the old file and the settings
+    EXPECT_EQ(folder_.names().size(), 2U); // the table and the old file
 }
 
 TEST_F(Program, EndsAtOnceDuringAQueryWithoutEnd)
