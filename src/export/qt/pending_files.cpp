@@ -12,6 +12,8 @@ void PendingFiles::write(const std::filesystem::path& path, const Writer& writer
     SafeFile file(system_, path, group_);
     auto& open = static_cast<QtOpenFile&>(file.file());
     const bool isWritten = writer(open.device());
+    if (!isWritten)
+        open.write("\n"); // a disk that has taken a part says why when it is to take more
     if (!open.sync() || !isWritten)
         file.refuse();
     if (!files_.empty())
