@@ -47,6 +47,7 @@ PackagesTest=(
     python3-pikepdf
     qpdf
     sqlite3
+    strace
     x11-apps
     x11-utils
     xauth

@@ -1,0 +1,328 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "apps/qt/program.h"
+
+#include <QElapsedTimer>
+#include <QThread>
+
+#include <gmock/gmock.h>
+
+#if defined(__unix__)
+
+#include <sys/resource.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <array>
+#include <csignal>
+#include <memory>
+#include <random>
+
+namespace pelloric::qt {
+
+namespace {
+
+constexpr int Kills = 100; ///< of each writer
+constexpr int AtOnce = 10; ///< programs that run side by side
+
+std::string table(int rows)
+{
+    std::string text = "number,text\n";
+    for (int row = 0; row < rows; ++row)
+        text += std::to_string(row) + ",some text of a row\n";
+    return text;
+}
+
+/// Bounds a resource of the program, which gets an error instead of a signal past it.
+void limit(QProcess& process, int resource, rlim_t most)
+{
+    process.setChildProcessModifier([resource, most] {
+        const rlimit bound { most, most };
+        setrlimit(static_cast<__rlimit_resource>(resource), &bound);
+        std::signal(SIGXFSZ, SIG_IGN);
+    });
+}
+
+/// Whose rights hold for a user who is no administrator.
+void becomeNobody(QProcess& process)
+{
+    process.setChildProcessModifier([] {
+        constexpr uid_t Nobody = 65534;
+        if (geteuid() == 0 && (setgid(Nobody) != 0 || setuid(Nobody) != 0))
+            _exit(99);
+    });
+}
+
+/// Runs the program in bad surroundings.
+class ProgramFaults : public Program {
+protected:
+    /// Kills programs at random moments of the time that one of them takes.
+    /// @param begin  starts the program with a number in its hands
+    void killAtRandom(const std::function<void(QProcess& process, int number)>& begin)
+    {
+        QElapsedTimer clock;
+        clock.start();
+        QProcess whole;
+        begin(whole, Kills);
+        ASSERT_EQ(finish(whole).status, 0);
+        const auto longest = static_cast<int>(clock.elapsed());
+        std::minstd_rand random(20041023);
+        for (int first = 0; first < Kills; first += AtOnce) {
+            std::vector<std::unique_ptr<QProcess>> processes;
+            std::vector<int> moments;
+            for (int number = first; number < first + AtOnce; ++number) {
+                processes.push_back(std::make_unique<QProcess>());
+                begin(*processes.back(), number);
+                moments.push_back(static_cast<int>(random() % static_cast<unsigned>(2 * longest)));
+            }
+            std::ranges::sort(moments);
+            clock.restart();
+            for (std::size_t at = 0; at < processes.size(); ++at) {
+                while (clock.elapsed() < moments[at])
+                    QThread::msleep(1);
+                processes[at]->kill();
+            }
+            for (const auto& process : processes)
+                process->waitForFinished(LongestRun);
+        }
+    }
+
+    void runIn(const char* configuration)
+    {
+        surround = [configuration](QProcess&, QProcessEnvironment& environment) {
+            environment.insert(QStringLiteral("HOME"), QString::fromLatin1(configuration));
+            environment.insert(
+                QStringLiteral("XDG_CONFIG_HOME"), QString::fromLatin1(configuration));
+        };
+    }
+
+    std::vector<std::string> sortedNames() const
+    {
+        std::vector<std::string> names = folder_.names();
+        std::ranges::sort(names);
+        return names;
+    }
+};
+
+/// A kind of file and how it ends when it is whole.
+struct Writer {
+    const char* ending;
+    const char* end;
+};
+
+constexpr auto Writers = std::to_array<Writer>({ { "pdf", "%%EOF\n" }, { "ostl", "\"\r\n" },
+    { "svg", "</svg>\n" }, { "png", "IEND\xAE\x42\x60\x82" } });
+
+} // namespace
+
+TEST_F(ProgramFaults, LeaveTheOldFileOrAWholeNewOneWhenTheProgramIsKilled)
+{
+    folder_.write("t.csv", table(40));
+    for (const Writer& writer : Writers) {
+        const auto target
+            = [&](int number) { return "k" + std::to_string(number) + "." + writer.ending; };
+        for (int number = 0; number <= Kills; ++number)
+            folder_.write(target(number), "old");
+        killAtRandom([&](QProcess& process, int number) {
+            start(process, words(("export t.csv -o " + target(number)).c_str()));
+        });
+        int replaced = 0;
+        for (int number = 0; number < Kills; ++number) {
+            const std::string bytes = folder_.read(target(number));
+            replaced += bytes == "old" ? 0 : 1;
+            EXPECT_TRUE(bytes == "old" || bytes.ends_with(writer.end)) << target(number);
+            std::filesystem::remove(folder_.file(target(number)));
+        }
+        RecordProperty(writer.ending, replaced);
+        EXPECT_EQ(run(words(("export t.csv -o " + target(Kills)).c_str())).status, 0);
+        std::filesystem::remove(folder_.file(target(Kills)));
+        EXPECT_THAT(sortedNames(), testing::ElementsAre("t.csv")) << writer.ending;
+    }
+}
+
+TEST_F(ProgramFaults, LeaveOldOrNewSettingsWhenTheProgramIsKilled)
+{
+    const std::string old = "\"\r\nTop= 12\r\n\"\r\n";
+    std::string whole;
+    const auto home = [&](int number) { return folder_.file("home" + std::to_string(number)); };
+    for (int number = 0; number <= Kills; ++number) {
+        std::filesystem::create_directories(home(number) / "pelloric");
+        folder_.write("home" + std::to_string(number) + "/pelloric/OstlConfig.ini", old);
+    }
+    killAtRandom([&](QProcess& process, int number) {
+        surround = [&](QProcess&, QProcessEnvironment& environment) {
+            environment.insert(
+                QStringLiteral("XDG_CONFIG_HOME"), QString::fromStdString(home(number).string()));
+        };
+        start(process, words("settings --reset"));
+    });
+    whole = TempFolder::bytesOf(home(Kills) / "pelloric" / "OstlConfig.ini");
+    EXPECT_TRUE(whole.ends_with("FooterRight= \r\n\"\r\n")) << whole;
+    for (int number = 0; number < Kills; ++number) {
+        const std::string bytes = TempFolder::bytesOf(home(number) / "pelloric" / "OstlConfig.ini");
+        EXPECT_TRUE(bytes == old || bytes == whole) << bytes;
+    }
+}
+
+TEST_F(ProgramFaults, LeaveOneWholeFileWhenSeveralProgramsWriteItAtOnce)
+{
+    folder_.write("t.csv", table(40));
+    for (const Writer& writer : Writers) {
+        const std::string target = std::string("same.") + writer.ending;
+        std::vector<std::unique_ptr<QProcess>> processes;
+        for (int number = 0; number < 8; ++number) {
+            processes.push_back(std::make_unique<QProcess>());
+            start(*processes.back(), words(("export t.csv -o " + target).c_str()));
+        }
+        for (const auto& process : processes) {
+            const Ended ended = finish(*process);
+            EXPECT_EQ(ended.status, 0) << ended.errors;
+        }
+        EXPECT_TRUE(folder_.read(target).ends_with(writer.end)) << target;
+        std::filesystem::remove(folder_.file(target));
+        EXPECT_THAT(sortedNames(), testing::ElementsAre("t.csv")) << writer.ending;
+    }
+}
+
+TEST_F(ProgramFaults, KeepTheOldFileWhenTheDiskIsFull)
+{
+    folder_.write("t.csv", table(30)); // one page
+    surround = [](QProcess& process, QProcessEnvironment&) { limit(process, RLIMIT_FSIZE, 3000); };
+    for (const Writer& writer : Writers) {
+        const std::string target = std::string("kept.") + writer.ending;
+        folder_.write(target, "old");
+        const Ended ended = run(words(("export t.csv -o " + target).c_str()));
+        EXPECT_EQ(ended.status, 1) << target;
+        EXPECT_TRUE(ended.errors.starts_with("pelloric: Disk full: ")) << ended.errors;
+        EXPECT_TRUE(has(ended.errors, target)) << ended.errors;
+        EXPECT_EQ(folder_.read(target), "old");
+        std::filesystem::remove(folder_.file(target));
+        EXPECT_THAT(sortedNames(), testing::ElementsAre("t.csv")) << writer.ending;
+    }
+}
+
+TEST_F(ProgramFaults, TellOfADeviceThatIsFull)
+{
+    folder_.write("t.csv", table(4));
+    std::filesystem::create_symlink("/dev/full", folder_.file("full.pdf"));
+    const Ended ended = run(words("export t.csv -o full.pdf"));
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_TRUE(has(ended.errors, "full.pdf")) << ended.errors;
+    EXPECT_EQ(std::count(ended.errors.begin(), ended.errors.end(), '\n'), 1) << ended.errors;
+}
+
+TEST_F(ProgramFaults, LetReportsBeMadeWithoutAHomeFolder)
+{
+    runIn("/proc/no-such-home");
+    folder_.write("t.csv", table(4));
+    folder_.write("s.js", "print('done')\n");
+    const Ended exported = run(words("export t.csv -o t.pdf"));
+    EXPECT_EQ(exported.status, 0);
+    EXPECT_EQ(exported.errors, "");
+    const Ended script = run(words("run s.js"));
+    EXPECT_EQ(script.status, 0);
+    EXPECT_EQ(script.output, "done\n");
+    EXPECT_TRUE(has(script.errors, "/proc/no-such-home/pelloric/OstlConfig.ini")) << script.errors;
+    const Ended settings = run(words("settings"));
+    EXPECT_EQ(settings.status, 1);
+    EXPECT_TRUE(has(settings.errors, "/proc/no-such-home/pelloric/OstlConfig.ini"));
+    EXPECT_THAT(sortedNames(), testing::ElementsAre("s.js", "t.csv", "t.pdf"));
+}
+
+TEST_F(ProgramFaults, LetReportsBeMadeInAHomeFolderThatCannotBeWritten)
+{
+    namespace fs = std::filesystem;
+    folder_.write("t.csv", table(4));
+    fs::permissions(folder_.path(), fs::perms::all);
+    fs::create_directory(folder_.file("home"));
+    fs::permissions(folder_.file("home"), fs::perms::others_read | fs::perms::others_exec);
+    surround = [this](QProcess& process, QProcessEnvironment& environment) {
+        const QString home = QString::fromStdString(folder_.file("home").string());
+        environment.insert(QStringLiteral("HOME"), home);
+        environment.insert(QStringLiteral("XDG_CONFIG_HOME"), home);
+        becomeNobody(process);
+    };
+    const Ended exported = run(words("export t.csv -o t.pdf"));
+    EXPECT_EQ(exported.status, 0) << exported.errors;
+    const Ended reset = run(words("settings --reset"));
+    EXPECT_EQ(reset.status, 1);
+    EXPECT_TRUE(has(reset.errors, "home/pelloric/OstlConfig.ini")) << reset.errors;
+    EXPECT_TRUE(fs::is_empty(folder_.file("home")));
+    EXPECT_THAT(sortedNames(), testing::ElementsAre("home", "t.csv", "t.pdf"));
+}
+
+TEST_F(ProgramFaults, TellRightsThatAreMissingFromAFullDisk)
+{
+    namespace fs = std::filesystem;
+    folder_.write("t.csv", table(4));
+    folder_.write("kept.pdf", "old");
+    fs::permissions(folder_.file("kept.pdf"), fs::perms::others_read);
+    surround = [](QProcess& process, QProcessEnvironment&) { becomeNobody(process); };
+    const Ended ended = run(words("export t.csv -o kept.pdf"));
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_TRUE(ended.errors.starts_with("pelloric: Permission denied: ")) << ended.errors;
+    EXPECT_TRUE(has(ended.errors, "kept.pdf")) << ended.errors;
+    EXPECT_EQ(folder_.read("kept.pdf"), "old");
+    EXPECT_THAT(sortedNames(), testing::ElementsAre("kept.pdf", "t.csv"));
+}
+
+TEST_F(ProgramFaults, FollowLinksToTheFilesThatTheyName)
+{
+    namespace fs = std::filesystem;
+    folder_.write("t.csv", table(4));
+    folder_.write("present.pdf", "old");
+    fs::create_symlink("present.pdf", folder_.file("link.pdf"));
+    fs::create_symlink("new.pdf", folder_.file("dangling.pdf"));
+    fs::create_symlink("loop.pdf", folder_.file("loop.pdf"));
+    for (const char* link : { "link.pdf", "dangling.pdf" }) {
+        const Ended ended = run({ "export", "t.csv", "-o", link });
+        EXPECT_EQ(ended.status, 0) << ended.errors;
+        EXPECT_TRUE(fs::is_symlink(folder_.file(link))) << link;
+    }
+    EXPECT_TRUE(folder_.read("present.pdf").ends_with("%%EOF\n"));
+    EXPECT_TRUE(folder_.read("new.pdf").ends_with("%%EOF\n"));
+    const Ended ended = run(words("export t.csv -o loop.pdf"));
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_TRUE(has(ended.errors, "loop.pdf")) << ended.errors;
+    EXPECT_TRUE(fs::is_symlink(folder_.file("loop.pdf")));
+    EXPECT_EQ(folder_.names().size(), 6U);
+}
+
+TEST_F(ProgramFaults, ReadAndWriteFilesWhoseNamesAreNoText)
+{
+    folder_.write("n\xFF.csv", "a\n1\n");
+    const auto command = [this](const std::string& arguments) {
+        QProcess shell;
+        shell.setProcessEnvironment(surroundings());
+        shell.setWorkingDirectory(QString::fromStdString(folder_.path().string()));
+        folder_.write("run.sh", "'" PELLORIC_PROGRAM "' " + arguments + "\n");
+        shell.start(QStringLiteral("sh"), { QStringLiteral("run.sh") });
+        return finish(shell);
+    };
+    for (const Writer& writer : Writers) {
+        const std::string target = std::string("o\xFE.") + writer.ending;
+        const Ended ended = command("export n\xFF.csv -o " + target);
+        EXPECT_EQ(ended.status, 0) << ended.errors;
+        EXPECT_TRUE(folder_.read(target).ends_with(writer.end)) << target;
+    }
+    EXPECT_EQ(command("export o\xFE.ostl -o again.pdf").status, 0);
+    EXPECT_EQ(folder_.names().size(), 7U); // and the script
+}
+
+TEST_F(ProgramFaults, TellThatThereIsNotEnoughMemory)
+{
+    folder_.write("t.csv", table(600000));
+    folder_.write("t.pdf", "old");
+    surround
+        = [](QProcess& process, QProcessEnvironment&) { limit(process, RLIMIT_AS, 200UL << 20U); };
+    const Ended ended = run(words("export t.csv -o t.pdf"));
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_TRUE(has(ended.errors, "there is not enough memory for this table")) << ended.errors;
+    EXPECT_EQ(folder_.read("t.pdf"), "old");
+    EXPECT_THAT(sortedNames(), testing::ElementsAre("t.csv", "t.pdf"));
+}
+
+} // namespace pelloric::qt
+
+#endif
