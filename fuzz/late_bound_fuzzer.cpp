@@ -62,7 +62,7 @@ public:
         case 1:
             return Value::ofTruth(bytes_.chance());
         case 2:
-            return Value::ofDate(static_cast<std::int64_t>(bytes_.number()));
+            return Value::ofDate(bytes_.chance() ? INT64_MIN + bytes_.byte() : bytes_.byte());
         case 3:
         case 4:
             return Value::ofNumber(bytes_.number());

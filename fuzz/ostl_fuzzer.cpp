@@ -9,6 +9,7 @@
 #include "document/ostl_writer.h"
 #include "document/page_document.h"
 #include "platform/run_time_error.h"
+#include "view/page_texts.h"
 
 #include <sstream>
 
@@ -55,6 +56,18 @@ bool changesOnReading(const PageDocument& document)
     return false;
 }
 
+/// Where the texts of the pages stand.
+void readTexts(const PageDocument& document)
+{
+    static fuzz::EvenMetrics metrics;
+    try {
+        for (int page = 0; page < document.pageCount(); ++page)
+            asTable(placedTexts(document, page, metrics));
+    } catch (const RunTimeError& error) {
+        fuzz::require(error.number() == ErrorNumber::Overflow);
+    }
+}
+
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
@@ -68,6 +81,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         written(first, setup);
         return 0;
     }
+    readTexts(first);
     const std::string once = written(first, setup);
     PageDocument second;
     PageSetup again;

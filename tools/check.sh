@@ -83,9 +83,12 @@ checkFuzz() {
         local corpus=("build/fuzz/corpus/$name")
         mkdir -p "${corpus[0]}"
         [ ! -d "fuzz/corpus/$name" ] || corpus+=("fuzz/corpus/$name")
+        local words=()
+        [ ! -f "fuzz/dictionaries/$name.dict" ] || words=("-dict=fuzz/dictionaries/$name.dict")
+        printf -- '-- %s\n' "$name"
         QT_QPA_PLATFORM=offscreen "$program" -max_total_time="$seconds" -timeout=10 \
             -rss_limit_mb=2048 -artifact_prefix="build/fuzz/$name-" -print_final_stats=1 \
-            "${corpus[@]}"
+            "${words[@]}" "${corpus[@]}"
     done
 }
 
