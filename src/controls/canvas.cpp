@@ -204,6 +204,7 @@ bool Canvas::rebuild(AutomationObject& grid, bool takeWidths, const Shape& earli
         return false;
     PageDocument earlierDocument = std::exchange(document_, document_.cleared());
     document_.shareStore(request.store);
+    document_.keepTexts(table.lentTexts);
     const ViewState earlierView = view_;
     const RecorderState earlierState = recorder_.state();
     try {

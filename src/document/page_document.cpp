@@ -156,14 +156,20 @@ std::uint32_t PageDocument::styleNumber(const TextStyle& style)
 
 void PageDocument::shareStore(std::shared_ptr<TextStore> store)
 {
-    earlierStores_.push_back(std::exchange(store_, std::move(store)));
+    furtherStores_.push_back(std::exchange(store_, std::move(store)));
+}
+
+void PageDocument::keepTexts(std::shared_ptr<const TextStore> texts)
+{
+    if (texts)
+        furtherStores_.push_back(std::move(texts));
 }
 
 std::size_t PageDocument::memoryBytes() const
 {
     std::size_t bytes = pages_.capacity() * sizeof(Page) + patterns_.memoryBytes()
         + store_->capacityBytes() + structure.memoryBytes();
-    for (const auto& store : earlierStores_)
+    for (const auto& store : furtherStores_)
         bytes += store->capacityBytes();
     for (const Page& page : pages_) {
         bytes += page.lines.memoryBytes() + page.texts.memoryBytes();

@@ -124,6 +124,10 @@ public:
     /// Takes over a store that a row set shares; texts recorded before stay valid.
     void shareStore(std::shared_ptr<TextStore> store);
 
+    /// Keeps texts of another store that are recorded.
+    /// @param texts  null: there are none
+    void keepTexts(std::shared_ptr<const TextStore> texts);
+
     /// Bytes that pages, records and text stores hold.
     std::size_t memoryBytes() const;
 
@@ -152,7 +156,7 @@ private:
     std::unordered_map<LinePen, std::uint32_t, PenHash> penNumbers_;
     std::unordered_map<TextStyle, std::uint32_t, StyleHash> styleNumbers_;
     std::shared_ptr<TextStore> store_;
-    std::vector<std::shared_ptr<TextStore>> earlierStores_;
+    std::vector<std::shared_ptr<const TextStore>> furtherStores_;
 };
 
 /// A text as it is put out: every `PageCountToken` replaced by the number of pages.

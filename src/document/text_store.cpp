@@ -21,15 +21,39 @@ std::uint64_t TextStore::place(TextView text)
     return (std::uint64_t { lastBlock_ } << BlockBits) | inBlock;
 }
 
+/// Texts are mostly looked for in the order in which they were copied.
+std::optional<std::uint64_t> TextStore::placeOf(TextView text, std::size_t& block) const
+{
+    for (std::size_t looked = 0; looked < blocks_.size(); ++looked) {
+        const std::size_t at = (block + looked) % blocks_.size();
+        const auto first = reinterpret_cast<std::uintptr_t>(blocks_[at].units.get());
+        const auto units = reinterpret_cast<std::uintptr_t>(text.data());
+        if (units < first || units >= first + blocks_[at].size * sizeof(char16_t))
+            continue;
+        block = at;
+        const std::uint64_t inBlock = (units - first) / sizeof(char16_t);
+        if (inBlock > BlockMask)
+            return std::nullopt;
+        return (std::uint64_t { at } << BlockBits) | inBlock;
+    }
+    return std::nullopt;
+}
+
 /// An empty text has a place, too.
 char16_t* TextStore::copy(TextView text)
 {
-    const bool fits = text.size() <= freeUnits_ && freeUnits_ > 0;
-    char16_t* const place = fits ? free_ : grow(text.size());
+    char16_t* const place = room(text.size());
     std::copy(text.begin(), text.end(), place);
+    return place;
+}
+
+char16_t* TextStore::room(std::size_t units)
+{
+    const bool fits = units <= freeUnits_ && freeUnits_ > 0;
+    char16_t* const place = fits ? free_ : grow(units);
     if (place == free_) {
-        free_ += text.size();
-        freeUnits_ -= text.size();
+        free_ += units;
+        freeUnits_ -= units;
         lastBlock_ = freeBlock_;
     }
     return place;

@@ -7,6 +7,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <vector>
 
 namespace pelloric {
@@ -28,6 +29,13 @@ public:
     {
         return blocks_[place >> BlockBits].units.get() + (place & BlockMask);
     }
+
+    /// The place of a text that stands in the store; nothing: it does not, or no place tells it.
+    /// @param block  where it is looked for first; then where it was found
+    std::optional<std::uint64_t> placeOf(TextView text, std::size_t& block) const;
+
+    /// Room for a text, to be filled in.
+    char16_t* room(std::size_t units);
 
     /// Bytes that the store holds, unused ends of its blocks included.
     std::size_t capacityBytes() const { return capacityBytes_; }

@@ -7,6 +7,7 @@
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
 
+#include <algorithm>
 #include <limits>
 
 namespace pelloric {
@@ -21,12 +22,12 @@ constexpr TextView Names[] = { u"Cols", u"Rows", u"ColWidth", u"TextMatrix" };
 
 TableGrid::TableGrid(std::vector<TableColumn> columns)
     : columns_(std::move(columns))
+    , store_(std::make_shared<TextStore>())
 {
 }
 
-void TableGrid::reserve(std::size_t rows, std::size_t units)
+void TableGrid::reserve(std::size_t rows)
 {
-    store_.reserve(units);
     rowStarts_.reserve(rows);
     cellEnds_.reserve(rows * columns_.size());
 }
@@ -44,10 +45,11 @@ void TableGrid::addRow(std::span<const TextView> cells)
         throw RunTimeError(ErrorNumber::Overflow,
             u"row " + decimal(rowCount() + 1) + u" holds more than 4294967295 characters");
 
-    rowStarts_.push_back(store_.size());
+    char16_t* const texts = store_->room(length);
+    rowStarts_.push_back(texts);
     std::uint32_t end = 0;
     for (const TextView cell : cells) {
-        store_.append(cell);
+        std::copy(cell.begin(), cell.end(), texts + end);
         end += static_cast<std::uint32_t>(cell.size());
         cellEnds_.push_back(end);
     }
@@ -74,7 +76,20 @@ TextView TableGrid::cell(std::int64_t row, int column) const
     const std::size_t first = at * columns_.size();
     const std::size_t cell = first + static_cast<std::size_t>(column);
     const std::size_t begin = cell == first ? 0 : cellEnds_[cell - 1];
-    return TextView(store_.data() + rowStarts_[at] + begin, cellEnds_[cell] - begin);
+    return TextView(rowStarts_[at] + begin, cellEnds_[cell] - begin);
+}
+
+void TableGrid::rowTexts(std::int32_t row, std::span<TextView> into) const
+{
+    if (row < 1 || row > rowCount())
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", row, rowCount()));
+    const auto at = static_cast<std::size_t>(row - 1);
+    const std::uint32_t* end = cellEnds_.data() + at * columns_.size();
+    std::uint32_t begin = 0;
+    for (TextView& text : into) {
+        text = TextView(rowStarts_[at] + begin, *end - begin);
+        begin = *end++;
+    }
 }
 
 std::optional<MemberId> TableGrid::findMember(TextView name) { return findMemberName(Names, name); }

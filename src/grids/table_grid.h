@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "document/kept_cells.h"
+#include "document/text_store.h"
 #include "platform/automation_object.h"
 #include "platform/units.h"
 
@@ -19,15 +21,15 @@ struct TableColumn {
 /// A flex grid over a table of texts in memory: `Cols`, `Rows`, `ColWidth`, `TextMatrix`.
 ///
 /// Row 0 holds the titles, the rows that were added follow. The texts of all cells stand one behind
-/// the other in one store, so that a table of a million rows costs little more than its texts.
-class TableGrid final : public AutomationObject {
+/// the other in one store, which whoever reads them can share, so that a table of a million rows
+/// costs little more than its texts.
+class TableGrid final : public AutomationObject, public KeptCells {
 public:
     /// A table without rows.
     explicit TableGrid(std::vector<TableColumn> columns);
 
     /// Makes room, so that adding moves nothing.
-    /// @param units  of all cells together, UTF-16 code units
-    void reserve(std::size_t rows, std::size_t units);
+    void reserve(std::size_t rows);
 
     /// Adds a row at the end.
     ///
@@ -43,7 +45,7 @@ public:
 
     /// @param row     0 the first that was added
     /// @param column  from 0
-    /// @return        borrowed until a row is added
+    /// @return        valid as long as the texts are kept
     /// @throws RunTimeError SubscriptOutOfRange
     TextView cell(std::int64_t row, int column) const;
 
@@ -52,10 +54,13 @@ public:
     Value get(MemberId member, std::span<const Value> arguments) override;
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
 
+    std::shared_ptr<const TextStore> keptTexts() const override { return store_; }
+    void rowTexts(std::int32_t row, std::span<TextView> into) const override;
+
 private:
     std::vector<TableColumn> columns_;
-    Text store_;
-    std::vector<std::uint64_t> rowStarts_; ///< where a row's first cell begins in the store
+    std::shared_ptr<TextStore> store_; ///< lives on where pages show its texts
+    std::vector<const char16_t*> rowStarts_; ///< a row's cells, one behind the other
     std::vector<std::uint32_t> cellEnds_; ///< where a cell ends, counted from its row's start
 };
 

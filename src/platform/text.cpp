@@ -15,15 +15,17 @@ bool isHighSurrogate(char16_t unit) { return unit >= 0xD800 && unit < 0xDC00; }
 
 bool isLowSurrogate(char16_t unit) { return unit >= 0xDC00 && unit < 0xE000; }
 
-void appendCodePoint(Text& text, char32_t codePoint)
+/// @return  behind what was put
+char16_t* putCodePoint(char16_t* out, char32_t codePoint)
 {
     if (codePoint < 0x10000) {
-        text.push_back(static_cast<char16_t>(codePoint));
-        return;
+        *out++ = static_cast<char16_t>(codePoint);
+        return out;
     }
     const char32_t offset = codePoint - 0x10000;
-    text.push_back(static_cast<char16_t>(0xD800 + (offset >> 10)));
-    text.push_back(static_cast<char16_t>(0xDC00 + (offset & 0x3FF)));
+    *out++ = static_cast<char16_t>(0xD800 + (offset >> 10));
+    *out++ = static_cast<char16_t>(0xDC00 + (offset & 0x3FF));
+    return out;
 }
 
 void appendByte(std::string& bytes, char32_t value) { bytes.push_back(static_cast<char>(value)); }
@@ -142,10 +144,26 @@ char32_t nextCodePoint(TextView text, std::size_t& position)
 Text fromUtf8(std::string_view bytes)
 {
     Text text;
-    text.reserve(bytes.size());
-    for (std::size_t position = 0; position < bytes.size();)
-        appendCodePoint(text, nextUtf8(bytes, position));
+    appendUtf8(text, bytes);
     return text;
+}
+
+/// There are never more units than bytes.
+void appendUtf8(Text& text, std::string_view bytes)
+{
+    const std::size_t begin = text.size();
+    text.resize(begin + bytes.size());
+    char16_t* out = text.data() + begin;
+    for (std::size_t position = 0; position < bytes.size();) {
+        const auto byte = static_cast<unsigned char>(bytes[position]);
+        if (byte < 0x80) {
+            *out++ = byte;
+            ++position;
+        } else {
+            out = putCodePoint(out, nextUtf8(bytes, position));
+        }
+    }
+    text.resize(static_cast<std::size_t>(out - text.data()));
 }
 
 std::string toUtf8(TextView text)

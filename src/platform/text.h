@@ -40,6 +40,9 @@ char32_t nextCodePoint(TextView text, std::size_t& position);
 /// UTF-8 to UTF-16; a sequence that is no character becomes U+FFFD.
 Text fromUtf8(std::string_view bytes);
 
+/// The same, put behind a text.
+void appendUtf8(Text& text, std::string_view bytes);
+
 /// UTF-16 to UTF-8; half a surrogate pair becomes U+FFFD.
 std::string toUtf8(TextView text);
 

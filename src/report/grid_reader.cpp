@@ -4,6 +4,7 @@
 #include "report/grid_reader.h"
 
 #include "document/cell_lines.h"
+#include "document/kept_cells.h"
 #include "platform/automation_object.h"
 #include "platform/cell_look.h"
 #include "platform/numbers.h"
@@ -184,6 +185,37 @@ private:
     int columns_;
 };
 
+/// Reads rows through the members of the grid.
+void readRows(const FlexGrid& grid, std::span<const PrintedColumn> columns, std::int32_t first,
+    std::int32_t end, TableRowSet& table, Pulse& pulse)
+{
+    for (std::int32_t row = first; row < end; ++row) {
+        table.addRecord();
+        int field = 0;
+        for (const PrintedColumn& column : columns) {
+            table.setLast(field++, grid.cell(row, column.position));
+            pulse.beat();
+        }
+    }
+}
+
+/// Reads rows whose texts stay where they are.
+void readKeptRows(const KeptCells& cells, int gridColumns, std::span<const PrintedColumn> columns,
+    std::int32_t first, std::int32_t end, TableRowSet& table, Pulse& pulse)
+{
+    std::vector<TextView> texts(static_cast<std::size_t>(gridColumns));
+    for (std::int32_t row = first; row < end; ++row) {
+        cells.rowTexts(row, texts);
+        table.addRecord();
+        int field = 0;
+        for (const PrintedColumn& column : columns) {
+            const TextView text = texts[static_cast<std::size_t>(column.position)];
+            table.setLast(field++, Value::ofText(text));
+            pulse.beat();
+        }
+    }
+}
+
 GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
 {
     const FlexGrid grid(object);
@@ -211,13 +243,14 @@ GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
     }
     const std::int32_t rows = grid.rows();
     table.reserveRecords(std::int64_t { rows } - std::max(0, request.startRow));
-    for (std::int32_t row = request.startRow; row < rows; ++row) {
-        table.addRecord();
-        int field = 0;
-        for (const PrintedColumn& column : columns) {
-            table.setLast(field++, grid.cell(row, column.position));
-            pulse.beat();
-        }
+    if (const auto* const kept = dynamic_cast<const KeptCells*>(&object)) {
+        result.lentTexts = kept->keptTexts();
+        table.borrow(result.lentTexts);
+        const std::int32_t below = std::max(1, request.startRow);
+        readRows(grid, columns, request.startRow, std::min(below, rows), table, pulse);
+        readKeptRows(*kept, grid.columns(), columns, below, rows, table, pulse);
+    } else {
+        readRows(grid, columns, request.startRow, rows, table, pulse);
     }
     setWidths(result, widthsOf(columns), request);
     result.gridColumns = positionsOf(columns);

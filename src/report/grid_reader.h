@@ -60,6 +60,9 @@ public:
     double tableWidth = 0; ///< their sum: twips
     std::vector<ColPos> ColumnBands;
 
+    /// Where texts of the grid are that were not copied; null: all were.
+    std::shared_ptr<const TextStore> lentTexts;
+
     /// The titles of the row set's fields.
     std::vector<Text> fieldNames;
 

@@ -29,7 +29,8 @@ enum CellTag : std::uint64_t {
     DateTag,
     LargeDateTag,
     ShortTextTag,
-    LargeTextTag
+    LargeTextTag,
+    LentTextTag
 };
 
 /// The content of a date: milliseconds more than this before 1970.
@@ -112,6 +113,11 @@ TableRowSet::Cell TableRowSet::cellOfDate(double milliseconds)
 
 TableRowSet::Cell TableRowSet::cellOfText(TextView text)
 {
+    if (lent_ && text.size() <= LongestShortText) {
+        const auto place = lent_->placeOf(text, lentBlock_);
+        if (place && *place <= LastPlace)
+            return tagged(LentTextTag, (*place << LengthBits) | text.size());
+    }
     if (text.size() > LongestShortText)
         return largeCell(LargeTextTag, { 0, store_->add(text) });
     const std::uint64_t place = store_->place(text);
@@ -134,6 +140,8 @@ Value TableRowSet::valueOf(Cell cell) const
     switch ((cell - FirstTagged) >> ContentBits) {
     case ShortTextTag:
         return Value::ofText({ store_->at(content >> LengthBits), content & LongestShortText });
+    case LentTextTag:
+        return Value::ofText({ lent_->at(content >> LengthBits), content & LongestShortText });
     case LargeTextTag:
         return Value::ofText(large_[content].text);
     case TruthTag:

@@ -24,13 +24,17 @@ public:
     /// Whether a field of exactly that name exists.
     bool fieldExists(TextView name) const;
 
+    /// Texts that stand in another store are not copied any more.
+    void borrow(std::shared_ptr<const TextStore> texts) { lent_ = std::move(texts); }
+
     /// Makes room for records that are going to be added.
     void reserveRecords(std::int64_t records);
 
     /// Adds a record of null values behind the last one.
     void addRecord();
 
-    /// Sets a field of the last record; a text is copied into the store.
+    /// Sets a field of the last record; a text is copied into the store unless it is a borrowed
+    /// one.
     ///
     /// @param field  0 to `fieldCount() - 1`
     /// @throws RunTimeError Overflow: a text longer than `MostCellUnits`; TypeMismatch: an object
@@ -68,6 +72,8 @@ private:
     Value valueOf(Cell cell) const;
 
     std::shared_ptr<TextStore> store_;
+    std::shared_ptr<const TextStore> lent_; ///< null: none
+    std::size_t lentBlock_ = 0; ///< where the text before was
     std::vector<LargeValue> large_;
     std::vector<Text> names_;
     std::unordered_set<Text> knownNames_;

@@ -55,6 +55,8 @@ SeparatedValues::SeparatedValues(std::string_view text, ValuesDialect dialect)
     : text_(text)
     , dialect_(dialect)
 {
+    for (const char end : { '\n', '\r', dialect.delimiter })
+        ends_[static_cast<unsigned char>(end)] = true;
 }
 
 bool SeparatedValues::nextRow()
@@ -75,11 +77,6 @@ std::string_view SeparatedValues::value(std::size_t index) const
 {
     const Piece& piece = values_[index];
     return (piece.isScratch ? std::string_view(scratch_) : text_).substr(piece.begin, piece.length);
-}
-
-bool SeparatedValues::endsValue(std::size_t at) const
-{
-    return at == text_.size() || text_[at] == dialect_.delimiter || isLineEnd(at);
 }
 
 /// Goes behind all line ends that follow.
@@ -143,9 +140,11 @@ bool SeparatedValues::readQuoted(std::size_t quote)
 void SeparatedValues::readPlain()
 {
     const std::size_t begin = position_;
-    while (!endsValue(position_))
-        ++position_;
-    const std::string_view value = withoutBlanks(text_.substr(begin, position_ - begin));
+    std::size_t end = begin;
+    while (!endsValue(end))
+        ++end;
+    position_ = end;
+    const std::string_view value = withoutBlanks(text_.substr(begin, end - begin));
     const std::size_t offset
         = value.empty() ? begin : static_cast<std::size_t>(value.data() - text_.data());
     values_.push_back({ offset, value.size(), false });

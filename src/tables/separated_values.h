@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <string>
@@ -55,7 +56,10 @@ private:
     };
 
     bool isLineEnd(std::size_t at) const { return text_[at] == '\n' || text_[at] == '\r'; }
-    bool endsValue(std::size_t at) const;
+    bool endsValue(std::size_t at) const
+    {
+        return at == text_.size() || ends_[static_cast<unsigned char>(text_[at])];
+    }
     void skipLineEnds();
     void readRow();
     bool readQuoted(std::size_t quote);
@@ -64,6 +68,7 @@ private:
 
     std::string_view text_;
     ValuesDialect dialect_;
+    std::array<bool, 256> ends_ {}; ///< by byte: whether a value ends before it
     std::size_t position_ = 0;
     std::int64_t line_ = 1;
     std::int64_t rowLine_ = 1;

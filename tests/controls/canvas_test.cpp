@@ -348,6 +348,20 @@ TEST_F(CanvasTest, OverflowsAtPage32768AndLeavesTheDocumentAlone)
     EXPECT_EQ(canvas.Totalpages(), 32767);
 }
 
+TEST_F(CanvasTest, ShowsItsPagesWhenTheTableIsGone)
+{
+    auto grid
+        = std::make_unique<TableGrid>(gridOf({ { u"A", 1000 } }, { { u"first" }, { u"second" } }));
+    canvas.doPreview(*grid);
+    const std::string before = showDocument(canvas.document());
+    grid.reset();
+    EXPECT_EQ(showDocument(canvas.document()), before);
+    EXPECT_EQ(textsOf(canvas.document(), 0), "A|first|second");
+    const PageDocument moved = std::move(canvas.document());
+    canvas.clear();
+    EXPECT_EQ(textsOf(moved, 0), "A|first|second");
+}
+
 TEST_F(CanvasTest, PutsTheHostsCursorBackAfterABuild)
 {
     canvas.m_PrintObj = PrintObjKind::datagrid;

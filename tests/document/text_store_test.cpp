@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <vector>
+
 namespace pelloric {
 
 TEST(TextStore, KeepsEveryTextWhereItIs)
@@ -47,6 +49,32 @@ TEST(TextStore, FindsATextByItsPlace)
     placed.emplace_back(u"after", store.place(u"after"));
     for (const auto& [text, place] : placed)
         EXPECT_EQ(TextView(store.at(place), text.size()), text);
+}
+
+TEST(TextStore, TellsThePlaceOfItsOwnTextsOnly)
+{
+    TextStore store;
+    std::vector<TextView> texts;
+    for (int index = 0; index < 20000; ++index)
+        texts.push_back(store.add(decimal(index)));
+    std::size_t block = 0;
+    for (const std::size_t at : { 19999U, 10U, 11U, 7000U, 6999U }) {
+        const auto place = store.placeOf(texts[at].substr(1), block);
+        ASSERT_TRUE(place) << at;
+        EXPECT_EQ(store.at(*place), texts[at].data() + 1);
+    }
+    const Text other = u"other";
+    EXPECT_FALSE(store.placeOf(other, block));
+    EXPECT_FALSE(TextStore().placeOf(other, block));
+}
+
+TEST(TextStore, TellsNoPlaceFarWithinALargeText)
+{
+    TextStore store;
+    const TextView large = store.add(Text(3'000'000, u'l'));
+    std::size_t block = 0;
+    EXPECT_TRUE(store.placeOf(large, block));
+    EXPECT_FALSE(store.placeOf(large.substr(2'000'000), block));
 }
 
 TEST(TextStore, WastesLittle)

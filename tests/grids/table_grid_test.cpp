@@ -7,6 +7,9 @@
 
 #include <gtest/gtest.h>
 
+#include <memory>
+#include <vector>
+
 namespace pelloric {
 
 namespace {
@@ -61,6 +64,37 @@ TEST(TableGrid, RefusesARowWithMoreCellsThanColumnsAndKeepsTheOthers)
     const TextView cells[] = { u"1", u"2", u"3", u"4" };
     EXPECT_EQ(errorOf([&] { grid.addRow(cells); }), ErrorNumber::SubscriptOutOfRange);
     EXPECT_EQ(grid.rowCount(), 3);
+}
+
+TEST(TableGrid, HandsOutTheTextsOfARowAsTheyAreKept)
+{
+    const TableGrid grid = fruits();
+    std::vector<TextView> texts(3);
+    for (std::int32_t row = 1; row <= grid.rowCount(); ++row) {
+        grid.rowTexts(row, texts);
+        for (int column = 0; column < 3; ++column) {
+            const TextView cell = grid.cell(row - 1, column);
+            EXPECT_EQ(texts[static_cast<std::size_t>(column)], cell);
+            EXPECT_EQ(texts[static_cast<std::size_t>(column)].data(), cell.data());
+        }
+    }
+    for (const std::int32_t row : { 0, 4 })
+        EXPECT_EQ(errorOf([&] { grid.rowTexts(row, texts); }), ErrorNumber::SubscriptOutOfRange);
+}
+
+TEST(TableGrid, LeavesTextsWhereTheyAreWhenRowsAreAddedAndWhenItGoes)
+{
+    auto grid = std::make_unique<TableGrid>(fruits());
+    const std::shared_ptr<const TextStore> kept = grid->keptTexts();
+    const TextView first = grid->cell(0, 0);
+    const Text before(first);
+    for (int row = 0; row < 10000; ++row) {
+        const TextView cells[] = { u"a text that needs room" };
+        grid->addRow(cells);
+    }
+    EXPECT_EQ(grid->cell(0, 0).data(), first.data());
+    grid.reset();
+    EXPECT_EQ(first, before);
 }
 
 TEST(TableGrid, TakesWidthsAsTheyArePut)

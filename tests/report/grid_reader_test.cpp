@@ -48,6 +48,29 @@ std::string recordsOf(RowSet& rows)
 
 } // namespace
 
+TEST(FlexGridReader, LeavesTextsOfATableWhereTheyAre)
+{
+    TableGrid grid = gridOf({ { u"A", 1000 }, { u"B", 0 }, { u"C", 1000 } },
+        { { u"1", u"2", u"3" }, { u"4", u"5", u"6" } });
+    const GridTable table = readAs(PrintObjKind::MSFlexGrid, grid);
+    EXPECT_EQ(recordsOf(*table.rows), "1,3,;4,6,;");
+    table.rows->setPosition(2);
+    EXPECT_EQ(table.rows->value(1).text().data(), grid.cell(1, 2).data());
+    EXPECT_EQ(table.lentTexts, grid.keptTexts());
+}
+
+TEST(FlexGridReader, CopiesTheTitlesOfATableWhereTheyArePrintedAsARow)
+{
+    TableGrid grid = gridOf({ { u"A", 1000 } }, { { u"1" } });
+    GridRequest request = requestOf(PrintObjKind::MSFlexGrid);
+    request.startRow = 0;
+    EXPECT_EQ(recordsOf(*readGrid(grid, request).rows), "A,;1,;");
+    request.startRow = 2;
+    EXPECT_EQ(recordsOf(*readGrid(grid, request).rows), "");
+    request.startRow = -1;
+    EXPECT_EQ(errorOf([&] { readGrid(grid, request); }), ErrorNumber::SubscriptOutOfRange);
+}
+
 TEST(FlexGridReader, CopiesTheColumnsWiderThan144Twips)
 {
     TableGrid grid = gridOf({ { u"A", 145 }, { u"B", 144 }, { u"C", 0 }, { u"D", 1000 } },

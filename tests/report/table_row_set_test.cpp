@@ -67,6 +67,24 @@ TEST_F(TableRows, KeepEveryKindOfValue)
     EXPECT_TRUE(rows.keepsTexts());
 }
 
+TEST_F(TableRows, CopyNoTextThatIsLent)
+{
+    auto lender = std::make_shared<TextStore>();
+    const TextView short_ = lender->add(u"lent");
+    const TextView long_ = lender->add(Text(5000, u'l'));
+    rows.borrow(lender);
+    add(Value::ofText(short_), Value::ofText(u"of its own"));
+    add(Value::ofText(long_), Value::ofText({}));
+    lender.reset();
+    rows.moveFirst();
+    EXPECT_EQ(rows.value(0).text().data(), short_.data());
+    EXPECT_EQ(rows.value(0).text(), u"lent");
+    EXPECT_EQ(rows.value(1).text(), u"of its own");
+    rows.moveNext();
+    EXPECT_EQ(rows.value(0).text(), Text(5000, u'l'));
+    EXPECT_EQ(rows.value(1).text(), u"");
+}
+
 TEST_F(TableRows, KeepNumbersDatesAndTextsOfEverySize)
 {
     constexpr double Infinity = std::numeric_limits<double>::infinity();

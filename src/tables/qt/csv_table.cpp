@@ -44,7 +44,6 @@ void tell(const CsvOptions& options, double part)
 struct Sizes {
     std::size_t columns = 0;
     std::size_t rows = 0; ///< the titles' among them
-    std::size_t bytes = 0; ///< of all cells; there are never more code units
     std::vector<std::int64_t> gluedLines {}; ///< where rows begin that look glued
     std::size_t glued = 0;
     std::size_t ragged = 0; ///< rows with another number of values than the titles, not glued
@@ -77,8 +76,6 @@ Sizes countSizes(std::string_view text, ValuesDialect dialect, const CsvOptions&
         if (count > MostColumns)
             throw RunTimeError(
                 ErrorNumber::Overflow, atLine(values.line(), u"more than 32767 values in a row"));
-        for (std::size_t at = 0; at < count; ++at)
-            sizes.bytes += values.value(at).size();
         if (sizes.rows++ == 0)
             titles = count;
         else
@@ -93,16 +90,6 @@ Sizes countSizes(std::string_view text, ValuesDialect dialect, const CsvOptions&
     return sizes;
 }
 
-/// Puts UTF-8 behind a text.
-void appendUtf8(std::string_view bytes, Text& text)
-{
-    const auto isAscii = [](char byte) { return static_cast<unsigned char>(byte) < 0x80; };
-    if (std::ranges::all_of(bytes, isAscii))
-        text.append(bytes.begin(), bytes.end());
-    else
-        text.append(fromUtf8(bytes));
-}
-
 /// The values of a row as texts, the buffers kept from row to row.
 class RowTexts {
 public:
@@ -111,7 +98,7 @@ public:
         units_.clear();
         ends_.clear();
         for (std::size_t at = 0; at < values.valueCount(); ++at) {
-            appendUtf8(values.value(at), units_);
+            appendUtf8(units_, values.value(at));
             ends_.push_back(units_.size());
         }
         cells_.clear();
@@ -140,7 +127,7 @@ TableGrid makeGrid(
     for (const TextView title : row.of(values))
         columns[column++].title = title;
     TableGrid grid(std::move(columns));
-    grid.reserve(sizes.rows - 1, sizes.bytes);
+    grid.reserve(sizes.rows - 1);
     for (std::size_t rows = 1; values.nextRow(); ++rows) {
         grid.addRow(row.of(values));
         if (rows % RowsOfAStep == 0)

@@ -9,6 +9,7 @@
 #include "tables/file_kinds.h"
 
 #include <QByteArray>
+#include <QByteArrayView>
 #include <QStringDecoder>
 
 #include <uchardet/uchardet.h>
@@ -16,6 +17,7 @@
 #include <algorithm>
 #include <fstream>
 #include <memory>
+#include <string_view>
 #include <vector>
 
 namespace pelloric::qt {
@@ -28,6 +30,7 @@ constexpr qsizetype ChunkBytes = 1 << 20;
 constexpr std::size_t DetectedBytes = 1U << 22U;
 
 constexpr char Utf8[] = "UTF-8";
+constexpr std::string_view Utf8Mark = "\xEF\xBB\xBF";
 constexpr char Gb18030[] = "GB18030";
 constexpr char Western[] = "windows-1252";
 
@@ -35,7 +38,7 @@ constexpr char Western[] = "windows-1252";
 
 Text named(const QByteArray& encoding) { return toText(QString::fromLatin1(encoding)); }
 
-QByteArray readAll(const std::filesystem::path& path, const TextFileOptions& options)
+std::string readAll(const std::filesystem::path& path, const TextFileOptions& options)
 {
     std::error_code none;
     std::ifstream file;
@@ -43,23 +46,27 @@ QByteArray readAll(const std::filesystem::path& path, const TextFileOptions& opt
         file.open(path, std::ios::binary);
     if (!file.is_open())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));
-    const auto size = std::filesystem::file_size(path, none);
-    const qsizetype whole = none ? 0 : static_cast<qsizetype>(size);
-    QByteArray bytes;
-    bytes.reserve(whole);
-    std::string chunk(ChunkBytes, '\0');
+    const auto measured = std::filesystem::file_size(path, none);
+    const std::size_t whole = none ? 0 : static_cast<std::size_t>(measured);
+    constexpr auto Chunk = static_cast<std::size_t>(ChunkBytes);
+    std::string bytes;
+    bytes.reserve(whole + Chunk);
+    std::size_t size = 0;
     while (file) {
-        file.read(chunk.data(), ChunkBytes);
-        bytes.append(chunk.data(), file.gcount());
-        const double part
-            = whole > 0 ? static_cast<double>(bytes.size()) / static_cast<double>(whole) : 0;
+        bytes.resize(size + Chunk);
+        file.read(bytes.data() + size, ChunkBytes);
+        size += static_cast<std::size_t>(file.gcount());
+        const double part = whole > 0 ? static_cast<double>(size) / static_cast<double>(whole) : 0;
         if (options.progress && !options.progress(std::min(1.0, part)))
             throw RunTimeError(ErrorNumber::Cancelled);
     }
     if (file.bad())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));
+    bytes.resize(size);
     return bytes;
 }
+
+bool isUtf8(std::string_view bytes) { return QByteArrayView(bytes).isValidUtf8(); }
 
 /// A text in another encoding; nothing that is no text of it is left unseen.
 struct Decoded {
@@ -114,16 +121,21 @@ std::int64_t badLine(QByteArrayView bytes, const QByteArray& encoding)
 }
 
 /// The bytes that every character of an encoding takes at least.
-qsizetype unitOf(const QByteArray& encoding)
+std::size_t unitOf(const QByteArray& encoding)
 {
     return encoding.startsWith("UTF-16") ? 2 : encoding.startsWith("UTF-32") ? 4 : 1;
 }
 
 /// Decodes as an encoding that the caller, or a mark, says it is.
-TextFile decodeAs(const QByteArray& bytes, const QByteArray& encoding, TextView whoSays)
+TextFile decodeAs(std::string bytes, const QByteArray& encoding, TextView whoSays)
 {
+    if (encoding.compare(Utf8, Qt::CaseInsensitive) == 0 && isUtf8(bytes)) {
+        if (bytes.starts_with(Utf8Mark))
+            bytes.erase(0, Utf8Mark.size());
+        return { std::move(bytes), QString::fromLatin1(encoding) };
+    }
     Decoded decoded = decode(bytes, encoding);
-    const qsizetype unit = unitOf(encoding);
+    const std::size_t unit = unitOf(encoding);
     if (!decoded.isWhole || bytes.size() % unit != 0)
         refuseBytes(unit > 1 ? 0 : badLine(bytes, encoding),
             u"bytes that are no " + named(encoding) + Text(whoSays));
@@ -137,12 +149,12 @@ QByteArray encodingOfMark(QByteArrayView start)
 }
 
 /// What the letters of a text are most likely written in; empty: they do not tell.
-QByteArray detectedEncoding(const QByteArray& bytes)
+QByteArray detectedEncoding(std::string_view bytes)
 {
     const std::unique_ptr<uchardet, decltype(&uchardet_delete)> detector(
         uchardet_new(), &uchardet_delete);
-    const auto size = std::min(static_cast<std::size_t>(bytes.size()), DetectedBytes);
-    if (!detector || uchardet_handle_data(detector.get(), bytes.constData(), size) != 0)
+    const std::size_t size = std::min(bytes.size(), DetectedBytes);
+    if (!detector || uchardet_handle_data(detector.get(), bytes.data(), size) != 0)
         return {};
     uchardet_data_end(detector.get());
     return uchardet_get_charset(detector.get());
@@ -167,7 +179,7 @@ bool isAllPairs(QByteArrayView bytes)
 }
 
 /// The encodings to try, the likeliest first. A short Chinese text is easily taken for Western.
-std::vector<QByteArray> guesses(const QByteArray& bytes)
+std::vector<QByteArray> guesses(std::string_view bytes)
 {
     const QByteArray detected = detectedEncoding(bytes);
     const bool isWestern = detected.isEmpty() || detected.startsWith("ISO-8859")
@@ -179,7 +191,7 @@ std::vector<QByteArray> guesses(const QByteArray& bytes)
 
 /// Decodes as the likeliest encoding. A text that reads the same in the usual Western encoding as
 /// in the detected one is said to be Western.
-TextFile decodeGuessed(const QByteArray& bytes)
+TextFile decodeGuessed(std::string_view bytes)
 {
     for (const QByteArray& encoding : guesses(bytes)) {
         if (encoding.isEmpty() || !QStringDecoder(encoding.constData()).isValid())
@@ -206,22 +218,21 @@ Text atLine(std::int64_t line, TextView what)
 
 TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options)
 {
-    const QByteArray bytes = readAll(path, options);
-    const TextView kind = notATable({ bytes.constData(), static_cast<std::size_t>(bytes.size()) });
-    if (!kind.empty())
+    std::string bytes = readAll(path, options);
+    if (const TextView kind = notATable(bytes); !kind.empty())
         refuse(Text(kind));
     if (!options.encoding.isEmpty()) {
         const QByteArray encoding = options.encoding.toLatin1();
         if (!QStringDecoder(encoding.constData()).isValid())
             refuse(u"unknown encoding " + toText(options.encoding)
                 + u"; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others");
-        return decodeAs(bytes, encoding, u"");
+        return decodeAs(std::move(bytes), encoding, u"");
     }
-    if (const QByteArray marked = encodingOfMark(bytes.first(std::min<qsizetype>(4, bytes.size())));
+    if (const QByteArray marked = encodingOfMark(std::string_view(bytes).substr(0, 4));
         !marked.isEmpty())
-        return decodeAs(bytes, marked, u", which the file's mark says it is");
-    if (bytes.isValidUtf8())
-        return { bytes.toStdString(), QString::fromLatin1(Utf8) };
+        return decodeAs(std::move(bytes), marked, u", which the file's mark says it is");
+    if (isUtf8(bytes))
+        return { std::move(bytes), QString::fromLatin1(Utf8) };
     return decodeGuessed(bytes);
 }
 
