@@ -6,6 +6,8 @@
 #include "export/pdf_syntax.h"
 
 #include <algorithm>
+#include <array>
+#include <charconv>
 #include <cstdlib>
 
 namespace pelloric::pdf {
@@ -305,10 +307,19 @@ void PdfContent::appendRectangle(ContentPoint corner, ContentPoint opposite, boo
 
 void PdfContent::appendPoint(ContentPoint point)
 {
-    appendLength(point.x);
-    stream_ += ' ';
-    appendLength(point.y);
-    stream_ += ' ';
+    if (point.x % Hundred != 0 || point.y % Hundred != 0) {
+        appendLength(point.x);
+        stream_ += ' ';
+        appendLength(point.y);
+        stream_ += ' ';
+        return;
+    }
+    std::array<char, 48> text;
+    char* end = std::to_chars(text.data(), text.data() + 24, point.x / Hundred).ptr;
+    *end++ = ' ';
+    end = std::to_chars(end, end + 23, point.y / Hundred).ptr;
+    *end++ = ' ';
+    stream_.append(text.data(), end);
 }
 
 void PdfContent::appendLength(std::int64_t hundredths)

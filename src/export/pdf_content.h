@@ -83,6 +83,15 @@ public:
         stream_ += static_cast<char>(glyph.code & 0xFFU);
     }
 
+    /// Shows glyphs of one font at the point moved to, and ends their run.
+    /// @param codes  two bytes each, none of which needs escaping
+    void glyphs(std::uint16_t use, std::string_view codes, const TextState& state)
+    {
+        beginString(use, state);
+        stream_ += codes;
+        endString();
+    }
+
     /// Ends a run of glyphs that share their state.
     void endText() { endString(); }
 

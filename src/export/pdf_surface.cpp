@@ -191,6 +191,8 @@ void PdfSurface::drawText(TextView text)
         if (tags_)
             tags_->resumeText();
     }
+    if (drawAtOnce(text))
+        return;
     const auto isPlain = [&](char16_t unit) { return face_->unit(unit).code != 0; };
     if (std::all_of(text.begin(), text.end(), isPlain)) {
         drawPlain({ .text = text });
@@ -200,6 +202,25 @@ void PdfSurface::drawText(TextView text)
             drawRun(run);
     }
     content_.endText();
+}
+
+/// Draws a text of plain characters of one font, as nearly all texts are.
+/// @return  false: it is no such text; nothing was drawn
+bool PdfSurface::drawAtOnce(TextView text)
+{
+    shown_.resize(2 * text.size());
+    char* place = shown_.data();
+    const std::uint16_t use = face_->unit(text.front()).use;
+    for (const char16_t unit : text) {
+        const GlyphCode code = face_->unit(unit);
+        if (code.code == 0 || code.use != use)
+            return false;
+        *place++ = static_cast<char>(code.code >> 8U);
+        *place++ = static_cast<char>(code.code & 0xFFU);
+    }
+    content_.moveTo(baselineAt(0, 0));
+    content_.glyphs(use, shown_, { .em = em_, .stretch = 1, .color = foreColor_ });
+    return true;
 }
 
 void PdfSurface::drawRun(const TextRun& run)

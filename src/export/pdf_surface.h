@@ -61,6 +61,7 @@ private:
     ContentPen penOf(Color color) const;
     bool hasPen() const;
     void drawText(TextView text);
+    bool drawAtOnce(TextView text);
     void drawRun(const TextRun& run);
     void drawPlain(const TextRun& run);
     void drawShaped(const TextRun& run);
@@ -86,6 +87,7 @@ private:
     std::int64_t ascent_ = 0; ///< hundredths of a twip
     Twips lineHeight_ = 0;
     std::vector<TextRun> runs_;
+    std::string shown_; ///< codes of a text
 
     bool isFontTransparent_ = true;
     Color foreColor_ = 0;

@@ -117,6 +117,9 @@ void JoinedLines::picture(TextView filePath, Tpoint topLeft, Tpoint size)
 
 void JoinedLines::usePen(const Pen& pen)
 {
+    if (usedPen_ == pen)
+        return;
+    usedPen_ = pen;
     target_.setForeColor(pen.color);
     target_.setDrawWidth(pen.width);
     target_.setDrawStyle(pen.style);

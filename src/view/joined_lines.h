@@ -85,6 +85,7 @@ private:
     DrawingSurface& target_;
     Pen pen_;
     Pen heldPen_;
+    std::optional<Pen> usedPen_; ///< what the target has; nothing: unknown
     std::vector<Segment> held_;
     Ends upright_;
     Ends level_;

@@ -109,8 +109,17 @@ void count(char32_t codePoint, std::vector<MissingScript>& scripts)
     ++found->count;
 }
 
+/// Most texts lack nothing.
+bool isWhole(TextView text, FaceMetrics& face)
+{
+    return std::ranges::all_of(
+        text, [&](char16_t unit) { return face.kindOf(unit) == CharacterKind::Plain; });
+}
+
 void countIn(TextView text, FaceMetrics& face, std::vector<MissingScript>& scripts)
 {
+    if (isWhole(text, face))
+        return;
     for (std::size_t position = 0; position < text.size();) {
         const char32_t codePoint = nextCodePoint(text, position);
         if (!isHalfPair(codePoint) && face.kindOf(codePoint) == CharacterKind::Missing)
