@@ -58,9 +58,44 @@ QString songFamily()
     return {};
 }
 
-QStringList familiesOf(const QString& family)
+/// Whether files can hold the outlines of a font; those of the old PostScript format have no
+/// tables.
+bool holdsTables(const QFont& font)
 {
-    QStringList families { family };
+    return !QRawFont::fromFont(font).fontTable("head").isEmpty();
+}
+
+bool hasStyle(const QString& family, bool bold, bool italic)
+{
+    return std::ranges::any_of(QFontDatabase::styles(family), [&](const QString& style) {
+        return QFontDatabase::bold(family, style) == bold
+            && QFontDatabase::italic(family, style) == italic;
+    });
+}
+
+/// A family as the toolkit is asked for it. One that is installed in several formats, each under a
+/// foundry of its own, is asked for in a format that files can hold.
+QString embeddableFamily(const QString& family, bool bold, bool italic)
+{
+    const auto isEmbeddable = [&](const QString& name) {
+        QFont font(name);
+        font.setBold(bold);
+        font.setItalic(italic);
+        return holdsTables(font);
+    };
+    if (isEmbeddable(family))
+        return family;
+    const QString withFoundry = family + QStringLiteral(" [");
+    for (const QString& other : QFontDatabase::families()) {
+        if (other.startsWith(withFoundry) && hasStyle(other, bold, italic) && isEmbeddable(other))
+            return other;
+    }
+    return family;
+}
+
+QStringList familiesOf(const QString& family, bool bold, bool italic)
+{
+    QStringList families { embeddableFamily(family, bold, italic) };
     for (const QString& substitute : substitutes()) {
         if (substitute != family && QFontDatabase::hasFamily(substitute))
             families.append(substitute);
@@ -71,7 +106,7 @@ QStringList familiesOf(const QString& family)
 QFont preparedFont(const QString& family, bool bold, bool italic, int pixels)
 {
     QFont font;
-    font.setFamilies(familiesOf(family));
+    font.setFamilies(familiesOf(family, bold, italic));
     font.setBold(bold);
     font.setItalic(italic);
     font.setPixelSize(pixels);

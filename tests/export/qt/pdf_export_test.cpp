@@ -237,6 +237,21 @@ TEST_F(PdfExportTest, AFontThatMayNotBeEmbeddedLeavesTheFileToTheToolkitAndIsNam
     EXPECT_FALSE(inkOf(page).isEmpty()) << "its characters are drawn as shapes";
 }
 
+/// Several formats of these families are installed; the toolkit would take the old one.
+TEST_F(PdfExportTest, AFamilyOfSeveralFormatsIsEmbeddedInTheOneThatFilesCanHold)
+{
+    for (const TextView name : { u"Nimbus Sans", u"Arial", u"Times New Roman", u"Courier New" }) {
+        for (const int guise : { 0, 1, 2, 3 })
+            addText(document_, { 1000, 1000 }, u"Quick brown fox",
+                { .font = { .name = Text(name), .bold = guise % 2 == 1, .italic = guise > 1 } });
+    }
+    const QString fonts = answer(QStringLiteral("pdffonts"), { pdf() });
+    EXPECT_EQ(toUtf8(because_), "");
+    for (const char* const face : { "NimbusSans-Regular", "NimbusSans-BoldItalic",
+             "NimbusRoman-Bold", "NimbusMonoPS-Italic" })
+        EXPECT_TRUE(fonts.contains(QLatin1String(face))) << face << "\n" << fonts.toStdString();
+}
+
 TEST_F(PdfExportTest, CancellingLeavesNothing)
 {
     for (int page = 0; page < 5; ++page)
