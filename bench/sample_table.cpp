@@ -6,6 +6,7 @@
 #include "platform/numbers.h"
 
 #include <array>
+#include <fstream>
 
 namespace pelloric::bench {
 
@@ -23,7 +24,7 @@ TableGrid sampleTable(std::int64_t rows)
 {
     TableGrid table({ { u"No.", 900 }, { u"Article", 1400 }, { u"品名", 1500 }, { u"Town", 1500 },
         { u"Buyer", 1200 }, { u"Date", 1300 }, { u"Quantity", 1100 }, { u"Amount", 1300 } });
-    table.reserve(static_cast<std::size_t>(rows), static_cast<std::size_t>(rows) * 60);
+    table.reserve(static_cast<std::size_t>(rows));
     for (std::int64_t row = 0; row < rows; ++row) {
         const auto pick = static_cast<std::size_t>(row);
         const Text number = decimal(row + 1);
@@ -51,6 +52,19 @@ TableGrid wideTable(std::int64_t rows, int columns)
         table.addRow(std::vector<TextView>(texts.begin(), texts.end()));
     }
     return table;
+}
+
+void writeCsv(const TableGrid& table, const std::filesystem::path& path)
+{
+    std::ofstream stream(path, std::ios::binary);
+    for (int column = 0; column < table.columnCount(); ++column)
+        stream << (column > 0 ? "," : "") << toUtf8(table.column(column).title);
+    stream << '\n';
+    for (std::int64_t row = 0; row < table.rowCount(); ++row) {
+        for (int column = 0; column < table.columnCount(); ++column)
+            stream << (column > 0 ? "," : "") << toUtf8(table.cell(row, column));
+        stream << '\n';
+    }
 }
 
 std::int64_t textBytes(const TableGrid& table)
