@@ -32,6 +32,20 @@ void TableGrid::reserve(std::size_t rows)
     cellEnds_.reserve(rows * columns_.size());
 }
 
+void TableGrid::widen(std::size_t count, const TableColumn& column)
+{
+    const std::size_t before = columns_.size();
+    std::vector<std::uint32_t> ends;
+    ends.reserve(rowStarts_.capacity() * count);
+    for (std::size_t row = 0; row < rowStarts_.size(); ++row) {
+        const auto first = cellEnds_.begin() + static_cast<std::ptrdiff_t>(row * before);
+        ends.insert(ends.end(), first, first + static_cast<std::ptrdiff_t>(before));
+        ends.resize((row + 1) * count, before > 0 ? ends.back() : 0);
+    }
+    cellEnds_ = std::move(ends);
+    columns_.resize(count, column);
+}
+
 void TableGrid::addRow(std::span<const TextView> cells)
 {
     if (cells.size() > columns_.size())

@@ -31,6 +31,11 @@ public:
     /// Makes room, so that adding moves nothing.
     void reserve(std::size_t rows);
 
+    /// Adds columns at the right, empty in the rows that are there.
+    /// @param count   how many columns there are then; not fewer than now
+    /// @param column  what each of the new ones is
+    void widen(std::size_t count, const TableColumn& column);
+
     /// Adds a row at the end.
     ///
     /// @param cells  left to right; cells that are missing at the end are empty

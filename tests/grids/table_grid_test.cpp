@@ -97,6 +97,21 @@ TEST(TableGrid, LeavesTextsWhereTheyAreWhenRowsAreAddedAndWhenItGoes)
     EXPECT_EQ(first, before);
 }
 
+TEST(TableGrid, HasEmptyCellsWhereItIsWidened)
+{
+    TableGrid grid = fruits();
+    const Text last(grid.cell(2, 2));
+    grid.widen(5, { .title = u"more", .width = -1 });
+    const TextView cells[] = { u"1", u"2", u"3", u"4", u"5" };
+    grid.addRow(cells);
+    EXPECT_EQ(grid.columnCount(), 5);
+    EXPECT_EQ(grid.column(4).title, u"more");
+    EXPECT_EQ(grid.cell(2, 2), last);
+    EXPECT_EQ(grid.cell(2, 3), u"");
+    EXPECT_EQ(grid.cell(0, 4), u"");
+    EXPECT_EQ(grid.cell(3, 4), u"5");
+}
+
 TEST(TableGrid, TakesWidthsAsTheyArePut)
 {
     TableGrid grid = fruits();

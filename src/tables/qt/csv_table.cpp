@@ -19,9 +19,11 @@ constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max();
 constexpr std::size_t RowsOfAStep = 4096; ///< between two reports of the progress
 constexpr std::size_t MostNamedRows = 5; ///< of those that look glued
 
-/// Parts of the whole work after which the bytes are read, and the rows counted.
+/// Part of the whole work after which the bytes are read.
 constexpr double PartRead = 0.3;
-constexpr double PartCounted = 0.6;
+
+/// Room for more rows than the first rows let expect.
+constexpr double Spare = 1.05;
 
 [[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::TypeMismatch, what); }
 
@@ -40,54 +42,48 @@ void tell(const CsvOptions& options, double part)
         throw RunTimeError(ErrorNumber::Cancelled);
 }
 
-/// What a table has to hold.
-struct Sizes {
-    std::size_t columns = 0;
-    std::size_t rows = 0; ///< the titles' among them
-    std::vector<std::int64_t> gluedLines {}; ///< where rows begin that look glued
+/// Rows with another number of values than the titles.
+struct OddRows {
+    std::vector<std::int64_t> gluedLines {}; ///< where the first of those begin that look glued
     std::size_t glued = 0;
-    std::size_t ragged = 0; ///< rows with another number of values than the titles, not glued
+    std::size_t ragged = 0; ///< of the others
     std::int64_t raggedLine = 0; ///< where the first of them begins
 };
 
 /// A line break in a value whose row does not have as many values as the titles is most likely a
 /// quote that somebody forgot to close.
-void noteOddRow(const SeparatedValues& row, std::size_t titles, Sizes& sizes)
+void noteOddRow(const SeparatedValues& row, std::size_t titles, OddRows& odd)
 {
     if (row.valueCount() == titles)
         return;
     if (!row.hasLineBreak()) {
-        if (sizes.ragged++ == 0)
-            sizes.raggedLine = row.line();
+        if (odd.ragged++ == 0)
+            odd.raggedLine = row.line();
         return;
     }
-    ++sizes.glued;
-    if (sizes.gluedLines.size() < MostNamedRows)
-        sizes.gluedLines.push_back(row.line());
+    ++odd.glued;
+    if (odd.gluedLines.size() < MostNamedRows)
+        odd.gluedLines.push_back(row.line());
 }
 
-Sizes countSizes(std::string_view text, ValuesDialect dialect, const CsvOptions& options)
+/// Goes to the next row. @throws RunTimeError Overflow: too many columns
+bool nextRow(SeparatedValues& values)
 {
-    SeparatedValues values(text, dialect);
-    Sizes sizes;
-    std::size_t titles = 0;
-    while (values.nextRow()) {
-        const std::size_t count = values.valueCount();
-        if (count > MostColumns)
-            throw RunTimeError(
-                ErrorNumber::Overflow, atLine(values.line(), u"more than 32767 values in a row"));
-        if (sizes.rows++ == 0)
-            titles = count;
-        else
-            noteOddRow(values, titles, sizes);
-        sizes.columns = std::max(sizes.columns, count);
-        if (sizes.rows % RowsOfAStep == 0)
-            tell(options,
-                PartRead
-                    + (PartCounted - PartRead) * static_cast<double>(values.position())
-                        / static_cast<double>(text.size()));
-    }
-    return sizes;
+    if (!values.nextRow())
+        return false;
+    if (values.valueCount() > MostColumns)
+        throw RunTimeError(
+            ErrorNumber::Overflow, atLine(values.line(), u"more than 32767 values in a row"));
+    return true;
+}
+
+/// The most values of a row, from a row on.
+std::size_t widestFrom(SeparatedValues values)
+{
+    std::size_t widest = values.valueCount();
+    while (nextRow(values))
+        widest = std::max(widest, values.valueCount());
+    return widest;
 }
 
 /// The values of a row as texts, the buffers kept from row to row.
@@ -116,25 +112,35 @@ private:
     std::vector<TextView> cells_;
 };
 
+TableGrid gridOf(std::span<const TextView> titles)
+{
+    std::vector<TableColumn> columns;
+    for (const TextView title : titles)
+        columns.push_back({ .title = Text(title), .width = -1 });
+    return TableGrid(std::move(columns));
+}
+
 TableGrid makeGrid(
-    std::string_view text, ValuesDialect dialect, const Sizes& sizes, const CsvOptions& options)
+    std::string_view text, ValuesDialect dialect, const CsvOptions& options, OddRows& odd)
 {
     SeparatedValues values(text, dialect);
+    if (!nextRow(values))
+        refuse(u"the file is empty");
     RowTexts row;
-    values.nextRow();
-    std::vector<TableColumn> columns(sizes.columns, TableColumn { .title = {}, .width = -1 });
-    std::size_t column = 0;
-    for (const TextView title : row.of(values))
-        columns[column++].title = title;
-    TableGrid grid(std::move(columns));
-    grid.reserve(sizes.rows - 1);
-    for (std::size_t rows = 1; values.nextRow(); ++rows) {
+    TableGrid grid = gridOf(row.of(values));
+    const std::size_t titles = values.valueCount();
+    for (std::size_t rows = 1; nextRow(values); ++rows) {
+        noteOddRow(values, titles, odd);
+        if (values.valueCount() > static_cast<std::size_t>(grid.columnCount()))
+            grid.widen(widestFrom(values), { .title = {}, .width = -1 });
         grid.addRow(row.of(values));
-        if (rows % RowsOfAStep == 0)
-            tell(options,
-                PartCounted
-                    + (1 - PartCounted) * static_cast<double>(values.position())
-                        / static_cast<double>(text.size()));
+        if (rows % RowsOfAStep != 0)
+            continue;
+        const double part
+            = static_cast<double>(values.position()) / static_cast<double>(text.size());
+        tell(options, PartRead + (1 - PartRead) * part);
+        if (rows == RowsOfAStep)
+            grid.reserve(static_cast<std::size_t>(static_cast<double>(rows) / part * Spare));
     }
     return grid;
 }
@@ -148,28 +154,26 @@ void refuseZeroBytes(std::string_view text)
     refuse(atLine(line, u"a zero byte; this is no text file"));
 }
 
-Text gluedNote(const Sizes& sizes)
+Text gluedNote(const OddRows& odd)
 {
     Text lines;
-    for (const std::int64_t line : sizes.gluedLines)
+    for (const std::int64_t line : odd.gluedLines)
         lines.append(lines.empty() ? u"" : u", ").append(decimal(line));
-    if (sizes.glued > sizes.gluedLines.size())
+    if (odd.glued > odd.gluedLines.size())
         lines.append(u" and others");
-    return (sizes.glued == 1 ? u"the row at line " : u"the rows at lines ") + lines
+    return (odd.glued == 1 ? u"the row at line " : u"the rows at lines ") + lines
         + u" may be several rows glued together: a quoted value goes on over a line break, and the "
           u"row has not as many values as the titles";
 }
 
-Text raggedNote(const Sizes& sizes, char delimiter)
+Text raggedNote(const OddRows& odd, std::int64_t rows, char delimiter)
 {
     const Text between = delimiter == '\t'
         ? Text(u"a tab")
         : Text(u"\"") + Text(1, static_cast<char16_t>(delimiter)) + u"\"";
-    return decimal(static_cast<std::int64_t>(sizes.ragged)) + u" of "
-        + decimal(static_cast<std::int64_t>(sizes.rows - 1))
+    return decimal(static_cast<std::int64_t>(odd.ragged)) + u" of " + decimal(rows)
         + u" rows have not as many values as the titles, the first at line "
-        + decimal(sizes.raggedLine) + u"; is this a table with " + between
-        + u" between its values?";
+        + decimal(odd.raggedLine) + u"; is this a table with " + between + u" between its values?";
 }
 
 } // namespace
@@ -184,17 +188,15 @@ TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
     const ValuesDialect dialect {
         options.delimiter ? *options.delimiter : delimiterOf(path, file.text), options.hasQuotes
     };
-    const Sizes sizes = countSizes(file.text, dialect, options);
-    if (sizes.rows == 0)
-        refuse(u"the file is empty");
-    TableGrid grid = makeGrid(file.text, dialect, sizes, options);
+    OddRows odd;
+    TableGrid grid = makeGrid(file.text, dialect, options, odd);
     if (options.notes != nullptr && file.isGuessed)
         options.notes->push_back(u"the encoding was guessed to be " + toText(file.encoding)
             + u"; name another one if letters look wrong");
-    if (options.notes != nullptr && sizes.glued > 0)
-        options.notes->push_back(gluedNote(sizes));
-    if (options.notes != nullptr && sizes.ragged > 0)
-        options.notes->push_back(raggedNote(sizes, dialect.delimiter));
+    if (options.notes != nullptr && odd.glued > 0)
+        options.notes->push_back(gluedNote(odd));
+    if (options.notes != nullptr && odd.ragged > 0)
+        options.notes->push_back(raggedNote(odd, grid.rowCount(), dialect.delimiter));
     return grid;
 }
 

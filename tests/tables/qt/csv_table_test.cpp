@@ -89,6 +89,8 @@ TEST(CsvTable, ReadsTitlesAndCells)
         { "empty_lines.csv", "a,b\n\n1,2\n\n\n3,4\n", "a|b|/1|2|/3|4|" },
         { "short_row.csv", "a,b,c\n1\n", "a|b|c|/1|||" },
         { "long_row.csv", "a\n1,2,3\n4\n", "a|||/1|2|3|/4|||" },
+        { "ever_longer_rows.csv", "a,b\n1\n2,3,4\n5\n6,7,8,9\n",
+            "a|b|||/1||||/2|3|4||/5||||/6|7|8|9|" },
         { "titles.csv", "a,b\n", "a|b|" },
         { "mark.csv",
             "\xEF\xBB\xBF"
