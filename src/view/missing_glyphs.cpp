@@ -112,8 +112,9 @@ void count(char32_t codePoint, std::vector<MissingScript>& scripts)
 /// Most texts lack nothing.
 bool isWhole(TextView text, FaceMetrics& face)
 {
-    return std::ranges::all_of(
-        text, [&](char16_t unit) { return face.kindOf(unit) == CharacterKind::Plain; });
+    return std::ranges::all_of(text, [&](char16_t unit) {
+        return !isHalfPair(unit) && face.kindOf(unit) == CharacterKind::Plain;
+    });
 }
 
 void countIn(TextView text, FaceMetrics& face, std::vector<MissingScript>& scripts)

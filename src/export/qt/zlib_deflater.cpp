@@ -11,8 +11,8 @@ namespace pelloric::qt {
 
 namespace {
 
-/// The level of zlib itself: a third of the bytes, and still much faster than they are drawn.
-constexpr int Level = 6;
+/// Two thirds of the time that zlib's usual level takes, for one byte more in twenty.
+constexpr int Level = 4;
 
 } // namespace
 
