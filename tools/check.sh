@@ -5,6 +5,7 @@
 # Checks of the sources and of sanitizer builds: all, or those named as arguments.
 #
 #   tools/check.sh [format] [layers] [spelling] [licences] [scripts] [translations] [tidy] [asan] [fuzz]
+#       [windows]
 #
 # CHECK_FUZZ_SECONDS (60) is how long each fuzzer runs; with 0 they are only built.
 
@@ -12,7 +13,7 @@ set -euo pipefail
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 . tools/packages.sh
 
-AllChecks=(format layers spelling licences scripts translations tidy asan fuzz)
+AllChecks=(format layers spelling licences scripts translations tidy asan fuzz windows)
 
 cxxFiles() {
     git ls-files -z -- '*.cpp' '*.h'
@@ -90,6 +91,15 @@ checkFuzz() {
             -rss_limit_mb=2048 -artifact_prefix="build/fuzz/$name-" -print_final_stats=1 \
             "${words[@]}" "${corpus[@]}"
     done
+}
+
+# The core and its tests, compiled for Windows and run by wine.
+checkWindows() {
+    needPackages build windows
+    needTools x86_64-w64-mingw32-g++-posix wine64 ctest
+    export WINEPREFIX=$PWD/build/wine WINEDEBUG=-all
+    configureAndBuild windows
+    ctest --preset windows
 }
 
 for check in "$@"; do

@@ -78,6 +78,13 @@ PackagesDocs=(
     doxygen
 )
 
+# Compiles the core for Windows and runs its tests; GoogleTest is compiled from its sources.
+PackagesWindows=(
+    g++-mingw-w64-x86-64-posix
+    googletest
+    wine64
+)
+
 # Makes and judges the Debian packages.
 PackagesPackage=(
     desktop-file-utils
@@ -136,7 +143,8 @@ aptGet() {
     return "$status"
 }
 
-# needPackages GROUP...: installs what is missing of the groups build, test, bench, check, docs, package.
+# needPackages GROUP...: installs what is missing of the groups: build, test, bench, check, docs,
+# windows, package.
 needPackages() {
     local group list package missing=()
     for group in "$@"; do

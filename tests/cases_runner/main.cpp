@@ -7,8 +7,8 @@
 #include "steps.h"
 #include "world.h"
 
-#include "platform/qt/qt_text_codec.h"
 #include "settings/settings_file.h"
+#include "support/chinese_codec.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -98,11 +98,11 @@ std::vector<fs::path> casesOf(const fs::path& folder)
 int run(const fs::path& folder, const fs::path& out)
 {
     fs::create_directories(out);
-    qt::QtTextCodec codec;
+    const std::unique_ptr<TextCodec> codec = chineseCodec();
     int status = 0;
     for (const fs::path& path : casesOf(folder)) {
         try {
-            runCase(path, out, codec);
+            runCase(path, out, *codec);
         } catch (const std::exception& error) {
             std::cerr << path.filename().string() << ": " << error.what() << '\n';
             status = 1;

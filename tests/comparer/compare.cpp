@@ -3,7 +3,7 @@
 
 #include "comparer/compare.h"
 
-#include "comparer/qt/sha256.h"
+#include "comparer/sha256.h"
 #include "platform/text.h"
 #include "platform/text_codec.h"
 

@@ -3,9 +3,9 @@
 
 #include "comparer/compare.h"
 
-#include "comparer/qt/sha256.h"
+#include "comparer/sha256.h"
 #include "fakes/temp_folder.h"
-#include "platform/qt/qt_text_codec.h"
+#include "support/chinese_codec.h"
 
 #include <gtest/gtest.h>
 
@@ -114,18 +114,18 @@ TEST(Comparer, TakesSinglesInResultsWhereTheStepAnswersOne)
 
 TEST(Comparer, SeesAChangedByteALostByteAndAWrongHashOfAFile)
 {
-    const qt::QtTextCodec codec;
+    const std::unique_ptr<TextCodec> codec = chineseCodec();
     const std::string bytes = "\"\r\n\xCB\xCE\xCC\xE5\r\n";
     json expected = { { "lines", { "\"", "宋体" } }, { "sha256", sha256(bytes) } };
-    EXPECT_EQ(compareFile(expected, bytes, codec), std::nullopt);
+    EXPECT_EQ(compareFile(expected, bytes, *codec), std::nullopt);
     std::string changed = bytes;
     changed[4] = '\xCF';
-    EXPECT_EQ(compareFile(expected, changed, codec),
+    EXPECT_EQ(compareFile(expected, changed, *codec),
         "file: differs from byte 4 on, in line 2; expected 9 bytes, got 9");
-    EXPECT_NE(compareFile(expected, bytes.substr(0, 8), codec), std::nullopt);
-    EXPECT_NE(compareFile(expected, bytes + "\n", codec), std::nullopt);
+    EXPECT_NE(compareFile(expected, bytes.substr(0, 8), *codec), std::nullopt);
+    EXPECT_NE(compareFile(expected, bytes + "\n", *codec), std::nullopt);
     expected["sha256"] = sha256("");
-    EXPECT_NE(compareFile(expected, bytes, codec), std::nullopt);
+    EXPECT_NE(compareFile(expected, bytes, *codec), std::nullopt);
 }
 
 TEST(Comparer, KnowsTheHashOfTheEmptyText)
@@ -135,12 +135,12 @@ TEST(Comparer, KnowsTheHashOfTheEmptyText)
 
 TEST(Comparer, SeesWhatTheRunnerDidNotWrite)
 {
-    const qt::QtTextCodec codec;
+    const std::unique_ptr<TextCodec> codec = chineseCodec();
     const TempFolder folder;
     const json expected = { { "a", 1 }, { "ostl", { { "lines", { "\"" } } } } };
     const auto path = folder.write("sample.json", caseOf(expected.dump()).dump());
     std::filesystem::create_directory(folder.file("out"));
-    const auto compared = [&] { return compareCase(path, folder.file("out"), codec); };
+    const auto compared = [&] { return compareCase(path, folder.file("out"), *codec); };
     EXPECT_EQ(compared(), "there is no dump");
     folder.write("out/sample.json", "{\"a\": ");
     EXPECT_EQ(compared(), "the dump is no object");
@@ -150,7 +150,7 @@ TEST(Comparer, SeesWhatTheRunnerDidNotWrite)
     EXPECT_NE(compared(), std::nullopt);
     const auto other = folder.write("other.json", caseOf("{}").dump());
     EXPECT_EQ(
-        compareCase(other, folder.file("out"), codec), "the case's id is not its file's name");
+        compareCase(other, folder.file("out"), *codec), "the case's id is not its file's name");
 }
 
 } // namespace pelloric::cases

@@ -6,7 +6,7 @@
 #include "comparer/compare.h"
 
 #include "fakes/temp_folder.h"
-#include "platform/qt/qt_text_codec.h"
+#include "support/chinese_codec.h"
 #include "support/test_paths.h"
 
 #include <gtest/gtest.h>
@@ -33,14 +33,23 @@ std::vector<std::string> caseIds()
     return ids;
 }
 
+/// Runs the runner; its status, 0 when every case ran.
+int runCases(const fs::path& cases, const fs::path& out)
+{
+    std::string command = std::string("\"") + PELLORIC_CASES + "\" \"" + cases.string() + "\" \""
+        + out.string() + "\" 2>&1";
+#ifdef _WIN32
+    command = "\"" + command + "\""; // The command interpreter takes the outermost quotes away.
+#endif
+    return std::system(command.c_str());
+}
+
 class ConformanceCases : public testing::TestWithParam<std::string> {
 protected:
     static void SetUpTestSuite()
     {
         folder_ = std::make_unique<TempFolder>();
-        const std::string command = std::string("\"") + PELLORIC_CASES + "\" \""
-            + CasesFolder.string() + "\" \"" + folder_->path().string() + "\"";
-        status_ = std::system(command.c_str());
+        status_ = runCases(CasesFolder, folder_->path());
     }
 
     static void TearDownTestSuite() { folder_.reset(); }
@@ -60,9 +69,9 @@ std::string nameOf(const testing::TestParamInfo<std::string>& info)
 
 TEST_P(ConformanceCases, EndsAsExpected)
 {
-    const qt::QtTextCodec codec;
+    const std::unique_ptr<TextCodec> codec = chineseCodec();
     const auto difference
-        = compareCase(CasesFolder / (GetParam() + ".json"), folder_->path(), codec);
+        = compareCase(CasesFolder / (GetParam() + ".json"), folder_->path(), *codec);
     EXPECT_EQ(difference.value_or("no difference"), "no difference");
 }
 
@@ -71,9 +80,7 @@ INSTANTIATE_TEST_SUITE_P(All, ConformanceCases, testing::ValuesIn(caseIds()), na
 TEST(ConformanceRunner, RefusesAFolderThatIsNotThere)
 {
     const TempFolder folder;
-    const std::string command = std::string("\"") + PELLORIC_CASES + "\" \""
-        + folder.file("none").string() + "\" \"" + folder.file("out").string() + "\" 2>&1";
-    EXPECT_NE(std::system(command.c_str()), 0);
+    EXPECT_NE(runCases(folder.file("none"), folder.file("out")), 0);
 }
 
 TEST(ConformanceRunner, GoesOnBehindACaseThatItCannotRun)
@@ -84,13 +91,11 @@ TEST(ConformanceRunner, GoesOnBehindACaseThatItCannotRun)
         R"({"id": "b-unknown", "input": {"steps": [["fly"]], "show": []}, "expected": {}})");
     folder.write("c-good.json",
         R"({"id": "c-good", "input": {"steps": [["clear"]], "show": []}, "expected": {}})");
-    const std::string command = std::string("\"") + PELLORIC_CASES + "\" \""
-        + folder.path().string() + "\" \"" + folder.file("out").string() + "\" 2>&1";
-    EXPECT_NE(std::system(command.c_str()), 0);
+    EXPECT_NE(runCases(folder.path(), folder.file("out")), 0);
     EXPECT_FALSE(fs::exists(folder.file("out") / "a-broken.json"));
     EXPECT_FALSE(fs::exists(folder.file("out") / "b-unknown.json"));
-    EXPECT_EQ(compareCase(folder.file("c-good.json"), folder.file("out"), qt::QtTextCodec()),
-        std::nullopt);
+    EXPECT_EQ(
+        compareCase(folder.file("c-good.json"), folder.file("out"), *chineseCodec()), std::nullopt);
 }
 
 } // namespace pelloric::cases

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "comparer/qt/sha256.h"
+#include "comparer/sha256.h"
 
 #include <QByteArray>
 #include <QCryptographicHash>
