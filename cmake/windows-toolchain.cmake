@@ -13,7 +13,10 @@ set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
 set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
-set(CMAKE_CROSSCOMPILING_EMULATOR wine64)
+
+# Debian's package wine64 puts the program where no PATH looks.
+find_program(PELLORIC_WINE wine64 PATHS /usr/lib/wine REQUIRED)
+set(CMAKE_CROSSCOMPILING_EMULATOR "${PELLORIC_WINE}")
 
 # The programs run where none of the compiler's libraries are.
 set(CMAKE_EXE_LINKER_FLAGS_INIT "-static")

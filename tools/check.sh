@@ -96,6 +96,7 @@ checkFuzz() {
 # The core and its tests, compiled for Windows and run by wine.
 checkWindows() {
     needPackages build windows
+    PATH=$PATH:/usr/lib/wine # where Debian puts wine64
     needTools x86_64-w64-mingw32-g++-posix wine64 ctest
     export WINEPREFIX=$PWD/build/wine WINEDEBUG=-all
     configureAndBuild windows
