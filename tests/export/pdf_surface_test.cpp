@@ -100,9 +100,9 @@ TEST_F(PdfSurfaceTest, SlantsAMadeUpItalicFaceButNotItsMoves)
     print({ 300, 600 }, u"a");
     print({ 400, 600 }, u"a");
     EXPECT_EQ(operators(),
-        "BT\n/F1 200 Tf\n1 0 .2126 1 100 9840 Tm\n(" + codes({ 1 }) + ")Tj\n1 0 .2126 1 200 9540 Tm\n("
-            + codes({ 1 }) + ")Tj\n1 0 0 1 300 9240 Tm\n(" + codes({ 1 }) + ")Tj\n100 0 Td("
-            + codes({ 1 }) + ")Tj\nET\n");
+        "BT\n/F1 200 Tf\n1 0 .2126 1 100 9840 Tm\n(" + codes({ 1 })
+            + ")Tj\n1 0 .2126 1 200 9540 Tm\n(" + codes({ 1 }) + ")Tj\n1 0 0 1 300 9240 Tm\n("
+            + codes({ 1 }) + ")Tj\n100 0 Td(" + codes({ 1 }) + ")Tj\nET\n");
 }
 
 TEST_F(PdfSurfaceTest, PlacesACharacterOfAnotherSlantBehindThoseBefore)
