@@ -61,6 +61,14 @@ QString nativeKeys(const QString& keys)
     return parts.join(QStringLiteral(", "));
 }
 
+QString namesOf(const QList<QKeySequence>& keys)
+{
+    QStringList names;
+    for (const QKeySequence& sequence : keys)
+        names.append(sequence.toString(QKeySequence::NativeText));
+    return names.join(QStringLiteral(", "));
+}
+
 } // namespace
 
 std::vector<KeyLine> allKeys(const std::vector<ViewCommand>& commands)
@@ -70,15 +78,11 @@ std::vector<KeyLine> allKeys(const std::vector<ViewCommand>& commands)
         lines.push_back({ nativeKeys(QString::fromLatin1(row.keys)),
             QCoreApplication::translate("KeysWindow", row.meaning) });
     for (const ViewCommand& command : commands) {
-        QStringList keys;
-        for (const QKeySequence& sequence : command.keys)
-            keys.append(sequence.toString(QKeySequence::NativeText));
-        if (!keys.isEmpty())
-            lines.push_back({ keys.join(QStringLiteral(", ")), command.text });
+        if (!command.keys.isEmpty())
+            lines.push_back({ namesOf(command.keys), command.text });
     }
     for (const PreviewTool& tool : PreviewTools)
-        lines.push_back(
-            { keysOf(tool).toString(QKeySequence::NativeText), meaningOf(tool.action) });
+        lines.push_back({ namesOf(allKeysOf(tool)), meaningOf(tool.action) });
     return lines;
 }
 

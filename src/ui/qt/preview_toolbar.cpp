@@ -43,14 +43,6 @@ constexpr int BoxGap = 4; ///< in front of a combo: pixels
 constexpr int ScaleLetters = 9; ///< room for "   500 %" and what is typed
 constexpr int PageLetters = 11; ///< room for "   NO. 32767" but for a letter
 
-/// Keys beside those of the table: on many keyboards "+" needs the shift key.
-constexpr auto FurtherKeys = std::to_array<std::pair<ToolAction, const char*>>({
-    { ToolAction::ZoomOut, "Ctrl+=" },
-    { ToolAction::ShowPrintOptions, "Print" },
-    { ToolAction::FourPages, "Alt+4" },
-    { ToolAction::ManyPages, "Alt+6" },
-});
-
 /// A caption without the blanks around it and the doubled ones in it.
 QString plainCaption(const PreviewTool& tool) { return toQString(tool.caption).simplified(); }
 
@@ -151,14 +143,7 @@ QAction* PreviewToolbar::makeAction(const PreviewTool& tool)
     action->setIconText(toQString(tool.caption));
     action->setToolTip(tipOf(tool));
     action->setEnabled(tool.enabled);
-    QList<QKeySequence> keys;
-    if (!tool.shortcut.empty())
-        keys.append(keysOf(tool));
-    for (const auto& [of, further] : FurtherKeys) {
-        if (of == tool.action)
-            keys.append(QKeySequence(QLatin1String(further)));
-    }
-    action->setShortcuts(keys);
+    action->setShortcuts(allKeysOf(tool));
     action->setAutoRepeat(tool.group == ToolGroup::Pages || tool.group == ToolGroup::Zoom);
     connect(action, &QAction::triggered, this, [this, id = tool.id] { emit clicked(id); });
     actions_[tool.id] = action;

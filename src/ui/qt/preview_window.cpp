@@ -109,12 +109,11 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     contextMenu_->setObjectName(QStringLiteral("PopMenu"));
     for (QAction* const action : toolbar_->contextActions())
         contextMenu_->addAction(action);
-    addSavePages();
     connectTools();
     session_.emplace(canvas_->canvas(), static_cast<PreviewHost&>(*this));
     reading_ = std::make_unique<ReadingInput>(*canvas_, *session_, [this] { return isBusy(); });
     tools_ = new ReaderTools({ *this, *contextMenu_, *canvas_, *session_, platform.fonts(),
-        [this] { return isBusy(); } });
+        [this] { return isBusy(); }, [this] { savePages(); } });
     navigationChanged();
     restorePlace();
     canvas_->setFocus();
@@ -142,16 +141,6 @@ void PreviewWindow::connectTools()
         if (button == RightButtonNumber)
             showContextMenu(QCursor::pos());
     });
-}
-
-void PreviewWindow::addSavePages()
-{
-    auto* const action = new QAction(tr("Save as PDF"), this);
-    action->setObjectName(QStringLiteral("SavePages"));
-    action->setShortcut(QKeySequence(Qt::CTRL | Qt::Key_E));
-    connect(action, &QAction::triggered, this, &PreviewWindow::savePages);
-    addAction(action);
-    contextMenu_->addAction(action);
 }
 
 void PreviewWindow::setPrompts(PreviewPrompts prompts)

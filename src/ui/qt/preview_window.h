@@ -105,7 +105,6 @@ private:
     PrintPages pagesToPrint() const;
     QString printFrom(PrintOptionsDialog& dialog, const PrintArguments& arguments);
     void connectTools();
-    void addSavePages();
     bool mayWritePages(const std::filesystem::path& path);
     void writePages(const std::filesystem::path& path);
     void click(int id);

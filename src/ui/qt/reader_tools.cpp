@@ -63,6 +63,7 @@ std::vector<ViewCommand> ReaderTools::commands()
             [this, id] { guarded([&] { parts_.session.click(id); }); } };
     };
     std::vector<ViewCommand> all {
+        { "SavePages", tr("Save as PDF"), keys({ "Ctrl+E" }), parts_.savePages },
         { "FitWidth", tr("Page Width"), keys({ "Ctrl+1" }),
             [&] { guarded([&] { session.fitPageWidth(); }); }, true },
         { "FitPage", tr("Page in View"), keys({ "Ctrl+2" }),

@@ -41,6 +41,7 @@ public:
         PreviewSession& session;
         QtFonts& fonts;
         std::function<bool()> isBusy; ///< commands are refused meanwhile
+        std::function<void()> savePages; ///< asks for a file, see `PreviewWindow::savePages`
     };
 
     explicit ReaderTools(const Window& window);

@@ -9,6 +9,7 @@
 #include <QCoreApplication>
 
 #include <array>
+#include <utility>
 
 namespace pelloric::qt {
 
@@ -53,6 +54,14 @@ constexpr auto Meanings = std::to_array<MeaningRow>({
 });
 static_assert(Meanings.size() == PreviewTools.size());
 
+/// Keys beside those of the table: on many keyboards "+" needs the shift key.
+constexpr auto FurtherKeys = std::to_array<std::pair<ToolAction, const char*>>({
+    { ToolAction::ZoomOut, "Ctrl+=" },
+    { ToolAction::ShowPrintOptions, "Print" },
+    { ToolAction::FourPages, "Alt+4" },
+    { ToolAction::ManyPages, "Alt+6" },
+});
+
 } // namespace
 
 QString meaningOf(ToolAction action)
@@ -67,6 +76,18 @@ QString meaningOf(ToolAction action)
 QKeySequence keysOf(const PreviewTool& tool)
 {
     return QKeySequence::fromString(toQString(tool.shortcut), QKeySequence::PortableText);
+}
+
+QList<QKeySequence> allKeysOf(const PreviewTool& tool)
+{
+    QList<QKeySequence> keys;
+    if (!tool.shortcut.empty())
+        keys.append(keysOf(tool));
+    for (const auto& [of, further] : FurtherKeys) {
+        if (of == tool.action)
+            keys.append(QKeySequence(QLatin1String(further)));
+    }
+    return keys;
 }
 
 } // namespace pelloric::qt

@@ -12,6 +12,7 @@
 #include "view/page_texts.h"
 
 #include <QAccessible>
+#include <QAction>
 #include <QClipboard>
 #include <QComboBox>
 #include <QDialog>
@@ -275,6 +276,11 @@ TEST_F(ReaderToolsTest, ListsAllKeys)
     for (const char* const key : { "F1", "F9", "Ctrl+F", "F3", "Shift+F3", "Ctrl+1", "Ctrl+2",
              "Ctrl+C", "Ctrl+A", "PgDown", "Space", "Esc" })
         EXPECT_TRUE(keys.contains(key)) << key;
+    for (const QAction* const action : window.findChildren<QAction*>()) {
+        for (const QKeySequence& shortcut : action->shortcuts())
+            EXPECT_TRUE(keys.contains(shortcut.toString(QKeySequence::NativeText)))
+                << shortcut.toString().toStdString();
+    }
     EXPECT_EQ(keys.removeDuplicates(), 0);
     QTest::keyClick(list, Qt::Key_Escape);
     EXPECT_FALSE(list->isVisible());
