@@ -73,7 +73,11 @@ int runPreview(const Invocation& invocation)
     opener.setPrompts(prompts);
     shown = &opener.showWindow().canvas().canvas();
     shown->options = shapeOf(line);
-    opener.openPreview(std::move(grid));
+    try {
+        opener.openPreview(std::move(grid));
+    } catch (const RunTimeError& error) {
+        tell(describe(error)); // the window says it, too, and can mend it
+    }
     return application.run();
 }
 

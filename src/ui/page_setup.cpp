@@ -6,6 +6,7 @@
 #include "platform/numbers.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
+#include "report/settings_check.h"
 #include "ui/font_description.h"
 #include "ui/numeric_text.h"
 
@@ -44,6 +45,16 @@ constexpr auto MarginKeys = std::to_array<MarginKey>({
     { SettingKey::Right, Margin::Right },
 });
 
+/// Problems that are about no key's value are about the file.
+Text fileHintOf(const Platform& platform)
+{
+    for (const SettingProblem& problem : settingProblems(platform)) {
+        if (!problem.key)
+            return problem.text + u" OK will save nothing.";
+    }
+    return {};
+}
+
 Text marginText(double millimetres) { return formatNumber(millimetres).append(MarginUnit); }
 
 /// Adds what stands before "mm" in a size box; an empty box leaves its key alone.
@@ -69,6 +80,7 @@ PageSetupState::PageSetupState(
     const Platform& platform, const std::vector<PaperForm>& forms, ReportSettings* own)
     : platform_(platform)
     , own_(own)
+    , fileHint_(own != nullptr ? Text() : fileHintOf(platform))
     , rows_(pelloric::paperRows(forms))
 {
     restoreMargins();

@@ -102,6 +102,10 @@ public:
     Text headerFontText() const;
     Text footerFontText() const;
 
+    /// What keeps `save` from writing anything, as it was when the dialog opened: a missing file,
+    /// or keys that are missing in it; empty when all is well.
+    const Text& fileHint() const { return fileHint_; }
+
     /// Rewrites the settings, all or nothing; the dialog closes in every case.
     ///
     /// `NothingWritten`: a step failed, a size box without "mm" or a key that the file lacks; the
@@ -117,6 +121,7 @@ private:
 
     const Platform& platform_;
     ReportSettings* own_;
+    Text fileHint_;
     std::vector<PaperRow> rows_;
     MarginSketch sketch_;
     std::array<Text, 4> boxes_;

@@ -7,9 +7,11 @@
 #include "platform/automation_object.h"
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
+#include "report/settings_check.h"
 #include "ui/tool_table.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace pelloric {
 
@@ -179,6 +181,7 @@ void PreviewSession::dispatch(ToolAction action)
         return;
     case ToolAction::ClearPages:
         canvas_.clear();
+        notice_.reset();
         return refreshNavigation();
     case ToolAction::Enlarge:
         canvas_.Maximum();
@@ -215,7 +218,44 @@ void PreviewSession::openFile()
 void PreviewSession::documentOpened()
 {
     state_.rebuild = grid_ != nullptr;
+    notice_.reset();
     refresh(false);
+}
+
+void PreviewSession::showNotice(std::optional<PreviewNotice> notice)
+{
+    notice_ = std::move(notice);
+    host_.navigationChanged();
+}
+
+void PreviewSession::restoreDefaults()
+{
+    quietly([this] {
+        try {
+            if (ReportSettings* const own = canvas_.ownSettings())
+                restoreDefaultSettings(*own);
+            else
+                restoreDefaultSettings(canvas_.platform());
+        } catch (const RunTimeError& error) {
+            return showNotice(noticeOfError(error));
+        }
+        showNotice(std::nullopt);
+        refresh(grid_ != nullptr);
+    });
+}
+
+/// Lets the canvas build pages; what keeps it from that is said above those that are shown.
+void PreviewSession::build(const std::function<void()>& step)
+{
+    try {
+        step();
+    } catch (const RunTimeError& error) {
+        if (error.number() != ErrorNumber::Cancelled)
+            showNotice(noticeOfFailure(error, canvas_.platform(), canvas_.ownSettings()));
+        throw;
+    }
+    state_.rebuild = true;
+    showNotice(noticeOfSettings(canvas_.platform(), canvas_.ownSettings()));
 }
 
 void PreviewSession::askForCentring()
@@ -485,14 +525,19 @@ void PreviewSession::refresh(bool rebuild)
     }
     AutomationObject& grid = keptGrid();
     askForCentring();
-    host_.beforeBuild(grid);
-    canvas_.doPreview(grid);
-    state_.rebuild = true;
+    build([&] {
+        host_.beforeBuild(grid);
+        canvas_.doPreview(grid);
+    });
     centre();
     refreshNavigation();
 }
 
-void PreviewSession::reZoom() { canvas_.ReDrawZoom(keptGrid()); }
+void PreviewSession::reZoom()
+{
+    AutomationObject& grid = keptGrid();
+    build([&] { canvas_.ReDrawZoom(grid); });
+}
 
 void PreviewSession::print(bool allPages, TextView pageList, std::int16_t copies)
 {

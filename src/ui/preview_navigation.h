@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "platform/text.h"
 #include "ui/page_reading.h"
+#include "ui/preview_notice.h"
 
 #include <array>
 #include <cstdint>
@@ -49,7 +50,8 @@ public:
     /// A kept grid is about to be read: its owner may bring it up to date.
     virtual void beforeBuild(AutomationObject&) { }
 
-    /// The session's `state()` is another now: the window applies it without raising changes.
+    /// The session's `state()` or `notice()` is another now: the window applies it without raising
+    /// changes.
     virtual void navigationChanged() = 0;
 };
 
@@ -89,6 +91,17 @@ public:
     PreviewSession& operator=(const PreviewSession&) = delete;
 
     const NavigationState& state() const { return state_; }
+
+    /// What is to be said above the pages; nothing when all is well.
+    const std::optional<PreviewNotice>& notice() const { return notice_; }
+
+    /// Says something above the pages, or no more.
+    void showNotice(std::optional<PreviewNotice> notice);
+
+    /// Makes every setting usable again, see `restoreDefaultSettings`, and builds again.
+    ///
+    /// What keeps the file from being written is said above the pages.
+    void restoreDefaults();
 
     /// Keeps a grid, previews it and refreshes the navigation.
     /// @param grid  borrowed until the next grid or `forgetGrid`
@@ -158,6 +171,7 @@ private:
     void viewChanged() override;
     void progressChanged() override { }
 
+    void build(const std::function<void()>& step);
     void quietly(const std::function<void()>& command);
     void dispatch(ToolAction action);
     AutomationObject& keptGrid() const;
@@ -191,6 +205,7 @@ private:
     PreviewHost& host_;
     AutomationObject* grid_ = nullptr;
     NavigationState state_;
+    std::optional<PreviewNotice> notice_;
     float scaleDivisor_ = 1; ///< that the text of the scale combo stands for
     Fit fit_ = Fit::None;
     float fitDivisor_ = 1; ///< that the fit gave: another one has ended it

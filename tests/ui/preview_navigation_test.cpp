@@ -8,6 +8,7 @@
 #include "fakes/fake_platform.h"
 #include "grids/table_grid.h"
 #include "settings/default_settings.h"
+#include "settings/settings_file.h"
 #include "support/errors.h"
 #include "ui/tool_table.h"
 
@@ -27,11 +28,17 @@ public:
     std::filesystem::path chooseFileToSave() override { return chosen("save;"); }
     void unload() override { log += "unload;"; }
     void navigationChanged() override { ++changes; }
+    void beforeBuild(AutomationObject&) override
+    {
+        if (doubt)
+            throw RunTimeError(*doubt);
+    }
 
     std::string log;
     std::filesystem::path path; ///< empty: the user cancels
     DialogEnd end = DialogEnd::Cancelled;
     int changes = 0;
+    std::optional<ErrorNumber> doubt; ///< of the grid's owner before it is read
 
 private:
     DialogEnd ended(const std::string& dialog)
@@ -338,6 +345,78 @@ TEST(PreviewNavigation, BuildsRefreshesAndZoomsAGrid)
     EXPECT_EQ(errorOf([&] { fixture.session().refresh(true); }), ErrorNumber::ObjectMissing);
     EXPECT_EQ(errorOf([&] { fixture.session().reZoom(); }), ErrorNumber::ObjectMissing);
     fixture.click({ 2, 23, 24 });
+}
+
+TEST(PreviewNavigation, SaysAboveThePagesWhyNoneCouldBeBuilt)
+{
+    Fixture fixture(3);
+    TableGrid grid({ { u"a", 1000 } });
+    const std::string path = fixture.platform.folder.file("OstlConfig.ini").string();
+    EXPECT_EQ(errorOf([&] { fixture.session().open(grid); }), ErrorNumber::FileNotFound);
+    ASSERT_TRUE(fixture.session().notice());
+    EXPECT_EQ(*fixture.session().notice(),
+        (PreviewNotice {
+            .text = fromUtf8("The pages could not be built. File not found: " + path + "."),
+            .offersDefaults = true }));
+    EXPECT_EQ(fixture.canvas.Totalpages(), 3);
+    fixture.session().restoreDefaults();
+    EXPECT_FALSE(fixture.session().notice());
+    EXPECT_EQ(fixture.canvas.Totalpages(), 1);
+    EXPECT_EQ(fixture.platform.folder.read("OstlConfig.ini"), toUtf8(defaultSettingsText()));
+}
+
+TEST(PreviewNavigation, SaysAboveThePagesWhatTheGridsOwnerFindsBeforeABuild)
+{
+    Fixture fixture(1);
+    deployDefaultSettings(fixture.platform.services());
+    TableGrid grid({ { u"a", 1000 } });
+    fixture.host.doubt = ErrorNumber::Overflow;
+    EXPECT_EQ(errorOf([&] { fixture.session().open(grid); }), ErrorNumber::Overflow);
+    ASSERT_TRUE(fixture.session().notice());
+    EXPECT_EQ(toUtf8(fixture.session().notice()->text), "The pages could not be built. Overflow.");
+}
+
+TEST(PreviewNavigation, OffersTheDialogsThatMendABadValue)
+{
+    Fixture fixture(1);
+    deployDefaultSettings(fixture.platform.services());
+    TableGrid grid({ { u"a", 1000 } });
+    fixture.session().open(grid);
+    EXPECT_FALSE(fixture.session().notice());
+    writeSetting(fixture.platform.services(), u"Top", u"4000");
+    fixture.click({ 2 });
+    ASSERT_TRUE(fixture.session().notice());
+    EXPECT_TRUE(contains(fixture.session().notice()->text, u"Top= 4000 in "));
+    EXPECT_TRUE(fixture.session().notice()->offersPageSetup);
+    EXPECT_FALSE(fixture.session().notice()->offersGridStyle);
+    writeSetting(fixture.platform.services(), u"Top", u"10");
+    writeSetting(fixture.platform.services(), u"FontSize", u"0");
+    fixture.click({ 2 });
+    ASSERT_TRUE(fixture.session().notice());
+    EXPECT_TRUE(fixture.session().notice()->text.starts_with(u"FontSize= 0 in "));
+    EXPECT_TRUE(fixture.session().notice()->offersGridStyle);
+    fixture.session().showNotice(std::nullopt);
+    EXPECT_FALSE(fixture.session().notice());
+}
+
+TEST(PreviewNavigation, SaysNothingAboveThePagesOfABuildThatTheUserEnds)
+{
+    Fixture fixture(1);
+    deployDefaultSettings(fixture.platform.services());
+    TableGrid grid({ { u"a", 1000 } });
+    fixture.platform.loop.cancelAt = 1;
+    EXPECT_EQ(errorOf([&] { fixture.session().open(grid); }), ErrorNumber::Cancelled);
+    EXPECT_FALSE(fixture.session().notice());
+}
+
+TEST(PreviewNavigation, SaysThatTheDefaultsCannotBeRestored)
+{
+    Fixture fixture(1);
+    fixture.platform.folder.write("file", "no folder");
+    fixture.platform.folders.directory = fixture.platform.folder.file("file");
+    fixture.session().restoreDefaults();
+    ASSERT_TRUE(fixture.session().notice());
+    EXPECT_TRUE(fixture.session().notice()->text.starts_with(u"The file cannot be written: "));
 }
 
 TEST(PreviewNavigation, RebuildsNoDocumentThatWasOpenedWithoutAGrid)

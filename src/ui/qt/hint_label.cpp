@@ -22,6 +22,7 @@ HintLabel::HintLabel(const QString& name, QWidget* parent)
     text_->setObjectName(name);
     text_->setTextFormat(Qt::PlainText);
     text_->setWordWrap(true);
+    text_->setAlignment(Qt::AlignLeft | Qt::AlignTop);
     auto* const layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(icon, 0, Qt::AlignTop);

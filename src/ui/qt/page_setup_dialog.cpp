@@ -6,6 +6,7 @@
 #include "platform/qt/qt_text.h"
 #include "print/paper_names.h"
 #include "ui/numeric_text.h"
+#include "ui/page_setup_hints.h"
 #include "ui/qt/dialog_parts.h"
 #include "ui/qt/hint_label.h"
 #include "ui/qt/page_sketch.h"
@@ -83,6 +84,8 @@ PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent, Repo
     setTabKeys(*tabs, "GMD");
     auto* layout = new QVBoxLayout(this);
     layout->addWidget(tabs);
+    fileHint_ = new HintLabel(QStringLiteral("labFileHint"), this);
+    layout->addWidget(fileHint_);
     const ClosingButtons buttons = addClosingButtons(
         *this, *layout, { QStringLiteral("OK"), 'K' }, { QStringLiteral("Cancel"), 'C' });
     connect(buttons.ok, &QPushButton::clicked, this, &PageSetupDialog::save);
@@ -105,8 +108,7 @@ QWidget* PageSetupDialog::makePageTab()
     papersHint_ = new HintLabel(QStringLiteral("labPapersHint"), group);
     inside->addWidget(papersHint_);
     auto* below = new QHBoxLayout;
-    below->addLayout(makeSizeBoxes(group));
-    below->addStretch();
+    below->addLayout(makeSizeBoxes(group), 1);
     below->addLayout(makeOrientation(group));
     inside->addLayout(below);
     auto* layout = new QVBoxLayout(page);
@@ -142,18 +144,25 @@ QLayout* PageSetupDialog::makeSizeBoxes(QWidget* parent)
     paperName_ = captionFor({}, 0, nullptr, parent, QStringLiteral("labPagerSize"));
     width_ = new QLineEdit(parent);
     width_->setObjectName(QStringLiteral("txtWidth"));
-    connect(width_, &QLineEdit::textEdited, this,
-        [this](const QString& text) { state_.paper.widthBox = toText(text); });
+    connect(width_, &QLineEdit::textEdited, this, [this](const QString& text) {
+        state_.paper.widthBox = toText(text);
+        showHints();
+    });
     height_ = new QLineEdit(parent);
     height_->setObjectName(QStringLiteral("txtHeight"));
-    connect(height_, &QLineEdit::textEdited, this,
-        [this](const QString& text) { state_.paper.heightBox = toText(text); });
+    connect(height_, &QLineEdit::textEdited, this, [this](const QString& text) {
+        state_.paper.heightBox = toText(text);
+        showHints();
+    });
     auto* grid = new QGridLayout;
     grid->addWidget(paperName_, 0, 0, 1, 2);
     grid->addWidget(captionFor(QStringLiteral("Width:"), 'W', width_, parent), 1, 0);
     grid->addWidget(width_, 1, 1);
     grid->addWidget(captionFor(QStringLiteral("Height:"), 'H', height_, parent), 2, 0);
     grid->addWidget(height_, 2, 1);
+    sizeHint_ = new HintLabel(QStringLiteral("labSizeHint"), parent);
+    grid->addWidget(sizeHint_, 0, 2, 3, 1);
+    grid->setColumnStretch(2, 1);
     grid->setRowStretch(3, 1);
     return grid;
 }
@@ -206,7 +215,9 @@ QWidget* PageSetupDialog::makeMarginsTab()
     });
     grid->addWidget(restore, line, 0, 1, 2);
     grid->setRowMinimumHeight(line, restore->sizeHint().height() * 2);
-    grid->setRowStretch(line + 1, 1);
+    marginHint_ = new HintLabel(QStringLiteral("labMarginHint"), frame);
+    grid->addWidget(marginHint_, line + 1, 0, 1, 2);
+    grid->setRowStretch(line + 2, 1);
     auto* back = new QGroupBox(QStringLiteral("Preview"), page);
     back->setObjectName(QStringLiteral("fraBack"));
     sketch_ = new PageSketch(state_, back);
@@ -290,6 +301,7 @@ void PageSetupDialog::showPaper()
     height_->setText(toQString(state_.paper.heightBox));
     upright_->setVisible(state_.paper.isPortrait());
     lying_->setVisible(!state_.paper.isPortrait());
+    showHints();
 }
 
 void PageSetupDialog::typeMargin(Margin margin)
@@ -300,6 +312,7 @@ void PageSetupDialog::typeMargin(Margin margin)
     state_.typeMargin(margin, toText(typed));
     rewriteText(box, toQString(state_.marginBox(margin)), static_cast<int>(before.size()));
     sketch_->refresh();
+    showHints();
 }
 
 void PageSetupDialog::showMargins()
@@ -310,6 +323,23 @@ void PageSetupDialog::showMargins()
             static_cast<int>(text.indexOf(QLatin1Char(' '))));
     }
     sketch_->refresh();
+    showHints();
+}
+
+/// Beside the values: why they cannot be, and what OK will do with them.
+void PageSetupDialog::showHints()
+{
+    const PageSetupHints hints = hintsOf(state_);
+    sizeHint_->say(toQString(hints.sizes));
+    fileHint_->say(toQString(hints.file));
+    QStringList margins;
+    for (const MarginRow& row : MarginRows) {
+        const QString hint = toQString(hints.of(row.margin));
+        margins_[static_cast<std::size_t>(row.margin)]->setAccessibleDescription(hint);
+        if (!hint.isEmpty())
+            margins.append(hint);
+    }
+    marginHint_->say(margins.join(QLatin1Char('\n')));
 }
 
 void PageSetupDialog::save()

@@ -64,6 +64,7 @@ private:
     void showPaper();
     void typeMargin(Margin margin);
     void showMargins();
+    void showHints();
     void save();
 
     Platform platform_;
@@ -79,6 +80,9 @@ private:
     SheetPicture* upright_ = nullptr;
     SheetPicture* lying_ = nullptr;
     std::array<UpDownBox*, 4> margins_ {};
+    HintLabel* sizeHint_ = nullptr;
+    HintLabel* marginHint_ = nullptr;
+    HintLabel* fileHint_ = nullptr;
     PageSketch* sketch_ = nullptr;
     PageTextsTab* texts_ = nullptr;
 };

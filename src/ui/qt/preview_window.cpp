@@ -14,6 +14,7 @@
 #include "ui/qt/choice_box.h"
 #include "ui/qt/grid_style_dialog.h"
 #include "ui/qt/icon_set.h"
+#include "ui/qt/notice_strip.h"
 #include "ui/qt/page_files.h"
 #include "ui/qt/page_setup_dialog.h"
 #include "ui/qt/preview_toolbar.h"
@@ -34,6 +35,7 @@
 #include <QScreen>
 #include <QSettings>
 #include <QTimer>
+#include <QVBoxLayout>
 
 #include <algorithm>
 
@@ -46,6 +48,8 @@ constexpr QSize FirstSize { 1180, 860 }; ///< before the user has chosen another
 constexpr short RightButtonNumber = 2;
 
 constexpr int ExitTool = 17;
+constexpr int GridStyleTool = 1;
+constexpr int PageSetupTool = 13;
 
 constexpr int CloseAgainMs = 20;
 
@@ -95,6 +99,7 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     , prompts_(standardPrompts())
     , folders_(std::make_shared<UsedFolders>())
     , toolbar_(new PreviewToolbar(this))
+    , strip_(new NoticeStrip(this))
     , canvas_(new Sorvane(platform, this))
     , contextMenu_(new QMenu(this))
 {
@@ -105,11 +110,12 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     setContextMenuPolicy(Qt::DefaultContextMenu);
     addToolBar(toolbar_);
     canvas_->setObjectName(QStringLiteral("Sorvane1"));
-    setCentralWidget(canvas_);
+    setCentralWidget(makeCentre());
     contextMenu_->setObjectName(QStringLiteral("PopMenu"));
     for (QAction* const action : toolbar_->contextActions())
         contextMenu_->addAction(action);
     connectTools();
+    connectStrip();
     session_.emplace(canvas_->canvas(), static_cast<PreviewHost&>(*this));
     reading_ = std::make_unique<ReadingInput>(*canvas_, *session_, [this] { return isBusy(); });
     tools_ = new ReaderTools({ *this, *contextMenu_, *canvas_, *session_, platform.fonts(),
@@ -120,6 +126,32 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
 }
 
 PreviewWindow::~PreviewWindow() { delete tools_; }
+
+/// The canvas, with the strip above it when there is something to say.
+QWidget* PreviewWindow::makeCentre()
+{
+    auto* const centre = new QWidget(this);
+    auto* const layout = new QVBoxLayout(centre);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(0);
+    layout->addWidget(strip_);
+    layout->addWidget(canvas_, 1);
+    return centre;
+}
+
+void PreviewWindow::connectStrip()
+{
+    connect(strip_, &NoticeStrip::pageSetupAsked, this, [this] { click(PageSetupTool); });
+    connect(strip_, &NoticeStrip::gridStyleAsked, this, [this] { click(GridStyleTool); });
+    connect(strip_, &NoticeStrip::defaultsAsked, this, [this] {
+        const Command command(*this);
+        session_->restoreDefaults();
+    });
+    connect(strip_, &NoticeStrip::dismissed, this, [this] {
+        session_->showNotice(std::nullopt);
+        canvas_->setFocus();
+    });
+}
 
 void PreviewWindow::connectTools()
 {
@@ -297,6 +329,7 @@ void PreviewWindow::navigationChanged()
     if (!session_)
         return;
     toolbar_->showNavigation(session_->state(), canvas_->canvas().document().currentPage);
+    strip_->showNotice(session_->notice());
     if (tools_)
         tools_->viewChanged();
 }

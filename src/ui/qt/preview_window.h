@@ -20,6 +20,7 @@ struct PrintArguments;
 
 namespace pelloric::qt {
 
+class NoticeStrip;
 class PreviewToolbar;
 class PrintOptionsDialog;
 class QtPlatform;
@@ -104,7 +105,9 @@ private:
     bool printPages(const PrintArguments& arguments);
     PrintPages pagesToPrint() const;
     QString printFrom(PrintOptionsDialog& dialog, const PrintArguments& arguments);
+    QWidget* makeCentre();
     void connectTools();
+    void connectStrip();
     bool mayWritePages(const std::filesystem::path& path);
     void writePages(const std::filesystem::path& path);
     void click(int id);
@@ -121,6 +124,7 @@ private:
     std::shared_ptr<UsedFolders> folders_;
     std::unique_ptr<AutomationObject> grid_;
     PreviewToolbar* toolbar_;
+    NoticeStrip* strip_;
     Sorvane* canvas_;
     QMenu* contextMenu_;
     std::optional<PreviewSession> session_;

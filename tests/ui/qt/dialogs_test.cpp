@@ -182,6 +182,24 @@ using PrintOptionsDialogTest = DialogWorld;
 
 } // namespace
 
+TEST_F(PageSetupDialogTest, SaysBesideAValueWhileItIsTypedWhyItCannotBe)
+{
+    PageSetupDialog dialog(services());
+    showTab(dialog, 1);
+    const auto& hint = child<QLabel>(dialog, "labMarginHint");
+    EXPECT_EQ(hint.text(), "");
+    const QSize before = dialog.size();
+    typeInto(child<QLineEdit>(dialog, "txtTop"), "400");
+    EXPECT_TRUE(hint.text().startsWith("Top 400 mm is printed as 640 mm; "))
+        << hint.text().toStdString();
+    EXPECT_EQ(dialog.size(), before);
+    press(dialog, "cmdRestore");
+    EXPECT_EQ(hint.text(), "");
+    showTab(dialog, 0);
+    typeInto(child<QLineEdit>(dialog, "txtWidth"), "200");
+    EXPECT_TRUE(child<QLabel>(dialog, "labSizeHint").text().startsWith("Width \"200\" lacks"));
+}
+
 TEST_F(PageSetupDialogTest, HasEveryControlWithItsCaption)
 {
     const PageSetupDialog dialog(services());

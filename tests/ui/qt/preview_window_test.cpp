@@ -5,6 +5,7 @@
 
 #include "controls/qt/sorvane.h"
 #include "platform/run_time_error.h"
+#include "settings/settings_file.h"
 #include "support/test_paths.h"
 #include "ui/qt/icon_set.h"
 #include "ui/qt/preview_world.h"
@@ -83,8 +84,59 @@ TEST_F(PreviewWindowTest, CarriesItsNamesAndItsTitle)
     EXPECT_EQ(window.windowTitle(), "Print Preview ");
     EXPECT_NE(window.findChild<QToolBar*>("ActiveBar1"), nullptr);
     EXPECT_EQ(window.findChildren<QToolBar*>().size(), 1);
-    EXPECT_EQ(window.centralWidget(), window.findChild<Sorvane*>("Sorvane1"));
+    EXPECT_TRUE(window.centralWidget()->isAncestorOf(window.findChild<Sorvane*>("Sorvane1")));
     EXPECT_EQ(canvas().strSCliectRect, u"full");
+}
+
+TEST_F(PreviewWindowTest, SaysInAStripWhyThereAreNoPagesAndMendsIt)
+{
+    folder_.write("OstlConfig.ini", "Top= 4000\r\n");
+    EXPECT_THROW(opener_.openPreview(gridOf(3)), RunTimeError);
+    PreviewWindow& window = *opener_.window();
+    ASSERT_TRUE(QTest::qWaitForWindowExposed(&window));
+    QWidget& strip = *window.findChild<QWidget*>("Notice");
+    EXPECT_TRUE(strip.isVisible());
+    EXPECT_TRUE(window.findChild<QLabel*>("labNotice")->text().contains("Top= 4000 in "));
+    EXPECT_LE(strip.geometry().bottom(), window.canvas().geometry().top());
+    const auto button = [&](const char* name) { return window.findChild<QAbstractButton*>(name); };
+    EXPECT_TRUE(button("cmdNoticePageSetup")->isVisible());
+    EXPECT_FALSE(button("cmdNoticeGridStyle")->isVisible());
+    button("cmdNoticeDefaults")->click();
+    EXPECT_FALSE(strip.isVisible());
+    EXPECT_EQ(canvas().page.intTop, 907);
+    EXPECT_FALSE(canvas().document().texts(0).empty());
+    EXPECT_EQ(folder_.read("OstlConfig.ini.bak"), "Top= 4000\r\n");
+}
+
+TEST_F(PreviewWindowTest, OpensPageSetupFromItsStrip)
+{
+    PreviewWindow& window = preview(3);
+    writeSetting(platform_.record(), u"Top", u"4000");
+    click(2);
+    ASSERT_TRUE(window.findChild<QWidget*>("Notice")->isVisible());
+    QTimer::singleShot(0, &window, [] {
+        QWidget* const dialog = QApplication::activeModalWidget();
+        ASSERT_NE(dialog, nullptr);
+        EXPECT_EQ(dialog->windowTitle(), "Page Setup");
+        auto* const top = dialog->findChild<QLineEdit*>("txtTop");
+        top->setText("12");
+        dialog->findChild<QAbstractButton*>("cmdOk")->click();
+    });
+    window.findChild<QAbstractButton*>("cmdNoticePageSetup")->click();
+    EXPECT_FALSE(window.findChild<QWidget*>("Notice")->isVisible());
+    EXPECT_EQ(canvas().page.intTop, 1089);
+}
+
+TEST_F(PreviewWindowTest, HidesItsStripWhenItWasRead)
+{
+    PreviewWindow& window = preview(3);
+    writeSetting(platform_.record(), u"HeaderFontSize", u"0");
+    click(2);
+    QWidget& strip = *window.findChild<QWidget*>("Notice");
+    EXPECT_TRUE(strip.isVisible());
+    window.findChild<QAbstractButton*>("cmdNoticeClose")->click();
+    EXPECT_FALSE(strip.isVisible());
+    EXPECT_EQ(QApplication::focusWidget(), &window.canvas());
 }
 
 TEST_F(PreviewWindowTest, DisablesWhatRebuildsADocumentThatWasOpenedWithoutAGrid)

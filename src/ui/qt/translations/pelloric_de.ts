@@ -308,6 +308,41 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::NoticeStrip</name>
+    <message>
+        <source>Page &amp;Setup...</source>
+        <translation>&amp;Seite einrichten...</translation>
+    </message>
+    <message>
+        <source>Change paper, margins, header and footer</source>
+        <translation>Papier, Ränder, Kopf- und Fußzeile ändern</translation>
+    </message>
+    <message>
+        <source>&amp;Design Report...</source>
+        <translation>Bericht &amp;gestalten...</translation>
+    </message>
+    <message>
+        <source>Change fonts, colours and grid lines</source>
+        <translation>Schriften, Farben und Gitterlinien ändern</translation>
+    </message>
+    <message>
+        <source>Restore De&amp;faults</source>
+        <translation>&amp;Vorgaben wiederherstellen</translation>
+    </message>
+    <message>
+        <source>Give every setting that is missing or cannot be used its default value; the old file is kept beside</source>
+        <translation>Gibt jeder Einstellung, die fehlt oder unbrauchbar ist, ihren Vorgabewert; die alte Datei bleibt daneben erhalten</translation>
+    </message>
+    <message>
+        <source>Notice</source>
+        <translation>Hinweis</translation>
+    </message>
+    <message>
+        <source>Hide this notice</source>
+        <translation>Diesen Hinweis ausblenden</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::PageFiles</name>
     <message>
         <source>PDF document</source>
@@ -438,10 +473,6 @@
 </context>
 <context>
     <name>pelloric::qt::PreviewWindow</name>
-    <message>
-        <source>Save as PDF</source>
-        <translation>Als PDF speichern</translation>
-    </message>
     <message>
         <source>Printing was ended: %1 of %2 pages were sent.</source>
         <translation>Der Druck wurde beendet: %1 von %2 Seiten wurden gesendet.</translation>
@@ -582,6 +613,10 @@
     <message>
         <source>Keys</source>
         <translation>Tasten</translation>
+    </message>
+    <message>
+        <source>Save as PDF</source>
+        <translation>Als PDF speichern</translation>
     </message>
 </context>
 <context>

@@ -308,6 +308,41 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::NoticeStrip</name>
+    <message>
+        <source>Page &amp;Setup...</source>
+        <translation>Page &amp;Setup...</translation>
+    </message>
+    <message>
+        <source>Change paper, margins, header and footer</source>
+        <translation>Change paper, margins, header and footer</translation>
+    </message>
+    <message>
+        <source>&amp;Design Report...</source>
+        <translation>&amp;Design Report...</translation>
+    </message>
+    <message>
+        <source>Change fonts, colours and grid lines</source>
+        <translation>Change fonts, colours and grid lines</translation>
+    </message>
+    <message>
+        <source>Restore De&amp;faults</source>
+        <translation>Restore De&amp;faults</translation>
+    </message>
+    <message>
+        <source>Give every setting that is missing or cannot be used its default value; the old file is kept beside</source>
+        <translation>Give every setting that is missing or cannot be used its default value; the old file is kept beside</translation>
+    </message>
+    <message>
+        <source>Notice</source>
+        <translation>Notice</translation>
+    </message>
+    <message>
+        <source>Hide this notice</source>
+        <translation>Hide this notice</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::PageFiles</name>
     <message>
         <source>PDF document</source>
@@ -438,10 +473,6 @@
 </context>
 <context>
     <name>pelloric::qt::PreviewWindow</name>
-    <message>
-        <source>Save as PDF</source>
-        <translation>Save as PDF</translation>
-    </message>
     <message>
         <source>Printing was ended: %1 of %2 pages were sent.</source>
         <translation>Printing was ended: %1 of %2 pages were sent.</translation>
@@ -582,6 +613,10 @@
     <message>
         <source>Keys</source>
         <translation>Keys</translation>
+    </message>
+    <message>
+        <source>Save as PDF</source>
+        <translation>Save as PDF</translation>
     </message>
 </context>
 <context>

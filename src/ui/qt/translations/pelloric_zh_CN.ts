@@ -308,6 +308,41 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::NoticeStrip</name>
+    <message>
+        <source>Page &amp;Setup...</source>
+        <translation>页面设置(&amp;S)...</translation>
+    </message>
+    <message>
+        <source>Change paper, margins, header and footer</source>
+        <translation>更改纸张、页边距、页眉和页脚</translation>
+    </message>
+    <message>
+        <source>&amp;Design Report...</source>
+        <translation>设计报表(&amp;D)...</translation>
+    </message>
+    <message>
+        <source>Change fonts, colours and grid lines</source>
+        <translation>更改字体、颜色和网格线</translation>
+    </message>
+    <message>
+        <source>Restore De&amp;faults</source>
+        <translation>恢复默认值(&amp;F)</translation>
+    </message>
+    <message>
+        <source>Give every setting that is missing or cannot be used its default value; the old file is kept beside</source>
+        <translation>将缺失或不可用的设置恢复为默认值；旧文件会保留在旁边</translation>
+    </message>
+    <message>
+        <source>Notice</source>
+        <translation>提示</translation>
+    </message>
+    <message>
+        <source>Hide this notice</source>
+        <translation>隐藏此提示</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::PageFiles</name>
     <message>
         <source>PDF document</source>
@@ -438,10 +473,6 @@
 </context>
 <context>
     <name>pelloric::qt::PreviewWindow</name>
-    <message>
-        <source>Save as PDF</source>
-        <translation>另存为 PDF</translation>
-    </message>
     <message>
         <source>Printing was ended: %1 of %2 pages were sent.</source>
         <translation>打印已结束：共 %2 页，已发送 %1 页。</translation>
@@ -582,6 +613,10 @@
     <message>
         <source>Keys</source>
         <translation>快捷键</translation>
+    </message>
+    <message>
+        <source>Save as PDF</source>
+        <translation>另存为 PDF</translation>
     </message>
 </context>
 <context>
