@@ -2,7 +2,7 @@
 # SPDX-FileCopyrightText: The Pelloric authors
 # SPDX-License-Identifier: MIT
 
-# Runs scripts that show the preview window:
+# Runs scripts that show the preview window, and a preview by settings that cannot be used:
 #   run_window_e2e.sh PROGRAM FOLDER
 # The window of `pelloric run --window` stays until the person closes it, and the script's exit
 # status is the program's. Screenshots stay in the folder.
@@ -68,6 +68,25 @@ start ended
 waitForEnd "$Host"
 [ "$Status" -eq 3 ] || fail "the script's status 3 became $Status"
 
+# A value that no page can be built by leaves a window that says so; restoring the defaults mends it.
+Settings=$HOME/.config/pelloric/OstlConfig.ini
+sed -i 's/^Top= .*/Top= 4000\r/' "$Settings"
+"$Program" preview "$Folder/towns.csv" > "$Folder/bad.out" 2> "$Folder/bad.err" &
+Host=$!
+Processes+=("$Host")
+toWindowOf "$Host" '^Print Preview $'
+sleep 0.5
+import -window "$Window" "$Folder/bad.png"
+grep -q 'Top= 4000 in .*OstlConfig.ini: this margin is at most 361 mm' "$Folder/bad.err" ||
+    fail "nobody says which setting cannot be used: $(cat "$Folder/bad.err")"
+xdotool key alt+f
+waitForInk "$Window" "$Folder/mended.png" 100000 400
+grep -q '^Top= 10' "$Settings" || fail "the bad value was not mended"
+grep -q '^Top= 4000' "$Settings.bak" || fail "the old settings were not kept beside"
+xdotool key alt+F4
+waitForEnd "$Host"
+[ "$Status" -eq 0 ] || fail "the preview ended with status $Status"
+
 # Without a window server the program says so, and what to do.
 Status=0
 env -u DISPLAY -u QT_QPA_PLATFORM "$Program" run --window "$Folder/shown.js" "$Folder/towns.csv" \
@@ -75,4 +94,4 @@ env -u DISPLAY -u QT_QPA_PLATFORM "$Program" run --window "$Folder/shown.js" "$F
 [ "$Status" -ne 0 ] || fail "there was no display, and no error"
 grep -q 'there is no display' "$Folder/nowhere.err" || fail "no display: $(cat "$Folder/nowhere.err")"
 
-printf 'run_window_e2e: a script shows, waits and ends\n'
+printf 'run_window_e2e: a script shows, waits and ends; a preview that cannot be built is mended\n'
