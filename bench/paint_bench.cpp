@@ -1,10 +1,11 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "platform/qt/qt_platform.h"
 #include "sample_table.h"
 #include "settings/default_settings.h"
+#include <pelloric/sorvane.h>
 
 #include <QCoreApplication>
 #include <QTemporaryDir>

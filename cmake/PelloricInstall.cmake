@@ -2,37 +2,152 @@
 # SPDX-License-Identifier: MIT
 
 # What `cmake --install` lays down, in four components: the libraries that programs run with
-# (runtime), headers and the package for find_package (development), the program with what desktops
-# and shells need of it (tools), and the plugin of Qt Designer (designer).
+# (runtime), headers and the packages that find_package and pkg-config read (development), the
+# program with what desktops and shells need of it (tools), and the plugin of Qt Designer (designer).
+# The package finds everything from where it lies itself, so that the whole may be moved. The kind of
+# library that was not chosen is laid down only where it is asked for by --component static or shared,
+# as the tests do.
 
 include(CMakePackageConfigHelpers)
 set(PELLORIC_PACKAGE_DIR "${CMAKE_INSTALL_LIBDIR}/cmake/Pelloric")
 
-# What programs load at run time is one component, what they are linked with another.
-function(pelloric_install_library name)
-    install(TARGETS ${name} EXPORT PelloricTargets
-        LIBRARY COMPONENT runtime NAMELINK_COMPONENT development
-        ARCHIVE COMPONENT development
-        RUNTIME COMPONENT runtime)
+# pelloric_dependencies(TARGET RESULT): lines that find what a static library of the target needs.
+function(pelloric_dependencies target result)
+    set(lines "")
+    if(TARGET ${target})
+        get_target_property(packages ${target} PELLORIC_PACKAGES)
+        get_target_property(private ${target} PELLORIC_PRIVATE_LIBRARIES)
+        foreach(item IN LISTS private)
+            if(item MATCHES "^Qt6::(.*)$")
+                string(APPEND lines "    find_dependency(Qt6 6.4 COMPONENTS ${CMAKE_MATCH_1})\n")
+            endif()
+        endforeach()
+        foreach(package IN LISTS packages)
+            string(APPEND lines "    find_dependency(${package})\n")
+        endforeach()
+    endif()
+    set(${result} "${lines}" PARENT_SCOPE)
 endfunction()
 
-set(CMAKE_INSTALL_DEFAULT_COMPONENT_NAME development)
-pelloric_install_library(pelloric_core)
-install(DIRECTORY "${PROJECT_SOURCE_DIR}/src/" DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/pelloric"
-    FILES_MATCHING PATTERN "*.h" PATTERN "qt" EXCLUDE)
-
-if(TARGET pelloric)
-    pelloric_install_library(pelloric)
-    foreach(room IN ITEMS platform grids tables print export controls ui script)
-        install(DIRECTORY "${PROJECT_SOURCE_DIR}/src/${room}/qt/"
-            DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/pelloric/${room}/qt"
-            FILES_MATCHING PATTERN "*.h")
+# pelloric_package(KIND): rules for the libraries of a kind.
+function(pelloric_package kind)
+    set(runtime runtime)
+    set(development development)
+    set(excluded "")
+    if(NOT kind STREQUAL PELLORIC_KIND)
+        set(runtime ${kind})
+        set(development ${kind})
+        set(excluded EXCLUDE_FROM_ALL)
+    endif()
+    foreach(component IN ITEMS core widgets tables script)
+        set(target pelloric_${component})
+        if(component STREQUAL "widgets")
+            set(target pelloric)
+        endif()
+        set(name pelloric-${component})
+        if(kind STREQUAL "shared")
+            string(APPEND target _shared)
+        endif()
+        if(NOT TARGET ${target})
+            continue()
+        endif()
+        install(TARGETS ${target} EXPORT Pelloric-${component}-${kind}
+            LIBRARY COMPONENT ${runtime} NAMELINK_COMPONENT ${development} ${excluded}
+            ARCHIVE COMPONENT ${development} ${excluded}
+            RUNTIME COMPONENT ${runtime} ${excluded})
+        install(EXPORT Pelloric-${component}-${kind} FILE Pelloric-${component}-${kind}.cmake
+            NAMESPACE Pelloric:: DESTINATION "${PELLORIC_PACKAGE_DIR}"
+            COMPONENT ${development} ${excluded})
+        pelloric_pkg_config(${component} ${kind})
+        install(FILES "${PROJECT_BINARY_DIR}/${kind}/${name}.pc"
+            DESTINATION "${CMAKE_INSTALL_LIBDIR}/pkgconfig" COMPONENT ${development} ${excluded})
     endforeach()
-    install(FILES "${PROJECT_SOURCE_DIR}/cmake/FindHarfBuzzSubset.cmake"
-        "${PROJECT_SOURCE_DIR}/cmake/FindLibDeflate.cmake"
-        "${PROJECT_SOURCE_DIR}/cmake/FindLibZip.cmake"
-        "${PROJECT_SOURCE_DIR}/cmake/FindUchardet.cmake" DESTINATION "${PELLORIC_PACKAGE_DIR}")
-endif()
+    install(DIRECTORY "${PROJECT_SOURCE_DIR}/include/pelloric"
+        DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}" COMPONENT ${development} ${excluded})
+    set(PELLORIC_INSTALLED_KIND ${kind})
+    set(PELLORIC_STATIC OFF)
+    if(kind STREQUAL "static")
+        set(PELLORIC_STATIC ON)
+    endif()
+    pelloric_dependencies(pelloric PELLORIC_WIDGETS_DEPENDENCIES)
+    pelloric_dependencies(pelloric_tables PELLORIC_TABLES_DEPENDENCIES)
+    configure_package_config_file("${PROJECT_SOURCE_DIR}/cmake/PelloricConfig.cmake.in"
+        "${PROJECT_BINARY_DIR}/${kind}/PelloricConfig.cmake"
+        INSTALL_DESTINATION "${PELLORIC_PACKAGE_DIR}")
+    file(GLOB finders "${PROJECT_SOURCE_DIR}/cmake/Find*.cmake")
+    install(FILES "${PROJECT_BINARY_DIR}/${kind}/PelloricConfig.cmake"
+        "${PROJECT_BINARY_DIR}/PelloricConfigVersion.cmake"
+        ${finders}
+        DESTINATION "${PELLORIC_PACKAGE_DIR}" COMPONENT ${development} ${excluded})
+endfunction()
+
+# pelloric_link_options(TARGET RESULT): " -lpng -lz" for a target of a system's library.
+function(pelloric_link_options target result)
+    get_target_property(files ${target} IMPORTED_LOCATION)
+    get_target_property(others ${target} INTERFACE_LINK_LIBRARIES)
+    set(options "")
+    foreach(file IN LISTS files others)
+        if(TARGET "${file}")
+            pelloric_link_options(${file} more)
+            string(APPEND options "${more}")
+        elseif(file MATCHES "/lib([^/]+)\\.(so|a|dylib)$")
+            string(APPEND options " -l${CMAKE_MATCH_1}")
+        endif()
+    endforeach()
+    set(${result} "${options}" PARENT_SCOPE)
+endfunction()
+
+# What a component's pkg-config file names, by component: what it builds on, and in a static library
+# what the host's linker needs besides.
+set(PELLORIC_PC_core_requires "")
+set(PELLORIC_PC_widgets_requires "Qt6Widgets Qt6PrintSupport")
+set(PELLORIC_PC_tables_requires "pelloric-widgets")
+set(PELLORIC_PC_script_requires "pelloric-widgets Qt6Qml")
+
+# pelloric_pkg_config(COMPONENT KIND): writes pelloric-COMPONENT.pc.
+function(pelloric_pkg_config component kind)
+    set(library pelloric_${component})
+    if(component STREQUAL "widgets")
+        set(library pelloric)
+    endif()
+    set(requires "${PELLORIC_PC_${component}_requires}")
+    set(libs "-L\${libdir} -l${library}")
+    if(kind STREQUAL "static")
+        get_target_property(private ${library} PELLORIC_PRIVATE_LIBRARIES)
+        if(component STREQUAL "widgets")
+            string(APPEND libs " -lpelloric_core")
+        endif()
+        foreach(item IN LISTS private)
+            if(item MATCHES "^Qt6::(.*)$")
+                string(APPEND requires " Qt6${CMAKE_MATCH_1}")
+            elseif(TARGET ${item})
+                pelloric_link_options(${item} options)
+                string(APPEND libs "${options}")
+            endif()
+        endforeach()
+    endif()
+    string(STRIP "${requires}" requires)
+    file(RELATIVE_PATH up "/${CMAKE_INSTALL_LIBDIR}/pkgconfig" "/")
+    file(CONFIGURE OUTPUT "${PROJECT_BINARY_DIR}/${kind}/pelloric-${component}.pc" CONTENT
+"prefix=\${pcfiledir}/${up}
+libdir=\${prefix}/${CMAKE_INSTALL_LIBDIR}
+includedir=\${prefix}/${CMAKE_INSTALL_INCLUDEDIR}
+
+Name: Pelloric ${component}
+Description: ${PROJECT_DESCRIPTION}
+Version: ${PROJECT_VERSION}
+Requires: ${requires}
+Cflags: -I\${includedir} -std=c++20
+Libs: ${libs}
+" @ONLY)
+endfunction()
+
+write_basic_package_version_file("${PROJECT_BINARY_DIR}/PelloricConfigVersion.cmake"
+    COMPATIBILITY SameMajorVersion)
+foreach(kind IN LISTS PELLORIC_KINDS)
+    pelloric_package(${kind})
+endforeach()
+
 if(TARGET pelloric_app)
     install(TARGETS pelloric_app COMPONENT tools)
     install(DIRECTORY "${PROJECT_SOURCE_DIR}/samples/" DESTINATION "${CMAKE_INSTALL_DATADIR}/pelloric/samples"
@@ -77,11 +192,3 @@ if(NOT TARGET uninstall)
         COMMAND "${CMAKE_COMMAND}" -DMANIFESTS=${PROJECT_BINARY_DIR}
             -P "${PROJECT_SOURCE_DIR}/cmake/Uninstall.cmake")
 endif()
-
-configure_package_config_file("${PROJECT_SOURCE_DIR}/cmake/PelloricConfig.cmake.in"
-    "${PROJECT_BINARY_DIR}/PelloricConfig.cmake" INSTALL_DESTINATION "${PELLORIC_PACKAGE_DIR}")
-write_basic_package_version_file("${PROJECT_BINARY_DIR}/PelloricConfigVersion.cmake"
-    COMPATIBILITY SameMajorVersion)
-install(FILES "${PROJECT_BINARY_DIR}/PelloricConfig.cmake"
-    "${PROJECT_BINARY_DIR}/PelloricConfigVersion.cmake" DESTINATION "${PELLORIC_PACKAGE_DIR}")
-install(EXPORT PelloricTargets NAMESPACE Pelloric:: DESTINATION "${PELLORIC_PACKAGE_DIR}")

@@ -45,7 +45,7 @@ set(CPACK_COMPONENT_DEVELOPMENT_DESCRIPTION "print preview and printing of grids
 
 set(CPACK_DEBIAN_TOOLS_PACKAGE_NAME pelloric)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_SECTION utils)
-set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS "${same}, libqt6sql6-sqlite")
+set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS libqt6sql6-sqlite)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_RECOMMENDS "fonts-arphic-uming")
 set(CPACK_COMPONENT_TOOLS_DESCRIPTION "previews, exports and prints tables
  The program pelloric lays out CSV and TSV files and tables of SQLite

@@ -2,13 +2,14 @@
 # SPDX-FileCopyrightText: The Pelloric authors
 # SPDX-License-Identifier: MIT
 
-# Includes go one way: a room of src includes only rooms before it, and Qt only below a folder qt.
+# Includes go one way: a room of src includes only rooms before it, and Qt only below a folder qt;
+# public headers include nothing of src.
 
 set -euo pipefail
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
 # In the order of their dependencies.
-Rooms=(platform settings document grids tables report view export print controls ui script)
+Rooms=(platform settings document grids tables report view export print controls ui script host)
 
 found=0
 
@@ -26,6 +27,10 @@ forbid '^#include <Q' 'Qt is included only below folders named qt' 'src/*.h' 'sr
     ':!src/*/qt/*'
 forbid '^#include "[a-z_]+/qt/' 'the core includes nothing of the Qt side' 'src/*.h' 'src/*.cpp' \
     ':!src/*/qt/*'
+
+forbid '^#include "' 'a public header includes nothing of src' 'include/*.h'
+forbid '^#include <pelloric/(export|grids|kestrane|pelloric|preview|printing|report|sorvane)\.h' \
+    'the core includes no public header of the Qt side' 'src/*.h' 'src/*.cpp' ':!src/*/qt/*'
 
 for i in "${!Rooms[@]}"; do
     later=("${Rooms[@]:i+1}")

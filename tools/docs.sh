@@ -17,28 +17,6 @@ Build=$1
 Out=out/docs
 Pictures=$Out/pictures
 
-# The headers that hosts use.
-Headers=(
-    src/controls/canvas.h
-    src/controls/facade.h
-    src/controls/qt/default_platform.h
-    src/controls/qt/kestrane.h
-    src/controls/qt/sorvane.h
-    src/export/qt/page_export.h
-    src/grids/qt/data_view_grid.h
-    src/grids/qt/grid_for.h
-    src/grids/table_grid.h
-    src/platform/automation_object.h
-    src/platform/run_time_error.h
-    src/report/report_options.h
-    src/settings/default_settings.h
-    src/tables/qt/csv_table.h
-    src/tables/qt/sqlite_table.h
-    src/ui/qt/preview_opener.h
-    src/ui/qt/translation.h
-)
-[ ! -d include/pelloric ] || Headers=(include/pelloric)
-
 # The first page of a table as a picture: pagePicture NAME TABLE [OPTION...]
 pagePicture() {
     local name=$1 table=$2
@@ -73,7 +51,7 @@ mkdir -p "$Pictures"
 makePictures
 version=$(sed -n 's/^project(Pelloric VERSION \([0-9.]*\).*/\1/p' CMakeLists.txt)
 sed -e "s|@VERSION@|$version|" -e "s|@SOURCE@|$PWD|g" -e "s|@OUT@|$PWD/$Out|" \
-    -e "s|@PICTURES@|$PWD/$Pictures|" -e "s|@HEADERS@|${Headers[*]}|" docs/Doxyfile.in > "$Out/Doxyfile"
+    -e "s|@PICTURES@|$PWD/$Pictures|" -e "s|@HEADERS@|$PWD/include/pelloric|" docs/Doxyfile.in > "$Out/Doxyfile"
 doxygen "$Out/Doxyfile"
 requirePictures
 printf 'The site: %s\n' "$PWD/$Out/html/index.html"

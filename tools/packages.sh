@@ -42,6 +42,7 @@ PackagesTest=(
     librsvg2-bin
     mupdf-tools
     openbox
+    pkgconf
     poppler-utils
     python3
     python3-pikepdf

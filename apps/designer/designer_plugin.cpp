@@ -3,9 +3,10 @@
 
 #include "designer_plugin.h"
 
-#include "controls/qt/kestrane.h"
-#include "controls/qt/sorvane.h"
 #include "ui/qt/icon_set.h"
+
+#include <pelloric/kestrane.h>
+#include <pelloric/sorvane.h>
 
 #include <QApplication>
 #include <QIcon>
@@ -32,12 +33,12 @@ struct ControlRow {
 template <typename Control> QWidget* make(QWidget* parent) { return new Control(parent); }
 
 constexpr auto Controls = std::to_array<ControlRow>({
-    { "pelloric::qt::Kestrane", "controls/qt/kestrane.h", "print", "Previews a grid of the form",
+    { "pelloric::qt::Kestrane", "pelloric/kestrane.h", "print", "Previews a grid of the form",
         "Call its doPreview with a table view, a tree widget or any object with the members of a "
         "grid: the preview window opens with the grid's pages. It need not be shown on the form. "
         "AddHeader and AddFooter set the texts of each page.",
         "preview", 48, 48, make<qt::Kestrane> },
-    { "pelloric::qt::Sorvane", "controls/qt/sorvane.h", "whole-page",
+    { "pelloric::qt::Sorvane", "pelloric/sorvane.h", "whole-page",
         "Shows the pages of a report in a form of your own",
         "The page canvas of the preview window. Set strSCliectRect to \"full\", then call "
         "doPreview "

@@ -4,7 +4,7 @@
 #include "demo_walk.h"
 
 #include "command_line.h"
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "demo_window.h"
 #include "export/qt/page_export.h"
 #include "platform/qt/qt_platform.h"
@@ -12,6 +12,7 @@
 #include "table_source.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
+#include <pelloric/sorvane.h>
 
 #include <QAbstractButton>
 #include <QAction>

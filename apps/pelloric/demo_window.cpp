@@ -4,7 +4,6 @@
 #include "demo_window.h"
 
 #include "command_line.h"
-#include "controls/qt/kestrane.h"
 #include "demo_code/demo_code.h"
 #include "own_table.h"
 #include "platform/qt/qt_platform.h"
@@ -15,6 +14,8 @@
 #include "tables/qt/csv_table.h"
 #include "ui/qt/icon_set.h"
 #include "ui/qt/named_boxes.h"
+
+#include <pelloric/kestrane.h>
 
 #include <QCheckBox>
 #include <QClipboard>

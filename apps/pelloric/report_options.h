@@ -4,7 +4,7 @@
 #pragma once
 
 #include "command_line.h"
-#include "settings/report_settings.h"
+#include <pelloric/settings.h>
 
 namespace pelloric {
 struct Platform;

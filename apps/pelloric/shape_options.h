@@ -4,7 +4,8 @@
 #pragma once
 
 #include "command_line.h"
-#include "report/report_options.h"
+
+#include <pelloric/options.h>
 
 namespace pelloric::app {
 

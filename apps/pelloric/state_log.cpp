@@ -4,9 +4,10 @@
 #include "state_log.h"
 
 #include "command_line.h"
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
+#include <pelloric/sorvane.h>
 
 #include <QAbstractButton>
 #include <QApplication>

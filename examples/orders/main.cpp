@@ -7,7 +7,7 @@
 
 #include "order_form.h"
 
-#include <ui/qt/preview_opener.h>
+#include <pelloric/preview.h>
 
 #include <QApplication>
 #include <QSqlDatabase>
@@ -58,7 +58,7 @@ bool fillDatabase()
 int main(int count, char** arguments)
 {
     QApplication application(count, arguments);
-    pelloric::qt::installPreviewWindow();
+    pelloric::qt::usePreviewWindow();
     if (!fillDatabase()) {
         std::fprintf(stderr, "%s\n", qPrintable(QSqlDatabase::database().lastError().text()));
         return 1;

@@ -3,11 +3,7 @@
 
 #include "order_form.h"
 
-#include <controls/qt/default_platform.h>
-#include <controls/qt/kestrane.h>
-#include <controls/qt/sorvane.h>
-#include <export/qt/page_export.h>
-#include <platform/run_time_error.h>
+#include <pelloric/pelloric.h>
 
 #include <QFileDialog>
 #include <QHeaderView>
@@ -43,9 +39,11 @@ OrderForm::OrderForm()
     preview_->hide();
 
     // A canvas of one's own paints nothing until it is told that it is no placeholder.
-    pages_->canvas().strSCliectRect = u"full";
-    pages_->canvas().options.fit.toSheet = true;
-    pages_->canvas().options.totals = { { u"Pieces" }, { u"Amount" } };
+    pages_->setstrSCliectRect(QStringLiteral("full"));
+    pelloric::ReportOptions options;
+    options.fit.toSheet = true;
+    options.totals = { { u"Pieces" }, { u"Amount" } };
+    pages_->setReportOptions(options);
     pages_->setDispScale(FirstScale);
 
     auto* const halves = new QSplitter;
@@ -83,10 +81,8 @@ void OrderForm::buildPages() { pages_->doPreview(view_); }
 
 bool OrderForm::savePdf(const QString& path)
 {
-    const pelloric::Canvas& canvas = pages_->canvas();
     try {
-        pelloric::qt::exportPdf(canvas.document(), canvas.page,
-            pelloric::qt::defaultPlatform().fonts(), { .title = u"Orders" }, path.toStdU16String());
+        exportPdf(*pages_, { .path = path, .title = QStringLiteral("Orders") });
     } catch (const pelloric::RunTimeError& error) {
         QMessageBox::warning(this, windowTitle(), QString::fromUtf8(error.what()));
         return false;

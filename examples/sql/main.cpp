@@ -1,8 +1,7 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include <controls/qt/kestrane.h>
-#include <ui/qt/preview_opener.h>
+#include <pelloric/pelloric.h>
 
 #include <QtSql>
 #include <QtWidgets>
@@ -10,7 +9,7 @@
 int main(int count, char** arguments)
 {
     QApplication application(count, arguments);
-    pelloric::qt::installPreviewWindow();
+    pelloric::qt::usePreviewWindow();
 
     QSqlDatabase database = QSqlDatabase::addDatabase("QSQLITE");
     database.setDatabaseName(QApplication::arguments().value(1, "samples/samples.sqlite"));

@@ -1,15 +1,14 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include <controls/qt/kestrane.h>
-#include <ui/qt/preview_opener.h>
+#include <pelloric/pelloric.h>
 
 #include <QtWidgets>
 
 int main(int count, char** arguments)
 {
     QApplication application(count, arguments);
-    pelloric::qt::installPreviewWindow(); // once, after the QApplication
+    pelloric::qt::usePreviewWindow(); // once, after the QApplication
 
     QWidget form;
     auto* table = new QTableWidget(40, 3); // or any other view or grid

@@ -1,15 +1,14 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include <controls/qt/kestrane.h>
-#include <ui/qt/preview_opener.h>
+#include <pelloric/pelloric.h>
 
 #include <QtWidgets>
 
 int main(int count, char** arguments)
 {
     QApplication application(count, arguments);
-    pelloric::qt::installPreviewWindow();
+    pelloric::qt::usePreviewWindow();
 
     QTreeWidget files;
     files.setHeaderLabels({ "Name", "Bytes", "Changed" });

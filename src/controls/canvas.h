@@ -7,10 +7,11 @@
 #include "document/recorder.h"
 #include "report/grid_reader.h"
 #include "report/layout_engine.h"
-#include "report/report_options.h"
 #include "report/report_style.h"
-#include "settings/report_settings.h"
 #include "view/view_state.h"
+
+#include <pelloric/options.h>
+#include <pelloric/settings.h>
 
 #include <filesystem>
 #include <functional>

@@ -5,6 +5,8 @@
 
 #include "platform/text.h"
 
+#include <pelloric/settings.h>
+
 #include <cstdint>
 #include <memory>
 
@@ -13,9 +15,6 @@ namespace pelloric {
 class AutomationObject;
 enum class SettingKey;
 struct Platform;
-
-/// The slots of a header or footer line.
-enum class AlignmentType : std::int16_t { LocLeft = 0, LocCenter = 1, LocRight = 2 };
 
 /// Opens the window that previews a grid.
 class PreviewOpener {

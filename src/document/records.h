@@ -7,21 +7,11 @@
 #include "platform/text.h"
 #include "platform/units.h"
 
+#include <pelloric/records.h>
+
 #include <cstdint>
 
 namespace pelloric {
-
-/// A font as settings and texts describe it.
-struct Font {
-    Text name = u"宋体"; ///< face name; a face that is not installed is drawn in its substitute
-    float size = 11; ///< points
-    bool bold = false;
-    bool italic = false;
-    bool strikethrough = false; ///< kept in settings only, never in a page's text
-    bool underline = false; ///< kept in settings only, never in a page's text
-
-    bool operator==(const Font&) const = default;
-};
 
 /// Pen and fill of a line or rectangle.
 struct LinePen {
@@ -33,41 +23,6 @@ struct LinePen {
     Color FillColor = rgb(224, 224, 224);
 
     bool operator==(const LinePen&) const = default;
-};
-
-/// One straight line, or one filled rectangle.
-struct Lineobj {
-    Tpoint pt1; ///< start, or a corner
-    Tpoint pt2; ///< end, or the opposite corner
-    std::int16_t LineStyle = SolidPen;
-    Color LineColor = 0;
-    std::int16_t LineWidth = 1; ///< device pixels
-    std::int16_t FillStyle = TransparentFill;
-    Color FillColor = 0;
-
-    bool operator==(const Lineobj&) const = default;
-};
-
-/// One run of text printed at a point.
-struct Textobj {
-    Tpoint pt; ///< top-left corner
-    Text Str; ///< may hold `PageCountToken`
-    Font prnFont; ///< name, size, bold and italic only
-    Color ForeColor = 0;
-
-    bool operator==(const Textobj&) const = default;
-};
-
-/// The one picture that a page may carry.
-struct MapLocation {
-    std::int16_t nLeft = 0; ///< twips
-    std::int16_t nTop = 0; ///< twips
-    std::int16_t nWidth = 0; ///< twips
-    std::int16_t nHeight = 0; ///< twips
-    Text nFJBH; ///< identifier of the picture
-    Text strFilePath; ///< image file that is painted into the rectangle
-
-    bool operator==(const MapLocation&) const = default;
 };
 
 /// Stands in recorded texts for the number of pages, which is known only when the layout ends.

@@ -80,10 +80,12 @@ RunTimeError::RunTimeError(ErrorNumber number, TextView detail)
 {
 }
 
-TextView RunTimeError::detail() const
+std::u16string_view RunTimeError::detail() const
 {
     const std::size_t plain = errorText(number_).size();
     return text_.size() > plain ? TextView(text_).substr(plain + 2) : TextView();
 }
+
+RunTimeError::~RunTimeError() = default;
 
 } // namespace pelloric

@@ -4,7 +4,8 @@
 #pragma once
 
 #include "platform/row_set.h"
-#include "report/report_options.h"
+
+#include <pelloric/options.h>
 
 #include <vector>
 

@@ -3,19 +3,13 @@
 
 #pragma once
 
+#include <pelloric/records.h>
+
 #include <cstdint>
 #include <span>
 #include <vector>
 
 namespace pelloric {
-
-/// A band of printed columns, both ends included; columns count from 1.
-struct ColPos {
-    std::int16_t StartCol = 1;
-    std::int16_t EndCol = 1;
-
-    bool operator==(const ColPos&) const = default;
-};
 
 /// Sum of the widths of columns: twips.
 double tableWidthOf(std::span<const double> widths);

@@ -8,6 +8,8 @@
 #include "platform/units.h"
 #include "report/column_bands.h"
 
+#include <pelloric/records.h>
+
 #include <memory>
 #include <optional>
 #include <span>
@@ -20,14 +22,6 @@ class CellLooks;
 class LateBoundRows;
 class MessageLoop;
 class TableRowSet;
-
-/// The kinds of grids; decides which members a reader uses.
-enum class PrintObjKind : std::int16_t {
-    MSHFlexGrid = 0,
-    MSFlexGrid = 1,
-    ListView = 2,
-    datagrid = 3
-};
 
 /// A grid of more columns, hidden ones among them, is refused before any of them is looked at.
 inline constexpr std::int32_t MostGridColumns = 1'000'000;

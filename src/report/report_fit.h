@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "report/report_options.h"
+#include <pelloric/options.h>
 
 #include <cstdint>
 #include <span>

@@ -3,8 +3,11 @@
 
 #pragma once
 
-#include "report/report_options.h"
+#include "platform/text.h"
 
+#include <pelloric/options.h>
+
+#include <optional>
 #include <vector>
 
 namespace pelloric {

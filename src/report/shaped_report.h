@@ -4,7 +4,8 @@
 #pragma once
 
 #include "report/layout_engine.h"
-#include "report/report_options.h"
+
+#include <pelloric/options.h>
 
 #include <vector>
 

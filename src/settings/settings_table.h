@@ -3,7 +3,9 @@
 
 #pragma once
 
-#include "settings/report_settings.h"
+#include "platform/text.h"
+
+#include <pelloric/settings.h>
 
 #include <span>
 #include <variant>

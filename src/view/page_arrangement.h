@@ -5,30 +5,12 @@
 
 #include "platform/units.h"
 
+#include <pelloric/records.h>
+
 namespace pelloric {
 
 struct PageSetup;
 class PageDocument;
-
-/// How pages are arranged in the viewport; any other value shows one page.
-enum class OrderStyle : std::int32_t {
-    Whole = 0, ///< one page, fitted to the viewport
-    One = 1, ///< one page at the present scale
-    Two = 2, ///< side by side, landscape pages one above the other
-    Four = 3, ///< two rows of two
-    Multiple = 4, ///< as many as fit across, in as many rows as it takes
-    UserCustom = 5, ///< one page; never set by the canvas itself
-    Six = 6, ///< two rows of three
-};
-
-/// The page window: which pages a multi-page arrangement shows.
-struct MuliPageType {
-    std::int16_t nPages = 0; ///< pages shown; 0 means no window
-    std::int16_t MinPage = 0; ///< first page, zero-based
-    std::int16_t MaxPage = 0; ///< last page, zero-based
-
-    bool operator==(const MuliPageType&) const = default;
-};
 
 /// Columns and rows of pages.
 struct PageGrid {

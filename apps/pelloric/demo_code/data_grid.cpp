@@ -4,13 +4,10 @@
 #include "demo_code.h"
 
 //! [shown]
-#include "controls/qt/kestrane.h"
-#include "grids/qt/data_view_grid.h"
+#include <pelloric/pelloric.h>
 
 #include <QSqlTableModel>
 #include <QTableView>
-
-#include <memory>
 
 /// The view shows a QSqlTableModel: model->setTable("time_zones"), model->select(). As a data grid
 /// its records are walked in place; doPreview(&view) prints it as it is shown instead.
@@ -20,6 +17,6 @@ void previewQuery(pelloric::qt::Kestrane& preview, QTableView& view, const QStri
     preview.AddHeader(QStringLiteral("Time Zones"), Place::LocLeft);
     preview.AddHeader(QStringLiteral("[Date Printed]"), Place::LocRight);
     preview.AddFooter(footer, Place::LocCenter); // "[Page # of Pages #]"
-    preview.doPreview(std::make_unique<pelloric::qt::DataViewGrid>(view));
+    preview.doPreview(pelloric::qt::dataGrid(view).get());
 }
 //! [shown]

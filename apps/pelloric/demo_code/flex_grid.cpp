@@ -4,11 +4,11 @@
 #include "demo_code.h"
 
 //! [shown]
-#include "controls/qt/kestrane.h"
+#include <pelloric/pelloric.h>
 
 #include <QTableWidget>
 
-/// Once, after the QApplication: pelloric::qt::installPreviewWindow();
+/// Once, after the QApplication: pelloric::qt::usePreviewWindow();
 /// "preview" is a Kestrane on the form: new pelloric::qt::Kestrane(form).
 void previewTable(pelloric::qt::Kestrane& preview, QTableWidget& table, const QString& footer)
 {

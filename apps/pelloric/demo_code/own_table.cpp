@@ -4,7 +4,7 @@
 #include "demo_code.h"
 
 //! [shown]
-#include "controls/qt/kestrane.h"
+#include <pelloric/pelloric.h>
 
 #include <QTableView>
 

@@ -1,9 +1,12 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/kestrane.h"
+#include <pelloric/kestrane.h>
 
+#include "controls/facade.h"
 #include "controls/qt/default_platform.h"
+#include "controls/qt/member_calls.h"
+#include "controls/qt/plain_calls.h"
 #include "controls/qt/published_values.h"
 #include "grids/qt/grid_for.h"
 #include "platform/platform.h"
@@ -40,17 +43,28 @@ struct CurrentOpener final : PreviewOpener {
 
 } // namespace
 
-/// What works without the window.
 struct Kestrane::Parts {
-    explicit Parts(QtPlatform& services)
-        : platform(services.record())
-        , facade(platform, opener)
+    /// What works without the window.
+    struct Core {
+        explicit Core(QtPlatform& services)
+            : platform(services.record())
+            , facade(platform, opener)
+        {
+        }
+
+        Platform platform;
+        CurrentOpener opener;
+        Facade facade;
+    };
+
+    Parts(Kestrane& control, QtPlatform& services)
+        : core(std::make_shared<Core>(services))
+        , calls(control, core, core->platform, [] {})
     {
     }
 
-    Platform platform;
-    CurrentOpener opener;
-    Facade facade;
+    std::shared_ptr<Core> core; ///< shared with the members that run
+    MemberCalls calls;
 };
 
 Kestrane::Kestrane(QWidget* parent)
@@ -60,9 +74,7 @@ Kestrane::Kestrane(QWidget* parent)
 
 Kestrane::Kestrane(QtPlatform& platform, QWidget* parent)
     : KestraneCalls(parent)
-    , parts_(std::make_shared<Parts>(platform))
-    , facade_(parts_->facade)
-    , calls_(*this, parts_, parts_->platform, [] {})
+    , parts_(std::make_unique<Parts>(*this, platform))
 {
     registerRecords();
     setObjectName(QStringLiteral("Kestrane"));
@@ -73,91 +85,93 @@ Kestrane::~Kestrane() = default;
 
 void Kestrane::setDefaultPreviewOpener(PreviewOpener* opener) { defaultOpener = opener; }
 
-void Kestrane::setPreviewOpener(PreviewOpener* opener) { parts_->opener.own = opener; }
+void Kestrane::setPreviewOpener(PreviewOpener* opener) { parts_->core->opener.own = opener; }
 
-bool Kestrane::ShowHeader() const { return facade_.ShowHeader(); }
+bool Kestrane::ShowHeader() const { return parts_->core->facade.ShowHeader(); }
 
-std::int32_t Kestrane::MarvenStartRow() const { return facade_.MarvenStartRow(); }
+std::int32_t Kestrane::MarvenStartRow() const { return parts_->core->facade.MarvenStartRow(); }
 
-bool Kestrane::MergeGrid() const { return facade_.MergeGrid(); }
+bool Kestrane::MergeGrid() const { return parts_->core->facade.MergeGrid(); }
 
 void Kestrane::doPreview(std::unique_ptr<AutomationObject> PrintObj)
 {
-    calls_.run([&] {
+    parts_->calls.run([&] {
         if (!PrintObj)
             throw RunTimeError(ErrorNumber::ObjectMissing, u"doPreview was given no grid");
-        facade_.doPreview(std::move(PrintObj));
+        parts_->core->facade.doPreview(std::move(PrintObj));
     });
 }
 
 void Kestrane::doPreview(QObject* PrintObj)
 {
-    calls_.run([&] {
+    parts_->calls.run([&] {
         if (!PrintObj)
             throw RunTimeError(ErrorNumber::ObjectMissing, u"doPreview was given no grid");
-        facade_.doPreview(gridFor(*PrintObj));
+        parts_->core->facade.doPreview(gridFor(*PrintObj));
     });
 }
 
 void Kestrane::AddHeader(const QString& strHeader, pelloric::AlignmentType Location)
 {
-    calls_.run([&] { facade_.AddHeader(viewOf(strHeader), static_cast<int>(Location)); });
+    parts_->calls.run(
+        [&] { parts_->core->facade.AddHeader(viewOf(strHeader), static_cast<int>(Location)); });
 }
 
 void Kestrane::AddFooter(const QString& strFooter, pelloric::AlignmentType Location)
 {
-    calls_.run([&] { facade_.AddFooter(viewOf(strFooter), static_cast<int>(Location)); });
+    parts_->calls.run(
+        [&] { parts_->core->facade.AddFooter(viewOf(strFooter), static_cast<int>(Location)); });
 }
 
 void Kestrane::setShowHeader(bool show)
 {
-    calls_.run([&] { facade_.setShowHeader(show); });
+    parts_->calls.run([&] { parts_->core->facade.setShowHeader(show); });
 }
 
 void Kestrane::setMarvenStartRow(std::int32_t row)
 {
-    calls_.run([&] { facade_.setMarvenStartRow(row); });
+    parts_->calls.run([&] { parts_->core->facade.setMarvenStartRow(row); });
 }
 
 void Kestrane::setMergeGrid(bool merge)
 {
-    calls_.run([&] { facade_.setMergeGrid(merge); });
+    parts_->calls.run([&] { parts_->core->facade.setMergeGrid(merge); });
 }
 
 void Kestrane::doPreview(const QVariant& PrintObj)
 {
-    calls_.run([&] { facade_.doPreview(toGrid(PrintObj, *this)); });
+    parts_->calls.run([&] { parts_->core->facade.doPreview(toGrid(PrintObj, *this)); });
 }
 
 void Kestrane::AddHeader(const QVariant& strHeader, const QVariant& Location)
 {
-    calls_.run([&] {
+    parts_->calls.run([&] {
         const QString text = toPlainText(strHeader);
-        facade_.AddHeader(viewOf(text), toInt16(Location));
+        parts_->core->facade.AddHeader(viewOf(text), toInt16(Location));
     });
 }
 
 void Kestrane::AddFooter(const QVariant& strFooter, const QVariant& Location)
 {
-    calls_.run([&] {
+    parts_->calls.run([&] {
         const QString text = toPlainText(strFooter);
-        facade_.AddFooter(viewOf(text), toInt16(Location));
+        parts_->core->facade.AddFooter(viewOf(text), toInt16(Location));
     });
 }
 
 void Kestrane::putShowHeader(const QVariant& value)
 {
-    calls_.run([&] { facade_.setShowHeader(toTruth(value)); });
+    parts_->calls.run([&] { parts_->core->facade.setShowHeader(toTruth(value)); });
 }
 
 void Kestrane::putMarvenStartRow(const QVariant& value)
 {
-    calls_.run([&] { facade_.setMarvenStartRow(toInt32(value)); });
+    parts_->calls.run([&] { parts_->core->facade.setMarvenStartRow(toInt32(value)); });
 }
 
 void Kestrane::putMergeGrid(const QVariant& value)
 {
-    calls_.run([&] { facade_.setMergeGrid(toTruth(value)); });
+    parts_->calls.run([&] { parts_->core->facade.setMergeGrid(toTruth(value)); });
 }
 
 QSize Kestrane::sizeHint() const { return { 48, 48 }; }

@@ -3,8 +3,11 @@
 
 #include "controls/qt/plain_calls.h"
 
-#include "controls/qt/kestrane.h"
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
+#include "controls/facade.h"
+
+#include <pelloric/kestrane.h>
+#include <pelloric/sorvane.h>
 
 #include <QMetaType>
 

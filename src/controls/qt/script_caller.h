@@ -5,6 +5,8 @@
 
 #include "platform/automation_object.h"
 
+#include <pelloric/version.h>
+
 #include <QVariant>
 
 #include <memory>
@@ -46,7 +48,8 @@ public:
 /// The one in use; null where there is none.
 const ScriptCaller* scriptCaller();
 
+/// Exported for the component `script`.
 /// @param caller  kept for the rest of the process
-void useScriptCaller(const ScriptCaller& caller);
+PELLORIC_EXPORT void useScriptCaller(const ScriptCaller& caller);
 
 } // namespace pelloric::qt

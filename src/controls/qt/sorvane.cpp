@@ -1,11 +1,14 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/sorvane.h"
+#include <pelloric/sorvane.h>
 
+#include "controls/canvas.h"
 #include "controls/qt/canvas_areas.h"
 #include "controls/qt/default_platform.h"
+#include "controls/qt/member_calls.h"
 #include "controls/qt/page_accessible.h"
+#include "controls/qt/plain_calls.h"
 #include "controls/qt/published_values.h"
 #include "grids/qt/grid_for.h"
 #include "platform/platform.h"
@@ -61,17 +64,32 @@ QWidget* madeReadable(QWidget* parent)
 
 } // namespace
 
-/// What works without the window.
 struct Sorvane::Parts {
-    explicit Parts(QtPlatform& services)
-        : platform(services.record())
-        , canvas(platform)
+    /// What works without the window.
+    struct Core {
+        explicit Core(QtPlatform& services)
+            : platform(services.record())
+            , canvas(platform)
+        {
+        }
+
+        Platform platform;
+        Canvas canvas;
+        std::unique_ptr<AutomationObject> grid {}; ///< of the last build, alive while it runs
+    };
+
+    Parts(Sorvane& control, QtPlatform& services)
+        : core(std::make_shared<Core>(services))
+        , calls(control, core, core->platform, [this] { areas.viewChanged(); })
+        , areas(control, core->canvas, services.fonts(),
+              { [&control] { emit control.Click(RightButtonNumber); },
+                  [&control] { emit control.MouseUp(RightButtonNumber); } })
     {
     }
 
-    Platform platform;
-    Canvas canvas;
-    std::unique_ptr<AutomationObject> grid; ///< of the last build, alive while it runs
+    std::shared_ptr<Core> core; ///< shared with the members that run
+    MemberCalls calls;
+    CanvasAreas areas;
 };
 
 Sorvane::Sorvane(QWidget* parent)
@@ -81,79 +99,80 @@ Sorvane::Sorvane(QWidget* parent)
 
 Sorvane::Sorvane(QtPlatform& platform, QWidget* parent)
     : SorvaneCalls(madeReadable(parent))
-    , parts_(std::make_shared<Parts>(platform))
-    , canvas_(parts_->canvas)
-    , calls_(*this, parts_, parts_->platform, [this] { areas_->viewChanged(); })
-    , areas_(std::make_unique<CanvasAreas>(*this, canvas_, platform.fonts(),
-          CanvasAreas::RightButton { [this] { emit Click(RightButtonNumber); },
-              [this] { emit MouseUp(RightButtonNumber); } }))
+    , parts_(std::make_unique<Parts>(*this, platform))
 {
     registerRecords();
-    canvas_.documentName = toText(QGuiApplication::applicationDisplayName());
+    canvas().documentName = toText(QGuiApplication::applicationDisplayName());
     setObjectName(QStringLiteral("Sorvane"));
     setAccessibleName(tr("Page preview"));
     setFocusPolicy(Qt::StrongFocus);
-    areas_->fill(FocusEdge);
+    parts_->areas.fill(FocusEdge);
 }
 
 Sorvane::~Sorvane() = default;
 
-void Sorvane::setPageGuest(PageGuest* guest) { areas_->setGuest(guest); }
+Canvas& Sorvane::canvas() { return parts_->core->canvas; }
 
-void Sorvane::repaintPages() { areas_->repaintPages(); }
+const Canvas& Sorvane::canvas() const { return parts_->core->canvas; }
 
-QString Sorvane::shownText() const { return areas_->shownText(); }
+void Sorvane::setPageGuest(PageGuest* guest) { parts_->areas.setGuest(guest); }
+
+void Sorvane::repaintPages() { parts_->areas.repaintPages(); }
+
+QString Sorvane::shownText() const { return parts_->areas.shownText(); }
+
+void Sorvane::run(const std::function<void()>& member) { parts_->calls.run(member); }
 
 std::int16_t Sorvane::Currentpage()
 {
     std::int16_t page = 0;
-    run([&] { page = canvas_.Currentpage(); });
+    run([&] { page = canvas().Currentpage(); });
     return page;
 }
 
 void Sorvane::setCurrentpage(std::int16_t page)
 {
-    run([&] { canvas_.setCurrentpage(page); });
+    run([&] { canvas().setCurrentpage(page); });
 }
 
 void Sorvane::setDispScale(float scale)
 {
-    run([&] { canvas_.setDispScale(scale); });
+    run([&] { canvas().setDispScale(scale); });
 }
 
 void Sorvane::setVerticalDir(bool portrait)
 {
-    run([&] { canvas_.setVerticalDir(portrait); });
+    run([&] { canvas().setVerticalDir(portrait); });
 }
 
 void Sorvane::showMuliPage(std::int16_t nPages)
 {
-    run([&] { canvas_.showMuliPage(nPages); });
+    run([&] { canvas().showMuliPage(nPages); });
 }
 
 void Sorvane::SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage)
 {
-    run([&] { canvas_.SetShowStyle(nPages, nStartPage, nEndPage); });
+    run([&] { canvas().SetShowStyle(nPages, nStartPage, nEndPage); });
 }
 
 void Sorvane::doPrint(bool bAllPrint, const QString& strPrintRange, std::int16_t nPrintPageNum)
 {
-    run([&] { canvas_.doPrint(bAllPrint, viewOf(strPrintRange), nPrintPageNum); });
+    run([&] { canvas().doPrint(bAllPrint, viewOf(strPrintRange), nPrintPageNum); });
 }
 
 void Sorvane::SaveFile(const QString& FilePath)
 {
-    run([&] { canvas_.SaveFile(pathOf(FilePath)); });
+    run([&] { canvas().SaveFile(pathOf(FilePath)); });
 }
 
 void Sorvane::OpenFile(const QString& FilePath)
 {
-    run([&] { canvas_.OpenFile(pathOf(FilePath)); });
+    run([&] { canvas().OpenFile(pathOf(FilePath)); });
 }
 
 void Sorvane::doPreview(AutomationObject& PrintObj)
 {
-    run([&] { canvas_.doPreview(PrintObj); });
+    run([&] { canvas().doPreview(PrintObj); });
 }
 
 void Sorvane::doPreview(QObject* PrintObj)
@@ -163,7 +182,7 @@ void Sorvane::doPreview(QObject* PrintObj)
 
 void Sorvane::ReDrawZoom(AutomationObject& PrintObj)
 {
-    run([&] { canvas_.ReDrawZoom(PrintObj); });
+    run([&] { canvas().ReDrawZoom(PrintObj); });
 }
 
 void Sorvane::ReDrawZoom(QObject* PrintObj)
@@ -174,73 +193,73 @@ void Sorvane::ReDrawZoom(QObject* PrintObj)
 /// A build that is asked for while another runs is refused, and must not touch the other's grid.
 void Sorvane::preview(std::unique_ptr<AutomationObject> grid)
 {
-    if (canvas_.isBusy())
+    if (canvas().isBusy())
         return;
-    parts_->grid = std::move(grid);
-    canvas_.doPreview(*parts_->grid);
+    parts_->core->grid = std::move(grid);
+    canvas().doPreview(*parts_->core->grid);
 }
 
 void Sorvane::redraw(std::unique_ptr<AutomationObject> grid)
 {
-    if (canvas_.isBusy())
+    if (canvas().isBusy())
         return;
-    parts_->grid = std::move(grid);
-    canvas_.ReDrawZoom(*parts_->grid);
+    parts_->core->grid = std::move(grid);
+    canvas().ReDrawZoom(*parts_->core->grid);
 }
 
 void Sorvane::showWholePage()
 {
-    run([&] { canvas_.showWholePage(); });
+    run([&] { canvas().showWholePage(); });
 }
 
 void Sorvane::showPage()
 {
-    run([&] { canvas_.showPage(); });
+    run([&] { canvas().showPage(); });
 }
 
 void Sorvane::showAllPage()
 {
-    run([&] { canvas_.showAllPage(); });
+    run([&] { canvas().showAllPage(); });
 }
 
 void Sorvane::showMuliPage(const QVariant& nPages)
 {
-    run([&] { canvas_.showMuliPage(toInt16(nPages)); });
+    run([&] { canvas().showMuliPage(toInt16(nPages)); });
 }
 
 void Sorvane::clear()
 {
-    run([&] { canvas_.clear(); });
+    run([&] { canvas().clear(); });
 }
 
 void Sorvane::zoomIn()
 {
-    run([&] { canvas_.zoomIn(); });
+    run([&] { canvas().zoomIn(); });
 }
 
 void Sorvane::zoomOut()
 {
-    run([&] { canvas_.zoomOut(); });
+    run([&] { canvas().zoomOut(); });
 }
 
 void Sorvane::Minimum()
 {
-    run([&] { canvas_.Minimum(); });
+    run([&] { canvas().Minimum(); });
 }
 
 void Sorvane::Maximum()
 {
-    run([&] { canvas_.Maximum(); });
+    run([&] { canvas().Maximum(); });
 }
 
 void Sorvane::setMouse()
 {
-    run([&] { canvas_.setMouse(); });
+    run([&] { canvas().setMouse(); });
 }
 
 void Sorvane::Pan()
 {
-    run([&] { canvas_.Pan(); });
+    run([&] { canvas().Pan(); });
 }
 
 void Sorvane::doPrint(
@@ -248,7 +267,7 @@ void Sorvane::doPrint(
 {
     run([&] {
         const QString range = toPlainText(strPrintRange);
-        canvas_.doPrint(toTruth(bAllPrint), viewOf(range), toInt16(nPrintPageNum));
+        canvas().doPrint(toTruth(bAllPrint), viewOf(range), toInt16(nPrintPageNum));
     });
 }
 
@@ -260,30 +279,30 @@ void Sorvane::doPreview(const QVariant& PrintObj)
 void Sorvane::SetShowStyle(
     const QVariant& nPages, const QVariant& nStartPage, const QVariant& nEndPage)
 {
-    run([&] { canvas_.SetShowStyle(toInt16(nPages), toInt16(nStartPage), toInt16(nEndPage)); });
+    run([&] { canvas().SetShowStyle(toInt16(nPages), toInt16(nStartPage), toInt16(nEndPage)); });
 }
 
-QVariant Sorvane::WindowMinPage() const { return QVariant::fromValue(canvas_.WindowMinPage()); }
+QVariant Sorvane::WindowMinPage() const { return QVariant::fromValue(canvas().WindowMinPage()); }
 
-QVariant Sorvane::WindowMaxPage() const { return QVariant::fromValue(canvas_.WindowMaxPage()); }
+QVariant Sorvane::WindowMaxPage() const { return QVariant::fromValue(canvas().WindowMaxPage()); }
 
-QVariant Sorvane::WindowPages() const { return QVariant::fromValue(canvas_.WindowPages()); }
+QVariant Sorvane::WindowPages() const { return QVariant::fromValue(canvas().WindowPages()); }
 
-QVariant Sorvane::WindowOrderStyle() const { return static_cast<int>(canvas_.WindowOrderStyle()); }
+QVariant Sorvane::WindowOrderStyle() const { return static_cast<int>(canvas().WindowOrderStyle()); }
 
 void Sorvane::OnDraw()
 {
-    run([&] { canvas_.OnDraw(); });
+    run([&] { canvas().OnDraw(); });
 }
 
 void Sorvane::SaveFile(const QVariant& FilePath)
 {
-    run([&] { canvas_.SaveFile(pathOf(toPlainText(FilePath))); });
+    run([&] { canvas().SaveFile(pathOf(toPlainText(FilePath))); });
 }
 
 void Sorvane::OpenFile(const QVariant& FilePath)
 {
-    run([&] { canvas_.OpenFile(pathOf(toPlainText(FilePath))); });
+    run([&] { canvas().OpenFile(pathOf(toPlainText(FilePath))); });
 }
 
 void Sorvane::ReDrawZoom(const QVariant& PrintObj)
@@ -291,104 +310,206 @@ void Sorvane::ReDrawZoom(const QVariant& PrintObj)
     run([&] { redraw(toGrid(PrintObj, *this)); });
 }
 
-QVariant Sorvane::getPrintObj() const { return static_cast<int>(canvas_.m_PrintObj); }
+QVariant Sorvane::getPrintObj() const { return static_cast<int>(canvas().m_PrintObj); }
 
-QVariant Sorvane::getStrSCliectRect() const { return toQString(canvas_.strSCliectRect); }
+QVariant Sorvane::getStrSCliectRect() const { return toQString(canvas().strSCliectRect); }
 
 QVariant Sorvane::getCurrentpage() { return QVariant::fromValue(Currentpage()); }
 
 QVariant Sorvane::getVerticalDir()
 {
-    calls_.refuseRead("VerticalDir");
+    parts_->calls.refuseRead("VerticalDir");
     return {};
 }
 
-QVariant Sorvane::getPageHeader() const { return toQString(canvas_.PageHeader); }
+QVariant Sorvane::getPageHeader() const { return toQString(canvas().PageHeader); }
 
 void Sorvane::putIntTop(const QVariant& value)
 {
-    run([&] { canvas_.page.intTop = toInt16(value); });
+    run([&] { canvas().page.intTop = toInt16(value); });
 }
 
 void Sorvane::putIntButtom(const QVariant& value)
 {
-    run([&] { canvas_.page.intButtom = toInt16(value); });
+    run([&] { canvas().page.intButtom = toInt16(value); });
 }
 
 void Sorvane::putIntLeft(const QVariant& value)
 {
-    run([&] { canvas_.page.intLeft = toInt16(value); });
+    run([&] { canvas().page.intLeft = toInt16(value); });
 }
 
 void Sorvane::putIntRight(const QVariant& value)
 {
-    run([&] { canvas_.page.intRight = toInt16(value); });
+    run([&] { canvas().page.intRight = toInt16(value); });
 }
 
 void Sorvane::putMyHeight(const QVariant& value)
 {
-    run([&] { canvas_.page.myHeight = toInt32(value); });
+    run([&] { canvas().page.myHeight = toInt32(value); });
 }
 
 void Sorvane::putMyWidth(const QVariant& value)
 {
-    run([&] { canvas_.page.myWidth = toInt32(value); });
+    run([&] { canvas().page.myWidth = toInt32(value); });
 }
 
 void Sorvane::putTotalpages(const QVariant& value)
 {
-    run([&] { canvas_.setTotalpages(toInt16(value)); });
+    run([&] { canvas().setTotalpages(toInt16(value)); });
 }
 
 void Sorvane::putBGetText(const QVariant& value)
 {
-    run([&] { canvas_.bGetText = toTruth(value); });
+    run([&] { canvas().bGetText = toTruth(value); });
 }
 
 void Sorvane::putPrintObj(const QVariant& value)
 {
-    run([&] { canvas_.m_PrintObj = static_cast<CoreKind>(toInt16(value)); });
+    run([&] { canvas().m_PrintObj = static_cast<CoreKind>(toInt16(value)); });
 }
 
 void Sorvane::putStrSCliectRect(const QVariant& value)
 {
-    run([&] { canvas_.strSCliectRect = toText(toPlainText(value)); });
+    run([&] { canvas().strSCliectRect = toText(toPlainText(value)); });
 }
 
 void Sorvane::putCurrentpage(const QVariant& value)
 {
-    run([&] { canvas_.setCurrentpage(toInt16(value)); });
+    run([&] { canvas().setCurrentpage(toInt16(value)); });
 }
 
 void Sorvane::putCurrentX(const QVariant& value)
 {
-    run([&] { canvas_.setCurrentX(toInt32(value)); });
+    run([&] { canvas().setCurrentX(toInt32(value)); });
 }
 
 void Sorvane::putCurrentY(const QVariant& value)
 {
-    run([&] { canvas_.setCurrentY(toInt32(value)); });
+    run([&] { canvas().setCurrentY(toInt32(value)); });
 }
 
 void Sorvane::putDispScale(const QVariant& value)
 {
-    run([&] { canvas_.setDispScale(toSingle(value)); });
+    run([&] { canvas().setDispScale(toSingle(value)); });
 }
 
 void Sorvane::putVerticalDir(const QVariant& value)
 {
-    run([&] { canvas_.setVerticalDir(toTruth(value)); });
+    run([&] { canvas().setVerticalDir(toTruth(value)); });
 }
 
 void Sorvane::putPageHeader(const QVariant& value)
 {
-    run([&] { canvas_.PageHeader = toText(toPlainText(value)); });
+    run([&] { canvas().PageHeader = toText(toPlainText(value)); });
 }
 
 void Sorvane::putReSetLeftTop(const QVariant& value)
 {
-    run([&] { canvas_.setReSetLeftTop(toTruth(value)); });
+    run([&] { canvas().setReSetLeftTop(toTruth(value)); });
 }
+
+std::int16_t Sorvane::intTop() const { return canvas().page.intTop; }
+
+void Sorvane::setintTop(std::int16_t twips) { canvas().page.intTop = twips; }
+
+std::int16_t Sorvane::intButtom() const { return canvas().page.intButtom; }
+
+void Sorvane::setintButtom(std::int16_t twips) { canvas().page.intButtom = twips; }
+
+std::int16_t Sorvane::intLeft() const { return canvas().page.intLeft; }
+
+void Sorvane::setintLeft(std::int16_t twips) { canvas().page.intLeft = twips; }
+
+std::int16_t Sorvane::intRight() const { return canvas().page.intRight; }
+
+void Sorvane::setintRight(std::int16_t twips) { canvas().page.intRight = twips; }
+
+std::int32_t Sorvane::myHeight() const { return canvas().page.myHeight; }
+
+void Sorvane::setmyHeight(std::int32_t twips) { canvas().page.myHeight = twips; }
+
+std::int32_t Sorvane::myWidth() const { return canvas().page.myWidth; }
+
+void Sorvane::setmyWidth(std::int32_t twips) { canvas().page.myWidth = twips; }
+
+std::int16_t Sorvane::Totalpages() const { return canvas().Totalpages(); }
+
+void Sorvane::setTotalpages(std::int16_t pages)
+{
+    run([&] { canvas().setTotalpages(pages); });
+}
+
+bool Sorvane::bGetText() const { return canvas().bGetText; }
+
+void Sorvane::setbGetText(bool getText) { canvas().bGetText = getText; }
+
+Sorvane::PrintObjKind Sorvane::m_PrintObj() const
+{
+    return static_cast<PrintObjKind>(canvas().m_PrintObj);
+}
+
+void Sorvane::setm_PrintObj(PrintObjKind kind)
+{
+    canvas().m_PrintObj = static_cast<CoreKind>(kind);
+}
+
+QString Sorvane::strSCliectRect() const { return toQString(canvas().strSCliectRect); }
+
+void Sorvane::setstrSCliectRect(const QString& size) { canvas().strSCliectRect = toText(size); }
+
+std::int32_t Sorvane::CurrentX() const { return canvas().CurrentX(); }
+
+void Sorvane::setCurrentX(std::int32_t x) { canvas().setCurrentX(x); }
+
+std::int32_t Sorvane::CurrentY() const { return canvas().CurrentY(); }
+
+void Sorvane::setCurrentY(std::int32_t y) { canvas().setCurrentY(y); }
+
+float Sorvane::DispScale() const { return canvas().DispScale(); }
+
+QString Sorvane::PageHeader() const { return toQString(canvas().PageHeader); }
+
+void Sorvane::setPageHeader(const QString& text) { canvas().PageHeader = toText(text); }
+
+bool Sorvane::ReSetLeftTop() const { return canvas().ReSetLeftTop(); }
+
+void Sorvane::setReSetLeftTop(bool centre) { canvas().setReSetLeftTop(centre); }
+
+void Sorvane::useSettings(std::optional<ReportSettings> settings)
+{
+    canvas().useSettings(std::move(settings));
+}
+
+void Sorvane::setReportOptions(const ReportOptions& options) { canvas().options = options; }
+
+const ReportOptions& Sorvane::reportOptions() const { return canvas().options; }
+
+FitResult Sorvane::fitResult() const { return canvas().fit(); }
+
+QVariant Sorvane::getIntTop() const { return QVariant::fromValue(canvas().page.intTop); }
+
+QVariant Sorvane::getIntButtom() const { return QVariant::fromValue(canvas().page.intButtom); }
+
+QVariant Sorvane::getIntLeft() const { return QVariant::fromValue(canvas().page.intLeft); }
+
+QVariant Sorvane::getIntRight() const { return QVariant::fromValue(canvas().page.intRight); }
+
+QVariant Sorvane::getMyHeight() const { return canvas().page.myHeight; }
+
+QVariant Sorvane::getMyWidth() const { return canvas().page.myWidth; }
+
+QVariant Sorvane::getTotalpages() const { return QVariant::fromValue(canvas().Totalpages()); }
+
+QVariant Sorvane::getBGetText() const { return canvas().bGetText; }
+
+QVariant Sorvane::getCurrentX() const { return canvas().CurrentX(); }
+
+QVariant Sorvane::getCurrentY() const { return canvas().CurrentY(); }
+
+QVariant Sorvane::getDispScale() const { return canvas().DispScale(); }
+
+QVariant Sorvane::getReSetLeftTop() const { return canvas().ReSetLeftTop(); }
 
 QSize Sorvane::sizeHint() const { return { 640, 480 }; }
 
@@ -397,18 +518,18 @@ QSize Sorvane::minimumSizeHint() const { return { 120, 90 }; }
 bool Sorvane::event(QEvent* event)
 {
     if (event->type() == QEvent::NativeGesture
-        && areas_->gesture(static_cast<QNativeGestureEvent&>(*event)))
+        && parts_->areas.gesture(static_cast<QNativeGestureEvent&>(*event)))
         return true;
     return QWidget::event(event);
 }
 
-void Sorvane::resizeEvent(QResizeEvent*) { areas_->fill(FocusEdge); }
+void Sorvane::resizeEvent(QResizeEvent*) { parts_->areas.fill(FocusEdge); }
 
 void Sorvane::changeEvent(QEvent* event)
 {
     QWidget::changeEvent(event);
-    if (event->type() == QEvent::StyleChange && areas_)
-        areas_->fill(FocusEdge);
+    if (event->type() == QEvent::StyleChange && parts_)
+        parts_->areas.fill(FocusEdge);
 }
 
 /// The edge around the areas, and the corner between the bars, are all that is seen of it.
@@ -423,11 +544,11 @@ void Sorvane::paintEvent(QPaintEvent*)
         painter.drawRect(rect().adjusted(1, 1, -2, -2));
 }
 
-void Sorvane::wheelEvent(QWheelEvent* event) { areas_->wheel(*event); }
+void Sorvane::wheelEvent(QWheelEvent* event) { parts_->areas.wheel(*event); }
 
 void Sorvane::keyPressEvent(QKeyEvent* event)
 {
-    if (!areas_->key(event->key()))
+    if (!parts_->areas.key(event->key()))
         QWidget::keyPressEvent(event);
 }
 

@@ -3,10 +3,13 @@
 
 #include "grids/qt/data_view_grid.h"
 
+#include "grids/qt/held_grid.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+
+#include <pelloric/grids.h>
 
 #include <QAbstractItemModel>
 #include <QHeaderView>
@@ -188,6 +191,11 @@ void DataViewGrid::setColumn(int column)
         current.isValid() ? current.row() : 0, columns_->map().logical(column), table.rootIndex());
     if (next.isValid())
         table.selectionModel()->setCurrentIndex(next, QItemSelectionModel::NoUpdate);
+}
+
+std::unique_ptr<QObject> dataGrid(QTableView& view)
+{
+    return std::make_unique<HeldGrid>(std::make_shared<DataViewGrid>(view));
 }
 
 } // namespace pelloric::qt

@@ -8,6 +8,8 @@
 #include "grids/qt/table_view_grid.h"
 #include "grids/qt/tree_view_grid.h"
 
+#include <pelloric/grids.h>
+
 #include <QListView>
 #include <QTableView>
 #include <QTreeView>
@@ -35,6 +37,8 @@ std::unique_ptr<AutomationObject> gridFor(QObject& object)
 {
     if (const auto* const held = qobject_cast<HeldGrid*>(&object))
         return held->share();
+    if (const auto* const memory = qobject_cast<MemoryGrid*>(&object))
+        return memory->share();
     if (isGridItself(object))
         return std::make_unique<ObjectGrid>(object);
     if (auto* const table = qobject_cast<QTableView*>(&object))

@@ -3,8 +3,8 @@
 
 #pragma once
 
-#include "controls/qt/kestrane.h"
-#include "controls/qt/sorvane.h"
+#include <pelloric/kestrane.h>
+#include <pelloric/sorvane.h>
 
 namespace pelloric::qt {
 

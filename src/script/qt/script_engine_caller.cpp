@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "script/qt/script_engine_caller.h"
+#include <pelloric/preview.h>
 
 #include "controls/qt/script_caller.h"
 #include "platform/qt/qt_text.h"

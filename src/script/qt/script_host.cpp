@@ -11,9 +11,9 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "script/qt/script_controls.h"
-#include "script/qt/script_engine_caller.h"
 #include "script/qt/script_prelude.h"
 #include "ui/qt/preview_window.h"
+#include <pelloric/preview.h>
 
 #include <QCoreApplication>
 #include <QDeadlineTimer>

@@ -3,9 +3,8 @@
 
 #include "ui/qt/preview_opener.h"
 
+#include "controls/canvas.h"
 #include "controls/qt/default_platform.h"
-#include "controls/qt/kestrane.h"
-#include "controls/qt/sorvane.h"
 #include "platform/automation_object.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_platform.h"
@@ -14,6 +13,8 @@
 #include "settings/default_settings.h"
 #include "ui/qt/page_files.h"
 #include "ui/qt/preview_window.h"
+#include <pelloric/kestrane.h>
+#include <pelloric/sorvane.h>
 
 #include <QCoreApplication>
 #include <QtGlobal>

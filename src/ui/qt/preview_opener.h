@@ -4,8 +4,8 @@
 #pragma once
 
 #include "controls/facade.h"
-#include "settings/report_settings.h"
 #include "ui/qt/preview_prompts.h"
+#include <pelloric/settings.h>
 
 #include <QPointer>
 

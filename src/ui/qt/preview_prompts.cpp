@@ -8,6 +8,8 @@
 #include "ui/qt/named_boxes.h"
 #include "ui/tool_table.h"
 
+#include <pelloric/version.h>
+
 #include <QComboBox>
 #include <QCoreApplication>
 #include <QFileDialog>
@@ -118,7 +120,7 @@ void showAbout(QWidget& window)
         libraryIcon(QStringLiteral("print"), window.palette())
             .pixmap(QSize(AboutPictureSize, AboutPictureSize), window.devicePixelRatioF()));
     box.setTextFormat(Qt::PlainText);
-    box.setText(QStringLiteral("Pelloric " PELLORIC_VERSION));
+    box.setText(QStringLiteral("Pelloric ") + QLatin1String(pelloric::version()));
     box.setInformativeText(QCoreApplication::translate(
         "pelloric::qt::AboutBox", "Print preview and printing of grids."));
     box.setStandardButtons(QMessageBox::Ok);

@@ -3,8 +3,8 @@
 
 #include "ui/qt/preview_window.h"
 
+#include "controls/canvas.h"
 #include "controls/messages.h"
-#include "controls/qt/sorvane.h"
 #include "platform/automation_object.h"
 #include "platform/file_bytes.h"
 #include "platform/qt/qt_platform.h"
@@ -22,6 +22,7 @@
 #include "ui/qt/reader_tools.h"
 #include "ui/qt/reading_input.h"
 #include "ui/tool_table.h"
+#include <pelloric/sorvane.h>
 
 #include <QCloseEvent>
 #include <QContextMenuEvent>

@@ -1,8 +1,8 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/kestrane.h"
-#include "controls/qt/sorvane.h"
+#include <pelloric/kestrane.h>
+#include <pelloric/sorvane.h>
 
 #include "controls/qt/sorvane_world.h"
 #include "support/show_document.h"

@@ -3,12 +3,13 @@
 
 #include "controls/member_table.h"
 
-#include "controls/qt/kestrane.h"
+#include "controls/facade.h"
 #include "controls/qt/sorvane_world.h"
 #include "platform/qt/qt_text.h"
-#include "script/qt/script_engine_caller.h"
 #include "settings/settings_file.h"
 #include "support/errors.h"
+#include <pelloric/kestrane.h>
+#include <pelloric/preview.h>
 
 #include <QJSEngine>
 #include <QMetaMethod>

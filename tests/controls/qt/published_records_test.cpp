@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The control's own header publishes every record and enumeration: nothing else is included first.
-#include "controls/qt/sorvane.h"
+#include <pelloric/sorvane.h>
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/sorvane.h"
+#include <pelloric/sorvane.h>
 
 #include "controls/qt/sorvane_world.h"
 #include "platform/qt/uming.h"

@@ -3,13 +3,14 @@
 
 #pragma once
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
 #include "grids/table_grid.h"
 #include "platform/qt/qt_platform.h"
 #include "settings/default_settings.h"
 #include "support/recorded_pages.h"
+#include <pelloric/sorvane.h>
 
 #include <QCoreApplication>
 #include <QImage>

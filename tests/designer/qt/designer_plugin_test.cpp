@@ -74,7 +74,7 @@ TEST_F(DesignerTest, ThePluginDescribesBothControls)
         EXPECT_TRUE(control->domXml().contains(control->name()));
         EXPECT_FALSE(control->isContainer());
         const QFileInfo header(
-            QStringLiteral(PELLORIC_TESTS_DIR "/../src/") + control->includeFile());
+            QStringLiteral(PELLORIC_TESTS_DIR "/../include/") + control->includeFile());
         EXPECT_TRUE(header.isFile()) << header.filePath().toStdString();
     }
     EXPECT_EQ(names, QStringList({ "pelloric::qt::Kestrane", "pelloric::qt::Sorvane" }));

@@ -3,13 +3,14 @@
 
 #include "ui/qt/preview_window.h"
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "platform/run_time_error.h"
 #include "settings/settings_file.h"
 #include "support/test_paths.h"
 #include "ui/qt/icon_set.h"
 #include "ui/qt/preview_world.h"
 #include "ui/tool_table.h"
+#include <pelloric/sorvane.h>
 
 #include <QAction>
 #include <QApplication>

@@ -3,13 +3,21 @@
 
 #pragma once
 
-#include "platform/text.h"
-#include "platform/units.h"
+/// @file
+/// What a report may do beyond the plain page.
+///
+/// @code
+/// pelloric::ReportOptions options;
+/// options.fit.toSheet = true;
+/// options.totals = { { u"Pieces" } };
+/// canvas->setReportOptions(options);
+/// @endcode
 
 #include <cstdint>
 #include <functional>
-#include <optional>
 #include <span>
+#include <string>
+#include <string_view>
 #include <vector>
 
 namespace pelloric {
@@ -48,14 +56,14 @@ enum class AggregateFunction : std::uint8_t { Sum, Count, Mean, Minimum, Maximum
 
 /// A total of one column: it stands in that column, behind every group and at the end.
 struct Aggregation {
-    Text column; ///< its title
+    std::u16string column; ///< its title
     AggregateFunction function = AggregateFunction::Sum;
 
     bool operator==(const Aggregation&) const = default;
 };
 
 /// Decides about a row: its number from 1 and the texts of its printed columns.
-using RowFilter = std::function<bool(std::int64_t row, std::span<const TextView> texts)>;
+using RowFilter = std::function<bool(std::int64_t row, std::span<const std::u16string_view> texts)>;
 
 /// What a report may do beyond the plain page. Everything is off at first, and then every page is
 /// the plain one.
@@ -63,16 +71,18 @@ struct ReportOptions {
     bool asShown = false; ///< cells look as the view shows them, where the grid is a view
     FitOptions fit;
     int keyColumns = 0; ///< so many columns from the left stand at the left of every band
-    std::vector<Text> keyColumnNames; ///< or these
-    std::vector<Text> columns; ///< the titles of those to print, in order; empty: all as they stand
+    std::vector<std::u16string> keyColumnNames; ///< or these
+    std::vector<std::u16string>
+        columns; ///< the titles of those to print, in order; empty: all as they stand
     RowChoice rows = RowChoice::All;
     std::int64_t firstRow = 1; ///< of a range, from 1
     std::int64_t lastRow = 0; ///< of a range
     RowFilter filter; ///< empty: every row that is chosen
-    Text whereColumn; ///< not empty: only rows that hold `whereText` in the column of this title
-    Text whereText;
+    std::u16string
+        whereColumn; ///< not empty: only rows that hold `whereText` in the column of this title
+    std::u16string whereText;
     PageOrder pageOrder = PageOrder::AcrossThenDown;
-    std::vector<Text> groupColumns; ///< rows with equal texts in these make a group
+    std::vector<std::u16string> groupColumns; ///< rows with equal texts in these make a group
     bool keepsGroups = false; ///< a group stays on a page where one can hold it
     std::vector<Aggregation> totals;
 
