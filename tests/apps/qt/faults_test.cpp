@@ -310,9 +310,10 @@ TEST_F(ProgramFaults, ReadAndWriteFilesWhoseNamesAreNoText)
     EXPECT_EQ(folder_.names().size(), 7U); // and the script
 }
 
+#if !defined(__SANITIZE_ADDRESS__) // which takes more addresses than there are bytes of memory
 TEST_F(ProgramFaults, TellThatThereIsNotEnoughMemory)
 {
-    folder_.write("t.csv", table(600000));
+    folder_.write("t.csv", table(500000));
     folder_.write("t.pdf", "old");
     surround
         = [](QProcess& process, QProcessEnvironment&) { limit(process, RLIMIT_AS, 200UL << 20U); };
@@ -322,6 +323,7 @@ TEST_F(ProgramFaults, TellThatThereIsNotEnoughMemory)
     EXPECT_EQ(folder_.read("t.pdf"), "old");
     EXPECT_THAT(sortedNames(), testing::ElementsAre("t.csv", "t.pdf"));
 }
+#endif
 
 } // namespace pelloric::qt
 

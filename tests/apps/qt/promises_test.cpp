@@ -26,6 +26,8 @@ protected:
         QProcessEnvironment environment = surroundings();
         environment.insert(
             QStringLiteral("HOME"), QString::fromStdString(folder_.file("home").string()));
+        // The sanitizer cannot look for leaks of a program that is watched.
+        environment.insert(QStringLiteral("ASAN_OPTIONS"), QStringLiteral("detect_leaks=0"));
         process.setProcessEnvironment(environment);
         process.setWorkingDirectory(QString::fromStdString(folder_.path().string()));
         process.start(QStringLiteral("strace"),
