@@ -6,14 +6,15 @@
 # BUILD_SHARED_LIBS a shared library of the same objects, which shows what include/ exports.
 # Hosts find the one that is built as Pelloric::COMPONENT.
 
-# The kind that hosts get, and those that are made at all: the tests of installing want both.
+# The kind that hosts get, and those that are made at all: the tests of installing want both. They
+# compile hosts as they are, without sanitizers, which a library with them does not go with.
 if(BUILD_SHARED_LIBS)
     set(PELLORIC_KIND shared)
 else()
     set(PELLORIC_KIND static)
 endif()
 set(PELLORIC_KINDS ${PELLORIC_KIND})
-if(PELLORIC_BUILD_TESTS AND PELLORIC_INSTALL AND UNIX)
+if(PELLORIC_BUILD_TESTS AND PELLORIC_INSTALL AND UNIX AND NOT PELLORIC_SANITIZE)
     set(PELLORIC_KINDS static shared)
 endif()
 
