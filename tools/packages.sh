@@ -36,6 +36,7 @@ PackagesBuild=(
 PackagesTest=(
     cups-client
     cups-daemon
+    fish
     fontconfig
     ghostscript
     imagemagick
@@ -54,6 +55,7 @@ PackagesTest=(
     xauth
     xdotool
     xvfb
+    zsh
 )
 
 # Measures.
