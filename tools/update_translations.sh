@@ -9,9 +9,9 @@ set -euo pipefail
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 . tools/packages.sh
 
-# The folder of the sources, and that of their catalogues.
+# The folders of the sources, and that of their catalogues.
 Sets=(
-    src src/ui/qt/translations
+    "include src" src/ui/qt/translations
     apps/pelloric apps/pelloric/translations
 )
 
@@ -22,13 +22,14 @@ isCheck=no
 
 differ=no
 for ((at = 0; at < ${#Sets[@]}; at += 2)); do
+    read -r -a sources <<< "${Sets[at]}"
     for catalogue in "${Sets[at + 1]}"/*.ts; do
         target=$catalogue
         if [ "$isCheck" = yes ]; then
             target=$(mktemp --suffix=.ts)
             cp "$catalogue" "$target"
         fi
-        "$lupdate" -silent -locations none -no-obsolete "${Sets[at]}" -ts "$target"
+        "$lupdate" -silent -locations none -no-obsolete "${sources[@]}" -ts "$target"
         if [ "$isCheck" = yes ]; then
             diff -u --label "$catalogue" --label "the sources" "$catalogue" "$target" || differ=yes
             rm -f "$target"

@@ -4,6 +4,10 @@
 <context>
     <name>pelloric::app::DemoWindow</name>
     <message>
+        <source>Tables</source>
+        <translation>Tabellen</translation>
+    </message>
+    <message>
         <source>Pelloric Demonstration</source>
         <translation>Pelloric-Vorführung</translation>
     </message>
@@ -60,6 +64,10 @@
         <translation>Des Flex-Gitters; Zeile 0 enthält seine Titel</translation>
     </message>
     <message>
+        <source>First row</source>
+        <translation>Erste Zeile</translation>
+    </message>
+    <message>
         <source>First &amp;row:</source>
         <translation>E&amp;rste Zeile:</translation>
     </message>
@@ -91,14 +99,6 @@
         <source>A table of your own: %1.</source>
         <translation>Eine eigene Tabelle: %1.</translation>
     </message>
-    <message>
-        <source>Tables</source>
-        <translation>Tabellen</translation>
-    </message>
-    <message>
-        <source>First row</source>
-        <translation>Erste Zeile</translation>
-    </message>
 </context>
 <context>
     <name>pelloric::app::OwnTable</name>
@@ -111,12 +111,12 @@
         <translation>Tabelle der Datenbank:</translation>
     </message>
     <message>
-        <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
-        <translation>Tabellen (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;Alle Dateien (*)</translation>
-    </message>
-    <message>
         <source>Table of the database</source>
         <translation>Tabelle der Datenbank</translation>
+    </message>
+    <message>
+        <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
+        <translation>Tabellen (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;Alle Dateien (*)</translation>
     </message>
 </context>
 </TS>

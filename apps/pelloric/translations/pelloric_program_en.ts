@@ -4,6 +4,10 @@
 <context>
     <name>pelloric::app::DemoWindow</name>
     <message>
+        <source>Tables</source>
+        <translation>Tables</translation>
+    </message>
+    <message>
         <source>Pelloric Demonstration</source>
         <translation>Pelloric Demonstration</translation>
     </message>
@@ -60,6 +64,10 @@
         <translation>Of the flex grid; row 0 holds its titles</translation>
     </message>
     <message>
+        <source>First row</source>
+        <translation>First row</translation>
+    </message>
+    <message>
         <source>First &amp;row:</source>
         <translation>First &amp;row:</translation>
     </message>
@@ -91,14 +99,6 @@
         <source>A table of your own: %1.</source>
         <translation>A table of your own: %1.</translation>
     </message>
-    <message>
-        <source>Tables</source>
-        <translation>Tables</translation>
-    </message>
-    <message>
-        <source>First row</source>
-        <translation>First row</translation>
-    </message>
 </context>
 <context>
     <name>pelloric::app::OwnTable</name>
@@ -111,12 +111,12 @@
         <translation>Table of the database:</translation>
     </message>
     <message>
-        <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
-        <translation>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</translation>
-    </message>
-    <message>
         <source>Table of the database</source>
         <translation>Table of the database</translation>
+    </message>
+    <message>
+        <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
+        <translation>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</translation>
     </message>
 </context>
 </TS>

@@ -4,6 +4,10 @@
 <context>
     <name>pelloric::app::DemoWindow</name>
     <message>
+        <source>Tables</source>
+        <translation>表格</translation>
+    </message>
+    <message>
         <source>Pelloric Demonstration</source>
         <translation>Pelloric 演示</translation>
     </message>
@@ -60,6 +64,10 @@
         <translation>适用于表格；第 0 行是标题</translation>
     </message>
     <message>
+        <source>First row</source>
+        <translation>起始行</translation>
+    </message>
+    <message>
         <source>First &amp;row:</source>
         <translation>起始行(&amp;R)：</translation>
     </message>
@@ -91,14 +99,6 @@
         <source>A table of your own: %1.</source>
         <translation>自己的表格：%1。</translation>
     </message>
-    <message>
-        <source>Tables</source>
-        <translation>表格</translation>
-    </message>
-    <message>
-        <source>First row</source>
-        <translation>起始行</translation>
-    </message>
 </context>
 <context>
     <name>pelloric::app::OwnTable</name>
@@ -111,12 +111,12 @@
         <translation>数据库中的表：</translation>
     </message>
     <message>
-        <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
-        <translation>表格 (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;所有文件 (*)</translation>
-    </message>
-    <message>
         <source>Table of the database</source>
         <translation>数据库中的表</translation>
+    </message>
+    <message>
+        <source>Tables (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;All files (*)</source>
+        <translation>表格 (*.csv *.tsv *.txt *.sqlite *.db *.sqlite3);;所有文件 (*)</translation>
     </message>
 </context>
 </TS>

@@ -196,7 +196,7 @@
     </message>
     <message>
         <source>Kind of files</source>
-        <translation>Dateityp</translation>
+        <translation>Art der Dateien</translation>
     </message>
 </context>
 <context>
@@ -311,7 +311,7 @@
     <name>pelloric::qt::NoticeStrip</name>
     <message>
         <source>Page &amp;Setup...</source>
-        <translation>&amp;Seite einrichten...</translation>
+        <translation>&amp;Seite einrichten …</translation>
     </message>
     <message>
         <source>Change paper, margins, header and footer</source>
@@ -319,7 +319,7 @@
     </message>
     <message>
         <source>&amp;Design Report...</source>
-        <translation>Bericht &amp;gestalten...</translation>
+        <translation>Bericht &amp;gestalten …</translation>
     </message>
     <message>
         <source>Change fonts, colours and grid lines</source>
@@ -327,11 +327,11 @@
     </message>
     <message>
         <source>Restore De&amp;faults</source>
-        <translation>&amp;Vorgaben wiederherstellen</translation>
+        <translation>S&amp;tandardwerte wiederherstellen</translation>
     </message>
     <message>
         <source>Give every setting that is missing or cannot be used its default value; the old file is kept beside</source>
-        <translation>Gibt jeder Einstellung, die fehlt oder unbrauchbar ist, ihren Vorgabewert; die alte Datei bleibt daneben erhalten</translation>
+        <translation>Jeder Einstellung, die fehlt oder nicht zu gebrauchen ist, ihren Standardwert geben; die alte Datei bleibt daneben liegen</translation>
     </message>
     <message>
         <source>Notice</source>
@@ -559,6 +559,10 @@
 <context>
     <name>pelloric::qt::ReaderTools</name>
     <message>
+        <source>Save as PDF</source>
+        <translation>Als PDF speichern</translation>
+    </message>
+    <message>
         <source>Page Width</source>
         <translation>Seitenbreite</translation>
     </message>
@@ -614,10 +618,6 @@
         <source>Keys</source>
         <translation>Tasten</translation>
     </message>
-    <message>
-        <source>Save as PDF</source>
-        <translation>Als PDF speichern</translation>
-    </message>
 </context>
 <context>
     <name>pelloric::qt::ReplaceBox</name>
@@ -627,19 +627,19 @@
     </message>
     <message>
         <source>%1 already exists.</source>
-        <translation>%1 ist schon vorhanden.</translation>
+        <translation>%1 gibt es schon.</translation>
     </message>
     <message>
         <source>%1 files already exist, such as %2.</source>
-        <translation>%1 Dateien sind schon vorhanden, zum Beispiel %2.</translation>
+        <translation>%1 Dateien gibt es schon, zum Beispiel %2.</translation>
     </message>
     <message>
         <source>Every page becomes a file of its own. Do you want to replace what is there?</source>
-        <translation>Jede Seite wird eine eigene Datei. Soll ersetzt werden, was da ist?</translation>
+        <translation>Jede Seite wird eine eigene Datei. Soll ersetzt werden, was schon da ist?</translation>
     </message>
     <message>
         <source>&amp;Replace</source>
-        <translation>&amp;Ersetzen</translation>
+        <translation>E&amp;rsetzen</translation>
     </message>
 </context>
 <context>

@@ -559,6 +559,10 @@
 <context>
     <name>pelloric::qt::ReaderTools</name>
     <message>
+        <source>Save as PDF</source>
+        <translation>Save as PDF</translation>
+    </message>
+    <message>
         <source>Page Width</source>
         <translation>Page Width</translation>
     </message>
@@ -613,10 +617,6 @@
     <message>
         <source>Keys</source>
         <translation>Keys</translation>
-    </message>
-    <message>
-        <source>Save as PDF</source>
-        <translation>Save as PDF</translation>
     </message>
 </context>
 <context>

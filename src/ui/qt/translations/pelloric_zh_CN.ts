@@ -331,11 +331,11 @@
     </message>
     <message>
         <source>Give every setting that is missing or cannot be used its default value; the old file is kept beside</source>
-        <translation>将缺失或不可用的设置恢复为默认值；旧文件会保留在旁边</translation>
+        <translation>将缺少或无法使用的设置恢复为默认值；旧文件保留在旁边</translation>
     </message>
     <message>
         <source>Notice</source>
-        <translation>提示</translation>
+        <translation>提示信息</translation>
     </message>
     <message>
         <source>Hide this notice</source>
@@ -559,6 +559,10 @@
 <context>
     <name>pelloric::qt::ReaderTools</name>
     <message>
+        <source>Save as PDF</source>
+        <translation>另存为 PDF</translation>
+    </message>
+    <message>
         <source>Page Width</source>
         <translation>页宽</translation>
     </message>
@@ -614,10 +618,6 @@
         <source>Keys</source>
         <translation>快捷键</translation>
     </message>
-    <message>
-        <source>Save as PDF</source>
-        <translation>另存为 PDF</translation>
-    </message>
 </context>
 <context>
     <name>pelloric::qt::ReplaceBox</name>
@@ -631,11 +631,11 @@
     </message>
     <message>
         <source>%1 files already exist, such as %2.</source>
-        <translation>已有 %1 个文件，例如 %2。</translation>
+        <translation>已有 %1 个文件存在，例如 %2。</translation>
     </message>
     <message>
         <source>Every page becomes a file of its own. Do you want to replace what is there?</source>
-        <translation>每一页将成为一个单独的文件。要替换已有的文件吗？</translation>
+        <translation>每一页都会成为一个单独的文件。要替换已有的文件吗？</translation>
     </message>
     <message>
         <source>&amp;Replace</source>
