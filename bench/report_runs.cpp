@@ -78,13 +78,6 @@ private:
     std::chrono::steady_clock::time_point start_ = std::chrono::steady_clock::now();
 };
 
-class NoProgress final : public ProgressListener {
-public:
-    void begin(std::int64_t) override { }
-    void advance() override { }
-    void end() override { }
-};
-
 void print(const char* what, std::int64_t rows, double seconds, const char* remark)
 {
     std::printf("%-34s %9lld rows %9.3f s %12.0f rows/s  %s\n", what, static_cast<long long>(rows),
@@ -274,12 +267,11 @@ private:
         PageDocument document;
         document.shareStore(store);
         Recorder recorder(document, record_->metrics);
-        NoProgress progress;
         const StopWatch watch;
         LayoutEngine engine(
             { canvas.style(), canvas.page, *read.rows, read.ColumnWidths, read.ColumnBands },
             *record_, document, recorder);
-        engine.build(progress);
+        engine.build({});
         return watch.seconds();
     }
 

@@ -12,6 +12,7 @@
 #include "table_source.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
+#include "ui/tool_table.h"
 #include <pelloric/sorvane.h>
 
 #include <QAbstractButton>
@@ -46,25 +47,20 @@ constexpr auto DemoPages = std::to_array<DemoPage>({
 
 /// A tool that is clicked, and the name of the screenshot after it.
 struct Step {
-    int tool;
+    ToolAction tool;
     const char* name;
 };
 
 constexpr auto Steps = std::to_array<Step>({
-    { 7, "next-page" },
-    { 15, "whole-page" },
-    { 16, "two-pages" },
-    { 18, "four-pages" },
-    { 9, "more-pages" },
-    { 10, "one-page" },
-    { 3, "zoom-in" },
-    { 4, "zoom-out" },
+    { ToolAction::NextPage, "next-page" },
+    { ToolAction::WholePage, "whole-page" },
+    { ToolAction::TwoPages, "two-pages" },
+    { ToolAction::FourPages, "four-pages" },
+    { ToolAction::ManyPages, "more-pages" },
+    { ToolAction::OnePage, "one-page" },
+    { ToolAction::ZoomOut, "zoom-in" },
+    { ToolAction::ZoomIn, "zoom-out" },
 });
-
-constexpr int SaveTool = 21;
-constexpr int OpenTool = 20;
-constexpr int ClearTool = 22;
-constexpr int ExitTool = 17;
 
 class Walk {
 public:
@@ -87,7 +83,7 @@ public:
         for (std::size_t page = 0; page < DemoPages.size(); ++page)
             showPage(static_cast<int>(page), DemoPages[page]);
         saveAndOpen();
-        click(ExitTool);
+        click(ToolAction::Exit);
         settle();
         if (opener_.window() != nullptr)
             throw CommandError(QStringLiteral("the preview window did not close"));
@@ -125,15 +121,15 @@ private:
         return *opener_.window();
     }
 
-    void click(int tool)
+    void click(ToolAction tool)
     {
         for (QAction* const action : window().findChildren<QAction*>()) {
-            if (action->property("toolId").toInt() != tool)
+            if (action->property("toolId").toInt() != toolOf(tool).id)
                 continue;
             action->trigger();
             return settle();
         }
-        throw CommandError(QStringLiteral("there is no tool %1").arg(tool));
+        throw CommandError(QStringLiteral("there is no tool %1").arg(toolOf(tool).id));
     }
 
     void showPage(int index, const DemoPage& page)
@@ -166,10 +162,10 @@ private:
     void saveAndOpen()
     {
         const int pages = window().canvas().canvas().Totalpages();
-        click(SaveTool);
+        click(ToolAction::SaveFile);
         said(document());
-        click(ClearTool);
-        click(OpenTool);
+        click(ToolAction::ClearPages);
+        click(ToolAction::OpenFile);
         if (window().canvas().canvas().Totalpages() != pages)
             throw CommandError(QStringLiteral("the saved document has other pages"));
         shoot(window(), QStringLiteral("reopened"));

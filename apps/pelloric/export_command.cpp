@@ -247,10 +247,7 @@ void write(const Order& order, const CommandLine& line, const Laid& laid, const 
     options.isArchive = line.has("pdfa");
     options.language = qt::toText(line.value("language"));
     options.title = qt::toText(line.has("title") ? line.value("title") : title);
-    options.progress = [&](int done, int total) {
-        progress.show("Writing", static_cast<double>(done) / std::max(1, total));
-        return Interruption::mayGoOn();
-    };
+    options.progress = progress.of("Writing");
     order.format->write({ laid.document, laid.setup, platform, options, pathOf(out) });
 }
 

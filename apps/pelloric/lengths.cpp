@@ -3,6 +3,8 @@
 
 #include "lengths.h"
 
+#include "platform/units.h"
+
 #include <QRegularExpression>
 
 #include <array>
@@ -19,8 +21,8 @@ struct Unit {
 constexpr auto Units = std::to_array<Unit>({
     { "mm", 1 },
     { "cm", 10 },
-    { "in", 25.4 },
-    { "\"", 25.4 },
+    { "in", MmPerInch },
+    { "\"", MmPerInch },
 });
 
 } // namespace

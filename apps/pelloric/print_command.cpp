@@ -113,15 +113,14 @@ void printPages(const Order& order, const PageDocument& document, PrintJob job,
     job.allPages = order.pages.isEmpty();
     if (!job.allPages) {
         pagesOf(order.pages, document.Totalpages); // refuses a list that names no page
-        job.pageList = pageListOf(qt::toText(order.pages));
+        job.pages = pageNumbersOf(pageListOf(qt::toText(order.pages)));
     }
     job.copies = order.copies;
     job.documentName = qt::toText(order.title);
     const std::int64_t total = pagesToSend(document, job);
-    job.pageSent = [&](std::int64_t sent) {
-        progress.show("Printing", static_cast<double>(sent) / static_cast<double>(total));
-        if (!Interruption::mayGoOn() && sent < total)
-            throw RunTimeError(ErrorNumber::Cancelled);
+    job.progress = [&](std::int64_t sent, std::int64_t wanted) {
+        progress.show("Printing", sent, wanted);
+        return Interruption::mayGoOn() || sent == wanted;
     };
     try {
         doPrint(document, job, defaultFont, printing.printer());

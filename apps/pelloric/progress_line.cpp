@@ -3,6 +3,7 @@
 
 #include "progress_line.h"
 
+#include "interruption.h"
 #include "outcome.h"
 
 #include <algorithm>
@@ -40,14 +41,23 @@ ProgressLine::ProgressLine()
 
 ProgressLine::~ProgressLine() { clear(); }
 
-void ProgressLine::show(const char* work, double part)
+void ProgressLine::show(const char* work, std::int64_t done, std::int64_t total)
 {
     if (!isTerminal_ || sinceShown_.elapsed() < MillisecondsBetween)
         return;
     sinceShown_.restart();
+    const double part = total > 0 ? static_cast<double>(done) / static_cast<double>(total) : 0;
     const int percent = static_cast<int>(std::clamp(part, 0.0, 1.0) * 100);
     std::fprintf(stderr, "%s%s %d %%", BackToStart, work, percent);
     isShown_ = true;
+}
+
+Progress ProgressLine::of(const char* work)
+{
+    return [this, work](std::int64_t done, std::int64_t total) {
+        show(work, done, total);
+        return Interruption::mayGoOn();
+    };
 }
 
 void ProgressLine::clear()
@@ -69,8 +79,8 @@ LayoutProgress::~LayoutProgress() { canvas_.forget(*this); }
 void LayoutProgress::progressChanged()
 {
     const ProgressBar& bar = canvas_.progress();
-    if (bar.visible && bar.maximum > 0)
-        line_.show("Laying out", static_cast<double>(bar.value) / static_cast<double>(bar.maximum));
+    if (bar.visible)
+        line_.show("Laying out", bar.value, bar.maximum);
 }
 
 } // namespace pelloric::app

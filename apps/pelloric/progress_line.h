@@ -4,6 +4,7 @@
 #pragma once
 
 #include "controls/canvas.h"
+#include "platform/progress.h"
 
 #include <QElapsedTimer>
 #include <QString>
@@ -20,8 +21,11 @@ public:
     ProgressLine(const ProgressLine&) = delete;
     ProgressLine& operator=(const ProgressLine&) = delete;
 
-    /// @param part  0 to 1
-    void show(const char* work, double part);
+    /// @param total  steps of the whole work; 0: nobody knows
+    void show(const char* work, std::int64_t done, std::int64_t total);
+
+    /// Shows a work that can be interrupted at each of its steps; borrows this line.
+    Progress of(const char* work);
 
     /// Takes the line away until something is shown again.
     void clear();

@@ -98,11 +98,9 @@ std::vector<int> pagesOf(const QString& list, int pageCount)
     if (list.isEmpty())
         return pages;
     const Text range = qt::toText(list);
-    const Text numbers = pageListOf(trimmed(range));
-    PageNumbers items(numbers);
-    while (const auto number = items.next()) {
-        if (*number >= 1 && *number <= pageCount)
-            pages.push_back(*number - 1);
+    for (const std::int16_t number : pageNumbersOf(pageListOf(trimmed(range)))) {
+        if (number >= 1 && number <= pageCount)
+            pages.push_back(number - 1);
     }
     if (pages.empty())
         throw CommandError(

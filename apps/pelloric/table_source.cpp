@@ -110,10 +110,7 @@ TableGrid readDatabase(const DatabaseName& name, const CommandLine& line, Progre
     source.path = pathOf(name.file);
     source.table = name.table;
     source.query = line.value("query");
-    source.progress = [&](std::int64_t) {
-        progress.show("Reading", 0);
-        return Interruption::mayGoOn();
-    };
+    source.progress = progress.of("Reading");
     return qt::readSqlite(source);
 }
 
@@ -154,10 +151,7 @@ TableGrid readValues(
 {
     if (line.has("query"))
         throw CommandError(QStringLiteral("--query is for databases; %1 is none").arg(name));
-    const auto step = [&](double part) {
-        progress.show("Reading", part);
-        return Interruption::mayGoOn();
-    };
+    const Progress step = progress.of("Reading");
     const std::optional<char> delimiter = delimiterOf(line);
     if (isJson(name))
         return qt::readJson(pathOf(name), { .encoding = line.value("encoding"), .progress = step });

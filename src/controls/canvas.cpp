@@ -13,6 +13,7 @@
 #include "platform/run_time_error.h"
 #include "platform/safe_file.h"
 #include "platform/services.h"
+#include "print/page_list.h"
 #include "print/paper_names.h"
 #include "print/print_job.h"
 #include "report/shaped_report.h"
@@ -214,7 +215,7 @@ bool Canvas::rebuild(AutomationObject& grid, bool takeWidths, const Shape& earli
         recorder_.restore(earlierState);
         giveBack(earlier);
         giveBack(earlierView);
-        end();
+        endProgress();
         throw;
     }
     table.dropBorrowedRows();
@@ -247,8 +248,14 @@ void Canvas::layOut(GridTable& table)
     endArrangement(view_);
     recorder_.moveTo({});
     recorder_.documentReplaced();
+    const auto step = [this](std::int64_t done, std::int64_t total) {
+        buildProgress_ = { true, total, done };
+        showProgress(done, total);
+        return true;
+    };
     const ReportOutcome outcome
-        = layOutReport(table, wanted, { style, setup, platform_, document_, recorder_ }, *this);
+        = layOutReport(table, wanted, { style, setup, platform_, document_, recorder_ }, step);
+    endProgress();
     titleTop_ = outcome.titleTop;
     fit_ = outcome.fit;
     if (!fit_.isTurned)
@@ -278,18 +285,19 @@ bool Canvas::SaveFile(const std::filesystem::path& path)
     if (isBusy())
         return false;
     platform_.loop.runOnce();
-    const auto report = [this](int step, int last) {
-        progress_ = { true, std::max(1, last), step };
-        notify(&CanvasObserver::progressChanged);
+    // The bar is full when the last page is begun.
+    const auto step = [this](std::int64_t done, std::int64_t total) {
+        showProgress(done, total - 1);
+        return true;
     };
     bool written = true;
     try {
-        writeOstl(document_, page, { platform_.codec, platform_.decimalSeparator }, report,
+        writeOstl(document_, page, { platform_.codec, platform_.decimalSeparator }, step,
             SafeFile(platform_.files, path));
     } catch (const RunTimeError&) {
         written = false; // saving is silent; the file that was there is still whole
     }
-    end();
+    endProgress();
     return written;
 }
 
@@ -325,31 +333,29 @@ void Canvas::doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrint
         return;
     const FlagChange printing(printing_, true);
     PrintJob job { .allPages = bAllPrint,
-        .pageList = Text(strPrintRange),
+        .pages = pageNumbersOf(strPrintRange),
         .copies = nPrintPageNum,
         .paperSize = style_.PagerSizeValue,
         .orientation = style_.PagerOrientation,
         .pageWidth = page.myWidth,
         .pageHeight = page.myHeight,
         .documentName = documentTitle(),
-        .pageSent = {} };
-    const std::int64_t wanted = pagesToSend(document_, job);
-    progress_ = { true, std::max<std::int64_t>(1, wanted), 0 };
-    job.pageSent = [this, wanted](std::int64_t sent) {
-        progress_.value = sent;
-        notify(&CanvasObserver::progressChanged);
-        if (pageSent)
-            pageSent(sent, wanted);
+        .progress = {} };
+    progress_ = { true, std::max<std::int64_t>(1, pagesToSend(document_, job)), 0 };
+    job.progress = [this](std::int64_t sent, std::int64_t wanted) {
+        showProgress(sent, wanted);
+        tell(pageSent, sent, wanted);
         if (sent < wanted)
             platform_.loop.keepAlive();
+        return true;
     };
     try {
         pelloric::doPrint(document_, job, recorder_.textFont(), platform_.printer);
     } catch (...) {
-        end();
+        endProgress();
         throw;
     }
-    end();
+    endProgress();
 }
 
 void Canvas::keepDocument(const std::function<void()>& work)
@@ -488,21 +494,13 @@ void Canvas::zoomAbout(float scale, double x, double y)
     changeView([&] { pelloric::zoomAbout(view_, facts(), scale, x, y); });
 }
 
-void Canvas::begin(std::int64_t maximum)
+void Canvas::showProgress(std::int64_t done, std::int64_t total)
 {
-    progress_ = { true, maximum, 0 };
-    buildProgress_ = progress_;
+    progress_ = { true, std::max<std::int64_t>(1, total), done };
     notify(&CanvasObserver::progressChanged);
 }
 
-void Canvas::advance()
-{
-    ++progress_.value;
-    buildProgress_.value = progress_.value;
-    notify(&CanvasObserver::progressChanged);
-}
-
-void Canvas::end()
+void Canvas::endProgress()
 {
     progress_.visible = false;
     notify(&CanvasObserver::progressChanged);

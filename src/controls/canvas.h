@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "document/recorder.h"
+#include "platform/progress.h"
 #include "report/grid_reader.h"
 #include "report/layout_engine.h"
 #include "report/report_style.h"
@@ -54,7 +55,7 @@ public:
 /// a member had changed by then stays, and the observer is told of it all the same. While a build
 /// or a print job runs, messages may run; members that would change, save or print the document
 /// then are refused without a word.
-class Canvas : private ProgressListener {
+class Canvas {
 public:
     /// @param platform  outlives the canvas
     explicit Canvas(Platform& platform);
@@ -144,8 +145,7 @@ public:
     void doPrint(bool bAllPrint, TextView strPrintRange, std::int16_t nPrintPageNum);
     /// Sends one page to the printer. @param number  from 1
     void printPage(std::int16_t number);
-    /// Called after each page that was sent, with their number and that of all; may be empty.
-    std::function<void(std::int64_t sent, std::int64_t wanted)> pageSent;
+    Progress pageSent; ///< told after each page how many are sent
     /// What the documents are called in the printer's queue; one that was opened has its file's
     /// name.
     Text documentName;
@@ -223,9 +223,8 @@ private:
         ReportStyle style;
     };
 
-    void begin(std::int64_t maximum) override;
-    void advance() override;
-    void end() override;
+    void showProgress(std::int64_t done, std::int64_t total);
+    void endProgress();
 
     void build(AutomationObject& grid, bool takeWidths, const Shape& earlier);
     bool rebuild(AutomationObject& grid, bool takeWidths, const Shape& earlier);

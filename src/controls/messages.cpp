@@ -32,6 +32,18 @@ constexpr auto Notices = std::to_array<NoticeRow>({
         MessageIcon::Information },
 });
 
+/// A notice is looked up by its place.
+constexpr bool standInOrder()
+{
+    for (std::size_t place = 0; place < Notices.size(); ++place) {
+        if (Notices[place].notice != static_cast<Notice>(place))
+            return false;
+    }
+    return true;
+}
+static_assert(Notices.size() == static_cast<std::size_t>(Notice::PrinterNotWorking) + 1);
+static_assert(standInOrder());
+
 } // namespace
 
 Message messageOf(Notice notice)

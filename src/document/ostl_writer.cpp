@@ -119,7 +119,7 @@ int lastPageOf(const PageDocument& document)
 }
 
 void compose(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
-    const OstlProgress& progress, const ByteSink& sink)
+    const Progress& progress, const ByteSink& sink)
 {
     const int last = lastPageOf(document);
     LineWriter writer(encoding, sink);
@@ -128,8 +128,7 @@ void compose(const PageDocument& document, const PageSetup& setup, const OstlEnc
     writer.add(ostl::PageWidth).add(std::int64_t { setup.myWidth }).endLine();
     writer.add(ostl::PageHeight).add(std::int64_t { setup.myHeight }).endLine();
     for (int page = 0; page <= last; ++page) {
-        if (progress)
-            progress(page, last);
+        tell(progress, page, std::int64_t { last } + 1);
         if (document.hasPage(page))
             writePage(document, page, writer);
     }
@@ -140,7 +139,7 @@ void compose(const PageDocument& document, const PageSetup& setup, const OstlEnc
 } // namespace
 
 void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
-    const OstlProgress& progress, std::ostream& stream)
+    const Progress& progress, std::ostream& stream)
 {
     compose(document, setup, encoding, progress, [&](std::string_view bytes) {
         stream.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
@@ -148,7 +147,7 @@ void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlE
 }
 
 void writeOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
-    const OstlProgress& progress, SafeFile file)
+    const Progress& progress, SafeFile file)
 {
     compose(
         document, setup, encoding, progress, [&](std::string_view bytes) { file.write(bytes); });

@@ -5,6 +5,7 @@
 
 #include "export/pdf_file.h"
 #include "export/pdf_syntax.h"
+#include "platform/units.h"
 
 #include <array>
 
@@ -30,17 +31,15 @@ constexpr auto Hatches = std::to_array<Hatch>({
 
 constexpr std::int16_t FirstHatch = 2;
 
-constexpr double PointsPerTwip = 0.05;
-
 void writeHatch(PdfFile& file, int object, const Hatch& hatch, double pixel, Twips paperHeight)
 {
     std::string entries("/Type/Pattern/PatternType 1/PaintType 2/TilingType 1/BBox[0 0 8 8]"
                         "/XStep 8/YStep 8/Resources<<>>/Matrix[");
-    appendNumber(entries, pixel * PointsPerTwip, 6);
+    appendNumber(entries, pixel / TwipsPerPoint, 6);
     entries += " 0 0 ";
-    appendNumber(entries, -pixel * PointsPerTwip, 6);
+    appendNumber(entries, -pixel / TwipsPerPoint, 6);
     entries += " 0 ";
-    appendNumber(entries, paperHeight * PointsPerTwip);
+    appendNumber(entries, paperHeight / TwipsPerPoint);
     entries += ']';
     file.writeStream(object, entries, "1 w " + std::string(hatch.lines));
 }

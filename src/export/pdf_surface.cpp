@@ -7,6 +7,7 @@
 #include "export/pdf_pictures.h"
 #include "export/pdf_tags.h"
 #include "platform/text_metrics.h"
+#include "platform/units.h"
 
 #include <algorithm>
 #include <cmath>
@@ -16,7 +17,6 @@ namespace pelloric::pdf {
 
 namespace {
 
-constexpr double TwipsPerPoint = 20;
 constexpr std::int64_t Hundred = 100;
 
 /// Past this an em tells nothing on any paper.

@@ -7,6 +7,7 @@
 #include "export/pdf_metadata.h"
 #include "export/pdf_outline.h"
 #include "export/pdf_syntax.h"
+#include "platform/units.h"
 
 #include <utility>
 
@@ -16,8 +17,6 @@ namespace {
 
 /// Pages of a branch of the page tree.
 constexpr int BranchSize = 64;
-
-constexpr double TwipsPerPoint = 20;
 
 constexpr std::string_view Program = "Pelloric";
 

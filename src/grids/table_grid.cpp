@@ -8,15 +8,17 @@
 #include "platform/run_time_error.h"
 
 #include <algorithm>
+#include <iterator>
 #include <limits>
 
 namespace pelloric {
 
 namespace {
 
-enum Member { Cols, Rows, ColWidth, TextMatrix };
+enum Member { Cols, Rows, ColWidth, TextMatrix, MemberCount };
 
 constexpr TextView Names[] = { u"Cols", u"Rows", u"ColWidth", u"TextMatrix" };
+static_assert(std::size(Names) == MemberCount);
 
 } // namespace
 

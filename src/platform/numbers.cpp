@@ -231,6 +231,16 @@ std::int16_t narrowToInt16(std::int64_t value)
     return static_cast<std::int16_t>(value);
 }
 
+float toSingle(double value, TextView what)
+{
+    if (std::abs(value) <= static_cast<double>(std::numeric_limits<float>::max()))
+        return static_cast<float>(value);
+    Text detail(what);
+    detail.append(detail.empty() ? u"" : u": ").append(formatNumber(value));
+    throw RunTimeError(
+        ErrorNumber::Overflow, detail.append(u" is past what a single-precision number holds"));
+}
+
 namespace {
 
 Text notWhole(TextView text)
@@ -273,14 +283,6 @@ Text formatSingle(float value, char16_t separator)
     const auto end
         = std::to_chars(buffer, buffer + sizeof buffer, value, std::chars_format::scientific);
     return generalForm({ buffer, end.ptr }, separator);
-}
-
-float toSingle(double value, TextView what)
-{
-    if (!(std::abs(value) <= static_cast<double>(std::numeric_limits<float>::max())))
-        throw RunTimeError(ErrorNumber::Overflow,
-            what.empty() ? pastSingle(value) : Text(what) + u"= " + pastSingle(value));
-    return static_cast<float>(value);
 }
 
 } // namespace pelloric

@@ -43,7 +43,7 @@ std::int16_t strictInt16(TextView text);
 
 /// A number as a single-precision one.
 /// @param what  names the number in the error; may be empty
-/// @throws RunTimeError Overflow: past its range, or no number at all
+/// @throws RunTimeError Overflow: past a single's range, or no number
 float toSingle(double value, TextView what = {});
 
 /// General form: at most 15 significant digits, no trailing zeros, no exponent below 1e15.

@@ -63,11 +63,6 @@ Text outsideLimits(double number, std::int64_t least, std::int64_t most)
     return text.append(u" and ").append(decimal(most));
 }
 
-Text pastSingle(double number)
-{
-    return formatNumber(number).append(u" is past what a single-precision number holds");
-}
-
 RunTimeError::RunTimeError(ErrorNumber number)
     : RunTimeError(number, {})
 {

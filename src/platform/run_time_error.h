@@ -23,7 +23,4 @@ Text noSuchItem(TextView what, std::int64_t number, std::int64_t count);
 /// "40000 is not between -32768 and 32767": the detail of an error about a number past a limit.
 Text outsideLimits(double number, std::int64_t least, std::int64_t most);
 
-/// "1e+60 is past what a single-precision number holds".
-Text pastSingle(double number);
-
 } // namespace pelloric

@@ -178,13 +178,6 @@ std::string toUtf8(TextView text)
     return bytes;
 }
 
-Text decimal(std::int64_t number)
-{
-    char digits[24];
-    const auto end = std::to_chars(digits, digits + sizeof digits, number).ptr;
-    return { digits, end };
-}
-
 Text onOneLine(TextView text)
 {
     Text line = replaceAll(text, u"\r\n", u" ");
@@ -193,6 +186,13 @@ Text onOneLine(TextView text)
             unit = u' ';
     }
     return line;
+}
+
+Text decimal(std::int64_t number)
+{
+    char digits[24];
+    const auto end = std::to_chars(digits, digits + sizeof digits, number).ptr;
+    return { digits, end };
 }
 
 } // namespace pelloric

@@ -46,10 +46,10 @@ void appendUtf8(Text& text, std::string_view bytes);
 /// UTF-16 to UTF-8; half a surrogate pair becomes U+FFFD.
 std::string toUtf8(TextView text);
 
+/// The text with a blank for every line break, as a setting or a cell of plain text holds it.
+Text onOneLine(TextView text);
+
 /// Plain decimal, "-" in front when negative.
 Text decimal(std::int64_t number);
-
-/// A text with a blank for every line break.
-Text onOneLine(TextView text);
 
 } // namespace pelloric

@@ -68,24 +68,20 @@ Text pageListOf(TextView rangeText)
     return list;
 }
 
-PageNumbers::PageNumbers(TextView list)
-    : rest_(list)
+std::vector<std::int16_t> pageNumbersOf(TextView list)
 {
-}
-
-std::optional<std::int16_t> PageNumbers::next()
-{
-    while (!atEnd_) {
-        const TextView item = firstItem(rest_);
-        atEnd_ = item.size() == rest_.size();
-        rest_.remove_prefix(atEnd_ ? item.size() : item.size() + 1);
+    std::vector<std::int16_t> numbers;
+    for (bool atEnd = false; !atEnd;) {
+        const TextView item = firstItem(list);
+        atEnd = item.size() == list.size();
+        list.remove_prefix(atEnd ? item.size() : item.size() + 1);
         if (!isNumber(item))
             continue;
         const double number = endOf(item);
         if (number >= -LastPage - 1 && number <= LastPage)
-            return roundToInt16(number);
+            numbers.push_back(roundToInt16(number));
     }
-    return std::nullopt;
+    return numbers;
 }
 
 std::int16_t copiesOf(TextView text)

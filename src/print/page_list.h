@@ -6,7 +6,7 @@
 #include "platform/text.h"
 
 #include <cstdint>
-#include <optional>
+#include <vector>
 
 namespace pelloric {
 
@@ -20,22 +20,12 @@ namespace pelloric {
 /// @throws RunTimeError Overflow: the list would be longer than any document asks for
 Text pageListOf(TextView rangeText);
 
-/// Reads a page list item by item.
+/// The page numbers of a page list, in its order, one-based and maybe no pages of the document.
 ///
 /// An item counts when all of it, blanks at its ends aside, is one decimal number within 16 bits
 /// after rounding half to even; every other item is passed over.
-class PageNumbers {
-public:
-    /// @param list  numbers separated by ","; borrowed
-    explicit PageNumbers(TextView list);
-
-    /// The next page number, one-based and maybe no page of the document; nothing at the end.
-    std::optional<std::int16_t> next();
-
-private:
-    TextView rest_;
-    bool atEnd_ = false;
-};
+/// @param list  numbers separated by ","
+std::vector<std::int16_t> pageNumbersOf(TextView list);
 
 /// The number of copies that a text asks for: its leading number, and 1 when it is empty.
 /// @throws RunTimeError Overflow: past 16 bits

@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/numbers.h"
+#include "platform/units.h"
 
 #include <algorithm>
 #include <cmath>
@@ -12,8 +13,6 @@
 namespace pelloric {
 
 namespace {
-
-constexpr double TwipsPerMm = TwipsPerCm / 10.0;
 
 bool isSameLength(double mm, Twips twips)
 {

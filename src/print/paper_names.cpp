@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/numbers.h"
+#include "platform/units.h"
 
 #include <algorithm>
 #include <array>

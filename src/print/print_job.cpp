@@ -6,7 +6,6 @@
 #include "document/page_document.h"
 #include "platform/printer.h"
 #include "platform/run_time_error.h"
-#include "print/page_list.h"
 #include "view/page_renderer.h"
 
 #include <vector>
@@ -30,10 +29,9 @@ std::vector<int> pagesOfCopy(const PageDocument& document, const PrintJob& job)
             pages.push_back(page);
         return pages;
     }
-    PageNumbers numbers(job.pageList);
-    while (const auto number = numbers.next()) {
-        if (*number <= document.Totalpages && document.hasPage(*number - 1))
-            pages.push_back(*number - 1);
+    for (const std::int16_t number : job.pages) {
+        if (number <= document.Totalpages && document.hasPage(number - 1))
+            pages.push_back(number - 1);
     }
     return pages;
 }
@@ -73,9 +71,7 @@ std::int64_t printCopies(
             } catch (const RunTimeError& error) {
                 throw errorAfter(error, sent, wanted);
             }
-            ++sent;
-            if (job.pageSent)
-                job.pageSent(sent);
+            tell(job.progress, ++sent, wanted);
         }
     }
     return sent;

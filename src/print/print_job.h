@@ -3,11 +3,12 @@
 
 #pragma once
 
+#include "platform/progress.h"
 #include "platform/text.h"
 #include "platform/units.h"
 
 #include <cstdint>
-#include <functional>
+#include <vector>
 
 namespace pelloric {
 
@@ -17,17 +18,15 @@ struct Font;
 
 /// What is to be printed, and how.
 struct PrintJob {
-    bool allPages = true; ///< false: the pages of the list
-    Text pageList {}; ///< one-based page numbers separated by ","
+    bool allPages = true; ///< false: those of `pages`
+    std::vector<std::int16_t> pages {}; ///< from 1, in the order in which they are sent
     std::int16_t copies = 1; ///< whole copies one after the other; none below 1
     std::int16_t paperSize = 9; ///< paper-size code of the report
     std::int16_t orientation = 1; ///< 1 portrait, 2 landscape
     Twips pageWidth = 0; ///< for a paper-size code that names no form; 0: unknown
     Twips pageHeight = 0; ///< for a paper-size code that names no form; 0: unknown
     Text documentName {}; ///< in the printer's queue; the page number is added
-
-    /// Called after each page with the number of pages sent so far; may be empty.
-    std::function<void(std::int64_t)> pageSent {};
+    Progress progress {}; ///< told after each page how many are sent
 };
 
 /// Sends one page to the printer, its records where they stand, and hands the document over.
@@ -47,8 +46,9 @@ std::int64_t pagesToSend(const PageDocument& document, const PrintJob& job);
 /// no page makes no document.
 /// @param defaultFont  as in `printPage`
 /// @return             the number of pages sent
-/// @throws RunTimeError the printer's own with ", after N of M pages" behind its text, and what
-///         `pageSent` throws; the job ends there
+/// @throws RunTimeError the printer's own with ", after N of M pages" behind its text, or
+/// Cancelled:
+///         the progress said so; the job ends there
 std::int64_t doPrint(
     const PageDocument& document, const PrintJob& job, const Font& defaultFont, Printer& printer);
 

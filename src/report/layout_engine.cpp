@@ -50,7 +50,7 @@ LayoutEngine::LayoutEngine(const ReportSource& source, const Platform& platform,
 {
 }
 
-void LayoutEngine::build(ProgressListener& progress)
+void LayoutEngine::build(const Progress& progress)
 {
     const std::int64_t records = records_.count();
     const auto bands = static_cast<std::int64_t>(source_.bands.size());
@@ -60,16 +60,17 @@ void LayoutEngine::build(ProgressListener& progress)
     recorder_.setLineAttributes(gridPen(source_.style));
     startBand(0);
     drawHeader();
-    progress.begin(std::max<std::int64_t>(1, records * bands));
+    const std::int64_t steps = std::max<std::int64_t>(1, records * bands);
+    std::int64_t done = 0;
+    tell(progress, done, steps);
     drawColumnTitles();
     platform_.loop.runOnce();
     for (record_ = 1; record_ <= records; ++record_) {
-        progress.advance();
+        tell(progress, ++done, steps);
         platform_.loop.keepAlive();
         ++rowsOnPage_;
         layoutRow();
     }
-    progress.end();
     const PageSetup& setup = source_.setup;
     pageLines_.drawPageFooter(
         document_.currentPage + 1, static_cast<double>(setup.myHeight) - setup.intButtom + LineGap);

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "document/recorder.h"
+#include "platform/progress.h"
 #include "report/column_bands.h"
 #include "report/page_fields.h"
 #include "report/record_cells.h"
@@ -19,19 +20,6 @@ class RowSet;
 struct PageSetup;
 struct Platform;
 struct ReportStyle;
-
-/// Is told how far a long operation is.
-class ProgressListener {
-public:
-    virtual ~ProgressListener() = default;
-
-    /// @param maximum  how many steps will come, at least 1
-    virtual void begin(std::int64_t maximum) = 0;
-    /// One step more is done.
-    virtual void advance() = 0;
-    /// The operation is over.
-    virtual void end() = 0;
-};
 
 /// What a report is laid out from; all of it is borrowed.
 struct ReportSource {
@@ -53,9 +41,11 @@ public:
 
     /// Builds all pages.
     ///
+    /// @param progress  told before the rows and at each of them; there is at least one step
     /// @throws RunTimeError Overflow: more than 32767 pages, or a position past 32 bits; Cancelled:
-    ///         by the message loop, before the rows or at any of them; or an error of the row set
-    void build(ProgressListener& progress);
+    ///         by the message loop or the progress, before the rows or at any of them; or an error
+    ///         of the row set
+    void build(const Progress& progress);
 
     /// Where the titles of the last page were asked for, when there is a page header: twips.
     double titleTop() const { return titleTop_; }

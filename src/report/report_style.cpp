@@ -6,6 +6,7 @@
 #include "platform/file_bytes.h"
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
+#include "platform/units.h"
 #include "report/settings_check.h"
 #include "settings/settings_file.h"
 #include "settings/settings_table.h"
@@ -94,13 +95,12 @@ constexpr std::int16_t DefaultMargin = 2 * TwipsPerCm;
 void applyPaper(const StyleNumbers& numbers, const ReportSettings& settings, PageSetup& setup)
 {
     for (const MarginRow& row : Margins) {
-        const double twips = settings.*row.millimetres * row.factor * TwipsPerCm / 10;
+        const double twips = twipsOfMm(settings.*row.millimetres * row.factor);
         const std::int16_t margin = numbers.shortWhole(row.key, twips);
         setup.*row.field = margin == 0 ? DefaultMargin : margin;
     }
-    setup.myWidth = numbers.whole(SettingKey::PagerWidth, TwipsPerCm * settings.paperWidthMm / 10);
-    setup.myHeight
-        = numbers.whole(SettingKey::PagerHeight, TwipsPerCm * settings.paperHeightMm / 10);
+    setup.myWidth = numbers.whole(SettingKey::PagerWidth, twipsOfMm(settings.paperWidthMm));
+    setup.myHeight = numbers.whole(SettingKey::PagerHeight, twipsOfMm(settings.paperHeightMm));
 }
 
 } // namespace

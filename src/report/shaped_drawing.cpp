@@ -30,7 +30,7 @@ void ShapedLayout::printRows()
         drawRowLines(at);
         printCells(at);
         if (!page_[at].isTotal())
-            progress_->advance();
+            tell(progress_, ++stepsDone_, steps_);
     }
     lastTexts_.clear();
     if (page_.empty() || page_.back().isTotal())

@@ -42,21 +42,21 @@ ShapedLayout::ShapedLayout(const ShapedSource& source, const Platform& platform,
 {
 }
 
-void ShapedLayout::build(ProgressListener& progress)
+void ShapedLayout::build(const Progress& progress)
 {
-    progress_ = &progress;
+    progress_ = progress;
     lineHeight_ = font(source_.style.body.font.bold, source_.style.body.font.italic).lineHeight;
     resolve();
     resolveLines();
     const auto records = source_.rows.recordCount();
     startBand(0);
-    progress.begin(std::max<std::int64_t>(1, records * static_cast<std::int64_t>(bands_.size())));
+    steps_ = std::max<std::int64_t>(1, records * static_cast<std::int64_t>(bands_.size()));
+    tell(progress_, stepsDone_, steps_);
     platform_.loop.runOnce();
     if (source_.options.pageOrder == PageOrder::AcrossThenDown)
         buildAcross();
     else
         buildDown();
-    progress.end();
 }
 
 /// Finds the columns that the options name, and cuts the bands.

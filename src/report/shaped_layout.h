@@ -5,6 +5,7 @@
 
 #include "document/recorder.h"
 #include "platform/cell_look.h"
+#include "platform/progress.h"
 #include "report/layout_engine.h"
 #include "report/page_fields.h"
 #include "report/report_fit.h"
@@ -47,7 +48,7 @@ public:
 
     /// Builds all pages. @throws RunTimeError as `LayoutEngine::build`; InvalidCall: a column that
     /// the options name is not there
-    void build(ProgressListener& progress);
+    void build(const Progress& progress);
 
     /// Where the titles of the last page were asked for, when there is a page header: twips.
     double titleTop() const { return titleTop_; }
@@ -172,7 +173,9 @@ private:
     PageDocument& document_;
     Recorder& recorder_;
     PageLines pageLines_;
-    ProgressListener* progress_ = nullptr;
+    Progress progress_;
+    std::int64_t stepsDone_ = 0;
+    std::int64_t steps_ = 1;
 
     double padding_ = 0; ///< on each side of a text: twips
     MeasuredFont fonts_[2][2]; ///< of the body: by bold and italic

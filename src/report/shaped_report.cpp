@@ -87,7 +87,7 @@ void turnSheet(ReportStyle& style, PageSetup& setup)
 } // namespace
 
 ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
-    const ReportTarget& target, ProgressListener& progress)
+    const ReportTarget& target, const Progress& progress)
 {
     const Platform& platform = target.platform;
     Choice choice = choose(table, options, platform.decimalSeparator);

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include "platform/progress.h"
 #include "report/layout_engine.h"
 
 #include <pelloric/options.h>
@@ -33,6 +34,6 @@ struct ReportOutcome {
 /// @throws RunTimeError as `LayoutEngine::build`; InvalidCall: the options name a column that is
 ///         not printed, or marked rows where none is marked
 ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
-    const ReportTarget& target, ProgressListener& progress);
+    const ReportTarget& target, const Progress& progress);
 
 } // namespace pelloric

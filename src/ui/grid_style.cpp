@@ -16,10 +16,12 @@ namespace {
 /// The switches' keys, in the order of `GridSwitch`.
 constexpr auto SwitchKeys = std::to_array<SettingKey>(
     { SettingKey::ShowHeaders, SettingKey::GridHor, SettingKey::GridVer, SettingKey::GridMerge });
+static_assert(SwitchKeys.size() == GridSwitchCount);
 
 /// The fonts, in the order of `GridFont`.
 constexpr auto Fonts
     = std::to_array<ReportFont>({ ReportFont::Body, ReportFont::Header, ReportFont::Footer });
+static_assert(Fonts.size() == GridFontCount);
 
 } // namespace
 

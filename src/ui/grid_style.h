@@ -20,13 +20,18 @@ inline constexpr TextView FontColumns[] = { u"name", u"value" };
 
 /// The switches, in the order in which they are loaded and saved.
 enum class GridSwitch { ShowHeaders, GridHor, GridVer, GridMerge };
+inline constexpr std::size_t GridSwitchCount = 4;
+static_assert(static_cast<std::size_t>(GridSwitch::GridMerge) + 1 == GridSwitchCount);
 
 /// The fonts, in the order of their rows.
 enum class GridFont { Body, Header, Footer };
+inline constexpr std::size_t GridFontCount = 3;
+static_assert(static_cast<std::size_t>(GridFont::Footer) + 1 == GridFontCount);
 
 /// The rows of the list of fonts.
 inline constexpr auto FontRows
     = std::to_array<TextView>({ u"Font", u"Header Font", u"Footer Font" });
+static_assert(FontRows.size() == GridFontCount);
 
 /// What the font dialog offers here: screen and printer fonts, with effects.
 inline constexpr int FontDialogFlags = 259;
@@ -80,8 +85,8 @@ private:
 
     const Platform& platform_;
     ReportSettings* own_;
-    std::array<std::int16_t, 4> switches_ {};
-    std::array<ColoredFont, 3> fonts_;
+    std::array<std::int16_t, GridSwitchCount> switches_ {};
+    std::array<ColoredFont, GridFontCount> fonts_;
     Text selectedRow_;
 };
 

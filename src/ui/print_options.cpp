@@ -35,10 +35,8 @@ PrintDoubt rangeDoubt(const PrintEntries& entries, int pages)
     if (range.empty())
         return PrintDoubt::EmptyRange;
     try {
-        const Text list = pageListOf(range);
-        PageNumbers numbers(list);
-        while (const auto number = numbers.next()) {
-            if (*number >= 1 && (pages == 0 || *number <= pages))
+        for (const std::int16_t number : pageNumbersOf(pageListOf(range))) {
+            if (number >= 1 && (pages == 0 || number <= pages))
                 return PrintDoubt::None;
         }
     } catch (const RunTimeError&) {

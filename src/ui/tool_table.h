@@ -5,6 +5,7 @@
 
 #include "platform/text.h"
 
+#include <algorithm>
 #include <array>
 #include <cstdint>
 
@@ -36,7 +37,7 @@ enum class ToolAction {
     SaveFile,
     ClearPages,
     Enlarge,
-    Shrink,
+    Shrink, ///< the last one
 };
 
 /// What a tool is made as.
@@ -118,10 +119,32 @@ inline constexpr auto PreviewTools = std::to_array<PreviewTool>({
     { 24, u"tool24", u"Minimum", ToolKind::Button, true, ToolAction::Shrink, ToolGroup::Report,
         u"Ctrl+Down", u"shrink" },
 });
-static_assert(PreviewTools.size() == 25);
+static_assert(PreviewTools.size() == static_cast<std::size_t>(ToolAction::Shrink) + 1);
 
-/// What the context menu of a page holds, in its order: tool numbers.
-inline constexpr auto ContextMenuTools = std::to_array<int>({ 22, 20, 21 });
+/// Whether every tool is there, and once.
+constexpr bool hasEveryTool()
+{
+    for (std::size_t action = 0; action < PreviewTools.size(); ++action) {
+        const auto does = [&](const PreviewTool& tool) {
+            return tool.action == static_cast<ToolAction>(action);
+        };
+        if (std::count_if(PreviewTools.begin(), PreviewTools.end(), does) != 1)
+            return false;
+    }
+    return true;
+}
+static_assert(hasEveryTool());
+
+/// The tool that does something.
+constexpr const PreviewTool& toolOf(ToolAction action)
+{
+    return *std::find_if(PreviewTools.begin(), PreviewTools.end(),
+        [&](const PreviewTool& tool) { return tool.action == action; });
+}
+
+/// What the context menu of a page holds, in its order.
+inline constexpr auto ContextMenuTools
+    = std::to_array({ ToolAction::ClearPages, ToolAction::OpenFile, ToolAction::SaveFile });
 
 /// The tool that a click on a number means; combos raise changes and are never clicked.
 /// @return  null: there is none of that number

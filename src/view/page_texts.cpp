@@ -56,14 +56,8 @@ bool isSameRow(const PageRect& first, const PageRect& next)
     return middle(next) >= first.top && middle(next) <= first.bottom;
 }
 
-Text oneLine(Text text)
-{
-    for (char16_t& unit : text) {
-        if (unit == u'\t' || unit == u'\n' || unit == u'\r')
-            unit = u' ';
-    }
-    return text;
-}
+/// A cell of a table whose cells end with tabs.
+Text plainCell(TextView text) { return replaceAll(onOneLine(text), u"\t", u" "); }
 
 } // namespace
 
@@ -118,7 +112,7 @@ Text asTable(std::vector<PlacedText> texts)
         for (auto text = row; text != end; ++text) {
             if (text != row)
                 table += u'\t';
-            table += oneLine(text->text);
+            table += plainCell(text->text);
         }
         row = end;
     }

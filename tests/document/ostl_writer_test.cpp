@@ -45,7 +45,7 @@ struct SavedWorld {
         return stream.str();
     }
 
-    void save(const std::filesystem::path& path, const OstlProgress& progress = {})
+    void save(const std::filesystem::path& path, const Progress& progress = {})
     {
         writeOstl(document, setup, { codec }, progress, SafeFile(files, path));
     }
@@ -141,12 +141,17 @@ TEST(OstlWriter, TellsEveryPageBeforeItIsWritten)
     SavedWorld world;
     world.document.newPage();
     world.document.newPage();
-    std::vector<std::pair<int, int>> steps;
+    std::vector<std::pair<std::int64_t, std::int64_t>> steps;
     std::ostringstream stream;
     writeOstl(
         world.document, world.setup, { world.codec },
-        [&](int page, int last) { steps.emplace_back(page, last); }, stream);
-    EXPECT_EQ(steps, (std::vector<std::pair<int, int>> { { 0, 2 }, { 1, 2 }, { 2, 2 } }));
+        [&](std::int64_t done, std::int64_t total) {
+            steps.emplace_back(done, total);
+            return true;
+        },
+        stream);
+    EXPECT_EQ(steps,
+        (std::vector<std::pair<std::int64_t, std::int64_t>> { { 0, 3 }, { 1, 3 }, { 2, 3 } }));
 }
 
 TEST(OstlWriter, WritesFewerOrNoPagesWhenTotalpagesSaysSo)
@@ -196,7 +201,7 @@ TEST(OstlWriter, ChangesNothingWhenTheUserEndsTheSave)
     const TempFolder folder;
     folder.write("a.ostl", "old");
     SavedWorld world;
-    const auto cancel = [](int, int) { throw RunTimeError(ErrorNumber::Cancelled); };
+    const auto cancel = [](std::int64_t, std::int64_t) { return false; };
     EXPECT_EQ(errorOf([&] { world.save(folder.file("a.ostl"), cancel); }), ErrorNumber::Cancelled);
     EXPECT_EQ(folder.read("a.ostl"), "old");
     EXPECT_EQ(folder.names().size(), 1U);

@@ -86,6 +86,25 @@ TEST(Rounding, OverflowsOutsideItsType)
     EXPECT_EQ(errorOf([] { narrowToInt16(-32769); }), ErrorNumber::Overflow);
 }
 
+TEST(ToSingle, OverflowsPastASinglesRangeAndNamesTheNumber)
+{
+    EXPECT_EQ(toSingle(8.1), 8.1F);
+    EXPECT_EQ(toSingle(-3.4028234663852886e38), -3.4028234663852886e38F);
+    for (const double value : { 3.41e38, -3.41e38, Infinity, -Infinity, NotANumber })
+        EXPECT_EQ(errorOf([&] { toSingle(value); }), ErrorNumber::Overflow) << value;
+    const auto textOf = [](double value, TextView what) {
+        try {
+            toSingle(value, what);
+        } catch (const RunTimeError& error) {
+            return toUtf8(error.text());
+        }
+        return std::string("no error");
+    };
+    EXPECT_EQ(textOf(1e60, u""), "Overflow: 1E+60 is past what a single-precision number holds");
+    EXPECT_EQ(textOf(1e60, u"BodyFontSize"),
+        "Overflow: BodyFontSize: 1E+60 is past what a single-precision number holds");
+}
+
 TEST(StrictInt16, TakesAWholeNumberAndNothingElse)
 {
     EXPECT_EQ(strictInt16(u" 9 "), 9);

@@ -67,6 +67,13 @@ TEST(Text, ReplacesBytesThatAreNoCharacter)
         EXPECT_EQ(fromUtf8(row.bytes), row.text);
 }
 
+TEST(Text, PutsABlankForEveryLineBreak)
+{
+    EXPECT_EQ(onOneLine(u"a\r\nb\nc\rd\n\re\t"), u"a b c d  e\t");
+    EXPECT_EQ(onOneLine(u"\r\n"), u" ");
+    EXPECT_EQ(onOneLine(u""), u"");
+}
+
 TEST(Text, WritesWholeNumbers)
 {
     EXPECT_EQ(decimal(0), u"0");

@@ -15,11 +15,8 @@ namespace {
 
 std::vector<int> numbersOf(TextView list)
 {
-    std::vector<int> found;
-    PageNumbers numbers(list);
-    while (const auto number = numbers.next())
-        found.push_back(*number);
-    return found;
+    const std::vector<std::int16_t> numbers = pageNumbersOf(list);
+    return { numbers.begin(), numbers.end() };
 }
 
 } // namespace

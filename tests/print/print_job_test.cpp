@@ -4,6 +4,7 @@
 #include "print/print_job.h"
 
 #include "fakes/fake_printer.h"
+#include "print/page_list.h"
 #include "support/errors.h"
 #include "support/recorded_pages.h"
 
@@ -48,7 +49,7 @@ public:
 PrintJob jobOf(TextView list, std::int16_t copies = 1)
 {
     return { .allPages = list.empty(),
-        .pageList = Text(list),
+        .pages = pageNumbersOf(list),
         .copies = copies,
         .paperSize = 8,
         .orientation = 2 };
@@ -164,7 +165,10 @@ TEST(DoPrint, EndsWithThePrintersErrorAndPutsItsSettingsBack)
     printer.failAt = 3;
     std::int64_t sent = 0;
     PrintJob job = jobOf(u"");
-    job.pageSent = [&](std::int64_t pages) { sent = pages; };
+    job.progress = [&](std::int64_t pages, std::int64_t) {
+        sent = pages;
+        return true;
+    };
     EXPECT_EQ(
         errorOf([&] { doPrint(document, job, DefaultFont, printer); }), ErrorNumber::InvalidCall);
     EXPECT_EQ(printer.jobs, Before + "page 1; end; page 2; " + After);
@@ -192,10 +196,10 @@ TEST(DoPrint, ReportsEveryPageSentAndStopsWhenAsked)
     JobPrinter printer;
     std::vector<std::int64_t> steps;
     PrintJob job = jobOf(u"", 2);
-    job.pageSent = [&](std::int64_t pages) {
+    job.progress = [&](std::int64_t pages, std::int64_t wanted) {
+        EXPECT_EQ(wanted, 6);
         steps.push_back(pages);
-        if (pages == 4)
-            throw RunTimeError(ErrorNumber::Cancelled);
+        return pages < 4;
     };
     EXPECT_EQ(
         errorOf([&] { doPrint(document, job, DefaultFont, printer); }), ErrorNumber::Cancelled);

@@ -12,6 +12,7 @@
 #include "platform/platform.h"
 #include "platform/qt/qt_drawing_surface.h"
 #include "platform/qt/qt_text.h"
+#include "platform/units.h"
 #include "view/page_renderer.h"
 #include "view/page_texts.h"
 

@@ -46,10 +46,4 @@ std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& opti
     return pages;
 }
 
-void tell(const ExportOptions& options, std::size_t done, std::size_t total)
-{
-    if (options.progress && !options.progress(static_cast<int>(done), static_cast<int>(total)))
-        throw RunTimeError(ErrorNumber::Cancelled);
-}
-
 } // namespace pelloric::qt

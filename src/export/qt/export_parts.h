@@ -14,8 +14,4 @@ void checkPaper(const PageSetup& setup);
 /// @throws RunTimeError SubscriptOutOfRange: no such page
 std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& options);
 
-/// Says how many pages are done.
-/// @throws RunTimeError Cancelled: nobody wants the rest
-void tell(const ExportOptions& options, std::size_t done, std::size_t total);
-
 } // namespace pelloric::qt

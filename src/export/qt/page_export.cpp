@@ -17,6 +17,7 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/safe_file.h"
+#include "platform/units.h"
 #include "view/joined_lines.h"
 #include "view/page_renderer.h"
 
@@ -26,15 +27,13 @@
 #include <QPdfWriter>
 
 #include <algorithm>
+#include <cmath>
 #include <memory>
 #include <string>
 
 namespace pelloric::qt {
 
 namespace {
-
-constexpr Twips TwipsPerPoint = 20;
-constexpr double InchesPerMetre = 1 / 0.0254;
 
 /// A cosmetic line of a PDF is one pixel of this resolution wide: fine, and seen everywhere.
 constexpr int PdfResolution = 600;
@@ -97,7 +96,7 @@ public:
             throw RunTimeError(ErrorNumber::Overflow,
                 u"there is no memory for an image of " + decimal(size.width()) + u" by "
                     + decimal(size.height()) + u" pixels; choose a lower resolution");
-        const int dotsPerMetre = roundToInt32(dpi * InchesPerMetre);
+        const int dotsPerMetre = roundToInt32(dpi * 1000 / MmPerInch);
         image_.setDotsPerMeterX(dotsPerMetre);
         image_.setDotsPerMeterY(dotsPerMetre);
     }
@@ -120,7 +119,7 @@ private:
 };
 
 /// The toolkit's pages measure whole points.
-int wholePoints(Twips length) { return (length + TwipsPerPoint - 1) / TwipsPerPoint; }
+int wholePoints(Twips length) { return roundToInt32(std::ceil(length / TwipsPerPoint)); }
 
 void setUpPdf(QPdfWriter& writer, const PageSetup& setup, const Text& title)
 {
@@ -153,10 +152,10 @@ std::vector<std::filesystem::path> exportEach(const PageDocument& document,
     const std::vector<std::filesystem::path> paths = pageFilePaths(document, options, path);
     PendingFiles files;
     for (std::size_t done = 0; done < pages.size(); ++done) {
-        tell(options, done, pages.size());
+        tell(options.progress, done, pages.size());
         files.write(paths[done], [&](QFile& file) { return write(pages[done], file); });
     }
-    tell(options, pages.size(), pages.size());
+    tell(options.progress, pages.size(), pages.size());
     files.putInPlace();
     return paths;
 }
@@ -200,13 +199,13 @@ void exportPdfByToolkit(const PageDocument& document, const PageSetup& setup, Qt
         setUpPdf(writer, setup, options.title);
         QPainter painter;
         for (std::size_t done = 0; done < pages.size(); ++done) {
-            tell(options, done, pages.size());
+            tell(options.progress, done, pages.size());
             const bool isReady = done == 0 ? painter.begin(&writer) : writer.newPage();
             if (!isReady || file.error() != QFileDevice::NoError)
                 return false;
             pagePainter.paint(pages[done], painter, PdfResolution, false);
         }
-        tell(options, pages.size(), pages.size());
+        tell(options.progress, pages.size(), pages.size());
         return painter.end();
     });
     files.putInPlace();
@@ -249,11 +248,8 @@ std::vector<std::filesystem::path> exportSvg(const PageDocument& document, const
 void exportOstl(const PageDocument& document, const PageSetup& setup, const OstlEncoding& encoding,
     const ExportOptions& options, const std::filesystem::path& path)
 {
-    const auto step = [&](int page, int last) {
-        tell(options, static_cast<std::size_t>(page), static_cast<std::size_t>(last) + 1);
-    };
     QtFiles files;
-    writeOstl(document, setup, encoding, step, SafeFile(files, path));
+    writeOstl(document, setup, encoding, options.progress, SafeFile(files, path));
 }
 
 } // namespace pelloric::qt

@@ -3,10 +3,10 @@
 
 #pragma once
 
+#include "platform/progress.h"
 #include "platform/text.h"
 
 #include <filesystem>
-#include <functional>
 #include <vector>
 
 namespace pelloric {
@@ -31,8 +31,7 @@ struct ExportOptions {
     /// rows of cells where the document was built from a grid, else paragraphs. It has an outline.
     bool isTagged = false;
     bool isArchive = false; ///< a PDF file is PDF/A-2b, which can be read for good
-    /// Told before each page how many are done; answers whether to go on. May be empty.
-    std::function<bool(int done, int total)> progress {};
+    Progress progress {}; ///< told before each page how many are done
 };
 
 /// How a PDF file came about.

@@ -35,14 +35,14 @@ void drawPages(const PageDocument& document, const PageSetup& setup, const Expor
     const std::vector<int> pages = pagesOf(document, options);
     const PageRenderer renderer(document);
     for (std::size_t done = 0; done < pages.size(); ++done) {
-        tell(options, done, pages.size());
+        tell(options.progress, done, pages.size());
         const pdf::Paper paper { .width = setup.myWidth, .height = setup.myHeight };
         JoinedLines joined(writer.beginPage(paper, document.structure, pages[done]));
         renderer.replay(pages[done], {}, joined);
         joined.finish();
         writer.endPage();
     }
-    tell(options, pages.size(), pages.size());
+    tell(options.progress, pages.size(), pages.size());
 }
 
 } // namespace

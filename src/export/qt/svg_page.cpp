@@ -8,6 +8,7 @@
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
 #include "platform/text_metrics.h"
+#include "platform/units.h"
 
 #include <QBuffer>
 #include <QByteArray>
@@ -23,8 +24,7 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerUnit = 15; ///< 96 units an inch
-constexpr double TwipsPerPoint = 20;
+constexpr double TwipsPerUnit = TwipsPerInch / 96;
 constexpr int OutlineEm = 1000; ///< units that outlines are drawn in
 
 /// Lengths of strokes and gaps by draw style: widths of the pen; those past a 0 do not count.

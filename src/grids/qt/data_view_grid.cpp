@@ -3,6 +3,7 @@
 
 #include "grids/qt/data_view_grid.h"
 
+#include "grids/collection.h"
 #include "grids/qt/held_grid.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
@@ -16,21 +17,21 @@
 #include <QItemSelectionModel>
 #include <QTableView>
 
+#include <iterator>
+
 namespace pelloric::qt {
 
 namespace {
 
-enum Member { DataSource, ColumnsMember, Col };
+enum Member { DataSource, ColumnsMember, Col, MemberCount };
 
 constexpr TextView Names[] = { u"DataSource", u"Columns", u"col" };
+static_assert(std::size(Names) == MemberCount);
 
-enum CollectionMember { Count, Item };
-
-constexpr TextView CollectionNames[] = { u"Count", u"Item" };
-
-enum ColumnMember { Width, Caption };
+enum ColumnMember { Width, Caption, ColumnMemberCount };
 
 constexpr TextView ColumnNames[] = { u"Width", u"Caption" };
+static_assert(std::size(ColumnNames) == ColumnMemberCount);
 
 QTableView& alive(const QPointer<QTableView>& view)
 {
@@ -84,10 +85,11 @@ private:
 } // namespace
 
 /// The columns in the order in which they are seen, counted from 0.
-class DataViewGrid::Columns final : public AutomationObject {
+class DataViewGrid::Columns final : public Collection {
 public:
     explicit Columns(const QPointer<QTableView>& view)
-        : view_(view)
+        : Collection(0)
+        , view_(view)
         , column_(view)
     {
         take();
@@ -97,29 +99,15 @@ public:
 
     const SectionMap& map() const { return map_; }
 
-    std::optional<MemberId> findMember(TextView name) override
-    {
-        return findMemberName(CollectionNames, name);
-    }
-
-    const void* memberTable() const override { return CollectionNames; }
-
-    Value get(MemberId member, std::span<const Value> arguments) override
-    {
-        if (member == Count)
-            return Value::ofNumber(map_.count());
-        if (member != Item)
-            refuseMember(CollectionNames, member);
-        column_.pointAt(map_.logical(indexArgument(arguments, 0, 0, map_.count() - 1)));
-        return Value::ofObject(column_);
-    }
-
-    void put(MemberId member, std::span<const Value>, const Value&) override
-    {
-        refuseMember(CollectionNames, member);
-    }
-
 private:
+    int count() const override { return map_.count(); }
+
+    AutomationObject& itemAt(int place) override
+    {
+        column_.pointAt(map_.logical(place));
+        return column_;
+    }
+
     const QPointer<QTableView>& view_;
     SectionMap map_;
     Column column_;
@@ -147,7 +135,7 @@ Value DataViewGrid::get(MemberId member, std::span<const Value> arguments)
         return Value::ofRows(takeRows());
     case ColumnsMember:
         columns_->take();
-        return arguments.empty() ? Value::ofObject(*columns_) : columns_->get(Item, arguments);
+        return arguments.empty() ? Value::ofObject(*columns_) : columns_->item(arguments);
     case Col:
         return Value::ofNumber(column());
     default:

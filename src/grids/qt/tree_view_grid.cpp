@@ -3,6 +3,7 @@
 
 #include "grids/qt/tree_view_grid.h"
 
+#include "grids/collection.h"
 #include "grids/qt/cell_text.h"
 #include "grids/qt/view_looks.h"
 #include "grids/qt/view_sections.h"
@@ -18,27 +19,27 @@
 #include <QTreeView>
 
 #include <functional>
+#include <iterator>
 #include <vector>
 
 namespace pelloric::qt {
 
 namespace {
 
-enum GridMember { ColumnHeaders, ListItems };
+enum GridMember { ColumnHeaders, ListItems, GridMemberCount };
 
 constexpr TextView GridNames[] = { u"ColumnHeaders", u"ListItems" };
+static_assert(std::size(GridNames) == GridMemberCount);
 
-enum CollectionMember { Count, Item };
-
-constexpr TextView CollectionNames[] = { u"Count", u"Item" };
-
-enum HeaderMember { HeaderWidth, HeaderText };
+enum HeaderMember { HeaderWidth, HeaderText, HeaderMemberCount };
 
 constexpr TextView HeaderNames[] = { u"Width", u"Text" };
+static_assert(std::size(HeaderNames) == HeaderMemberCount);
 
-enum ItemMember { ItemText, SubItems };
+enum ItemMember { ItemText, SubItems, ItemMemberCount };
 
 constexpr TextView ItemNames[] = { u"Text", u"SubItems" };
+static_assert(std::size(ItemNames) == ItemMemberCount);
 
 /// Tells that the rows of a model are no longer those that were listed.
 class ModelWatch {
@@ -257,37 +258,24 @@ private:
 };
 
 /// The column headers, counted from 1.
-class TreeViewGrid::Headers final : public AutomationObject {
+class TreeViewGrid::Headers final : public Collection {
 public:
     explicit Headers(Source& source)
-        : source_(source)
+        : Collection(1)
+        , source_(source)
         , header_(source)
     {
     }
 
-    std::optional<MemberId> findMember(TextView name) override
-    {
-        return findMemberName(CollectionNames, name);
-    }
-
-    const void* memberTable() const override { return CollectionNames; }
-
-    Value get(MemberId member, std::span<const Value> arguments) override
-    {
-        if (member == Count)
-            return Value::ofNumber(source_.columns.count());
-        if (member != Item)
-            refuseMember(CollectionNames, member);
-        header_.pointAt(indexArgument(arguments, 0, 1, source_.columns.count()) - 1);
-        return Value::ofObject(header_);
-    }
-
-    void put(MemberId member, std::span<const Value>, const Value&) override
-    {
-        refuseMember(CollectionNames, member);
-    }
-
 private:
+    int count() const override { return source_.columns.count(); }
+
+    AutomationObject& itemAt(int place) override
+    {
+        header_.pointAt(place);
+        return header_;
+    }
+
     Source& source_;
     Header header_;
 };
@@ -339,38 +327,24 @@ private:
 };
 
 /// The rows, counted from 1.
-class TreeViewGrid::Items final : public AutomationObject {
+class TreeViewGrid::Items final : public Collection {
 public:
     explicit Items(Source& source)
-        : source_(source)
+        : Collection(1)
+        , source_(source)
         , item_(source)
     {
     }
 
-    std::optional<MemberId> findMember(TextView name) override
-    {
-        return findMemberName(CollectionNames, name);
-    }
-
-    const void* memberTable() const override { return CollectionNames; }
-
-    Value get(MemberId member, std::span<const Value> arguments) override
-    {
-        const auto count = static_cast<int>(source_.rows.size());
-        if (member == Count)
-            return Value::ofNumber(count);
-        if (member != Item)
-            refuseMember(CollectionNames, member);
-        item_.pointAt(indexArgument(arguments, 0, 1, count) - 1);
-        return Value::ofObject(item_);
-    }
-
-    void put(MemberId member, std::span<const Value>, const Value&) override
-    {
-        refuseMember(CollectionNames, member);
-    }
-
 private:
+    int count() const override { return static_cast<int>(source_.rows.size()); }
+
+    AutomationObject& itemAt(int place) override
+    {
+        item_.pointAt(place);
+        return item_;
+    }
+
     Source& source_;
     ListItem item_;
 };
@@ -410,14 +384,14 @@ Value TreeViewGrid::get(MemberId member, std::span<const Value> arguments)
     switch (member) {
     case ColumnHeaders:
         if (!arguments.empty())
-            return headers_->get(Item, arguments);
+            return headers_->item(arguments);
         source_->takeColumns();
         return Value::ofObject(*headers_);
     case ListItems:
         if (!arguments.empty()) {
             if (source_->watch.isChanged())
                 source_->takeRows();
-            return items_->get(Item, arguments);
+            return items_->item(arguments);
         }
         source_->takeRows();
         return Value::ofObject(*items_);

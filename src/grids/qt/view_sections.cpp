@@ -4,6 +4,7 @@
 #include "grids/qt/view_sections.h"
 
 #include "platform/numbers.h"
+#include "platform/units.h"
 
 #include <QAbstractProxyModel>
 #include <QHeaderView>

@@ -5,6 +5,7 @@
 
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
+#include "platform/units.h"
 
 #include <QFontDatabase>
 #include <QTextLayout>
@@ -16,7 +17,6 @@ namespace pelloric::qt {
 namespace {
 
 constexpr double WidestLine = 1e7; ///< pixels; nothing is wrapped
-constexpr double TwipsPerPoint = 20;
 
 } // namespace
 

@@ -6,6 +6,7 @@
 #include "platform/qt/glyph_runs.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
+#include "platform/units.h"
 
 #include <QFontMetricsF>
 #include <QPaintEngine>
@@ -21,8 +22,6 @@
 namespace pelloric::qt {
 
 namespace {
-
-constexpr double TwipsPerPoint = 20;
 
 /// An em this close to whole pixels is taken as whole.
 constexpr double WholePixel = 1e-4;

@@ -5,6 +5,7 @@
 
 #include "platform/qt/glyph_runs.h"
 #include "platform/qt/qt_text.h"
+#include "platform/units.h"
 
 #include <QFontDatabase>
 #include <QFontInfo>
@@ -20,8 +21,6 @@ namespace {
 
 /// At this size, a multiple of the units that outlines are drawn in, advances are exact.
 constexpr int ReferencePixels = 2048;
-
-constexpr double TwipsPerPoint = 20;
 
 /// Names kept before the table of names is emptied: a document may hold any number of them.
 constexpr std::size_t MostNames = 4096;

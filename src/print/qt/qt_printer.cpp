@@ -5,6 +5,7 @@
 
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "platform/units.h"
 #include "print/qt/paper_sizes.h"
 #include "print/qt/qt_printer_system.h"
 #include "print/qt/spooler.h"

@@ -4,6 +4,8 @@
 #include "print/qt/sheet.h"
 
 #include "platform/qt/qt_text.h"
+#include "platform/units.h"
+#include "print/paper_fit.h"
 #include "print/qt/paper_sizes.h"
 #include "print/qt/spooler.h"
 
@@ -17,8 +19,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerMm = TwipsPerCm / 10.0;
-constexpr double SameSizeMm = 1;
 constexpr std::int16_t Landscape = 2;
 
 QPageLayout::Orientation orientationOf(const PaperRequest& pages)
@@ -28,8 +28,8 @@ QPageLayout::Orientation orientationOf(const PaperRequest& pages)
 
 bool isSame(const QSizeF& one, const QSizeF& other)
 {
-    return std::abs(one.width() - other.width()) < SameSizeMm
-        && std::abs(one.height() - other.height()) < SameSizeMm;
+    return std::abs(one.width() - other.width()) < SamePaperMm
+        && std::abs(one.height() - other.height()) < SamePaperMm;
 }
 
 /// The sizes that a printer takes besides its own papers: millimetres.
@@ -40,7 +40,7 @@ bool takesSize(const QPrinterInfo& printer, const QSizeF& size)
     const QSizeF least = printer.minimumPhysicalPageSize().size(QPageSize::Millimeter);
     const QSizeF most = printer.maximumPhysicalPageSize().size(QPageSize::Millimeter);
     const auto lies = [](double length, double low, double high) {
-        return length > low - SameSizeMm && (high <= 0 || length < high + SameSizeMm);
+        return length > low - SamePaperMm && (high <= 0 || length < high + SamePaperMm);
     };
     return lies(size.width(), least.width(), most.width())
         && lies(size.height(), least.height(), most.height());

@@ -19,6 +19,8 @@ constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max();
 constexpr std::size_t RowsOfAStep = 4096; ///< between two reports of the progress
 constexpr std::size_t MostNamedRows = 5; ///< of those that look glued
 
+constexpr std::int64_t Steps = 1000; ///< of the whole work
+
 /// Part of the whole work after which the bytes are read.
 constexpr double PartRead = 0.3;
 
@@ -36,10 +38,9 @@ char delimiterOf(const std::filesystem::path& path, std::string_view text)
 }
 
 /// Tells how far a walk over the rows has come.
-void tell(const CsvOptions& options, double part)
+void tellPart(const CsvOptions& options, double part)
 {
-    if (options.progress && !options.progress(part))
-        throw RunTimeError(ErrorNumber::Cancelled);
+    tell(options.progress, static_cast<std::int64_t>(part * Steps), Steps);
 }
 
 /// Rows with another number of values than the titles.
@@ -138,7 +139,7 @@ TableGrid makeGrid(
             continue;
         const double part
             = static_cast<double>(values.position()) / static_cast<double>(text.size());
-        tell(options, PartRead + (1 - PartRead) * part);
+        tellPart(options, PartRead + (1 - PartRead) * part);
         if (rows == RowsOfAStep)
             grid.reserve(static_cast<std::size_t>(static_cast<double>(rows) / part * Spare));
     }
@@ -182,7 +183,11 @@ TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
 {
     TextFileOptions reading { options.encoding, {} };
     if (options.progress)
-        reading.progress = [&](double part) { return options.progress(part * PartRead); };
+        reading.progress = [&](std::int64_t done, std::int64_t total) {
+            const double part
+                = static_cast<double>(done) / static_cast<double>(std::max<std::int64_t>(1, total));
+            return options.progress(static_cast<std::int64_t>(part * PartRead * Steps), Steps);
+        };
     const TextFile file = readTextFile(path, reading);
     refuseZeroBytes(file.text);
     const ValuesDialect dialect {

@@ -14,8 +14,7 @@ namespace pelloric::qt {
 /// How a file of separated values is read.
 struct CsvOptions {
     QString encoding {}; ///< as `TextFileOptions` has it
-    /// Told now and then how much is done; answers whether to go on. May be empty.
-    std::function<bool(double part)> progress {};
+    Progress progress {}; ///< told now and then how many thousandths of the work are done
     std::optional<char> delimiter {}; ///< an ASCII character; nothing: found out
     bool hasQuotes = true; ///< false: a quote is a character like any other
     /// Gets sentences that the user should read: an encoding that was guessed, rows that look glued

@@ -228,8 +228,8 @@ TableGrid readRows(const SqliteSource& source, QSqlQuery& query)
     while (query.next()) {
         grid.addRow(texts.read(query));
         const std::int64_t rows = grid.rowCount();
-        if (rows % RowsPerReport == 0 && source.progress && !source.progress(rows))
-            throw RunTimeError(ErrorNumber::Cancelled);
+        if (rows % RowsPerReport == 0)
+            tell(source.progress, rows, 0);
     }
     if (query.lastError().isValid())
         refuse(query.lastError());

@@ -4,11 +4,11 @@
 #pragma once
 
 #include "grids/table_grid.h"
+#include "platform/progress.h"
 
 #include <QString>
 
 #include <filesystem>
-#include <functional>
 
 namespace pelloric::qt {
 
@@ -18,8 +18,8 @@ struct SqliteSource {
     QString table {}; ///< a table or view; empty: the only one that there is
     QString query {}; ///< a SELECT statement, taken instead of the table when it is not empty
     char16_t decimalSeparator = u'.';
-    /// Told now and then how many rows have been read; answers whether to go on. May be empty.
-    std::function<bool(std::int64_t rows)> progress {};
+    Progress
+        progress {}; ///< told now and then how many rows have been read; nobody knows of how many
 };
 
 /// Reads a table or the answer of a query into a table, the names of the columns as titles.

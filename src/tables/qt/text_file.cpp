@@ -56,9 +56,9 @@ std::string readAll(const std::filesystem::path& path, const TextFileOptions& op
         bytes.resize(size + Chunk);
         file.read(bytes.data() + size, ChunkBytes);
         size += static_cast<std::size_t>(file.gcount());
-        const double part = whole > 0 ? static_cast<double>(size) / static_cast<double>(whole) : 0;
-        if (options.progress && !options.progress(std::min(1.0, part)))
-            throw RunTimeError(ErrorNumber::Cancelled);
+        // A pipe has no size, and a file may grow while it is read.
+        tell(options.progress, static_cast<std::int64_t>(size),
+            static_cast<std::int64_t>(whole > 0 ? std::max(size, whole) : 0));
     }
     if (file.bad())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));

@@ -3,12 +3,12 @@
 
 #pragma once
 
+#include "platform/progress.h"
 #include "platform/text.h"
 
 #include <QString>
 
 #include <filesystem>
-#include <functional>
 #include <string>
 
 namespace pelloric::qt {
@@ -23,8 +23,7 @@ struct TextFile {
 /// How a text file is read.
 struct TextFileOptions {
     QString encoding {}; ///< empty: by a byte order mark, else UTF-8, else guessed by the letters
-    /// Told now and then how much has been read; answers whether to go on. May be empty.
-    std::function<bool(double part)> progress {};
+    Progress progress {}; ///< told now and then how many bytes have been read
 };
 
 /// Reads a text file of any encoding.

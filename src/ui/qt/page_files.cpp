@@ -117,14 +117,14 @@ std::vector<std::filesystem::path> filesInTheWay(
     return files;
 }
 
-void savePages(Canvas& canvas, QtFonts& fonts, const std::filesystem::path& path,
-    const std::function<bool(int done, int total)>& mayGoOn)
+void savePages(
+    Canvas& canvas, QtFonts& fonts, const std::filesystem::path& path, const Progress& progress)
 {
     const PageFile* const kind = kindOf(path);
     if (kind == nullptr)
         throw RunTimeError(ErrorNumber::InvalidCall,
             pathText(path) + u": the name must end in .pdf, .png or .svg");
-    const ExportOptions options { .title = canvas.documentTitle(), .progress = mayGoOn };
+    const ExportOptions options { .title = canvas.documentTitle(), .progress = progress };
     canvas.keepDocument([&] { kind->write(canvas, fonts, options, path); });
 }
 

@@ -3,12 +3,12 @@
 
 #pragma once
 
+#include "platform/progress.h"
 #include "platform/text.h"
 
 #include <QStringList>
 
 #include <filesystem>
-#include <functional>
 #include <vector>
 
 namespace pelloric {
@@ -32,10 +32,10 @@ std::vector<std::filesystem::path> filesInTheWay(
 
 /// Writes the pages of a canvas as the path's ending says: .pdf, .png or .svg, the pictures one
 /// file a page as the exports name them.
-/// @param mayGoOn  told how many pages are done of how many; its answer false ends the writing
+/// @param progress  told how many pages are done
 /// @throws RunTimeError InvalidCall: another ending; WriteFailed; Cancelled
-void savePages(Canvas& canvas, QtFonts& fonts, const std::filesystem::path& path,
-    const std::function<bool(int done, int total)>& mayGoOn);
+void savePages(
+    Canvas& canvas, QtFonts& fonts, const std::filesystem::path& path, const Progress& progress);
 
 /// The folders that files were opened from and saved to in this session, the last one first.
 class UsedFolders {

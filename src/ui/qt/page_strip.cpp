@@ -5,6 +5,7 @@
 
 #include "controls/canvas.h"
 #include "platform/qt/qt_drawing_surface.h"
+#include "platform/units.h"
 #include "view/page_renderer.h"
 
 #include <QAbstractListModel>
@@ -21,7 +22,7 @@ namespace {
 
 constexpr int LongSide = 150; ///< of a picture: pixels
 constexpr int Margin = 10; ///< around it: pixels
-constexpr double TwipsPerPixel = 15;
+constexpr double TwipsPerPixel = TwipsPerInch / 96;
 
 /// The size of every picture: the paper's shape, with its longer side as given.
 QSize pictureSize(const Canvas& canvas)

@@ -215,11 +215,12 @@ void PreviewToolbar::focusBox(ChoiceBox& box)
 
 void PreviewToolbar::showNavigation(const NavigationState& state, int currentPage)
 {
-    const std::pair<int, bool> enabled[]
-        = { { 5, state.first }, { 6, state.previous }, { 7, state.next }, { 8, state.last },
-              { 2, state.rebuild }, { 23, state.rebuild }, { 24, state.rebuild } };
-    for (const auto& [id, isEnabled] : enabled)
-        actions_.at(id)->setEnabled(isEnabled);
+    const std::pair<ToolAction, bool> enabled[] = { { ToolAction::FirstPage, state.first },
+        { ToolAction::PreviousPage, state.previous }, { ToolAction::NextPage, state.next },
+        { ToolAction::LastPage, state.last }, { ToolAction::Refresh, state.rebuild },
+        { ToolAction::Enlarge, state.rebuild }, { ToolAction::Shrink, state.rebuild } };
+    for (const auto& [action, isEnabled] : enabled)
+        actions_.at(toolOf(action).id)->setEnabled(isEnabled);
     if (pageBox_->count() != state.pageEntries) {
         QStringList entries;
         for (int number = 1; number <= state.pageEntries; ++number)
@@ -239,8 +240,8 @@ std::vector<QAction*> PreviewToolbar::contextActions() const
 {
     std::vector<QAction*> actions;
     actions.reserve(ContextMenuTools.size());
-    for (const int id : ContextMenuTools)
-        actions.push_back(actions_.at(id));
+    for (const ToolAction action : ContextMenuTools)
+        actions.push_back(actions_.at(toolOf(action).id));
     return actions;
 }
 

@@ -48,10 +48,6 @@ constexpr QSize FirstSize { 1180, 860 }; ///< before the user has chosen another
 
 constexpr short RightButtonNumber = 2;
 
-constexpr int ExitTool = 17;
-constexpr int GridStyleTool = 1;
-constexpr int PageSetupTool = 13;
-
 constexpr int CloseAgainMs = 20;
 
 /// Where size and place of the window are kept.
@@ -142,8 +138,10 @@ QWidget* PreviewWindow::makeCentre()
 
 void PreviewWindow::connectStrip()
 {
-    connect(strip_, &NoticeStrip::pageSetupAsked, this, [this] { click(PageSetupTool); });
-    connect(strip_, &NoticeStrip::gridStyleAsked, this, [this] { click(GridStyleTool); });
+    connect(strip_, &NoticeStrip::pageSetupAsked, this,
+        [this] { click(toolOf(ToolAction::ShowPageSetup).id); });
+    connect(strip_, &NoticeStrip::gridStyleAsked, this,
+        [this] { click(toolOf(ToolAction::ShowGridStyle).id); });
     connect(strip_, &NoticeStrip::defaultsAsked, this, [this] {
         const Command command(*this);
         session_->restoreDefaults();
@@ -271,7 +269,7 @@ void PreviewWindow::escape()
     if (isBusy())
         services_.loop().cancel();
     else if (mayLeave_)
-        click(ExitTool);
+        click(toolOf(ToolAction::Exit).id);
 }
 
 /// A key that was pressed while a command ran may arrive after it: it is no wish to leave. Input
@@ -375,8 +373,10 @@ PrintPages PreviewWindow::pagesToPrint() const
 QString PreviewWindow::printFrom(PrintOptionsDialog& dialog, const PrintArguments& arguments)
 {
     Canvas& canvas = canvas_->canvas();
-    canvas.pageSent
-        = [&dialog](std::int64_t sent, std::int64_t wanted) { dialog.showSent(sent, wanted); };
+    canvas.pageSent = [&dialog](std::int64_t sent, std::int64_t wanted) {
+        dialog.showSent(sent, wanted);
+        return true;
+    };
     const bool isThrough = printPages(arguments);
     canvas.pageSent = {};
     if (isThrough)

@@ -10,6 +10,7 @@
 #include "ui/qt/keys_window.h"
 #include "ui/qt/page_marks.h"
 #include "ui/qt/page_strip.h"
+#include "ui/tool_table.h"
 
 #include <QApplication>
 #include <QClipboard>
@@ -58,21 +59,22 @@ std::vector<ViewCommand> ReaderTools::commands()
             list.append(QKeySequence(QString::fromLatin1(name)));
         return list;
     };
-    const auto tool = [&](const char* name, int id, const QString& text, const char* shown) {
-        return ViewCommand { name, text + QLatin1Char('\t') + QString::fromLatin1(shown), {},
-            [this, id] { guarded([&] { parts_.session.click(id); }); } };
-    };
+    const auto tool
+        = [&](const char* name, ToolAction action, const QString& text, const char* shown) {
+              return ViewCommand { name, text + QLatin1Char('\t') + QString::fromLatin1(shown), {},
+                  [this, id = toolOf(action).id] { guarded([&] { parts_.session.click(id); }); } };
+          };
     std::vector<ViewCommand> all {
         { "SavePages", tr("Save as PDF"), keys({ "Ctrl+E" }), parts_.savePages },
         { "FitWidth", tr("Page Width"), keys({ "Ctrl+1" }),
             [&] { guarded([&] { session.fitPageWidth(); }); }, true },
         { "FitPage", tr("Page in View"), keys({ "Ctrl+2" }),
             [&] { guarded([&] { session.fitPage(); }); } },
-        tool("ModeWhole", 15, tr("Fill the Window"), "Ctrl+0"),
-        tool("ModeOne", 10, tr("One Page"), "Alt+1"),
-        tool("ModeTwo", 16, tr("Two Pages"), "Alt+2"),
-        tool("ModeFour", 18, tr("Four Pages"), "Alt+4"),
-        tool("ModeMany", 9, tr("More Pages"), "Alt+6"),
+        tool("ModeWhole", ToolAction::WholePage, tr("Fill the Window"), "Ctrl+0"),
+        tool("ModeOne", ToolAction::OnePage, tr("One Page"), "Alt+1"),
+        tool("ModeTwo", ToolAction::TwoPages, tr("Two Pages"), "Alt+2"),
+        tool("ModeFour", ToolAction::FourPages, tr("Four Pages"), "Alt+4"),
+        tool("ModeMany", ToolAction::ManyPages, tr("More Pages"), "Alt+6"),
         { "Find", tr("Find…"), keys({ "Ctrl+F" }), [this] { openFind(); }, true },
         { "FindNextPlace", tr("Next Place"), keys({ "F3", "Ctrl+K" }),
             [this] { findDock_->isVisible() ? find_->walk(true) : openFind(); } },

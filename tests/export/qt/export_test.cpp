@@ -27,7 +27,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerPoint = 20;
 constexpr double Tolerance = 0.2; ///< twips
 
 /// What a tool of poppler writes about a PDF file.

@@ -42,9 +42,10 @@ std::string failureOf(
     PrintJob job;
     job.paperSize = 8;
     job.orientation = 2;
-    job.pageSent = [&](std::int64_t sent) {
+    job.progress = [&](std::int64_t sent, std::int64_t) {
         if (sent == 1 && afterFirst)
             afterFirst();
+        return true;
     };
     try {
         doPrint(document, job, Font {}, printer);

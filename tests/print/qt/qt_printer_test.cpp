@@ -19,8 +19,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double TwipsPerPoint = 20;
-
 const Font DefaultFont { .name = u"宋体", .size = 10.5F };
 
 /// Two pages with a text and a line each.
@@ -400,11 +398,11 @@ TEST_F(QtPrinterTest, PrintsTheRealPagesOfAnEndlessRangeAndSkipsNonsense)
     const PageDocument document = twoPages();
     PrintJob job = jobOf(1);
     job.allPages = false;
-    job.pageList = pageListOf(u"1-1000000");
+    job.pages = pageNumbersOf(pageListOf(u"1-1000000"));
     EXPECT_EQ(doPrint(document, job, DefaultFont, printing.printer()), 2);
-    job.pageList = pageListOf(u"x,,2,-,99999999999,é,2.6,0x1");
+    job.pages = pageNumbersOf(pageListOf(u"x,,2,-,99999999999,é,2.6,0x1"));
     EXPECT_EQ(doPrint(document, job, DefaultFont, printing.printer()), 1);
-    job.pageList = pageListOf(u"nothing of this");
+    job.pages = pageNumbersOf(pageListOf(u"nothing of this"));
     EXPECT_EQ(doPrint(document, job, DefaultFont, printing.printer()), 0);
     EXPECT_EQ(cups.jobs().size(), 3U);
 }

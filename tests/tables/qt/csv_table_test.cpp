@@ -203,7 +203,8 @@ TEST(CsvTable, RefusesAnUnknownEncodingAndAMissingFile)
 TEST(CsvTable, EndsWhenTheProgressSaysSo)
 {
     const TempFolder folder;
-    const CsvOptions options { .encoding = {}, .progress = [](double) { return false; } };
+    const CsvOptions options { .encoding = {},
+        .progress = [](std::int64_t, std::int64_t) { return false; } };
     try {
         readCsv(folder.write("a.csv", "a\n1\n"), options);
         FAIL() << "it was read all the same";
