@@ -4,17 +4,12 @@
 #include "print/qt/held_pages.h"
 
 #include "platform/qt/qt_drawing_surface.h"
+#include "platform/units.h"
 
 #include <QPagedPaintDevice>
 #include <QPainter>
 
 namespace pelloric::qt {
-
-namespace {
-
-constexpr double TwipsPerInch = 1440;
-
-} // namespace
 
 bool paintHeldPages(
     const std::vector<HeldDrawing>& pages, QPagedPaintDevice& device, QtFonts& fonts)

@@ -6,6 +6,7 @@
 #include "export/qt/qt_glyph_faces.h"
 #include "export/qt/qt_pdf_writer.h"
 #include "platform/qt/qt_text.h"
+#include "platform/units.h"
 #include "print/qt/held_pages.h"
 #include "view/joined_lines.h"
 
@@ -32,8 +33,6 @@ constexpr int AnswerMs = 2500;
 /// Fine enough that the thinnest line is 0.12 points wide, and coarse enough that it is seen.
 constexpr int Resolution = 600;
 constexpr double Pixel = 1440.0 / Resolution; ///< twips
-
-constexpr int TwipsPerPoint = 20;
 
 struct FreeDestination {
     void operator()(cups_dest_t* destination) const { cupsFreeDests(1, destination); }
