@@ -4,12 +4,11 @@
 #include "report/grid_reader.h"
 
 #include "document/cell_lines.h"
-#include "document/kept_cells.h"
 #include "platform/automation_object.h"
 #include "platform/cell_look.h"
 #include "platform/numbers.h"
 #include "platform/run_time_error.h"
-#include "platform/services.h"
+#include "report/flex_rows.h"
 #include "report/late_bound_rows.h"
 #include "report/table_row_set.h"
 
@@ -81,27 +80,6 @@ std::int32_t columnCount(std::int32_t count)
     return count;
 }
 
-/// Keeps the windows of a request alive while cells are read.
-class Pulse {
-public:
-    explicit Pulse(const GridRequest& request)
-        : loop_(request.loop)
-    {
-    }
-
-    /// To be called for every cell or column.
-    void beat()
-    {
-        constexpr unsigned CellsBetween = 64;
-        if (loop_ != nullptr && ++cells_ % CellsBetween == 0)
-            loop_->keepAlive();
-    }
-
-private:
-    MessageLoop* loop_;
-    unsigned cells_ = 0;
-};
-
 /// Names a field after its title; an empty title gets a name of its own, and a name that is there
 /// already gets the column's number behind it.
 void appendTitle(TableRowSet& table, TextView title, int position)
@@ -172,9 +150,9 @@ public:
         grid_.put(colWidth_, { &index, 1 }, Value::ofNumber(width));
     }
 
-    Value cell(std::int32_t row, int column) const
+    Value title(int column) const
     {
-        const Value indexes[] = { Value::ofNumber(row), Value::ofNumber(column) };
+        const Value indexes[] = { Value::ofNumber(0), Value::ofNumber(column) };
         return grid_.get(textMatrix_, indexes);
     }
 
@@ -185,41 +163,10 @@ private:
     int columns_;
 };
 
-/// Reads rows through the members of the grid.
-void readRows(const FlexGrid& grid, std::span<const PrintedColumn> columns, std::int32_t first,
-    std::int32_t end, TableRowSet& table, Pulse& pulse)
-{
-    for (std::int32_t row = first; row < end; ++row) {
-        table.addRecord();
-        int field = 0;
-        for (const PrintedColumn& column : columns) {
-            table.setLast(field++, grid.cell(row, column.position));
-            pulse.beat();
-        }
-    }
-}
-
-/// Reads rows whose texts stay where they are.
-void readKeptRows(const KeptCells& cells, int gridColumns, std::span<const PrintedColumn> columns,
-    std::int32_t first, std::int32_t end, TableRowSet& table, Pulse& pulse)
-{
-    std::vector<TextView> texts(static_cast<std::size_t>(gridColumns));
-    for (std::int32_t row = first; row < end; ++row) {
-        cells.rowTexts(row, texts);
-        table.addRecord();
-        int field = 0;
-        for (const PrintedColumn& column : columns) {
-            const TextView text = texts[static_cast<std::size_t>(column.position)];
-            table.setLast(field++, Value::ofText(text));
-            pulse.beat();
-        }
-    }
-}
-
 GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
 {
     const FlexGrid grid(object);
-    Pulse pulse(request);
+    Pulse pulse(request.loop);
     std::vector<PrintedColumn> columns;
     for (int column = 0; column < grid.columns(); ++column) {
         pulse.beat();
@@ -238,22 +185,16 @@ GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
     TableRowSet& table = GridTableParts::newTable(result, request);
     Text buffer;
     for (const PrintedColumn& column : columns) {
-        const Value title = grid.cell(0, column.position);
+        const Value title = grid.title(column.position);
         appendTitle(table, displayText(title, request.decimalSeparator, buffer), column.position);
     }
     const std::int32_t rows = grid.rows();
     table.reserveRecords(std::int64_t { rows } - std::max(0, request.startRow));
-    if (const auto* const kept = dynamic_cast<const KeptCells*>(&object)) {
-        result.lentTexts = kept->keptTexts();
-        table.borrow(result.lentTexts);
-        const std::int32_t below = std::max(1, request.startRow);
-        readRows(grid, columns, request.startRow, std::min(below, rows), table, pulse);
-        readKeptRows(*kept, grid.columns(), columns, below, rows, table, pulse);
-    } else {
-        readRows(grid, columns, request.startRow, rows, table, pulse);
-    }
+    const std::vector<int> positions = positionsOf(columns);
+    result.lentTexts
+        = readFlexRows({ object, grid.columns(), positions, request.startRow, rows }, table, pulse);
     setWidths(result, widthsOf(columns), request);
-    result.gridColumns = positionsOf(columns);
+    result.gridColumns = positions;
     result.firstLookRow = request.startRow;
     GridTableParts::finishTable(result);
     return result;
@@ -288,7 +229,7 @@ std::vector<PrintedColumn> readHeaders(
 {
     const Collection headers(getMember(object, u"ColumnHeaders").toObject());
     const int count = columnCount(headers.count());
-    Pulse pulse(request);
+    Pulse pulse(request.loop);
     MemberOfItems widthMember(u"Width");
     MemberOfItems textMember(u"Text");
     std::vector<PrintedColumn> columns;
@@ -316,7 +257,7 @@ GridTable readListView(AutomationObject& object, const GridRequest& request)
     const Collection items(getMember(object, u"ListItems").toObject());
     MemberOfItems textMember(u"Text");
     MemberOfItems subItemsMember(u"SubItems");
-    Pulse pulse(request);
+    Pulse pulse(request.loop);
     table.reserveRecords(items.count());
     for (int number = 1; number <= items.count(); ++number) {
         AutomationObject& item = items.item(number);
@@ -343,7 +284,7 @@ std::vector<double> readDataColumns(AutomationObject& object, const GridRequest&
     const MemberId selected = memberOf(object, u"col");
     MemberOfItems widthMember(u"Width");
     std::vector<double> widths;
-    Pulse pulse(request);
+    Pulse pulse(request.loop);
     const int count = columnCount(Collection(object.get(columnsMember, {}).toObject()).count());
     for (int position = 0; position < count; ++position) {
         pulse.beat();

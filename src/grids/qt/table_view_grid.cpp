@@ -59,7 +59,12 @@ Value TableViewGrid::get(MemberId member, std::span<const Value> arguments)
         return Value::ofNumber(sectionWidth(*view().horizontalHeader(), columnOf(arguments, 0)));
     case TextMatrix: {
         const int row = indexArgument(arguments, 0, 0, rows_.count());
-        return Value::ofText(cell(row, columnOf(arguments, 1)));
+        const int column = indexArgument(arguments, 1, 0, columns_.count() - 1);
+        if (row == 0)
+            return Value::ofText(title(columns_.logical(column)));
+        TextView shown;
+        readRow(row, { &column, 1 }, [&](TextView text) { shown = text; });
+        return Value::ofText(shown);
     }
     default:
         return dataGrid().get(member - MemberCount, arguments);
@@ -108,27 +113,40 @@ int TableViewGrid::columnOf(std::span<const Value> arguments, std::size_t positi
     return columns_.logical(indexArgument(arguments, position, 0, columns_.count() - 1));
 }
 
-/// @param row     0 the titles
-/// @param column  the model's
-TextView TableViewGrid::cell(int row, int column)
+void TableViewGrid::readRow(
+    std::int32_t row, std::span<const int> columns, const std::function<void(TextView text)>& take)
 {
-    QTableView& table = view();
+    const QTableView& table = view();
     const QAbstractItemModel& model = *table.model();
-    if (row == 0) {
-        title_ = columnTitle(model, column);
-        return viewOf(title_);
-    }
-    const int modelRow = rows_.logical(row - 1);
     const QModelIndex root = table.rootIndex();
-    if (modelRow >= model.rowCount(root) || column >= model.columnCount(root))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the grid has lost rows");
-    ModelCell shown { modelRow, column };
-    if (const CellSpan* const span = spans_.at(shown)) {
-        if (span->shown != shown)
-            return {};
-        shown = span->first;
+    if (row < 1 || row > rows_.count())
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", row, rows_.count()));
+    const int modelRow = rows_.logical(row - 1);
+    const int modelColumns = model.columnCount(root);
+    for (const int column : columns) {
+        const int modelColumn = columns_.logical(column);
+        if (modelRow >= model.rowCount(root) || modelColumn >= modelColumns)
+            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the grid has lost rows");
+        take(text(table, root, { modelRow, modelColumn }));
     }
-    return text_.of(table, model.index(shown.row, shown.column, root));
+}
+
+/// @param column  the model's
+TextView TableViewGrid::title(int column)
+{
+    title_ = columnTitle(*view().model(), column);
+    return viewOf(title_);
+}
+
+TextView TableViewGrid::text(const QTableView& table, const QModelIndex& root, ModelCell cell)
+{
+    if (const CellSpan* const span = spans_.at(cell)) {
+        if (span->shown != cell)
+            return {};
+        cell = span->first;
+    }
+    return text_.of(table, table.model()->index(cell.row, cell.column, root));
 }
 
 GridLook TableViewGrid::gridLook()

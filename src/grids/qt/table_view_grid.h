@@ -8,6 +8,7 @@
 #include "grids/qt/view_looks.h"
 #include "grids/qt/view_sections.h"
 #include "platform/automation_object.h"
+#include "platform/row_cells.h"
 
 #include <QPointer>
 
@@ -27,7 +28,7 @@ class DataViewGrid;
 /// then they stay as they were.
 ///
 /// It answers a data grid's members as `DataViewGrid` does, too, for a host that asks for those.
-class TableViewGrid final : public AutomationObject, public CellLooks {
+class TableViewGrid final : public AutomationObject, public CellLooks, public RowCells {
 public:
     /// @param view  borrowed; once it is gone, its members are the object-missing error
     explicit TableViewGrid(QTableView& view);
@@ -37,6 +38,9 @@ public:
     const void* memberTable() const override;
     Value get(MemberId member, std::span<const Value> arguments) override;
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
+
+    void readRow(std::int32_t row, std::span<const int> columns,
+        const std::function<void(TextView text)>& take) override;
 
     GridLook gridLook() override;
     void readLook(std::int32_t row, std::int32_t column, CellLook& look) override;
@@ -50,7 +54,8 @@ private:
     QTableView& view() const;
     void takeMaps();
     int columnOf(std::span<const Value> arguments, std::size_t position) const;
-    TextView cell(int row, int column);
+    TextView title(int column);
+    TextView text(const QTableView& table, const QModelIndex& root, ModelCell cell);
     DataViewGrid& dataGrid();
 
     QPointer<QTableView> view_;
