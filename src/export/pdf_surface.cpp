@@ -59,38 +59,38 @@ PdfSurface::PdfSurface(
 
 void PdfSurface::setFontName(TextView name)
 {
-    if (fontName_ == name)
+    if (state_.fontName == name)
         return;
-    fontName_ = name;
+    state_.fontName = name;
     isFontStale_ = true;
 }
 
 void PdfSurface::setFontSize(float size)
 {
-    isFontStale_ = isFontStale_ || fontSize_ != size;
-    fontSize_ = size;
+    isFontStale_ = isFontStale_ || state_.fontSize != size;
+    state_.fontSize = size;
 }
 
 void PdfSurface::setFontBold(bool bold)
 {
-    isFontStale_ = isFontStale_ || bold_ != bold;
-    bold_ = bold;
+    isFontStale_ = isFontStale_ || state_.fontBold != bold;
+    state_.fontBold = bold;
 }
 
 void PdfSurface::setFontItalic(bool italic)
 {
-    isFontStale_ = isFontStale_ || italic_ != italic;
-    italic_ = italic;
+    isFontStale_ = isFontStale_ || state_.fontItalic != italic;
+    state_.fontItalic = italic;
 }
 
 /// A line without length is a dot as wide as the pen; readers leave out what has no length at all.
 void PdfSurface::line(Tpoint from, Tpoint to)
 {
-    current_ = to;
+    state_.current = to;
     if (!hasPen())
         return;
     announceShape();
-    ContentPen pen = penOf(foreColor_);
+    ContentPen pen = penOf(state_.foreColor);
     ContentPoint end = pointOf(to);
     if (from == to) {
         pen.dashes = {};
@@ -101,13 +101,13 @@ void PdfSurface::line(Tpoint from, Tpoint to)
 
 void PdfSurface::box(Tpoint corner, Tpoint opposite, Color outline)
 {
-    current_ = opposite;
+    state_.current = opposite;
     const ContentPen pen = penOf(outline);
     const ContentPen* const outlined = hasPen() ? &pen : nullptr;
     announceShape();
-    if (fillStyle_ != TransparentFill)
-        content_.box(
-            pointOf(corner), pointOf(opposite), fillColor_, hatchName(fillStyle_), outlined);
+    if (state_.fillStyle != TransparentFill)
+        content_.box(pointOf(corner), pointOf(opposite), state_.fillColor,
+            hatchName(state_.fillStyle), outlined);
     else if (outlined)
         content_.frame(pointOf(corner), pointOf(opposite), pen);
 }
@@ -120,9 +120,9 @@ void PdfSurface::print(TextView text)
     if (!text.empty() && em_ > 0)
         drawText(text);
     constexpr std::int64_t Lowest = std::numeric_limits<Twips>::max();
-    const std::int64_t below
-        = current_.y + std::int64_t { lineHeight_ } * static_cast<std::int64_t>(lineCount(text));
-    current_ = { 0, static_cast<Twips>(std::min(below, Lowest)) };
+    const std::int64_t below = state_.current.y
+        + std::int64_t { lineHeight_ } * static_cast<std::int64_t>(lineCount(text));
+    state_.current = { 0, static_cast<Twips>(std::min(below, Lowest)) };
 }
 
 void PdfSurface::picture(TextView filePath, Tpoint topLeft, Tpoint size)
@@ -148,9 +148,9 @@ void PdfSurface::takeFont()
     if (!isFontStale_)
         return;
     isFontStale_ = false;
-    GlyphFace& face = faces_.face(fontName_, bold_, italic_);
+    GlyphFace& face = faces_.face(state_.fontName, state_.fontBold, state_.fontItalic);
     face_ = &codes_.try_emplace(&face, face, fonts_).first->second;
-    em_ = emOf(fontSize_);
+    em_ = emOf(state_.fontSize);
     ascent_ = hundredths(face.ascent() / TwipsPerPoint * em_);
     lineHeight_
         = static_cast<Twips>(std::nearbyint(face.metrics().lineHeight() / TwipsPerPoint * em_));
@@ -166,26 +166,26 @@ ContentPoint PdfSurface::pointOf(Tpoint point) const
 /// @param fromLeft  of the text: twips
 ContentPoint PdfSurface::baselineAt(std::size_t line, double fromLeft) const
 {
-    const ContentPoint topLeft = pointOf(current_);
+    const ContentPoint topLeft = pointOf(state_.current);
     const std::int64_t lines = std::int64_t { lineHeight_ } * static_cast<std::int64_t>(line);
     return { topLeft.x + hundredths(fromLeft), topLeft.y - lines * Hundred - ascent_ };
 }
 
 ContentPen PdfSurface::penOf(Color color) const
 {
-    const auto style = static_cast<std::size_t>(drawStyle_);
-    const bool isKnown = drawStyle_ >= 0 && style < DashPatterns.size();
+    const auto style = static_cast<std::size_t>(state_.drawStyle);
+    const bool isKnown = state_.drawStyle >= 0 && style < DashPatterns.size();
     return { .color = color,
-        .width = std::max<int>(1, drawWidth_) * place_.pixel,
+        .width = std::max<int>(1, state_.drawWidth) * place_.pixel,
         .dashes = isKnown ? DashPatterns[style] : std::span<const std::uint8_t>() };
 }
 
-bool PdfSurface::hasPen() const { return drawStyle_ != NoPen; }
+bool PdfSurface::hasPen() const { return state_.drawStyle != NoPen; }
 
 /// Nearly all texts hold nothing but plain characters.
 void PdfSurface::drawText(TextView text)
 {
-    if (!isFontTransparent_) {
+    if (!state_.fontTransparent) {
         announceShape();
         fillBehind(text);
         if (tags_)
@@ -219,7 +219,7 @@ bool PdfSurface::drawAtOnce(TextView text)
         *place++ = static_cast<char>(code.code & 0xFFU);
     }
     content_.moveTo(baselineAt(0, 0));
-    content_.glyphs(use, shown_, { .em = em_, .stretch = 1, .color = foreColor_ });
+    content_.glyphs(use, shown_, { .em = em_, .stretch = 1, .color = state_.foreColor });
     return true;
 }
 
@@ -245,7 +245,7 @@ void PdfSurface::drawRun(const TextRun& run)
 
 void PdfSurface::drawPlain(const TextRun& run)
 {
-    const TextState state { .em = em_, .stretch = 1, .color = foreColor_ };
+    const TextState state { .em = em_, .stretch = 1, .color = state_.foreColor };
     content_.moveTo(baselineAt(run.line, toTwips(run.left)));
     std::uint16_t use = 0;
     bool isSlanted = false;
@@ -275,7 +275,7 @@ void PdfSurface::drawShaped(const TextRun& run)
     const double width = toTwips(run.advance);
     const double wanted = shaped.advance * em_;
     const double stretch = width > 0 && wanted > width ? width / wanted : 1;
-    const TextState state { .em = em_, .stretch = stretch, .color = foreColor_ };
+    const TextState state { .em = em_, .stretch = stretch, .color = state_.foreColor };
     for (const ShapedGlyph& glyph : shaped.glyphs) {
         const GlyphCode code = fonts_.code(glyph.font, glyph.glyph, glyph.meaning);
         ContentPoint point = baselineAt(run.line, toTwips(run.left) + glyph.x * stretch * em_);
@@ -294,7 +294,7 @@ void PdfSurface::drawBox(const TextRun& run)
         return ContentPoint { baseline.x + hundredths(x), baseline.y - hundredths(y) };
     };
     content_.ring(corner(box.left, box.bottom), corner(box.right, box.top), hundredths(box.stroke),
-        foreColor_);
+        state_.foreColor);
 }
 
 void PdfSurface::fillBehind(TextView text)
@@ -302,7 +302,7 @@ void PdfSurface::fillBehind(TextView text)
     const double width = toTwips(longestLineAdvance(text, face_->face().metrics()));
     const std::int64_t height
         = std::int64_t { lineHeight_ } * static_cast<std::int64_t>(lineCount(text));
-    const ContentPoint corner = pointOf(current_);
+    const ContentPoint corner = pointOf(state_.current);
     content_.box(
         corner, { corner.x + hundredths(width), corner.y - height * Hundred }, White, {}, nullptr);
 }

@@ -4,7 +4,7 @@
 #pragma once
 
 #include "export/pdf_content.h"
-#include "platform/drawing_surface.h"
+#include "platform/drawing_state.h"
 #include "platform/text_runs.h"
 
 namespace pelloric::pdf {
@@ -20,7 +20,7 @@ struct PagePlace {
 };
 
 /// A page of a PDF file: what is drawn becomes operators of the page's content.
-class PdfSurface final : public DrawingSurface {
+class PdfSurface final : public StatefulSurface {
 public:
     /// @param content   borrowed
     /// @param faces     borrowed
@@ -35,19 +35,11 @@ public:
     /// @param tags  borrowed; null: none
     void setTags(PdfTags* tags) { tags_ = tags; }
 
-    void clear() override { current_ = {}; }
+    void clear() override { state_.current = {}; }
     void setFontName(TextView name) override;
     void setFontSize(float size) override;
     void setFontBold(bool bold) override;
     void setFontItalic(bool italic) override;
-    void setFontTransparent(bool transparent) override { isFontTransparent_ = transparent; }
-    void setForeColor(Color color) override { foreColor_ = color; }
-    void setDrawWidth(std::int16_t width) override { drawWidth_ = width; }
-    void setDrawStyle(std::int16_t style) override { drawStyle_ = style; }
-    void setFillStyle(std::int16_t style) override { fillStyle_ = style; }
-    void setFillColor(Color color) override { fillColor_ = color; }
-    void setCurrentX(Twips x) override { current_.x = x; }
-    void setCurrentY(Twips y) override { current_.y = y; }
     void line(Tpoint from, Tpoint to) override;
     void box(Tpoint corner, Tpoint opposite, Color outline) override;
     void print(TextView text) override;
@@ -76,10 +68,6 @@ private:
     PagePlace place_;
     PdfTags* tags_ = nullptr;
 
-    Text fontName_;
-    float fontSize_ = 0;
-    bool bold_ = false;
-    bool italic_ = false;
     bool isFontStale_ = true;
     std::map<GlyphFace*, FaceCodes> codes_;
     FaceCodes* face_ = nullptr;
@@ -88,14 +76,6 @@ private:
     Twips lineHeight_ = 0;
     std::vector<TextRun> runs_;
     std::string shown_; ///< codes of a text
-
-    bool isFontTransparent_ = true;
-    Color foreColor_ = 0;
-    std::int16_t drawWidth_ = 1;
-    std::int16_t drawStyle_ = SolidPen;
-    std::int16_t fillStyle_ = TransparentFill;
-    Color fillColor_ = 0;
-    Tpoint current_;
 };
 
 } // namespace pelloric::pdf

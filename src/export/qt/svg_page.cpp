@@ -155,29 +155,30 @@ void SvgPage::clear()
 {
     body_ = "<rect width=\"" + units(size_.x) + "\" height=\"" + units(size_.y)
         + "\" fill=\"#ffffff\"/>\n";
-    current_ = {};
+    state_.current = {};
 }
 
 /// A line that ends where it begins is a dot of the pen's width.
 void SvgPage::line(Tpoint from, Tpoint to)
 {
-    current_ = to;
-    if (drawStyle_ == NoPen)
+    state_.current = to;
+    if (state_.drawStyle == NoPen)
         return;
     if (from == to) {
-        const double width = std::max<int>(1, drawWidth_);
+        const double width = std::max<int>(1, state_.drawWidth);
         body_ += "<rect x=\"" + number(from.x / TwipsPerUnit - width / 2) + "\" y=\""
             + number(from.y / TwipsPerUnit - width / 2) + "\" width=\"" + number(width)
-            + "\" height=\"" + number(width) + "\" fill=\"" + colorText(foreColor_) + "\"/>\n";
+            + "\" height=\"" + number(width) + "\" fill=\"" + colorText(state_.foreColor)
+            + "\"/>\n";
         return;
     }
     body_ += "<path d=\"M" + units(from.x) + " " + units(from.y) + "L" + units(to.x) + " "
-        + units(to.y) + "\"" + stroke(foreColor_) + "/>\n";
+        + units(to.y) + "\"" + stroke(state_.foreColor) + "/>\n";
 }
 
 void SvgPage::box(Tpoint corner, Tpoint opposite, Color outline)
 {
-    current_ = opposite;
+    state_.current = opposite;
     const double width = std::abs(static_cast<double>(opposite.x) - corner.x);
     const double height = std::abs(static_cast<double>(opposite.y) - corner.y);
     body_ += "<rect x=\"" + units(std::min(corner.x, opposite.x)) + "\" y=\""
@@ -187,19 +188,19 @@ void SvgPage::box(Tpoint corner, Tpoint opposite, Color outline)
 
 void SvgPage::print(TextView text)
 {
-    QtFace& face = fonts_.face(fontName_, bold_, italic_);
-    const double em = std::max(0.0, static_cast<double>(fontSize_) * TwipsPerPoint);
+    QtFace& face = fonts_.face(state_.fontName, state_.fontBold, state_.fontItalic);
+    const double em = std::max(0.0, static_cast<double>(state_.fontSize) * TwipsPerPoint);
     const double lineHeight = std::nearbyint(face.lineHeight() / TwipsPerPoint * em);
     const Print print { face, em, lineHeight };
     if (em > 0 && !text.empty()) {
-        if (!isFontTransparent_)
+        if (!state_.fontTransparent)
             fillBehind(text, print);
         cutIntoRuns(text, face, runs_);
         for (const TextRun& run : runs_)
             printRun(run, print);
     }
-    const double bottom = current_.y + lineHeight * static_cast<double>(lineCount(text));
-    current_ = { 0, roundToInt32(bottom) };
+    const double bottom = state_.current.y + lineHeight * static_cast<double>(lineCount(text));
+    state_.current = { 0, roundToInt32(bottom) };
 }
 
 void SvgPage::picture(TextView filePath, Tpoint topLeft, Tpoint size)
@@ -216,8 +217,8 @@ void SvgPage::picture(TextView filePath, Tpoint topLeft, Tpoint size)
 void SvgPage::printRun(const TextRun& run, const Print& print)
 {
     const double toTwips = print.em / TwipsPerPoint;
-    const double x = current_.x + run.left * toTwips;
-    const double top = current_.y + print.lineHeight * static_cast<double>(run.line);
+    const double x = state_.current.x + run.left * toTwips;
+    const double top = state_.current.y + print.lineHeight * static_cast<double>(run.line);
     const double y = top + print.face.ascent() * toTwips;
     if (run.kind == RunKind::Box)
         printBox(run, print, x, y);
@@ -245,8 +246,8 @@ void SvgPage::printGlyphs(const ShapedRun& shaped, const Print& print, double x,
                 appendAttribute(uses, "y", number(positions[at].y()));
             uses += "/>";
         }
-        if (bold_ && isBoldMadeUp(font) && !uses.empty())
-            uses = "<g stroke=\"" + colorText(foreColor_) + "\" stroke-width=\""
+        if (state_.fontBold && isBoldMadeUp(font) && !uses.empty())
+            uses = "<g stroke=\"" + colorText(state_.foreColor) + "\" stroke-width=\""
                 + number(font.lineThickness() * MadeUpBoldStroke) + "\">" + uses + "</g>";
         glyphs += uses;
     }
@@ -256,7 +257,7 @@ void SvgPage::printGlyphs(const ShapedRun& shaped, const Print& print, double x,
     const auto fine
         = [](double value) { return toUtf8(formatNumber(std::nearbyint(value * Fine) / Fine)); };
     body_ += "<g transform=\"matrix(" + fine(scale * shaped.squeeze) + " 0 0 " + fine(scale) + " "
-        + units(x) + " " + units(y) + ")\" fill=\"" + colorText(foreColor_) + "\">" + glyphs
+        + units(x) + " " + units(y) + ")\" fill=\"" + colorText(state_.foreColor) + "\">" + glyphs
         + "</g>\n";
 }
 
@@ -268,8 +269,8 @@ void SvgPage::printBox(const TextRun& run, const Print& print, double x, double 
             + units(x + box.right - inset) + "V" + units(y + box.bottom - inset) + "H"
             + units(x + box.left + inset) + "Z";
     };
-    body_ += "<path fill-rule=\"evenodd\" fill=\"" + colorText(foreColor_) + "\" d=\"" + edges(0)
-        + edges(box.stroke) + "\"/>\n";
+    body_ += "<path fill-rule=\"evenodd\" fill=\"" + colorText(state_.foreColor) + "\" d=\""
+        + edges(0) + edges(box.stroke) + "\"/>\n";
 }
 
 /// The text itself, which is found, marked and copied.
@@ -287,26 +288,27 @@ void SvgPage::fillBehind(TextView text, const Print& print)
 {
     const double width = longestLineAdvance(text, print.face) * print.em / TwipsPerPoint;
     const double height = print.lineHeight * static_cast<double>(lineCount(text));
-    body_ += "<rect x=\"" + units(current_.x) + "\" y=\"" + units(current_.y) + "\" width=\""
-        + units(width) + "\" height=\"" + units(height) + "\" fill=\"#ffffff\"/>\n";
+    body_ += "<rect x=\"" + units(state_.current.x) + "\" y=\"" + units(state_.current.y)
+        + "\" width=\"" + units(width) + "\" height=\"" + units(height) + "\" fill=\"#ffffff\"/>\n";
 }
 
 /// The attributes of the pen.
 std::string SvgPage::stroke(Color color) const
 {
-    if (drawStyle_ == NoPen)
+    if (state_.drawStyle == NoPen)
         return {};
-    const int width = std::max<int>(1, drawWidth_);
+    const int width = std::max<int>(1, state_.drawWidth);
     std::string text;
     appendAttribute(text, "stroke", colorText(color));
     appendAttribute(text, "stroke-width", std::to_string(width));
-    const bool isDashed = drawStyle_ > 0 && static_cast<std::size_t>(drawStyle_) < Dashes.size();
+    const bool isDashed
+        = state_.drawStyle > 0 && static_cast<std::size_t>(state_.drawStyle) < Dashes.size();
     if (!isDashed) {
         appendAttribute(text, "stroke-linecap", "square");
         return text;
     }
     std::string dashes;
-    for (const int length : Dashes[static_cast<std::size_t>(drawStyle_)]) {
+    for (const int length : Dashes[static_cast<std::size_t>(state_.drawStyle)]) {
         if (length > 0)
             dashes += (dashes.empty() ? "" : " ") + std::to_string(length * width);
     }
@@ -317,18 +319,18 @@ std::string SvgPage::stroke(Color color) const
 /// What a rectangle is filled with: a colour, nothing, or a hatch in the fill colour.
 std::string SvgPage::fill()
 {
-    if (fillStyle_ == TransparentFill)
+    if (state_.fillStyle == TransparentFill)
         return "none";
-    const auto hatch = static_cast<std::size_t>(fillStyle_ - FirstHatch);
-    if (fillStyle_ < FirstHatch || hatch >= Hatches.size())
-        return colorText(fillColor_);
-    std::string& name = hatches_[{ fillColor_, fillStyle_ }];
+    const auto hatch = static_cast<std::size_t>(state_.fillStyle - FirstHatch);
+    if (state_.fillStyle < FirstHatch || hatch >= Hatches.size())
+        return colorText(state_.fillColor);
+    std::string& name = hatches_[{ state_.fillColor, state_.fillStyle }];
     if (name.empty()) {
         name = "h" + std::to_string(hatches_.size());
         const std::string side = std::to_string(HatchDistance);
         defs_ += "<pattern id=\"" + name + "\" patternUnits=\"userSpaceOnUse\" width=\"" + side
             + "\" height=\"" + side + "\"><path d=\"" + Hatches[hatch]
-            + "\" fill=\"none\" stroke=\"" + colorText(fillColor_)
+            + "\" fill=\"none\" stroke=\"" + colorText(state_.fillColor)
             + "\" stroke-width=\"1\"/></pattern>\n";
     }
     return "url(#" + name + ")";
@@ -339,7 +341,8 @@ std::string SvgPage::outlineName(const QRawFont& font, std::uint32_t glyph)
 {
     const std::string face = (font.familyName() + QLatin1Char('/') + font.styleName()
         + QLatin1Char('/') + QString::number(font.weight()) + QLatin1Char('/')
-        + QString::number(static_cast<int>(font.style())) + QLatin1Char(italic_ ? 'i' : ' '))
+        + QString::number(static_cast<int>(font.style()))
+        + QLatin1Char(state_.fontItalic ? 'i' : ' '))
                                  .toStdString();
     const auto known = outlines_.find({ face, glyph });
     if (known != outlines_.end())

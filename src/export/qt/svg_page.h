@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "platform/drawing_surface.h"
+#include "platform/drawing_state.h"
 #include "platform/text_runs.h"
 
 #include <cstdint>
@@ -25,7 +25,7 @@ struct ShapedRun;
 /// Glyphs are outlines, each kept once, so that the page looks the same in every viewer, whatever
 /// fonts it has. Over each text lies the same text unseen, so that it can be found, marked and
 /// copied. Widths of pens and distances of hatches are units.
-class SvgPage final : public DrawingSurface {
+class SvgPage final : public StatefulSurface {
 public:
     /// @param fonts  borrowed
     SvgPage(Tpoint size, TextView title, QtFonts& fonts);
@@ -34,18 +34,6 @@ public:
     std::string take();
 
     void clear() override;
-    void setFontName(TextView name) override { fontName_ = name; }
-    void setFontSize(float size) override { fontSize_ = size; }
-    void setFontBold(bool bold) override { bold_ = bold; }
-    void setFontItalic(bool italic) override { italic_ = italic; }
-    void setFontTransparent(bool transparent) override { isFontTransparent_ = transparent; }
-    void setForeColor(Color color) override { foreColor_ = color; }
-    void setDrawWidth(std::int16_t width) override { drawWidth_ = width; }
-    void setDrawStyle(std::int16_t style) override { drawStyle_ = style; }
-    void setFillStyle(std::int16_t style) override { fillStyle_ = style; }
-    void setFillColor(Color color) override { fillColor_ = color; }
-    void setCurrentX(Twips x) override { current_.x = x; }
-    void setCurrentY(Twips y) override { current_.y = y; }
     void line(Tpoint from, Tpoint to) override;
     void box(Tpoint corner, Tpoint opposite, Color outline) override;
     void print(TextView text) override;
@@ -76,18 +64,6 @@ private:
     std::map<std::pair<std::string, std::uint32_t>, std::string> outlines_; ///< by face and glyph
     std::map<std::pair<Color, std::int16_t>, std::string> hatches_;
     std::vector<TextRun> runs_;
-
-    Text fontName_;
-    float fontSize_ = 0;
-    bool bold_ = false;
-    bool italic_ = false;
-    bool isFontTransparent_ = true;
-    Color foreColor_ = 0;
-    std::int16_t drawWidth_ = 1;
-    std::int16_t drawStyle_ = SolidPen;
-    std::int16_t fillStyle_ = TransparentFill;
-    Color fillColor_ = 0;
-    Tpoint current_;
 };
 
 } // namespace pelloric::qt

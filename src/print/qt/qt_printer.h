@@ -4,6 +4,7 @@
 #pragma once
 
 #include "export/qt/qt_glyph_faces.h"
+#include "platform/drawing_state.h"
 #include "platform/printer.h"
 #include "print/qt/sheet.h"
 
@@ -62,20 +63,6 @@ public:
     void endDoc() override;
 
 private:
-    /// What a document begins with.
-    struct Attributes {
-        Text fontName;
-        float fontSize = 0;
-        bool fontBold = false;
-        bool fontItalic = false;
-        bool fontTransparent = true;
-        Color foreColor = 0;
-        std::int16_t drawWidth = 1;
-        std::int16_t drawStyle = 0;
-        std::int16_t fillStyle = 1;
-        Color fillColor = 0;
-        Tpoint current;
-    };
     struct Document;
 
     /// Where documents go, as long as neither printer nor paper change.
@@ -97,7 +84,7 @@ private:
     const QtPrinterSystem& system_;
     QtFonts& fonts_;
     QtGlyphFaces faces_;
-    Attributes attributes_;
+    DrawingState attributes_; ///< what a document begins with
     Text title_;
     bool isAnnounced_ = false; ///< a title was set and no document has begun since
     std::int16_t paperSize_ = 0; ///< 0: the printer's own
