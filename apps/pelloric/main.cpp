@@ -11,6 +11,7 @@
 
 #include <algorithm>
 #include <array>
+#include <csignal>
 #include <new>
 
 namespace pelloric::app {
@@ -94,6 +95,10 @@ int statusOf(const RunTimeError& error)
 /// Runs the program; every error becomes one line and an exit status.
 int guardedRun(int argc, char** argv)
 {
+#ifdef SIGXFSZ
+    // A file past the largest size that is allowed is an error like any other.
+    std::signal(SIGXFSZ, SIG_IGN);
+#endif
     // The toolkit would take options such as "--title" for its own.
     int applicationArgc = std::min(argc, 1);
     try {

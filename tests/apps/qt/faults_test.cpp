@@ -15,7 +15,6 @@
 
 #include <algorithm>
 #include <array>
-#include <csignal>
 #include <memory>
 #include <random>
 
@@ -34,13 +33,12 @@ std::string table(int rows)
     return text;
 }
 
-/// Bounds a resource of the program, which gets an error instead of a signal past it.
+/// Bounds a resource of the program.
 void limit(QProcess& process, int resource, rlim_t most)
 {
     process.setChildProcessModifier([resource, most] {
         const rlimit bound { most, most };
         setrlimit(static_cast<__rlimit_resource>(resource), &bound);
-        std::signal(SIGXFSZ, SIG_IGN);
     });
 }
 
