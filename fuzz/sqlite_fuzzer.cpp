@@ -56,7 +56,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const std::string_view bytes(reinterpret_cast<const char*>(data) + 1, size - 1);
     qt::SqliteSource source;
     int rounds = 0;
-    source.progress = [&rounds](std::int64_t) { return ++rounds < 100; };
+    source.progress = [&rounds](std::int64_t, std::int64_t) { return ++rounds < 100; };
     if (data[0] % 2 == 0) {
         source.path = folder.write("any.sqlite", bytes);
         read(source);
