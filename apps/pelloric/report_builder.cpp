@@ -7,6 +7,7 @@
 #include "document/ostl_reader.h"
 #include "font_notes.h"
 #include "grids/table_grid.h"
+#include "outcome.h"
 #include "platform/automation_object.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
@@ -63,6 +64,8 @@ void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, Progr
     setColumnWidths(grid, line, canvas);
     const LayoutProgress watched(canvas, progress);
     canvas.options = shapeOf(line);
+    if (canvas.options.asShown && !grid.hasLooks())
+        note(QStringLiteral("--as-shown does nothing here: only cells of office files have looks"));
     canvas.doPreview(grid);
     if (canvas.table() == nullptr)
         throw CommandError(QStringLiteral("no column is wide enough to be printed; give other "

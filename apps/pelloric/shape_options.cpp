@@ -13,6 +13,7 @@ namespace {
 
 constexpr auto Options = std::to_array<Option>({
     { "where", "NAME=TEXT", "only rows whose column NAME holds TEXT" },
+    { "as-shown", nullptr, "cells have the fonts, colours and alignment of the office file" },
     { "fit", nullptr, "turn the paper, then shrink, until the table is as wide as one page" },
     { "pages-across", "N", "shrink until the table is at most N pages wide" },
     { "key-columns", "N|NAME,...", "columns to repeat at the left of every page" },
@@ -97,6 +98,7 @@ ReportOptions shapeOf(const CommandLine& line)
         options.whereColumn = qt::toText(condition.left(sign).trimmed());
         options.whereText = qt::toText(condition.mid(sign + 1));
     }
+    options.asShown = line.has("as-shown");
     options.fit.toSheet = line.has("fit");
     if (line.has("pages-across"))
         options.fit.pagesAcross = static_cast<int>(

@@ -173,11 +173,15 @@ TableGrid selected(TableGrid table, const CommandLine& line)
     for (const int column : columns)
         taken.push_back(table.column(column));
     TableGrid result(std::move(taken));
+    result.setLooks(table.looks());
     std::vector<TextView> cells(columns.size());
+    std::vector<std::uint16_t> looks(columns.size());
     for (const std::int64_t row : rows) {
-        for (std::size_t at = 0; at < columns.size(); ++at)
+        for (std::size_t at = 0; at < columns.size(); ++at) {
             cells[at] = table.cell(row, columns[at]);
-        result.addRow(cells);
+            looks[at] = table.lookNumber(row, columns[at]);
+        }
+        result.addRow(cells, looks);
     }
     return result;
 }

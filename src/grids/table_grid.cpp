@@ -45,10 +45,17 @@ void TableGrid::widen(std::size_t count, const TableColumn& column)
         ends.resize((row + 1) * count, before > 0 ? ends.back() : 0);
     }
     cellEnds_ = std::move(ends);
+    if (!looks_.empty()) {
+        std::vector<std::uint16_t> looks(rowStarts_.size() * count);
+        for (std::size_t row = 0; row < rowStarts_.size(); ++row)
+            std::copy_n(cellLooks_.begin() + static_cast<std::ptrdiff_t>(row * before), before,
+                looks.begin() + static_cast<std::ptrdiff_t>(row * count));
+        cellLooks_ = std::move(looks);
+    }
     columns_.resize(count, column);
 }
 
-void TableGrid::addRow(std::span<const TextView> cells)
+void TableGrid::addRow(std::span<const TextView> cells, std::span<const std::uint16_t> looks)
 {
     if (cells.size() > columns_.size())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
@@ -70,6 +77,32 @@ void TableGrid::addRow(std::span<const TextView> cells)
         cellEnds_.push_back(end);
     }
     cellEnds_.resize(rowStarts_.size() * columns_.size(), end);
+    if (looks_.empty())
+        return;
+    const std::size_t count = std::min(looks.size(), columns_.size());
+    cellLooks_.insert(
+        cellLooks_.end(), looks.begin(), looks.begin() + static_cast<std::ptrdiff_t>(count));
+    cellLooks_.resize(rowStarts_.size() * columns_.size());
+}
+
+void TableGrid::setLooks(std::vector<CellLook> looks) { looks_ = std::move(looks); }
+
+std::uint16_t TableGrid::lookNumber(std::int64_t row, int column) const
+{
+    const std::size_t cell
+        = static_cast<std::size_t>(row) * columns_.size() + static_cast<std::size_t>(column);
+    return cell < cellLooks_.size() ? cellLooks_[cell] : std::uint16_t { 0 };
+}
+
+void TableGrid::readLook(std::int32_t row, std::int32_t column, CellLook& look)
+{
+    const std::size_t number = row > 0 ? lookNumber(std::int64_t { row } - 1, column) : 0;
+    look = number < looks_.size() ? looks_[number] : CellLook();
+}
+
+CellAlignment TableGrid::titleAlignment(std::int32_t column)
+{
+    return this->column(column).alignment;
 }
 
 const TableColumn& TableGrid::column(int column) const

@@ -6,6 +6,7 @@
 #include "document/kept_cells.h"
 #include "document/text_store.h"
 #include "platform/automation_object.h"
+#include "platform/cell_look.h"
 #include "platform/units.h"
 
 #include <vector>
@@ -16,6 +17,7 @@ namespace pelloric {
 struct TableColumn {
     Text title;
     Twips width = 0; ///< -1: the default width, which a reader replaces on the grid
+    CellAlignment alignment = CellAlignment::Left; ///< of the title, where cells have looks
 };
 
 /// A flex grid over a table of texts in memory: `Cols`, `Rows`, `ColWidth`, `TextMatrix`.
@@ -23,7 +25,7 @@ struct TableColumn {
 /// Row 0 holds the titles, the rows that were added follow. The texts of all cells stand one behind
 /// the other in one store, which whoever reads them can share, so that a table of a million rows
 /// costs little more than its texts.
-class TableGrid final : public AutomationObject, public KeptCells {
+class TableGrid final : public AutomationObject, public KeptCells, public CellLooks {
 public:
     /// A table without rows.
     explicit TableGrid(std::vector<TableColumn> columns);
@@ -41,7 +43,15 @@ public:
     /// @param cells  left to right; cells that are missing at the end are empty
     /// @throws RunTimeError SubscriptOutOfRange: more cells than columns; Overflow: a row of 2^32
     ///         code units or more; the table is as before
-    void addRow(std::span<const TextView> cells);
+    /// @param looks  numbers of the looks of these cells; others have look 0; may be empty
+    void addRow(std::span<const TextView> cells, std::span<const std::uint16_t> looks = {});
+
+    /// What cells look like besides their texts, by the numbers that rows name; a table without
+    /// rows is given them.
+    void setLooks(std::vector<CellLook> looks);
+    const std::vector<CellLook>& looks() const { return looks_; }
+    /// The number of a cell's look; 0 where there are none.
+    std::uint16_t lookNumber(std::int64_t row, int column) const;
 
     int columnCount() const { return static_cast<int>(columns_.size()); }
     /// The number of rows that were added; the row of titles does not count.
@@ -62,11 +72,20 @@ public:
     std::shared_ptr<const TextStore> keptTexts() const override { return store_; }
     void rowTexts(std::int32_t row, std::span<TextView> into) const override;
 
+    bool hasLooks() const override { return !looks_.empty(); }
+    GridLook gridLook() override { return {}; }
+    void readLook(std::int32_t row, std::int32_t column, CellLook& look) override;
+    CellAlignment titleAlignment(std::int32_t column) override;
+    bool isMarked(std::int32_t) override { return false; }
+    std::optional<double> number(std::int32_t, std::int32_t) override { return std::nullopt; }
+
 private:
     std::vector<TableColumn> columns_;
     std::shared_ptr<TextStore> store_; ///< lives on where pages show its texts
     std::vector<const char16_t*> rowStarts_; ///< a row's cells, one behind the other
     std::vector<std::uint32_t> cellEnds_; ///< where a cell ends, counted from its row's start
+    std::vector<CellLook> looks_;
+    std::vector<std::uint16_t> cellLooks_; ///< numbers of looks, of every cell; empty without looks
 };
 
 } // namespace pelloric

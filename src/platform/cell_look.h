@@ -41,15 +41,15 @@ struct CellLook {
     bool italic = false;
     bool underline = false;
     bool strikethrough = false;
-    std::optional<Color> foreground;
-    std::optional<Color> background;
+    std::optional<Color> foreground {};
+    std::optional<Color> background {};
     CheckMark check = CheckMark::None;
     TooWide tooWide = TooWide::Wrapped;
     std::uint16_t level = 0; ///< of a tree, from 0
     Twips indent = 0; ///< of the text: twips
     std::uint64_t goesOn = 0; ///< bit n: the branch of level n has more rows below this one
     bool isBranch = false; ///< the cell stands in a tree's column of branches
-    std::optional<CellBox> box; ///< the box that the cell belongs to
+    std::optional<CellBox> box {}; ///< the box that the cell belongs to
 
     bool operator==(const CellLook&) const = default;
 };
@@ -68,6 +68,9 @@ struct GridLook {
 class CellLooks {
 public:
     virtual ~CellLooks() = default;
+
+    /// Whether there is anything to tell; a table in memory may have texts alone.
+    virtual bool hasLooks() const { return true; }
 
     virtual GridLook gridLook() = 0;
 

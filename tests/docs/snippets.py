@@ -80,7 +80,7 @@ def run_page(page, pelloric, sources, built):
     count = 0
     with tempfile.TemporaryDirectory() as name:
         folder = pathlib.Path(name)
-        for shared in ("samples", "examples"):
+        for shared in ("samples", "examples", "tests"):
             (folder / shared).symlink_to(sources / shared)
         environment = {key: value for key, value in os.environ.items()
                        if key not in ("DISPLAY", "WAYLAND_DISPLAY")}

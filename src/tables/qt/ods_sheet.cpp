@@ -2,7 +2,9 @@
 // SPDX-License-Identifier: MIT
 
 #include "platform/qt/qt_text.h"
+#include "tables/qt/ods_styles.h"
 #include "tables/qt/sheet_cells.h"
+#include "tables/qt/sheet_xml.h"
 #include "tables/qt/zip_entries.h"
 
 #include <QStringList>
@@ -10,6 +12,7 @@
 
 #include <algorithm>
 #include <utility>
+#include <vector>
 
 namespace pelloric::qt {
 
@@ -27,15 +30,6 @@ std::int64_t repeated(const QXmlStreamReader& xml, const char* name)
     return 1;
 }
 
-QString attribute(const QXmlStreamReader& xml, const char* name)
-{
-    for (const QXmlStreamAttribute& one : xml.attributes()) {
-        if (one.name() == QLatin1String(name))
-            return one.value().toString();
-    }
-    return {};
-}
-
 bool isCell(QStringView name)
 {
     return name == QLatin1String("table-cell") || name == QLatin1String("covered-table-cell");
@@ -44,8 +38,9 @@ bool isCell(QStringView name)
 /// Reads one sheet; the file keeps every cell's text as it looks.
 class SheetReader {
 public:
-    explicit SheetReader(QXmlStreamReader& xml)
+    SheetReader(QXmlStreamReader& xml, const QHash<QString, SheetLook>& looks)
         : xml_(xml)
+        , looks_(looks)
     {
     }
 
@@ -54,13 +49,47 @@ public:
     {
         std::int64_t row = 0;
         while (!atEndOf("table")) {
-            if (xml_.isStartElement() && xml_.name() == QLatin1String("table-row"))
+            if (!xml_.isStartElement())
+                continue;
+            if (xml_.name() == QLatin1String("table-row"))
                 row += readRow(row);
+            else if (xml_.name() == QLatin1String("table-column"))
+                columns_.emplace_back(repeated(xml_, "number-columns-repeated"),
+                    attribute(xml_, "default-cell-style-name"));
         }
         return std::move(cells_);
     }
 
 private:
+    struct Filled {
+        std::int64_t column;
+        Text text;
+        SheetValue value;
+        SheetLook look;
+    };
+
+    /// What the cell that begins here holds.
+    SheetValue valueHere() const
+    {
+        const QString type = attribute(xml_, "value-type");
+        if (type.isEmpty() || type == QLatin1String("string"))
+            return SheetValue::Words;
+        return type == QLatin1String("boolean") ? SheetValue::Truth : SheetValue::Number;
+    }
+
+    /// The look of a style, or of the column's where the cell names none.
+    SheetLook lookAt(const QString& style, std::int64_t column) const
+    {
+        if (!style.isEmpty())
+            return looks_.value(style);
+        for (const auto& [count, columnStyle] : columns_) {
+            if (column < count)
+                return looks_.value(columnStyle);
+            column -= count;
+        }
+        return {};
+    }
+
     /// Goes on. @return  whether it came to the end of the element
     bool atEndOf(const char* element)
     {
@@ -74,19 +103,21 @@ private:
     {
         const std::int64_t rows = repeated(xml_, "number-rows-repeated");
         std::int64_t column = 0;
-        std::vector<std::pair<std::int64_t, Text>> texts;
+        std::vector<Filled> filled;
         while (!atEndOf("table-row")) {
             if (!xml_.isStartElement() || !isCell(xml_.name()))
                 continue;
             const std::int64_t columns = repeated(xml_, "number-columns-repeated");
+            const SheetValue value = valueHere();
+            const QString style = attribute(xml_, "style-name");
             const Text text = readCell();
             for (std::int64_t at = 0; at < columns && !text.empty(); ++at)
-                texts.emplace_back(column + at, text);
+                filled.push_back({ column + at, text, value, lookAt(style, column + at) });
             column += columns;
         }
-        for (std::int64_t at = 0; at < rows && !texts.empty(); ++at) {
-            for (const auto& [place, text] : texts)
-                cells_.put(row + at, place, text);
+        for (std::int64_t at = 0; at < rows && !filled.empty(); ++at) {
+            for (const Filled& cell : filled)
+                cells_.put(row + at, cell.column, cell.text, cell.look, cell.value);
         }
         return rows;
     }
@@ -131,6 +162,8 @@ private:
     }
 
     QXmlStreamReader& xml_;
+    const QHash<QString, SheetLook>& looks_;
+    std::vector<std::pair<std::int64_t, QString>> columns_; ///< so many columns, and their style
     SheetCells cells_;
 };
 
@@ -146,7 +179,7 @@ SheetCells readOdsSheet(const ZipEntries& file, const QString& sheet)
             continue;
         names.append(attribute(xml, "name"));
         if (sheet.isEmpty() || names.last() == sheet)
-            return SheetReader(xml).read();
+            return SheetReader(xml, readOdsStyles(file)).read();
         xml.skipCurrentElement();
     }
     if (xml.hasError() || names.isEmpty())

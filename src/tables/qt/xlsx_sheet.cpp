@@ -5,39 +5,19 @@
 #include "platform/qt/qt_text.h"
 #include "tables/number_look.h"
 #include "tables/qt/sheet_cells.h"
+#include "tables/qt/sheet_xml.h"
+#include "tables/qt/xlsx_styles.h"
 #include "tables/qt/zip_entries.h"
 
 #include <QDateTime>
-#include <QMap>
 #include <QXmlStreamReader>
 
 #include <cmath>
-#include <functional>
-#include <unordered_map>
+#include <vector>
 
 namespace pelloric::qt {
 
 namespace {
-
-using Element = std::function<void(QXmlStreamReader& xml)>;
-
-/// Calls back at the beginning of every element of a file.
-/// @throws RunTimeError TypeMismatch: it is no XML
-void forEachElement(const QByteArray& bytes, const Element& element)
-{
-    QXmlStreamReader xml(bytes);
-    while (!xml.atEnd()) {
-        if (xml.readNext() == QXmlStreamReader::StartElement)
-            element(xml);
-    }
-    if (xml.hasError())
-        refuseDamaged();
-}
-
-QString attribute(const QXmlStreamReader& xml, const char* name)
-{
-    return xml.attributes().value(QLatin1String(name)).toString();
-}
 
 /// The text of an element with all its runs, but without the readings of Chinese characters.
 Text textOf(QXmlStreamReader& xml)
@@ -69,46 +49,6 @@ std::vector<Text> readSharedTexts(const ZipEntries& file)
             texts.push_back(textOf(xml));
     });
     return texts;
-}
-
-/// The formats that files name only by their numbers.
-std::string_view builtInFormat(int number)
-{
-    static const std::unordered_map<int, std::string_view> Formats { { 1, "0" }, { 2, "0.00" },
-        { 3, "#,##0" }, { 4, "#,##0.00" }, { 9, "0%" }, { 10, "0.00%" }, { 14, "m/d/yy" },
-        { 15, "d-mmm-yy" }, { 16, "d-mmm" }, { 17, "mmm-yy" }, { 18, "h:mm" }, { 19, "h:mm:ss" },
-        { 20, "h:mm" }, { 21, "h:mm:ss" }, { 22, "m/d/yy h:mm" }, { 45, "mm:ss" },
-        { 46, "[h]:mm:ss" }, { 47, "mm:ss.0" } };
-    const auto found = Formats.find(number);
-    return found != Formats.end() ? found->second : std::string_view();
-}
-
-/// The looks of cells by the numbers of their styles.
-std::vector<NumberLook> readLooks(const ZipEntries& file)
-{
-    std::vector<NumberLook> looks;
-    const QByteArray bytes = file.read("xl/styles.xml");
-    if (bytes.isEmpty())
-        return looks;
-    std::unordered_map<int, std::string> formats;
-    bool isCellStyles = false;
-    forEachElement(bytes, [&](QXmlStreamReader& xml) {
-        const auto name = xml.name();
-        if (name == QLatin1String("numFmt"))
-            formats[attribute(xml, "numFmtId").toInt()]
-                = attribute(xml, "formatCode").toStdString();
-        else if (name == QLatin1String("cellXfs") || name == QLatin1String("cellStyleXfs"))
-            isCellStyles = name == QLatin1String("cellXfs");
-        else if (name == QLatin1String("cellStyles") || name == QLatin1String("dxfs"))
-            isCellStyles = false;
-        if (name != QLatin1String("xf") || !isCellStyles)
-            return;
-        const int number = attribute(xml, "numFmtId").toInt();
-        const auto own = formats.find(number);
-        looks.push_back(numberLook(
-            own != formats.end() ? std::string_view(own->second) : builtInFormat(number)));
-    });
-    return looks;
 }
 
 /// What a workbook says of its sheets.
@@ -195,7 +135,7 @@ class SheetReader {
 public:
     SheetReader(const ZipEntries& file, bool startsIn1904)
         : texts_(readSharedTexts(file))
-        , looks_(readLooks(file))
+        , styles_(readXlsxStyles(file))
         , startsIn1904_(startsIn1904)
     {
     }
@@ -231,8 +171,17 @@ private:
             else if (xml.isStartElement() && xml.name() == QLatin1String("v"))
                 text = shown(xml.readElementText(), type, style);
         }
-        cells_.put(next_.row, next_.column, std::move(text));
+        const SheetLook look = style < styles_.size() ? styles_[style].look : SheetLook();
+        cells_.put(next_.row, next_.column, std::move(text), look, valueOf(type));
         ++next_.column;
+    }
+
+    static SheetValue valueOf(const QString& type)
+    {
+        if (type == QLatin1String("b") || type == QLatin1String("e"))
+            return SheetValue::Truth;
+        return type.isEmpty() || type == QLatin1String("n") ? SheetValue::Number
+                                                            : SheetValue::Words;
     }
 
     Text shown(const QString& value, const QString& type, std::size_t style) const
@@ -247,12 +196,12 @@ private:
         const double number = value.toDouble(&isNumber);
         if (!isNumber || (!type.isEmpty() && type != QLatin1String("n")))
             return toText(value);
-        const NumberLook look = style < looks_.size() ? looks_[style] : NumberLook();
+        const NumberLook look = style < styles_.size() ? styles_[style].number : NumberLook();
         return look.isDate ? dateText(number, startsIn1904_) : shownNumber(number, look);
     }
 
     std::vector<Text> texts_;
-    std::vector<NumberLook> looks_;
+    std::vector<XlsxStyle> styles_;
     bool startsIn1904_;
     Place next_;
     SheetCells cells_;

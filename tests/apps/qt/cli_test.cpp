@@ -22,6 +22,29 @@
 
 namespace pelloric::qt {
 
+TEST_F(Program, PrintsOfficeCellsAsTheyAreShownOnlyWhenAskedTo)
+{
+    const QString sheet = QStringLiteral(PELLORIC_TESTS_DIR "/data/office/looks.xlsx");
+    const auto picture = [&](const QString& name, const QStringList& more) {
+        EXPECT_EQ(run(QStringList { "export", sheet, "-o", name } + more).status, 0);
+        return QImage(QString::fromStdString(folder_.file(name.toStdString()).string()));
+    };
+    const auto holds = [](const QImage& image, QColor color) {
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                if (image.pixelColor(x, y) == color)
+                    return true;
+            }
+        }
+        return false;
+    };
+    const QColor gold(0xFF, 0xE6, 0x99);
+    EXPECT_FALSE(holds(picture("plain.png", {}), gold));
+    EXPECT_TRUE(holds(picture("shown.png", { "--as-shown" }), gold));
+    EXPECT_TRUE(holds(
+        picture("sorted.png", { "--as-shown", "--sort", "Number", "--columns", "Text" }), gold));
+}
+
 TEST_F(Program, RefusesALanguageThatItHasNoCatalogueFor)
 {
     const Ended refused = run({ "demo", "--walk", "out", "--language", "fi" });

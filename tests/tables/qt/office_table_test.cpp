@@ -73,6 +73,58 @@ TEST(OfficeTable, SaysWhatIsWrongWithOtherFiles)
         "installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV");
 }
 
+TEST(OfficeTable, TellsFontsColoursAndAlignmentOfExcelCells)
+{
+    TableGrid grid = readOffice({ .path = sample("looks.xlsx"), .sheet = {} });
+    ASSERT_TRUE(grid.hasLooks());
+    EXPECT_EQ(grid.titleAlignment(0), CellAlignment::Left);
+    EXPECT_EQ(grid.titleAlignment(1), CellAlignment::Centre);
+    CellLook look;
+    grid.readLook(1, 0, look);
+    EXPECT_EQ(look,
+        (CellLook { .alignment = CellAlignment::Centre,
+            .place = CellPlace::Top,
+            .bold = true,
+            .italic = true,
+            .underline = true,
+            .foreground = rgb(0xC0, 0, 0),
+            .background = rgb(0xFF, 0xE6, 0x99) }));
+    grid.readLook(1, 1, look); // a number stands right; half as light as the theme's white
+    EXPECT_EQ(look,
+        (CellLook { .alignment = CellAlignment::Right,
+            .place = CellPlace::Bottom,
+            .strikethrough = true,
+            .foreground = rgb(0x44, 0x72, 0xC4),
+            .background = rgb(128, 128, 128) }));
+    grid.readLook(2, 0, look);
+    EXPECT_EQ(look, (CellLook { .alignment = CellAlignment::Left, .place = CellPlace::Bottom }));
+    grid.readLook(2, 1, look);
+    EXPECT_EQ(look, (CellLook { .alignment = CellAlignment::Left, .place = CellPlace::Middle }));
+    grid.readLook(3, 0, look);
+    EXPECT_EQ(look.alignment, CellAlignment::Centre);
+}
+
+TEST(OfficeTable, TellsFontsColoursAndAlignmentOfOpenDocumentCells)
+{
+    TableGrid grid = readOffice({ .path = sample("looks.ods"), .sheet = {} });
+    EXPECT_EQ(grid.titleAlignment(1), CellAlignment::Centre);
+    CellLook look;
+    grid.readLook(1, 0, look);
+    EXPECT_EQ(look,
+        (CellLook { .alignment = CellAlignment::Centre,
+            .place = CellPlace::Top,
+            .bold = true,
+            .italic = true,
+            .underline = true,
+            .foreground = rgb(0xC0, 0, 0),
+            .background = rgb(0xFF, 0xE6, 0x99) }));
+    grid.readLook(1, 1, look); // the column's style, which derives from itself
+    EXPECT_EQ(look,
+        (CellLook { .alignment = CellAlignment::Right,
+            .place = CellPlace::Bottom,
+            .strikethrough = true }));
+}
+
 TEST(OfficeTable, IsKnownByItsContentWhereTheNameDoesNotTell)
 {
     const TempFolder folder;
