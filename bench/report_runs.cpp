@@ -4,6 +4,7 @@
 // Measures whole roads of a report, each budget beside what was measured:
 //   pelloric_bench_runs [ROWS]    up to ROWS rows, 1,000,000 unless given
 
+#include "judgement.h"
 #include "sample_table.h"
 
 #include "controls/canvas.h"
@@ -25,7 +26,6 @@
 
 #include <malloc.h>
 
-#include <chrono>
 #include <cstdio>
 #include <cstdlib>
 #include <filesystem>
@@ -37,6 +37,9 @@
 namespace {
 
 using namespace pelloric;
+using bench::judge;
+using bench::print;
+using bench::StopWatch;
 namespace fs = std::filesystem;
 
 constexpr std::int64_t UsualRoadRows = 10'000; ///< the toolkit's table takes minutes beyond that
@@ -64,33 +67,6 @@ void repeatPages(const fs::path& path, int times)
     const std::string pages = bytes.substr(first, last - first);
     for (int time = 1; time < times; ++time)
         output << pages;
-}
-
-/// Seconds since it was made.
-class StopWatch {
-public:
-    double seconds() const
-    {
-        return std::chrono::duration<double>(std::chrono::steady_clock::now() - start_).count();
-    }
-
-private:
-    std::chrono::steady_clock::time_point start_ = std::chrono::steady_clock::now();
-};
-
-void print(const char* what, std::int64_t rows, double seconds, const char* remark)
-{
-    std::printf("%-34s %9lld rows %9.3f s %12.0f rows/s  %s\n", what, static_cast<long long>(rows),
-        seconds, static_cast<double>(rows) / seconds, remark);
-    std::fflush(stdout);
-}
-
-void judge(const char* budget, double value, double limit, bool atMost)
-{
-    const bool met = atMost ? value <= limit : value >= limit;
-    std::printf("    %-52s %10.2f  (%s %.2f: %s)\n", budget, value, atMost ? "at most" : "at least",
-        limit, met ? "met" : "MISSED");
-    std::fflush(stdout);
 }
 
 struct Counts {

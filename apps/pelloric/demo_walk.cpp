@@ -43,6 +43,8 @@ constexpr auto DemoPages = std::to_array<DemoPage>({
     { "flex-grid", "previewFlexGrid" },
     { "list-view", "previewListView" },
     { "data-grid", "previewDataGrid" },
+    { "spans", "previewSpans" },
+    { "tree", "previewTree" },
 });
 
 /// A tool that is clicked, and the name of the screenshot after it.

@@ -5,6 +5,7 @@
 
 #include "command_line.h"
 #include "demo_code/demo_code.h"
+#include "demo_grids.h"
 #include "own_table.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
@@ -14,6 +15,7 @@
 #include "tables/qt/csv_table.h"
 #include "ui/qt/icon_set.h"
 #include "ui/qt/named_boxes.h"
+#include <pelloric/options.h>
 
 #include <pelloric/kestrane.h>
 
@@ -132,7 +134,10 @@ DemoWindow::DemoWindow(qt::QtPlatform& platform, const QString& samples)
     layout->addWidget(pages_, 1);
     layout->addWidget(makeReportBox());
     setCentralWidget(body);
-    QTableWidget* const table = makeFlexGrid(samples + QStringLiteral("/wine.csv"));
+    const TableGrid wines = readSample(samples + QStringLiteral("/wine.csv"));
+    QTableWidget* const table = makeWineTable(wines);
+    table->setHorizontalHeaderLabels(titlesOf(wines));
+    arrange(*table);
     addPage({ QStringLiteral("FlexGrid"), tr("&Flex Grid"),
                 tr("A table widget: 178 wines in 15 columns, more than one sheet is wide."),
                 "flex_grid.cpp", [=, this] { previewTable(*facade_, *table, footer_->text()); } },
@@ -148,7 +153,30 @@ DemoWindow::DemoWindow(qt::QtPlatform& platform, const QString& samples)
                 tr("A table view on an SQL table: time zones and their places."), "data_grid.cpp",
                 [=, this] { previewQuery(*facade_, *view, footer_->text()); } },
         view);
+    addShownPages(wines, samples);
     resize(FirstSize.boundedTo(screen()->availableSize() * 9 / 10));
+}
+
+/// Pages whose previews look as their views do.
+void DemoWindow::addShownPages(const TableGrid& wines, const QString& samples)
+{
+    QTableWidget* const classes = makeWineClasses(wines);
+    arrange(*classes);
+    addPage({ QStringLiteral("Spans"), tr("&Spans"),
+                tr("A table widget with spans, ticks and colours, printed as it is shown."),
+                "as_shown.cpp",
+                [=, this] {
+                    previewAsShown(*facade_, *classes, tr("Classes of wines"), footer_->text());
+                } },
+        classes);
+    QTreeWidget* const tree = makeZoneTree(readSample(samples + QStringLiteral("/time-zones.tsv")));
+    tree->setUniformRowHeights(true);
+    fitColumns(*tree->header());
+    addPage({ QStringLiteral("Tree"), tr("&Tree"),
+                tr("A tree widget with branches, icons and ticks, printed as it is shown."),
+                "as_shown.cpp",
+                [=, this] { previewAsShown(*facade_, *tree, tr("Time zones"), footer_->text()); } },
+        tree);
 }
 
 DemoWindow::~DemoWindow()
@@ -191,6 +219,9 @@ QWidget* DemoWindow::makeReportBox()
     showHeader_->setObjectName(QStringLiteral("ShowHeader"));
     mergeGrid_ = new QCheckBox(tr("&Merge equal cells"));
     mergeGrid_->setObjectName(QStringLiteral("MergeGrid"));
+    asShown_ = new QCheckBox(tr("As sho&wn"));
+    asShown_->setObjectName(QStringLiteral("AsShown"));
+    asShown_->setToolTip(tr("Cells look as the view shows them; F4 in the preview offers more"));
     startRow_ = new QSpinBox;
     startRow_->setObjectName(QStringLiteral("MarvenStartRow"));
     startRow_->setRange(1, LastStartRow);
@@ -203,7 +234,7 @@ QWidget* DemoWindow::makeReportBox()
     auto* const footerLabel = new QLabel(tr("Foot&er:"));
     footerLabel->setBuddy(footer_);
     for (QWidget* const part : std::initializer_list<QWidget*> {
-             showHeader_, mergeGrid_, rowLabel, startRow_, footerLabel })
+             showHeader_, mergeGrid_, asShown_, rowLabel, startRow_, footerLabel })
         layout->addWidget(part);
     layout->addWidget(footer_, 1);
     layout->setSpacing(Margin);
@@ -239,7 +270,10 @@ void DemoWindow::addPage(const Page& page, QAbstractItemView* view)
     parts->setStretchFactor(0, 5 - CodeShare);
     parts->setStretchFactor(1, CodeShare);
     layout->addWidget(parts, 1);
-    connect(button, &QPushButton::clicked, this, page.preview);
+    connect(button, &QPushButton::clicked, this, [this, preview = page.preview] {
+        facade_->setReportOptions({ .asShown = asShown_->isChecked() });
+        preview();
+    });
     pages_->addTab(holder, page.title);
     setTabOrder(view, button);
     for (QWidget* const part : parts->widget(1)->findChildren<QWidget*>(
@@ -293,20 +327,13 @@ void DemoWindow::addOwnTable()
     view->setFocus();
 }
 
-QTableWidget* DemoWindow::makeFlexGrid(const QString& file)
+/// Rows and columns as the demonstration shows them.
+void DemoWindow::arrange(QTableWidget& view)
 {
-    const TableGrid table = readSample(file);
-    auto* const view = new QTableWidget(static_cast<int>(table.rowCount()), table.columnCount());
-    view->setHorizontalHeaderLabels(titlesOf(table));
-    for (int row = 0; row < view->rowCount(); ++row) {
-        for (int column = 0; column < view->columnCount(); ++column)
-            view->setItem(row, column, new QTableWidgetItem(cellText(table, row, column)));
-    }
-    view->setEditTriggers(QAbstractItemView::NoEditTriggers);
-    view->setTabKeyNavigation(false);
-    view->verticalHeader()->setDefaultSectionSize(RowHeight);
-    fitColumns(*view->horizontalHeader());
-    return view;
+    view.setEditTriggers(QAbstractItemView::NoEditTriggers);
+    view.setTabKeyNavigation(false);
+    view.verticalHeader()->setDefaultSectionSize(RowHeight);
+    fitColumns(*view.horizontalHeader());
 }
 
 QTreeWidget* DemoWindow::makeListView(const QString& file)

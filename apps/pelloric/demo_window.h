@@ -17,6 +17,10 @@ class QTableView;
 class QTableWidget;
 class QTreeWidget;
 
+namespace pelloric {
+class TableGrid;
+}
+
 namespace pelloric::qt {
 class Kestrane;
 class QtPlatform;
@@ -24,8 +28,8 @@ class QtPlatform;
 
 namespace pelloric::app {
 
-/// The demonstration: one form with a flex grid, a list view and a data grid on real tables, the
-/// host code of each beside it, and one `Kestrane` that previews them.
+/// The demonstration: one form with a flex grid, a list view, a data grid, spans and a tree on
+/// real tables, the host code of each beside it, and one `Kestrane` that previews them.
 class DemoWindow final : public QMainWindow {
     Q_OBJECT
 
@@ -36,7 +40,8 @@ public:
     DemoWindow(qt::QtPlatform& platform, const QString& samples);
     ~DemoWindow() override;
 
-    /// The pages of the form: "Flex Grid", "List View", "Data Grid", then the person's own tables.
+    /// The pages of the form: "Flex Grid", "List View", "Data Grid", "Spans", "Tree", then the
+    /// person's own tables.
     QTabWidget& pages() { return *pages_; }
 
 private:
@@ -53,7 +58,8 @@ private:
     QWidget* makeReportBox();
     void addPage(const Page& page, QAbstractItemView* view);
     QWidget* makeCode(const Page& page);
-    QTableWidget* makeFlexGrid(const QString& file);
+    void addShownPages(const TableGrid& wines, const QString& samples);
+    static void arrange(QTableWidget& view);
     QTreeWidget* makeListView(const QString& file);
     QTableView* makeDataGrid(const QString& file);
     void addOwnTable();
@@ -63,6 +69,7 @@ private:
     QTabWidget* pages_;
     QCheckBox* showHeader_ = nullptr;
     QCheckBox* mergeGrid_ = nullptr;
+    QCheckBox* asShown_ = nullptr;
     QSpinBox* startRow_ = nullptr;
     QLineEdit* footer_ = nullptr;
     int ownTables_ = 0;

@@ -93,6 +93,8 @@ void writeDocument(const Export& job)
         note(QStringLiteral("a document file holds %1 pages; the last %2 were left out")
                  .arg(ostl::LastPageIndex + 1)
                  .arg(leftOut));
+    if (job.document.hasReportPictures())
+        note(QStringLiteral("a document file holds no pictures; watermark and logo were left out"));
 }
 
 /// A kind of file that can be made.

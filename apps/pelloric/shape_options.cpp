@@ -5,7 +5,9 @@
 
 #include "platform/qt/qt_text.h"
 
+#include <algorithm>
 #include <array>
+#include <initializer_list>
 
 namespace pelloric::app {
 
@@ -20,10 +22,20 @@ constexpr auto Options = std::to_array<Option>({
     { "down-first", nullptr, "all rows of the first columns come before the next columns" },
     { "group", "NAME,...", "rows with equal texts in these columns stay on one page" },
     { "total", "F:NAME,...", "totals of columns; F is sum, count, mean, min or max" },
+    { "watermark", "TEXT", "a faint text across every page" },
+    { "watermark-image", "FILE", "a faint picture in the middle of every page" },
+    { "opacity", "PERCENT", "of the watermark, 1 to 100 (15)" },
+    { "above", nullptr, "the watermark lies above the table, not behind it" },
+    { "logo", "FILE", "a picture at the top of every page" },
+    { "logo-at", "SLOT", "where the logo stands: left, center or right (left)" },
 });
 
 constexpr double MostPages = 1000;
 constexpr double MostColumns = 32767;
+
+constexpr double Percent = 100;
+
+constexpr auto Slots = std::to_array<const char*>({ "left", "center", "right" });
 
 struct FunctionName {
     const char* name;
@@ -71,6 +83,45 @@ void takeKeys(const QString& text, ReportOptions& options)
         options.keyColumnNames = namesOf(text);
 }
 
+int slotOf(const QString& name)
+{
+    for (std::size_t slot = 0; slot < Slots.size(); ++slot) {
+        if (name.compare(QLatin1String(Slots[slot]), Qt::CaseInsensitive) == 0)
+            return static_cast<int>(slot);
+    }
+    throw CommandError(
+        QStringLiteral("--logo-at takes left, center or right, not \"%1\"").arg(name), WrongUsage);
+}
+
+/// @param needs  one of them must be given, too
+void require(const CommandLine& line, const char* option, std::initializer_list<const char*> needs)
+{
+    const auto isGiven = [&](const char* name) { return line.has(name); };
+    if (line.has(option) && std::none_of(needs.begin(), needs.end(), isGiven))
+        throw CommandError(QStringLiteral("--%1 says something about --%2, which is not given")
+                               .arg(QLatin1String(option), QLatin1String(*needs.begin())),
+            WrongUsage);
+}
+
+void takePictures(const CommandLine& line, ReportOptions& options)
+{
+    require(line, "opacity", { "watermark", "watermark-image" });
+    require(line, "above", { "watermark", "watermark-image" });
+    require(line, "logo-at", { "logo" });
+    if (line.has("watermark") && line.has("watermark-image"))
+        throw CommandError(
+            QStringLiteral("--watermark and --watermark-image exclude each other"), WrongUsage);
+    options.watermark.text = qt::toText(line.value("watermark"));
+    options.watermark.imageFile = qt::toText(line.value("watermark-image"));
+    options.watermark.isAbove = line.has("above");
+    if (line.has("opacity"))
+        options.watermark.opacity
+            = numberOf("opacity", line.value("opacity"), 1, Percent, false) / Percent;
+    options.logo.imageFile = qt::toText(line.value("logo"));
+    if (line.has("logo-at"))
+        options.logo.slot = slotOf(line.value("logo-at"));
+}
+
 } // namespace
 
 OptionTable shapeOptions() { return Options; }
@@ -87,6 +138,7 @@ const char* firstShapeOption(const CommandLine& line)
 ReportOptions shapeOf(const CommandLine& line)
 {
     ReportOptions options;
+    options.asShown = line.has("as-shown");
     if (line.has("where")) {
         const QString condition = line.value("where");
         const auto sign = condition.indexOf(QLatin1Char('='));
@@ -98,7 +150,6 @@ ReportOptions shapeOf(const CommandLine& line)
         options.whereColumn = qt::toText(condition.left(sign).trimmed());
         options.whereText = qt::toText(condition.mid(sign + 1));
     }
-    options.asShown = line.has("as-shown");
     options.fit.toSheet = line.has("fit");
     if (line.has("pages-across"))
         options.fit.pagesAcross = static_cast<int>(
@@ -111,6 +162,7 @@ ReportOptions shapeOf(const CommandLine& line)
     options.keepsGroups = !options.groupColumns.empty();
     for (const QString& total : line.value("total").split(QLatin1Char(','), Qt::SkipEmptyParts))
         options.totals.push_back(totalOf(total));
+    takePictures(line, options);
     return options;
 }
 

@@ -25,6 +25,7 @@ namespace pelloric {
 
 class AutomationObject;
 class PreviewOpener;
+struct ReportOptions;
 
 } // namespace pelloric
 
@@ -81,6 +82,12 @@ public:
     /// Who opens the preview window of every control that was given nobody else.
     /// @param opener  borrowed, or null
     static void setDefaultPreviewOpener(PreviewOpener* opener);
+
+    /// What the previews of this control do beyond the plain page; everything is off at first. What
+    /// people switch in the window holds until the next preview.
+    void setReportOptions(const ReportOptions& options);
+    /// What was set last.
+    const ReportOptions& reportOptions() const;
 
     /// Previews a grid in the preview window, which keeps the adapter.
     void doPreview(std::unique_ptr<AutomationObject> PrintObj);

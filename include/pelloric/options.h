@@ -62,6 +62,27 @@ struct Aggregation {
     bool operator==(const Aggregation&) const = default;
 };
 
+/// A text or a picture on every page, centred on the paper.
+struct Watermark {
+    std::u16string text; ///< stands across the page, from the lower left to the upper right
+    std::u16string imageFile; ///< counts where there is no text
+    double opacity = 0.15; ///< 0 to 1
+    bool isAbove = false; ///< above what is printed; else behind it
+
+    bool isAsked() const { return !text.empty() || !imageFile.empty(); }
+    bool operator==(const Watermark&) const = default;
+};
+
+/// A picture in a slot of the page header, at the top margin; the header's texts stand below it.
+struct Logo {
+    std::u16string imageFile; ///< empty: no logo
+    int slot = 0; ///< 0 left, 1 centre, any other right
+    std::int32_t height
+        = 567; ///< twips, a centimetre at first; the width follows; less where that needs more room
+
+    bool operator==(const Logo&) const = default;
+};
+
 /// Decides about a row: its number from 1 and the texts of its printed columns.
 using RowFilter = std::function<bool(std::int64_t row, std::span<const std::u16string_view> texts)>;
 
@@ -85,6 +106,8 @@ struct ReportOptions {
     std::vector<std::u16string> groupColumns; ///< rows with equal texts in these make a group
     bool keepsGroups = false; ///< a group stays on a page where one can hold it
     std::vector<Aggregation> totals;
+    Watermark watermark;
+    Logo logo;
 
     /// Whether rows or columns are left out or moved.
     bool choosesCells() const
@@ -94,9 +117,10 @@ struct ReportOptions {
     }
 
     /// Whether anything but the plain arrangement of rows and bands is asked for.
-    bool shapesPages() const
+    /// @param hasLooks  whether the grid tells how its cells look
+    bool shapesPages(bool hasLooks) const
     {
-        return asShown || fit.isAsked() || keyColumns > 0 || !keyColumnNames.empty()
+        return (asShown && hasLooks) || fit.isAsked() || keyColumns > 0 || !keyColumnNames.empty()
             || pageOrder != PageOrder::AcrossThenDown || keepsGroups || !totals.empty();
     }
 };

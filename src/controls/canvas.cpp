@@ -119,6 +119,7 @@ void Canvas::clear()
     if (isBusy())
         return;
     recorder_.clear();
+    fit_ = {};
     ++documentNumber_;
     endArrangement(view_);
     if (table_)

@@ -69,7 +69,7 @@ public:
     /// What builds do beyond the plain page; everything is off at first.
     ReportOptions options;
 
-    /// What the last build did to bring its table onto the sheet.
+    /// What was done to bring the table of the pages onto the sheet.
     const FitResult& fit() const { return fit_; }
 
     /// Tells an observer, too, from now on.

@@ -15,6 +15,7 @@ namespace pelloric {
 class AutomationObject;
 enum class SettingKey;
 struct Platform;
+struct ReportOptions;
 
 /// Opens the window that previews a grid.
 class PreviewOpener {
@@ -24,6 +25,10 @@ public:
     /// Shows the preview window, which there is once, and has it preview the grid.
     /// @param grid  the window keeps it until the next one, to build the pages anew
     virtual void openPreview(std::unique_ptr<AutomationObject> grid) = 0;
+
+    /// Says what the window's reports do beyond the plain page from now on. A window that is open
+    /// builds its pages anew only for the next grid.
+    virtual void setReportOptions(const ReportOptions&) { }
 };
 
 /// What `Kestrane` publishes, without a window.

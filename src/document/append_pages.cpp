@@ -26,6 +26,11 @@ void appendPage(PageDocument& pages, const PageDocument& further, int page)
         copy.style = pages.styleNumber(further.style(text.style));
         pages.append(copy);
     }
+    for (const PictureRecord& picture : further.reportPictures(page)) {
+        PictureRecord copy = picture;
+        copy.file = pages.store().add(picture.file);
+        pages.addPicture(pages.currentPage, copy);
+    }
 }
 
 } // namespace

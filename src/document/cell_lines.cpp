@@ -106,4 +106,16 @@ void breakText(TextView text, double room, const MeasuredFont& font, std::vector
     }
 }
 
+void breakPrinted(
+    TextView text, double room, const MeasuredFont& font, std::vector<CellLine>& lines)
+{
+    if (text.find(u'\n') != TextView::npos)
+        return breakText(text, room, font, lines);
+    const Twips width = font.width(text);
+    if (width <= room)
+        lines.push_back({ text, width, true });
+    else
+        wrapText(text, room, font, lines);
+}
+
 } // namespace pelloric

@@ -60,4 +60,12 @@ void wrapText(TextView text, double room, const MeasuredFont& font, std::vector<
 /// @param lines  at least one is appended
 void breakText(TextView text, double room, const MeasuredFont& font, std::vector<CellLine>& lines);
 
+/// Breaks a text as it is printed in a cell: as `breakText` does where it holds a line feed, else
+/// it is one line, wrapped where it is too wide; a typed separator alone breaks nothing.
+/// @param text   without carriage returns
+/// @param room   twips; may have a fraction
+/// @param lines  appended; an empty text has one
+void breakPrinted(
+    TextView text, double room, const MeasuredFont& font, std::vector<CellLine>& lines);
+
 } // namespace pelloric

@@ -133,6 +133,18 @@ void PageDocument::removePicture(int page)
         pictures_[static_cast<std::size_t>(page)].reset();
 }
 
+void PageDocument::addPicture(int page, const PictureRecord& picture)
+{
+    pageAt(page);
+    pages_[static_cast<std::size_t>(page)].pictures.push_back(picture);
+}
+
+bool PageDocument::hasReportPictures() const
+{
+    return std::any_of(
+        pages_.begin(), pages_.end(), [](const Page& page) { return !page.pictures.empty(); });
+}
+
 std::uint32_t PageDocument::penNumber(const LinePen& pen)
 {
     const auto [place, isNew]
@@ -171,9 +183,9 @@ std::size_t PageDocument::memoryBytes() const
         + store_->capacityBytes() + structure.memoryBytes();
     for (const auto& store : furtherStores_)
         bytes += store->capacityBytes();
-    for (const Page& page : pages_) {
-        bytes += page.lines.memoryBytes() + page.texts.memoryBytes();
-    }
+    for (const Page& page : pages_)
+        bytes += page.lines.memoryBytes() + page.texts.memoryBytes()
+            + page.pictures.capacity() * sizeof(PictureRecord);
     return bytes;
 }
 

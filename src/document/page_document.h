@@ -28,14 +28,30 @@ struct PageSetup {
     bool operator==(const PageSetup&) const = default;
 };
 
+/// Where a picture lies among what a page shows.
+enum class PictureLayer : std::uint8_t {
+    Behind, ///< everything
+    Cells, ///< above lines and boxes, behind texts
+    Above ///< everything
+};
+
+/// A picture that a report draws on a page, as the page keeps it.
+struct PictureRecord {
+    PictureLayer layer = PictureLayer::Cells;
+    Tpoint pt; ///< top-left corner
+    Tpoint size; ///< twips
+    TextView file; ///< lives in a text store of the document
+};
+
 /// A margin given in whole centimetres, as twips.
 /// @throws RunTimeError Overflow: above 57 or below -57
 std::int16_t marginOfCentimetres(std::int16_t centimetres);
 
-/// The laid-out pages: for each a list of lines, a list of texts and at most one picture.
+/// The laid-out pages: for each a list of lines, a list of texts and at most one placed picture.
 ///
 /// A page is never a picture of itself; screen, printer and files replay its records, every line
-/// and then every text, in the order recorded. Pages count from 0 here.
+/// and then every text, in the order recorded. Reports that ask for more than the plain page also
+/// have pictures of their own: watermarks, logos, icons. Pages count from 0 here.
 class PageDocument {
 public:
     PageDocument();
@@ -119,6 +135,14 @@ public:
             current().lines.appendRow(top, bottom, pattern, lines);
     }
 
+    /// Adds a picture to a page of a report.
+    /// @throws RunTimeError SubscriptOutOfRange: no such page
+    void addPicture(int page, const PictureRecord& picture);
+    /// The pictures that a report draws on a page. @throws RunTimeError SubscriptOutOfRange
+    std::span<const PictureRecord> reportPictures(int page) const { return pageAt(page).pictures; }
+    /// Whether a report draws pictures on any page; document files do not hold them.
+    bool hasReportPictures() const;
+
     /// Where new texts are kept.
     TextStore& store() { return *store_; }
     /// Takes over a store that a row set shares; texts recorded before stay valid.
@@ -135,6 +159,7 @@ private:
     struct Page {
         LineList lines;
         TextList texts;
+        std::vector<PictureRecord> pictures;
     };
 
     struct PenHash {

@@ -73,6 +73,8 @@ public:
     void rowTexts(std::int32_t row, std::span<TextView> into) const override;
 
     bool hasLooks() const override { return !looks_.empty(); }
+    CellLooks* cellLooks() override { return hasLooks() ? this : nullptr; }
+    TextView text(std::int32_t row, std::int32_t column) override { return cell(row - 1, column); }
     GridLook gridLook() override { return {}; }
     void readLook(std::int32_t row, std::int32_t column, CellLook& look) override;
     CellAlignment titleAlignment(std::int32_t column) override;

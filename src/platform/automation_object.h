@@ -10,6 +10,8 @@
 
 namespace pelloric {
 
+class CellLooks;
+
 /// Stands for one member of one class of objects; what it means is the object's own business.
 using MemberId = int;
 
@@ -36,6 +38,10 @@ public:
     /// Writes a property, with its indexes.
     /// @throws RunTimeError NoSuchMember: it cannot be written; or as `get`
     virtual void put(MemberId member, std::span<const Value> arguments, const Value& value) = 0;
+
+    /// How its cells are shown, for a grid that is a view; null: that is not known. Lives as long
+    /// as the object and follows its rows and columns.
+    virtual CellLooks* cellLooks() { return nullptr; }
 };
 
 /// Looks a member up.

@@ -21,7 +21,7 @@ enum class CellPlace : std::uint8_t { Top, Middle, Bottom };
 enum class CheckMark : std::uint8_t { None, Off, Partly, On };
 
 /// What becomes of a text that is wider than its cell.
-enum class TooWide : std::uint8_t { Wrapped, CutLeft, CutMiddle, CutRight };
+enum class TooWide : std::uint8_t { Wrapped, CutLeft, CutMiddle, CutRight, CutPlainly };
 
 /// One box over several cells: rows and columns of the grid, both ends included.
 struct CellBox {
@@ -49,6 +49,7 @@ struct CellLook {
     Twips indent = 0; ///< of the text: twips
     std::uint64_t goesOn = 0; ///< bit n: the branch of level n has more rows below this one
     bool isBranch = false; ///< the cell stands in a tree's column of branches
+    TextView icon {}; ///< file of the square picture before the text; empty: none
     std::optional<CellBox> box {}; ///< the box that the cell belongs to
 
     bool operator==(const CellLook&) const = default;
@@ -61,7 +62,7 @@ struct GridLook {
     Color lineColor = 0;
 };
 
-/// Tells how a view shows its cells. A grid that is a view is an `AutomationObject` and this.
+/// Tells how a view shows its cells; see `AutomationObject::looks`.
 ///
 /// Rows count from 1 as a flex grid's rows behind its titles and the items of a list view do;
 /// columns from 0 as the grid's own.
@@ -74,8 +75,12 @@ public:
 
     virtual GridLook gridLook() = 0;
 
-    /// Overwrites all of `look`.
+    /// Overwrites all of `look`; its icon is borrowed until the next build.
     virtual void readLook(std::int32_t row, std::int32_t column, CellLook& look) = 0;
+
+    /// The text of a cell as it stands in the plain grid; of a box the first of its cells has it.
+    /// @return  borrowed until the next call
+    virtual TextView text(std::int32_t row, std::int32_t column) = 0;
 
     /// Where a column's title stands.
     virtual CellAlignment titleAlignment(std::int32_t column) = 0;

@@ -11,6 +11,7 @@ class Clock;
 class FileSystem;
 class MessageLoop;
 class MessageService;
+class PictureService;
 class Printer;
 class PrinterSystem;
 class SystemFolders;
@@ -35,6 +36,7 @@ struct Platform {
     PrinterSystem& printers;
     LibraryState& library;
     char16_t decimalSeparator = u'.'; ///< of the user's locale
+    PictureService* pictures = nullptr; ///< null: reports have neither watermarks nor logos
 };
 
 } // namespace pelloric

@@ -4,6 +4,7 @@
 #pragma once
 
 #include "platform/text.h"
+#include "platform/units.h"
 
 #include <filesystem>
 #include <optional>
@@ -69,6 +70,27 @@ public:
 
     /// The folder of the settings file, without a separator at its end.
     virtual std::filesystem::path systemDirectory() const = 0;
+};
+
+/// Makes and measures the pictures that reports draw on pages.
+class PictureService {
+public:
+    virtual ~PictureService() = default;
+
+    /// The size of an image file in pixels; nothing when it cannot be read.
+    virtual std::optional<Tpoint> pixelSize(TextView file) = 0;
+
+    /// An image file that shows the same as another one, faded, and stays while the program runs.
+    /// @param opacity  0 to 1
+    /// @throws RunTimeError FileNotFound: it cannot be read; WriteFailed
+    virtual Text kept(TextView file, double opacity) = 0;
+
+    /// An image file that shows a text across a sheet, from the lower left to the upper right; it
+    /// stays while the program runs.
+    /// @param size     of the sheet: twips
+    /// @param opacity  0 to 1
+    /// @throws RunTimeError WriteFailed
+    virtual Text writtenAcross(TextView text, Tpoint size, double opacity) = 0;
 };
 
 } // namespace pelloric

@@ -356,9 +356,7 @@ GridTable readGrid(AutomationObject& grid, const GridRequest& request)
         if (row.kind != request.kind)
             continue;
         GridTable table = row.read(grid, request);
-        table.looks = dynamic_cast<CellLooks*>(&grid); // a grid that is a view is both
-        if (table.looks != nullptr && !table.looks->hasLooks())
-            table.looks = nullptr;
+        table.looks = grid.cellLooks();
         for (int field = 0; table.rows != nullptr && field < table.rows->fieldCount(); ++field)
             table.fieldNames.emplace_back(table.rows->fieldName(field));
         return table;

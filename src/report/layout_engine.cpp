@@ -135,16 +135,8 @@ void LayoutEngine::drawTitleTexts(Twips top)
         document_.structure.beginCell(column.field);
         const TextView title = titles_[static_cast<std::size_t>(column.field)];
         const double left = column.left + Padding;
-        const double room = column.width - CellPadding;
-        const MeasuredFont& font = recorder_.measured();
-        const Twips width = font.width(title);
         rowLines_.clear();
-        if (title.find(u'\n') != TextView::npos)
-            breakText(title, room, font, rowLines_);
-        else if (width <= room)
-            rowLines_.push_back({ title, width, true });
-        else
-            wrapText(title, room, font, rowLines_);
+        breakPrinted(title, column.width - CellPadding, recorder_.measured(), rowLines_);
         recorder_.moveTo({ roundToInt32(left), below(top, Padding) });
         recorder_.printLines(rowLines_, left, column.width);
     }

@@ -13,6 +13,8 @@ namespace pelloric {
 
 namespace {
 
+constexpr double Trace = 1e-6; ///< rounding leaves of a line's height
+
 Twips below(Twips y, double distance) { return roundToInt32(static_cast<double>(y) + distance); }
 
 } // namespace
@@ -20,8 +22,8 @@ Twips below(Twips y, double distance) { return roundToInt32(static_cast<double>(
 void ShapedLayout::printRows()
 {
     tops_.assign(1, top_);
-    for (const Row& row : page_)
-        tops_.push_back(below(tops_.back(), rowHeight(row)));
+    for (const ShapedRow& row : page_)
+        tops_.push_back(below(tops_.back(), rows_.height(row)));
     for (std::size_t at = 0; at < page_.size() && source_.looks != nullptr; ++at)
         fillBackgrounds(at);
     usePen(gridPen_);
@@ -35,26 +37,22 @@ void ShapedLayout::printRows()
     lastTexts_.clear();
     if (page_.empty() || page_.back().isTotal())
         return;
-    for (const Cell& cell : page_.back().cells)
+    for (const ShapedCell& cell : page_.back().cells)
         lastTexts_.push_back(cell.text);
-    if (source_.looks != nullptr) {
-        const std::int32_t last = lookRow(page_.back().record);
-        std::erase_if(boxes_, [&](const OpenBox& open) {
-            return columns_.back().field == bands_.back().back() && open.box.lastRow <= last;
-        });
-    }
+    if (columns_.back().field == bands_.back().back())
+        rows_.closeBoxes(page_.back().record);
 }
 
 /// Neighbouring cells of one colour get one box.
 void ShapedLayout::fillBackgrounds(std::size_t at)
 {
-    const Row& row = page_[at];
+    const ShapedRow& row = page_[at];
     if (row.looks.empty())
         return;
     const auto colorOf = [&](const BandColumn& column) {
         const CellLook* look = lookOf(row, column.field);
-        if (const OpenBox* const open = openBox(look))
-            look = &open->look;
+        if (const BoxContent* const box = boxOf(look))
+            look = &box->look;
         return look->background;
     };
     for (std::size_t first = 0; first < columns_.size();) {
@@ -73,7 +71,7 @@ void ShapedLayout::fillBackgrounds(std::size_t at)
 
 void ShapedLayout::drawRowLines(std::size_t at)
 {
-    const Row& row = page_[at];
+    const ShapedRow& row = page_[at];
     const Twips top = tops_[at];
     const Twips bottom = tops_[at + 1];
     const bool isMerged = source_.style.GridMerge && !row.isTotal();
@@ -90,7 +88,7 @@ void ShapedLayout::drawRowLines(std::size_t at)
     }
     if (!drawsHor_)
         return;
-    const Row* const next = at + 1 < page_.size() ? &page_[at + 1] : nullptr;
+    const ShapedRow* const next = at + 1 < page_.size() ? &page_[at + 1] : nullptr;
     if (next == nullptr || (!isMerged && row.looks.empty())) {
         drawLine({ tableLeft_, bottom }, { tableRight_, bottom });
         return;
@@ -115,44 +113,51 @@ void ShapedLayout::drawRowLines(std::size_t at)
 
 void ShapedLayout::printCells(std::size_t at)
 {
-    const Row& row = page_[at];
-    const ReportStyle& style = source_.style;
-    const Color color = roundToInt32(style.body.color);
     for (std::size_t place = 0; place < columns_.size(); ++place) {
-        const BandColumn& column = columns_[place];
-        const Cell& cell = row.cells[static_cast<std::size_t>(column.field)];
-        if (!column.isPrinted)
+        if (!columns_[place].isPrinted)
             continue;
-        const CellLook* const look = lookOf(row, column.field);
-        const std::span<const CellLine> lines = row.lines;
-        const Area area { column.left, column.left + column.width, static_cast<double>(tops_[at]),
-            static_cast<double>(tops_[at + 1]) };
-        if (row.isTotal()) {
-            CellLook total;
-            total.bold = true;
-            total.italic = style.body.font.italic;
-            if (column.field != bands_.front().front())
-                total.alignment = CellAlignment::Right;
-            printShown(total, lines.subspan(cell.firstLine, cell.lineCount), area);
-        } else if (look == nullptr) {
-            if (style.GridMerge && isBlanked(at, column.field))
-                continue;
-            useFont(style.body.font.bold, style.body.font.italic, color);
-            printPlain(column, row, cell, tops_[at]);
-        } else if (look->box) {
-            printBox(at, place);
-        } else {
-            printShown(*look, lines.subspan(cell.firstLine, cell.lineCount), area);
-        }
+        document_.structure.beginCell(columns_[place].field);
+        printCell(at, place);
     }
+    document_.structure.endRow(document_.currentPage);
 }
 
-void ShapedLayout::printPlain(const BandColumn& column, const Row& row, const Cell& cell, Twips top)
+void ShapedLayout::printCell(std::size_t at, std::size_t place)
 {
+    const ShapedRow& row = page_[at];
+    const BandColumn& column = columns_[place];
+    const CellLook* const look = lookOf(row, column.field);
+    const auto lines = row.linesOf(row.cells[static_cast<std::size_t>(column.field)]);
+    const Area area { column.left, column.left + column.width, static_cast<double>(tops_[at]),
+        static_cast<double>(tops_[at + 1]) };
+    if (row.isTotal())
+        printTotal(column, lines, area);
+    else if (look == nullptr && !(source_.style.GridMerge && isBlanked(at, column.field)))
+        printPlain(column, lines, tops_[at]);
+    else if (look != nullptr && look->box)
+        printBox(at, place);
+    else if (look != nullptr)
+        printShown(*look, lines, area);
+}
+
+void ShapedLayout::printPlain(const BandColumn& column, std::span<const CellLine> lines, Twips top)
+{
+    const ColoredFont& body = source_.style.body;
+    useFont(body.font.bold, body.font.italic, roundToInt32(body.color));
     const double left = column.left + padding_;
-    const std::span<const CellLine> lines = row.lines;
     recorder_.moveTo({ roundToInt32(left), below(top, padding_) });
-    recorder_.printLines(lines.subspan(cell.firstLine, cell.lineCount), left, column.width);
+    recorder_.printLines(lines, left, column.width);
+}
+
+void ShapedLayout::printTotal(
+    const BandColumn& column, std::span<const CellLine> lines, const Area& area)
+{
+    CellLook look;
+    look.bold = true;
+    look.italic = source_.style.body.font.italic;
+    if (column.field != bands_.front().front())
+        look.alignment = CellAlignment::Right;
+    printShown(look, lines, area);
 }
 
 void ShapedLayout::printShown(const CellLook& look, std::span<const CellLine> lines, Area area)
@@ -161,7 +166,7 @@ void ShapedLayout::printShown(const CellLook& look, std::span<const CellLine> li
         drawBranches(look, area);
     if (lines.empty())
         return;
-    const MeasuredFont& face = font(look.bold, look.italic);
+    const MeasuredFont& face = rows_.font(look.bold, look.italic);
     area.left += padding_ + look.indent;
     area.right -= padding_;
     const double block = static_cast<double>(lines.size()) * face.lineHeight;
@@ -190,36 +195,62 @@ void ShapedLayout::printShown(const CellLook& look, std::span<const CellLine> li
     }
 }
 
-/// Prints a box at its first row and column on the page.
+/// Prints a box at its first row and column on the page: as many lines as its part there holds.
 void ShapedLayout::printBox(std::size_t at, std::size_t place)
 {
-    const Row& row = page_[at];
+    const ShapedRow& row = page_[at];
     const int field = columns_[place].field;
     const bool isBegun = (at > 0 && isSameBox(page_[at - 1], field, row, field))
         || (place > 0 && isSameBox(row, columns_[place - 1].field, row, field));
-    const OpenBox* const open = openBox(lookOf(row, field));
-    if (isBegun || open == nullptr)
+    const BoxContent* const box = boxOf(lookOf(row, field));
+    if (isBegun || box == nullptr)
         return;
     std::size_t lastRow = at;
     while (lastRow + 1 < page_.size() && isSameBox(page_[lastRow + 1], field, row, field))
         ++lastRow;
-    std::size_t lastColumn = place;
-    while (lastColumn + 1 < columns_.size()
-        && isSameBox(row, columns_[lastColumn + 1].field, row, field))
-        ++lastColumn;
-    const OpenBox copy = *open;
-    printShown(copy.look, copy.lines,
-        { columns_[place].left, columns_[lastColumn].left + columns_[lastColumn].width,
-            static_cast<double>(tops_[at]), static_cast<double>(tops_[lastRow + 1]) });
+    std::size_t last = place;
+    while (last + 1 < columns_.size() && isSameBox(row, columns_[last + 1].field, row, field))
+        ++last;
+    const Area area { columns_[place].left, columns_[last].left + columns_[last].width,
+        static_cast<double>(tops_[at]), static_cast<double>(tops_[lastRow + 1]) };
+    const double room
+        = area.right - area.left - 2 * padding_ - box->look.indent - rows_.marksWidth(box->look);
+    std::vector<CellLine> lines;
+    if (room > 0)
+        rows_.breakShown(box->text, box->look, room, lines);
+    const double height = area.bottom - area.top - 2 * padding_;
+    const double lineHeight = rows_.font(box->look.bold, box->look.italic).lineHeight;
+    const auto held = static_cast<std::size_t>(std::max(1.0, height / lineHeight + Trace));
+    lines.resize(std::min(lines.size(), held));
+    printShown(box->look, lines, area);
 }
 
-/// Draws the check box. @return  how far the text moves to the right: twips
+/// Draws check box and icon. @return  how far the text moves to the right: twips
 double ShapedLayout::printMarks(const CellLook& look, const Area& area)
 {
-    const double side = lineHeight_ * 0.7;
-    if (look.check != CheckMark::None)
-        drawCheckMark(look.check, area.left, area.top + (lineHeight_ - side) / 2, side);
-    return marksWidth(look);
+    const double line = rows_.lineHeight();
+    double left = area.left;
+    if (look.check != CheckMark::None) {
+        const double side = line * 0.7;
+        drawCheckMark(look.check, left, area.top + (line - side) / 2, side);
+        left += line;
+    }
+    if (!look.icon.empty()) {
+        const Twips side = roundToInt32(line);
+        document_.addPicture(document_.currentPage,
+            { PictureLayer::Cells, { roundToInt32(left), roundToInt32(area.top) }, { side, side },
+                keptIcon(look.icon) });
+    }
+    return rows_.marksWidth(look);
+}
+
+/// The name of an icon's file, once in the document's store however many cells show it.
+TextView ShapedLayout::keptIcon(TextView file)
+{
+    TextView& kept = icons_[file.data()];
+    if (kept.empty())
+        kept = document_.store().add(file);
+    return kept;
 }
 
 void ShapedLayout::drawCheckMark(CheckMark mark, double left, double top, double side)
@@ -268,7 +299,7 @@ void ShapedLayout::drawBranches(const CellLook& look, const Area& area)
 /// Strokes in the text's colour, a fifteenth of its height thick.
 void ShapedLayout::underline(const CellLook& look, const CellLine& line, Tpoint at)
 {
-    const MeasuredFont& face = font(look.bold, look.italic);
+    const MeasuredFont& face = rows_.font(look.bold, look.italic);
     const Color color = look.foreground.value_or(roundToInt32(source_.style.body.color));
     const double height = face.lineHeight;
     const auto stroke = [&](double place) {
@@ -318,21 +349,18 @@ void ShapedLayout::fillBox(const Area& area, Color color)
         { roundToInt32(area.right), roundToInt32(area.bottom) });
 }
 
-const CellLook* ShapedLayout::lookOf(const Row& row, int field) const
+const CellLook* ShapedLayout::lookOf(const ShapedRow& row, int field) const
 {
     return row.looks.empty() ? nullptr : &row.looks[static_cast<std::size_t>(field)];
 }
 
-const ShapedLayout::OpenBox* ShapedLayout::openBox(const CellLook* look) const
+const BoxContent* ShapedLayout::boxOf(const CellLook* look) const
 {
-    if (look == nullptr || !look->box)
-        return nullptr;
-    const auto found = std::find_if(
-        boxes_.begin(), boxes_.end(), [&](const OpenBox& open) { return open.box == *look->box; });
-    return found != boxes_.end() ? &*found : nullptr;
+    return look != nullptr && look->box ? rows_.box(*look->box) : nullptr;
 }
 
-bool ShapedLayout::isSameBox(const Row& row, int field, const Row& other, int otherField) const
+bool ShapedLayout::isSameBox(
+    const ShapedRow& row, int field, const ShapedRow& other, int otherField) const
 {
     const CellLook* const one = lookOf(row, field);
     const CellLook* const two = lookOf(other, otherField);
@@ -350,7 +378,7 @@ bool ShapedLayout::isBlanked(std::size_t at, int field) const
     return equalsLeft(page_[at], field);
 }
 
-bool ShapedLayout::equalsLeft(const Row& row, int field) const
+bool ShapedLayout::equalsLeft(const ShapedRow& row, int field) const
 {
     const auto place = static_cast<std::size_t>(field);
     return field > 0 && row.cells[place - 1].text == row.cells[place].text;

@@ -4,36 +4,17 @@
 #pragma once
 
 #include "document/recorder.h"
-#include "platform/cell_look.h"
 #include "platform/progress.h"
 #include "report/layout_engine.h"
 #include "report/page_fields.h"
-#include "report/report_fit.h"
-#include "report/report_totals.h"
+#include "report/shaped_rows.h"
 
-#include <deque>
-#include <functional>
 #include <optional>
 #include <span>
+#include <unordered_map>
 #include <vector>
 
 namespace pelloric {
-
-/// What a shaped report is laid out from; all of it is borrowed.
-struct ShapedSource {
-    const ReportStyle& style;
-    const PageSetup& setup;
-    RowSet& rows; ///< its cursor is left where the layout ended
-    std::span<const double> widths; ///< twips; one per printed column, shrunk already
-    const ReportOptions& options;
-    double scale = 1; ///< what widths and body font were shrunk by
-    CellLooks* looks = nullptr; ///< null: no looks are asked for or known
-    std::span<const int> lookColumns; ///< of the grid, one per printed column
-    std::span<const std::int64_t> lookRows; ///< of the looks, one per record; empty: in order
-    std::int32_t firstLookRow = 1; ///< what the first record shows, where `lookRows` is empty
-    /// Tells the number that a cell shows: record from 1, field from 0. May be empty.
-    std::function<std::optional<double>(std::int64_t record, int field)> number;
-};
 
 /// Lays records out as report options ask: with key columns in every band, pages across or down
 /// first, groups held together, rows of totals, and cells that look as their view shows them.
@@ -54,29 +35,10 @@ public:
     double titleTop() const { return titleTop_; }
 
 private:
-    /// A cell of a row, measured.
-    struct Cell {
-        TextView text; ///< trimmed; lives in the document's store
-        std::size_t firstLine = 0; ///< of the row's lines
-        std::size_t lineCount = 0; ///< 0: nothing is printed
-    };
-
-    /// A row of the table or of totals.
-    struct Row {
-        std::int64_t record = 0; ///< from 1; 0: a row of totals
-        bool startsGroup = false;
-        double textHeight = 0; ///< twips
-        std::vector<Cell> cells; ///< one per field
-        std::vector<CellLine> lines;
-        std::vector<CellLook> looks; ///< one per field; empty: none are asked for
-
-        bool isTotal() const { return record == 0; }
-    };
-
     /// What another band needs to lay the same row out again.
     struct PlannedRow {
         std::int64_t record = 0; ///< 0: a row of totals
-        std::size_t total = 0; ///< of `totalTexts_`
+        std::size_t total = 0; ///< which row of totals
     };
 
     /// A page of rows as it was cut in the first band.
@@ -94,13 +56,6 @@ private:
         bool isPrinted = true;
     };
 
-    /// A box over several cells whose rows are being printed.
-    struct OpenBox {
-        CellBox box;
-        CellLook look;
-        std::vector<CellLine> lines;
-    };
-
     /// Where something stands: exact twips.
     struct Area {
         double left = 0;
@@ -109,8 +64,6 @@ private:
         double bottom = 0;
     };
 
-    using TotalTexts = std::vector<TextView>; ///< one per field
-
     void resolve();
     void resolveLines();
     void buildAcross();
@@ -118,36 +71,26 @@ private:
     void beginPage(std::size_t band, bool isFirst);
     void startBand(std::size_t band);
     void drawTitles();
+    void emptyPage();
     double measureTitle(std::size_t field, const MeasuredFont& body) const;
     void printTitle(const BandColumn& column, Twips top);
     void fillPage();
     void refillPage(const PlannedPage& page);
     void planPage();
-    bool mayStay(const Row& row, double bottom);
+    bool mayStay(const ShapedRow& row, double bottom);
     void endPage(bool isFull);
-
-    bool ensureRows(std::size_t count);
-    void readNext();
-    void readRow(std::int64_t record, Row& row);
-    TextView readText(int field);
-    void measureCell(int field, Row& row);
-    void measureShown(int field, Row& row);
-    void noteNumbers(const Row& row);
-    void closeGroup();
-    void addTotals(const Totals& totals, TextView name);
-    void layTotals(std::size_t total, Row& row);
-    bool beginsGroup(const Row& row) const;
-    double groupHeight();
-    Row takeSpare();
 
     void printRows();
     void fillBackgrounds(std::size_t at);
     void drawRowLines(std::size_t at);
     void printCells(std::size_t at);
-    void printPlain(const BandColumn& column, const Row& row, const Cell& cell, Twips top);
+    void printCell(std::size_t at, std::size_t place);
+    void printPlain(const BandColumn& column, std::span<const CellLine> lines, Twips top);
+    void printTotal(const BandColumn& column, std::span<const CellLine> lines, const Area& area);
     void printShown(const CellLook& look, std::span<const CellLine> lines, Area area);
     void printBox(std::size_t at, std::size_t place);
     double printMarks(const CellLook& look, const Area& area);
+    TextView keptIcon(TextView file);
     void drawBranches(const CellLook& look, const Area& area);
     void drawCheckMark(CheckMark mark, double left, double top, double side);
     void underline(const CellLook& look, const CellLine& line, Tpoint at);
@@ -156,17 +99,11 @@ private:
     void drawLine(Tpoint from, Tpoint to);
     void fillBox(const Area& area, Color color);
 
-    const MeasuredFont& font(bool bold, bool italic);
-    const CellLook* lookOf(const Row& row, int field) const;
-    const OpenBox* openBox(const CellLook* look) const;
-    bool isSameBox(const Row& row, int field, const Row& other, int otherField) const;
+    const CellLook* lookOf(const ShapedRow& row, int field) const;
+    const BoxContent* boxOf(const CellLook* look) const;
+    bool isSameBox(const ShapedRow& row, int field, const ShapedRow& other, int otherField) const;
     bool isBlanked(std::size_t at, int field) const;
-    bool equalsLeft(const Row& row, int field) const;
-    double rowHeight(const Row& row) const { return row.textHeight + 2 * padding_; }
-    double marksWidth(const CellLook& look) const;
-    double boxWidth(const CellLook& look, int field) const;
-    bool isAnchor(const CellLook& look, std::int64_t record, int field) const;
-    std::int32_t lookRow(std::int64_t record) const;
+    bool equalsLeft(const ShapedRow& row, int field) const;
 
     ShapedSource source_;
     const Platform& platform_;
@@ -177,13 +114,9 @@ private:
     std::int64_t stepsDone_ = 0;
     std::int64_t steps_ = 1;
 
-    double padding_ = 0; ///< on each side of a text: twips
-    MeasuredFont fonts_[2][2]; ///< of the body: by bold and italic
-    double lineHeight_ = 0; ///< of the body font: twips
-    std::vector<int> groupFields_;
-    std::vector<int> totalFields_;
     std::vector<BandColumns> bands_;
-    GridLook gridLook_;
+    ShapedRows rows_; ///< reads `source_` and `bands_`
+    double padding_; ///< on each side of a text: twips
     LinePen gridPen_;
     bool drawsHor_ = false;
     bool drawsVer_ = false;
@@ -198,18 +131,10 @@ private:
     Twips top_ = 0; ///< of the first row of the page
     double footerHeight_ = 0;
 
-    std::deque<Row> rows_; ///< read, not printed yet
-    std::vector<Row> spare_; ///< their memory is used again
-    std::int64_t nextRecord_ = 1;
-    bool isRead_ = false; ///< all records and totals have been read
-    std::vector<TextView> groupTexts_; ///< of the row that was read last
-    Totals groupTotals_;
-    Totals allTotals_;
-    std::vector<TotalTexts> totalTexts_;
-    std::vector<OpenBox> boxes_;
+    std::unordered_map<const char16_t*, TextView> icons_; ///< kept names by lent ones
     Text buffer_;
 
-    std::vector<Row> page_; ///< the rows of the page
+    std::vector<ShapedRow> page_; ///< the rows of the page
     std::vector<Twips> tops_; ///< of the page's rows, and the bottom of the last
     bool isFull_ = false; ///< the page's last row reaches the bottom margin
     std::vector<TextView> lastTexts_; ///< of the row before the page's first; empty: none

@@ -8,10 +8,12 @@
 #include "platform/platform.h"
 #include "report/chosen_rows.h"
 #include "report/grid_reader.h"
+#include "report/report_pictures.h"
 #include "report/report_style.h"
 #include "report/shaped_layout.h"
 
 #include <algorithm>
+#include <limits>
 #include <numeric>
 #include <optional>
 #include <utility>
@@ -84,6 +86,25 @@ void turnSheet(ReportStyle& style, PageSetup& setup)
     setPrintableTenths(style, setup);
 }
 
+/// The setup of the text below what the pictures take of a page's top.
+PageSetup belowPictures(const PageSetup& setup, const ReportPictures& placed)
+{
+    PageSetup rest = setup;
+    const std::int64_t top = std::int64_t { setup.intTop } + placed.headRoom;
+    rest.intTop
+        = narrowToInt16(std::min<std::int64_t>(top, std::numeric_limits<std::int16_t>::max()));
+    return rest;
+}
+
+/// Every page of a report has the same ones.
+void addToPages(const ReportPictures& placed, PageDocument& document)
+{
+    for (int page = 0; page < document.pageCount(); ++page) {
+        for (const PictureRecord& picture : placed.pictures)
+            document.addPicture(page, picture);
+    }
+}
+
 } // namespace
 
 ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
@@ -93,12 +114,15 @@ ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
     Choice choice = choose(table, options, platform.decimalSeparator);
     RowSet& rows = choice.rows ? static_cast<RowSet&>(*choice.rows) : *table.rows;
     ReportOutcome outcome;
-    if (!options.shapesPages()) {
-        const auto bands
-            = cutColumnBands(choice.widths, target.setup.myWidth, target.setup.intLeft);
-        LayoutEngine engine({ target.style, target.setup, rows, choice.widths, bands }, platform,
+    if (!options.shapesPages(table.looks != nullptr)) {
+        const ReportPictures placed = placeReportPictures(
+            options, target.setup, platform.pictures, target.document.store());
+        const PageSetup setup = belowPictures(target.setup, placed);
+        const auto bands = cutColumnBands(choice.widths, setup.myWidth, setup.intLeft);
+        LayoutEngine engine({ target.style, setup, rows, choice.widths, bands }, platform,
             target.document, target.recorder);
         engine.build(progress);
+        addToPages(placed, target.document);
         outcome.titleTop = engine.titleTop();
         return outcome;
     }
@@ -109,12 +133,15 @@ ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
         target.style.body.font.size, options.fit);
     if (outcome.fit.isTurned)
         turnSheet(target.style, target.setup);
+    const ReportPictures placed
+        = placeReportPictures(options, target.setup, platform.pictures, target.document.store());
+    const PageSetup setup = belowPictures(target.setup, placed);
     ReportStyle style = target.style;
     style.body.font.size = static_cast<float>(style.body.font.size * outcome.fit.scale);
     for (double& width : choice.widths)
         width *= outcome.fit.scale;
     ShapedSource source { .style = style,
-        .setup = target.setup,
+        .setup = setup,
         .rows = rows,
         .widths = choice.widths,
         .options = options,
@@ -135,6 +162,7 @@ ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
     }
     ShapedLayout layout(source, platform, target.document, target.recorder);
     layout.build(progress);
+    addToPages(placed, target.document);
     outcome.titleTop = layout.titleTop();
     return outcome;
 }

@@ -114,6 +114,8 @@ std::size_t keptBack(TextView text, double room, const MeasuredFont& font)
 
 Text shortened(TextView line, double room, TooWide where, const MeasuredFont& font)
 {
+    if (where == TooWide::CutPlainly)
+        return Text(line.substr(0, keptFront(line, room, font)));
     const double left = room - font.width(Dots);
     if (where == TooWide::CutLeft)
         return Text(Dots) + Text(line.substr(line.size() - keptBack(line, left, font)));

@@ -19,9 +19,10 @@ class TextStore;
 /// @param lines  at least one is appended
 void wrapWords(TextView text, double room, const MeasuredFont& font, std::vector<CellLine>& lines);
 
-/// Breaks a text at its line feeds only and shortens every line that is too wide by "…".
+/// Breaks a text at its line feeds only and shortens every line that is too wide, by "…" or
+/// plainly.
 ///
-/// @param where  `CutLeft`, `CutMiddle` or `CutRight`: where the dots stand
+/// @param where  any but `Wrapped`: where the dots stand, if any
 /// @param store  keeps the shortened lines
 void cutLines(TextView text, double room, TooWide where, const MeasuredFont& font, TextStore& store,
     std::vector<CellLine>& lines);

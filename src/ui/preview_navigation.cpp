@@ -177,7 +177,8 @@ void PreviewSession::dispatch(ToolAction action)
     case ToolAction::OpenFile:
         return openFile();
     case ToolAction::SaveFile:
-        canvas_.SaveFile(host_.chooseFileToSave());
+        if (canvas_.SaveFile(host_.chooseFileToSave()))
+            host_.documentSaved();
         return;
     case ToolAction::ClearPages:
         canvas_.clear();

@@ -50,6 +50,9 @@ public:
     /// A kept grid is about to be read: its owner may bring it up to date.
     virtual void beforeBuild(AutomationObject&) { }
 
+    /// The document was written to a document file.
+    virtual void documentSaved() { }
+
     /// The session's `state()` or `notice()` is another now: the window applies it without raising
     /// changes.
     virtual void navigationChanged() = 0;

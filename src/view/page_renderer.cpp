@@ -51,6 +51,24 @@ void drawPicture(const MapLocation& place, DrawingSurface& surface)
         place.strFilePath, { place.nLeft, place.nTop }, { place.nWidth, place.nHeight });
 }
 
+/// Whether a picture may reach into the visible part.
+bool mayShow(const PictureRecord& picture, const ReplayOptions& options)
+{
+    return !options.visible
+        || (picture.pt.x <= options.visible->right && picture.pt.y <= options.visible->bottom
+            && picture.pt.x + picture.size.x >= options.visible->left
+            && picture.pt.y + picture.size.y >= options.visible->top);
+}
+
+void drawPictures(std::span<const PictureRecord> pictures, PictureLayer layer,
+    const ReplayOptions& options, DrawingSurface& surface)
+{
+    for (const PictureRecord& picture : pictures) {
+        if (picture.layer == layer && mayShow(picture, options))
+            surface.picture(picture.file, picture.pt, picture.size);
+    }
+}
+
 } // namespace
 
 ReplayOptions paperReplay(const Font& font)
@@ -72,6 +90,7 @@ void PageRenderer::replay(int page, const ReplayOptions& options, DrawingSurface
 {
     const auto lines = document_.lines(page);
     const auto texts = document_.texts(page);
+    const auto pictures = document_.reportPictures(page);
     if (options.isCleared)
         surface.clear();
     surface.setFontName(options.reportFontName);
@@ -79,6 +98,7 @@ void PageRenderer::replay(int page, const ReplayOptions& options, DrawingSurface
     const MapLocation* const place = document_.picture(page);
     if (place != nullptr && options.hasPicture)
         drawPicture(*place, surface);
+    drawPictures(pictures, PictureLayer::Behind, options, surface);
     for (const LineRecord line : lines) {
         const LinePen& pen = document_.pen(line.pen);
         if (mayShow(line, pen.LineWidth, options))
@@ -86,11 +106,13 @@ void PageRenderer::replay(int page, const ReplayOptions& options, DrawingSurface
     }
     if (options.resetsFill)
         surface.setFillStyle(TransparentFill);
+    drawPictures(pictures, PictureLayer::Cells, options, surface);
     Text buffer;
     for (const TextRecord text : texts) {
         if (mayShow(text, document_.style(text.style).font.size, options))
             drawText(text, options, surface, buffer);
     }
+    drawPictures(pictures, PictureLayer::Above, options, surface);
 }
 
 /// A filled record has the fill colour all over, its outline too.

@@ -37,16 +37,17 @@ struct ReplayOptions {
     std::optional<PageRect> visible
         = std::nullopt; ///< the only part that is seen; nothing: all of the page
     bool isCleared = true; ///< the surface is made blank first
-    bool hasPicture = true; ///< the page's picture is painted
+    bool hasPicture = true; ///< the page's placed picture is painted
     bool resetsFill = false; ///< the fill style is transparent again behind the lines
     bool makesTextsTransparent = false; ///< every text is told to leave what is behind it visible
 };
 
-/// What a printer's page is replayed with: its paper is blank, and pictures are not printed.
+/// What a printer's page is replayed with: its paper is blank, and placed pictures are not printed.
 /// @param font  of the printer before the first record
 ReplayOptions paperReplay(const Font& font);
 
-/// Replays the records of a page on a drawing surface: every line, then every text.
+/// Replays the records of a page on a drawing surface: every line, then every text; the pictures of
+/// a report behind, between and above them.
 ///
 /// Keeps no picture of a page: each call draws the records again, so screen and paper agree.
 class PageRenderer {

@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-// Runs every case of a folder in a world of its own and writes what came out.
+// Runs every case of a folder in a world of its own and writes what came out; on demand on canvases
+// that were given report options, every one of which is off.
 
 #include "json.h"
 #include "steps.h"
@@ -15,6 +16,7 @@
 #include <fstream>
 #include <iostream>
 #include <random>
+#include <string>
 #include <vector>
 
 namespace {
@@ -54,12 +56,25 @@ Json parse(const fs::path& path)
     return Json::parse(file);
 }
 
-void runCase(const fs::path& path, const fs::path& out, TextCodec& codec)
+/// Every switch is off; what says more about a switch differs from its start value.
+ReportOptions idleOptions()
+{
+    return { .fit = { .leastSize = 8, .leastScale = 0.9 },
+        .firstRow = 2,
+        .lastRow = 3,
+        .whereText = u"nothing",
+        .watermark = { .opacity = 0.5, .isAbove = true },
+        .logo = { .slot = 2, .height = 999 } };
+}
+
+void runCase(const fs::path& path, const fs::path& out, TextCodec& codec, bool hasOptions)
 {
     const Json description = parse(path);
     const Json& input = description.at("input");
     const CaseFolder folder;
     cases::World world(folder.systemDirectory(), codec);
+    if (hasOptions)
+        world.canvas.options = idleOptions();
     if (input.contains("settings") && !input.at("settings").is_null())
         world.writeLines(world.settingsFile(), input.at("settings"));
     if (input.contains("grid") && !input.at("grid").is_null())
@@ -95,14 +110,14 @@ std::vector<fs::path> casesOf(const fs::path& folder)
     return paths;
 }
 
-int run(const fs::path& folder, const fs::path& out)
+int run(const fs::path& folder, const fs::path& out, bool hasOptions)
 {
     fs::create_directories(out);
     const std::unique_ptr<TextCodec> codec = chineseCodec();
     int status = 0;
     for (const fs::path& path : casesOf(folder)) {
         try {
-            runCase(path, out, *codec);
+            runCase(path, out, *codec, hasOptions);
         } catch (const std::exception& error) {
             std::cerr << path.filename().string() << ": " << error.what() << '\n';
             status = 1;
@@ -115,12 +130,13 @@ int run(const fs::path& folder, const fs::path& out)
 
 int main(int count, char** arguments)
 {
-    if (count != 3) {
-        std::cerr << "usage: pelloric_cases CASES OUT\n";
+    const bool hasOptions = count == 4 && std::string(arguments[3]) == "--idle-options";
+    if (count != 3 && !hasOptions) {
+        std::cerr << "usage: pelloric_cases CASES OUT [--idle-options]\n";
         return 1;
     }
     try {
-        return run(arguments[1], arguments[2]);
+        return run(arguments[1], arguments[2], hasOptions);
     } catch (const std::exception& error) {
         std::cerr << error.what() << '\n';
         return 1;

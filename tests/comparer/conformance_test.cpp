@@ -1,7 +1,8 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-// Runs the runner over all cases once and compares what it wrote, one test per case.
+// Runs the runner over all cases and compares what it wrote, one test per case: once as it is, and
+// once with report options that are off.
 
 #include "comparer/compare.h"
 
@@ -34,29 +35,55 @@ std::vector<std::string> caseIds()
 }
 
 /// Runs the runner; its status, 0 when every case ran.
-int runCases(const fs::path& cases, const fs::path& out)
+/// @param option  of the runner; may be empty
+int runCases(const fs::path& cases, const fs::path& out, const std::string& option = {})
 {
     std::string command = std::string("\"") + PELLORIC_CASES + "\" \"" + cases.string() + "\" \""
-        + out.string() + "\" 2>&1";
+        + out.string() + "\" " + option + " 2>&1";
 #ifdef _WIN32
     command = "\"" + command + "\""; // The command interpreter takes the outermost quotes away.
 #endif
     return std::system(command.c_str());
 }
 
-class ConformanceCases : public testing::TestWithParam<std::string> {
+/// What the runner wrote of all cases.
+class RunnerOutput {
+public:
+    /// @param option  of the runner; may be empty
+    explicit RunnerOutput(const std::string& option)
+    {
+        status_ = runCases(CasesFolder, folder_.path(), option);
+    }
+
+    int status() const { return status_; }
+
+    /// How a case differs from what is expected.
+    std::string difference(const std::string& id) const
+    {
+        const std::unique_ptr<TextCodec> codec = chineseCodec();
+        return compareCase(CasesFolder / (id + ".json"), folder_.path(), *codec)
+            .value_or("no difference");
+    }
+
+private:
+    TempFolder folder_;
+    int status_;
+};
+
+template <bool hasOptions> class Cases : public testing::TestWithParam<std::string> {
 protected:
     static void SetUpTestSuite()
     {
-        folder_ = std::make_unique<TempFolder>();
-        status_ = runCases(CasesFolder, folder_->path());
+        run_ = std::make_unique<RunnerOutput>(hasOptions ? "--idle-options" : "");
     }
 
-    static void TearDownTestSuite() { folder_.reset(); }
+    static void TearDownTestSuite() { run_.reset(); }
 
-    static inline std::unique_ptr<TempFolder> folder_;
-    static inline int status_ = -1;
+    static inline std::unique_ptr<RunnerOutput> run_;
 };
+
+using ConformanceCases = Cases<false>;
+using ConformanceCasesWithIdleOptions = Cases<true>;
 
 std::string nameOf(const testing::TestParamInfo<std::string>& info)
 {
@@ -69,13 +96,19 @@ std::string nameOf(const testing::TestParamInfo<std::string>& info)
 
 TEST_P(ConformanceCases, EndsAsExpected)
 {
-    const std::unique_ptr<TextCodec> codec = chineseCodec();
-    const auto difference
-        = compareCase(CasesFolder / (GetParam() + ".json"), folder_->path(), *codec);
-    EXPECT_EQ(difference.value_or("no difference"), "no difference");
+    EXPECT_EQ(run_->status(), 0);
+    EXPECT_EQ(run_->difference(GetParam()), "no difference");
+}
+
+TEST_P(ConformanceCasesWithIdleOptions, EndsAsExpected)
+{
+    EXPECT_EQ(run_->status(), 0);
+    EXPECT_EQ(run_->difference(GetParam()), "no difference");
 }
 
 INSTANTIATE_TEST_SUITE_P(All, ConformanceCases, testing::ValuesIn(caseIds()), nameOf);
+INSTANTIATE_TEST_SUITE_P(
+    All, ConformanceCasesWithIdleOptions, testing::ValuesIn(caseIds()), nameOf);
 
 TEST(ConformanceRunner, RefusesAFolderThatIsNotThere)
 {

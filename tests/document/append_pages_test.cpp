@@ -18,6 +18,7 @@ TEST(AppendPages, PutsPagesBehindEachOtherWithTheirOwnPageCounts)
     PageDocument other;
     addText(other, { 30, 40 }, u"alone of [Pages]");
     addLine(other, { 1, 2 }, { 3, 4 });
+    other.addPicture(0, { PictureLayer::Above, { 5, 6 }, { 7, 8 }, other.store().add(u"seal") });
     PageDocument joined;
     appendPages(joined, one, true);
     appendPages(joined, other, false);
@@ -28,6 +29,10 @@ TEST(AppendPages, PutsPagesBehindEachOtherWithTheirOwnPageCounts)
     EXPECT_EQ(joined.texts(2)[0].text(), u"alone of 1");
     EXPECT_EQ(joined.texts(2)[0].pt, (Tpoint { 30, 40 }));
     EXPECT_EQ(joined.line(2, 0), other.line(0, 0));
+    EXPECT_TRUE(joined.reportPictures(0).empty());
+    ASSERT_EQ(joined.reportPictures(2).size(), 1U);
+    EXPECT_EQ(joined.reportPictures(2)[0].file, u"seal");
+    EXPECT_EQ(joined.reportPictures(2)[0].layer, PictureLayer::Above);
     EXPECT_EQ(joined.text(1, 0).prnFont, one.text(1, 0).prnFont);
 }
 

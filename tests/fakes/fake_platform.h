@@ -30,10 +30,11 @@ struct FakePlatform {
     FakePrinter printer;
     FakePrinterSystem printers;
     LibraryState library;
+    FakePictureService pictures;
 
 private:
     Platform record_ { metrics, codec, messages, loop, clock, folders, files, printer, printers,
-        library };
+        library, u'.', &pictures };
 };
 
 } // namespace pelloric

@@ -85,4 +85,27 @@ public:
     std::filesystem::path directory;
 };
 
+/// Pictures of 200 by 100 pixels, but for files that are called "missing"; they are named after
+/// what was asked for.
+class FakePictureService : public PictureService {
+public:
+    std::optional<Tpoint> pixelSize(TextView file) override
+    {
+        return file == u"missing" ? std::nullopt : std::optional<Tpoint>({ 200, 100 });
+    }
+
+    Text kept(TextView file, double opacity) override { return Text(file) + percent(opacity); }
+
+    Text writtenAcross(TextView text, Tpoint, double opacity) override
+    {
+        return u"text " + Text(text) + percent(opacity);
+    }
+
+private:
+    static Text percent(double opacity)
+    {
+        return u" " + decimal(static_cast<std::int64_t>(opacity * 100 + 0.5)) + u"%";
+    }
+};
+
 } // namespace pelloric

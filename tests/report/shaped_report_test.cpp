@@ -41,6 +41,8 @@ public:
         grid_.put(member, arguments, value);
     }
 
+    CellLooks* cellLooks() override { return this; }
+
     CellLook& look(std::int32_t row, std::int32_t column) { return looks_[{ row, column }]; }
 
     GridLook grid {};
@@ -53,6 +55,11 @@ private:
     {
         const auto found = looks_.find({ row, column });
         look = found != looks_.end() ? found->second : CellLook {};
+    }
+
+    TextView text(std::int32_t row, std::int32_t column) override
+    {
+        return grid_.cell(row - 1, column);
     }
 
     CellAlignment titleAlignment(std::int32_t) override { return CellAlignment::Right; }
@@ -335,6 +342,27 @@ TEST_F(ShapedReportTest, DrawsCheckBoxesInPlaceOfTheirCharacters)
     EXPECT_EQ(page(1), "C1|done|☑ text") << "the last one is typed";
 }
 
+TEST_F(ShapedReportTest, DrawsIconsAtTheHeightOfTheTextBeforeIt)
+{
+    ShownGrid grid(gridOf(columnsOf(1, 3000), { { u"with" }, { u"without" }, { u"" } }));
+    grid.look(1, 0).icon = u"flag.png";
+    grid.look(3, 0).icon = u"flag.png";
+    canvas.options.asShown = true;
+    canvas.doPreview(grid);
+    const auto icons = canvas.document().reportPictures(0);
+    ASSERT_EQ(icons.size(), 2U);
+    const TextRecord text = textsOn(1)[1];
+    const Twips plain = textsOn(1)[2].pt.x;
+    const float size = canvas.document().style(text.style).font.size;
+    const auto line = static_cast<Twips>(size * 24); // of the fake metrics
+    EXPECT_EQ(icons[0].file, u"flag.png");
+    EXPECT_EQ(icons[0].layer, PictureLayer::Cells);
+    EXPECT_EQ(icons[0].size, (Tpoint { line, line }));
+    EXPECT_EQ(icons[0].pt, (Tpoint { plain, text.pt.y }));
+    EXPECT_NEAR(text.pt.x, plain + 1.2 * line, 1);
+    EXPECT_EQ(icons[1].pt.x, plain) << "an icon needs no text";
+}
+
 TEST_F(ShapedReportTest, ASpanIsOneBoxThatIsClosedAtThePagesEndAndRepeatedBehindIt)
 {
     std::vector<std::vector<Text>> rows;
@@ -348,6 +376,23 @@ TEST_F(ShapedReportTest, ASpanIsOneBoxThatIsClosedAtThePagesEndAndRepeatedBehind
     ASSERT_GE(canvas.Totalpages(), 2);
     for (int number = 1; number <= canvas.Totalpages(); ++number)
         EXPECT_NE(page(number).find("spanning"), std::string::npos) << number;
+}
+
+TEST_F(ShapedReportTest, ASpanShowsItsTextThoughTheRowAndColumnThatHoldItAreLeftOut)
+{
+    ShownGrid grid(gridOf(columnsOf(3, 3000),
+        { { u"spanning", u"", u"a" }, { u"", u"", u"b" }, { u"c", u"d", u"e" } }));
+    for (int row = 1; row <= 2; ++row) {
+        for (int column = 0; column < 2; ++column)
+            grid.look(row, column).box = CellBox { 1, 2, 0, 1 };
+    }
+    canvas.options.asShown = true;
+    canvas.options.rows = RowChoice::Range;
+    canvas.options.firstRow = 2;
+    canvas.options.lastRow = 3;
+    canvas.options.columns = { u"C2", u"C3" };
+    canvas.doPreview(grid);
+    EXPECT_EQ(page(1), "C2|C3|spanning|b|d|e");
 }
 
 TEST_F(ShapedReportTest, BreaksBetweenWordsAndCutsWhatAViewCuts)
@@ -366,6 +411,66 @@ TEST_F(ShapedReportTest, BreaksBetweenWordsAndCutsWhatAViewCuts)
             words += toUtf8(text.text()) + " ";
     }
     EXPECT_EQ(words, "one two three four ");
+}
+
+TEST_F(ShapedReportTest, PutsTheWatermarkBehindOrAboveEveryPageAndChangesNothingElse)
+{
+    TableGrid grid = gridOf(columnsOf(2, 2000), numberedRows(90, 2));
+    canvas.doPreview(grid);
+    const std::string plain = showDocument(canvas.document());
+    EXPECT_FALSE(canvas.document().hasReportPictures());
+    canvas.options.watermark = { .text = u"Draft", .opacity = 0.2 };
+    canvas.doPreview(grid);
+    EXPECT_EQ(showDocument(canvas.document()), plain);
+    ASSERT_GE(canvas.Totalpages(), 2);
+    for (int number = 0; number < canvas.Totalpages(); ++number) {
+        const auto shown = canvas.document().reportPictures(number);
+        ASSERT_EQ(shown.size(), 1U) << number;
+        EXPECT_EQ(shown[0].file, u"text Draft 20%");
+        EXPECT_EQ(shown[0].layer, PictureLayer::Behind);
+        EXPECT_EQ(shown[0].pt, Tpoint());
+        EXPECT_EQ(shown[0].size, (Tpoint { 11907, 16840 }));
+    }
+    canvas.options.watermark = { .imageFile = u"seal.png", .opacity = 1, .isAbove = true };
+    canvas.doPreview(grid);
+    const PictureRecord seal = canvas.document().reportPictures(0)[0];
+    EXPECT_EQ(seal.file, u"seal.png 100%");
+    EXPECT_EQ(seal.layer, PictureLayer::Above);
+    // Twice as wide as high, and seven tenths of the sheet's width.
+    EXPECT_EQ(seal.size, (Tpoint { 8335, 4168 }));
+    EXPECT_EQ(seal.pt, (Tpoint { (11907 - 8335) / 2, (16840 - 4168) / 2 }));
+    canvas.options.watermark = { .imageFile = u"missing" };
+    EXPECT_EQ(errorOf([&] { canvas.doPreview(grid); }), ErrorNumber::FileNotFound);
+    EXPECT_EQ(canvas.document().reportPictures(0)[0].file, u"seal.png 100%")
+        << "the old document stays";
+}
+
+TEST_F(ShapedReportTest, PutsALogoIntoItsSlotAndTheHeaderBelowIt)
+{
+    set({ { u"HeaderLeft", u"head" } });
+    TableGrid grid = gridOf(columnsOf(2, 2000), numberedRows(2, 2));
+    canvas.doPreview(grid);
+    const Twips head = textsOn(1)[0].pt.y;
+    const Twips title = textsOn(1)[1].pt.y;
+    struct Case {
+        int slot;
+        Twips left;
+    };
+    for (const Case& expected :
+        { Case { 0, 680 }, Case { 1, (11907 - 1200) / 2 }, Case { 2, 11907 - 680 - 1200 } }) {
+        canvas.options.logo = { .imageFile = u"logo.png", .slot = expected.slot, .height = 600 };
+        canvas.doPreview(grid);
+        const PictureRecord logo = canvas.document().reportPictures(0)[0];
+        EXPECT_EQ(logo.file, u"logo.png 100%");
+        EXPECT_EQ(logo.pt, (Tpoint { expected.left, canvas.page.intTop })) << expected.slot;
+        EXPECT_EQ(logo.size, (Tpoint { 1200, 600 }));
+        EXPECT_EQ(textsOn(1)[0].pt.y, head + 600 + 72);
+        EXPECT_EQ(textsOn(1)[1].pt.y, title + 600 + 72);
+    }
+    EXPECT_EQ(canvas.page.intTop, 907) << "the margin is the host's";
+    canvas.options.logo.height = 9000;
+    canvas.doPreview(grid);
+    EXPECT_EQ(canvas.document().reportPictures(0)[0].size.y, 16840 / 4);
 }
 
 TEST_F(ShapedReportTest, EveryChosenCellStandsOncePerBandAndNothingOutsideThePaper)

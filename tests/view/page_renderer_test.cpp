@@ -55,6 +55,31 @@ TEST(PageRenderer, DrawsLinesThenTextsInTheOrderRecorded)
         replayed(document, 0), SampleStart + SampleLines + SampleText + "print Page 2 of 4, 4\n");
 }
 
+TEST(PageRenderer, PutsReportPicturesBehindLinesBetweenLinesAndTextsAndAboveAll)
+{
+    PageDocument document;
+    addSampleRecords(document);
+    TextStore& store = document.store();
+    document.addPicture(0, { PictureLayer::Above, { 1, 2 }, { 3, 4 }, store.add(u"seal") });
+    document.addPicture(0, { PictureLayer::Cells, { 5, 6 }, { 7, 8 }, store.add(u"icon") });
+    document.addPicture(0, { PictureLayer::Behind, { 0, 0 }, { 900, 900 }, store.add(u"mark") });
+    const std::string behind = "picture mark 0,0 900,900\n";
+    const std::string icon = "picture icon 5,6 7,8\n";
+    const std::string above = "picture seal 1,2 3,4\n";
+    EXPECT_EQ(replayed(document, 0),
+        SampleStart + behind + SampleLines + icon + SampleText + "print Page 2 of 1, 1\n" + above);
+    const std::string paper = [&] {
+        FakeSurface surface;
+        PageRenderer(document).replay(0, paperReplay({}), surface);
+        return surface.log();
+    }();
+    for (const std::string& picture : { behind, icon, above })
+        EXPECT_NE(paper.find(picture), std::string::npos) << "they are printed, too";
+    const std::string part = replayed(document, 0, { .visible = PageRect { 100, 100, 200, 200 } });
+    EXPECT_NE(part.find(behind), std::string::npos);
+    EXPECT_EQ(part.find(icon), std::string::npos) << "what is not seen is left out";
+}
+
 TEST(PageRenderer, LeavesThePageCountTokenInAPageWindow)
 {
     PageDocument document;

@@ -3,6 +3,7 @@
 
 #pragma once
 
+class QAbstractItemView;
 class QString;
 class QTableView;
 class QTableWidget;
@@ -27,3 +28,7 @@ void previewQuery(pelloric::qt::Kestrane& preview, QTableView& view, const QStri
 /// A table view on any model.
 void previewView(
     pelloric::qt::Kestrane& preview, QTableView& view, const QString& title, const QString& footer);
+
+/// Any view, its cells as it shows them.
+void previewAsShown(pelloric::qt::Kestrane& preview, QAbstractItemView& view, const QString& title,
+    const QString& footer);

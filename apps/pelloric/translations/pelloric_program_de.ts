@@ -2,6 +2,41 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="de" sourcelanguage="en">
 <context>
+    <name>DemoGrids</name>
+    <message>
+        <source>Class</source>
+        <translation>Klasse</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>Messwert</translation>
+    </message>
+    <message>
+        <source>Least</source>
+        <translation>Kleinster</translation>
+    </message>
+    <message>
+        <source>Median</source>
+        <translation>Mittlerer</translation>
+    </message>
+    <message>
+        <source>Most</source>
+        <translation>Größter</translation>
+    </message>
+    <message>
+        <source>Zone</source>
+        <translation>Zone</translation>
+    </message>
+    <message>
+        <source>Country</source>
+        <translation>Land</translation>
+    </message>
+    <message>
+        <source>Coordinates</source>
+        <translation>Koordinaten</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::app::DemoWindow</name>
     <message>
         <source>Tables</source>
@@ -98,6 +133,38 @@
     <message>
         <source>A table of your own: %1.</source>
         <translation>Eine eigene Tabelle: %1.</translation>
+    </message>
+    <message>
+        <source>&amp;Spans</source>
+        <translation>&amp;Verbundene Zellen</translation>
+    </message>
+    <message>
+        <source>A table widget with spans, ticks and colours, printed as it is shown.</source>
+        <translation>Eine Tabelle mit verbundenen Zellen, Häkchen und Farben, gedruckt wie gezeigt.</translation>
+    </message>
+    <message>
+        <source>Classes of wines</source>
+        <translation>Klassen der Weine</translation>
+    </message>
+    <message>
+        <source>&amp;Tree</source>
+        <translation>&amp;Baum</translation>
+    </message>
+    <message>
+        <source>A tree widget with branches, icons and ticks, printed as it is shown.</source>
+        <translation>Ein Baum mit Ästen, Symbolen und Häkchen, gedruckt wie gezeigt.</translation>
+    </message>
+    <message>
+        <source>Time zones</source>
+        <translation>Zeitzonen</translation>
+    </message>
+    <message>
+        <source>As sho&amp;wn</source>
+        <translation>&amp;Wie gezeigt</translation>
+    </message>
+    <message>
+        <source>Cells look as the view shows them; F4 in the preview offers more</source>
+        <translation>Zellen sehen aus wie in der Ansicht; F4 in der Vorschau bietet mehr</translation>
     </message>
 </context>
 <context>

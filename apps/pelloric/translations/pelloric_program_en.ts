@@ -2,6 +2,41 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="en" sourcelanguage="en">
 <context>
+    <name>DemoGrids</name>
+    <message>
+        <source>Class</source>
+        <translation>Class</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>Measure</translation>
+    </message>
+    <message>
+        <source>Least</source>
+        <translation>Least</translation>
+    </message>
+    <message>
+        <source>Median</source>
+        <translation>Median</translation>
+    </message>
+    <message>
+        <source>Most</source>
+        <translation>Most</translation>
+    </message>
+    <message>
+        <source>Zone</source>
+        <translation>Zone</translation>
+    </message>
+    <message>
+        <source>Country</source>
+        <translation>Country</translation>
+    </message>
+    <message>
+        <source>Coordinates</source>
+        <translation>Coordinates</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::app::DemoWindow</name>
     <message>
         <source>Tables</source>
@@ -98,6 +133,38 @@
     <message>
         <source>A table of your own: %1.</source>
         <translation>A table of your own: %1.</translation>
+    </message>
+    <message>
+        <source>&amp;Spans</source>
+        <translation>&amp;Spans</translation>
+    </message>
+    <message>
+        <source>A table widget with spans, ticks and colours, printed as it is shown.</source>
+        <translation>A table widget with spans, ticks and colours, printed as it is shown.</translation>
+    </message>
+    <message>
+        <source>Classes of wines</source>
+        <translation>Classes of wines</translation>
+    </message>
+    <message>
+        <source>&amp;Tree</source>
+        <translation>&amp;Tree</translation>
+    </message>
+    <message>
+        <source>A tree widget with branches, icons and ticks, printed as it is shown.</source>
+        <translation>A tree widget with branches, icons and ticks, printed as it is shown.</translation>
+    </message>
+    <message>
+        <source>Time zones</source>
+        <translation>Time zones</translation>
+    </message>
+    <message>
+        <source>As sho&amp;wn</source>
+        <translation>As sho&amp;wn</translation>
+    </message>
+    <message>
+        <source>Cells look as the view shows them; F4 in the preview offers more</source>
+        <translation>Cells look as the view shows them; F4 in the preview offers more</translation>
     </message>
 </context>
 <context>

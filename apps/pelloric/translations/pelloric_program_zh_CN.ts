@@ -2,6 +2,41 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="zh_CN" sourcelanguage="en">
 <context>
+    <name>DemoGrids</name>
+    <message>
+        <source>Class</source>
+        <translation>类别</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>指标</translation>
+    </message>
+    <message>
+        <source>Least</source>
+        <translation>最小</translation>
+    </message>
+    <message>
+        <source>Median</source>
+        <translation>中位</translation>
+    </message>
+    <message>
+        <source>Most</source>
+        <translation>最大</translation>
+    </message>
+    <message>
+        <source>Zone</source>
+        <translation>时区</translation>
+    </message>
+    <message>
+        <source>Country</source>
+        <translation>国家</translation>
+    </message>
+    <message>
+        <source>Coordinates</source>
+        <translation>坐标</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::app::DemoWindow</name>
     <message>
         <source>Tables</source>
@@ -98,6 +133,38 @@
     <message>
         <source>A table of your own: %1.</source>
         <translation>自己的表格：%1。</translation>
+    </message>
+    <message>
+        <source>&amp;Spans</source>
+        <translation>合并单元格(&amp;S)</translation>
+    </message>
+    <message>
+        <source>A table widget with spans, ticks and colours, printed as it is shown.</source>
+        <translation>带合并单元格、勾选和颜色的表格，按所见打印。</translation>
+    </message>
+    <message>
+        <source>Classes of wines</source>
+        <translation>葡萄酒类别</translation>
+    </message>
+    <message>
+        <source>&amp;Tree</source>
+        <translation>树(&amp;T)</translation>
+    </message>
+    <message>
+        <source>A tree widget with branches, icons and ticks, printed as it is shown.</source>
+        <translation>带分支、图标和勾选的树，按所见打印。</translation>
+    </message>
+    <message>
+        <source>Time zones</source>
+        <translation>时区</translation>
+    </message>
+    <message>
+        <source>As sho&amp;wn</source>
+        <translation>按所见(&amp;W)</translation>
+    </message>
+    <message>
+        <source>Cells look as the view shows them; F4 in the preview offers more</source>
+        <translation>单元格与视图一致；预览中按 F4 可选更多</translation>
     </message>
 </context>
 <context>

@@ -13,6 +13,7 @@
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include <pelloric/options.h>
 
 #include <QPainter>
 
@@ -35,10 +36,12 @@ struct CurrentOpener final : PreviewOpener {
         PreviewOpener* const opener = own ? own : defaultOpener;
         if (!opener)
             throw RunTimeError(ErrorNumber::InvalidCall, u"nobody opens the preview window");
+        opener->setReportOptions(options);
         opener->openPreview(std::move(grid));
     }
 
     PreviewOpener* own = nullptr; ///< null: the default one
+    ReportOptions options;
 };
 
 } // namespace
@@ -92,6 +95,13 @@ bool Kestrane::ShowHeader() const { return parts_->core->facade.ShowHeader(); }
 std::int32_t Kestrane::MarvenStartRow() const { return parts_->core->facade.MarvenStartRow(); }
 
 bool Kestrane::MergeGrid() const { return parts_->core->facade.MergeGrid(); }
+
+void Kestrane::setReportOptions(const ReportOptions& options)
+{
+    parts_->core->opener.options = options;
+}
+
+const ReportOptions& Kestrane::reportOptions() const { return parts_->core->opener.options; }
 
 void Kestrane::doPreview(std::unique_ptr<AutomationObject> PrintObj)
 {

@@ -5,6 +5,7 @@
 
 #include "platform/numbers.h"
 #include "platform/qt/glyph_runs.h"
+#include "platform/qt/picture_files.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
 #include "platform/text_metrics.h"
@@ -115,9 +116,9 @@ std::string pathData(const QPainterPath& path)
 }
 
 /// The file of a picture as one that every viewer shows; empty: it cannot be read.
-QByteArray pictureData(const QString& path)
+QByteArray pictureData(TextView path)
 {
-    const QImage image(path);
+    const QImage image = loadPicture(path);
     QByteArray bytes;
     QBuffer buffer(&bytes);
     buffer.open(QIODevice::WriteOnly);
@@ -205,7 +206,7 @@ void SvgPage::print(TextView text)
 
 void SvgPage::picture(TextView filePath, Tpoint topLeft, Tpoint size)
 {
-    const QByteArray bytes = pictureData(toQString(filePath));
+    const QByteArray bytes = pictureData(filePath);
     if (bytes.isEmpty())
         return;
     body_ += "<image x=\"" + units(topLeft.x) + "\" y=\"" + units(topLeft.y) + "\" width=\""

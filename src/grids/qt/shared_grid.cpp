@@ -29,6 +29,8 @@ public:
         grid_->put(member, arguments, value);
     }
 
+    CellLooks* cellLooks() override { return grid_->cellLooks(); }
+
 private:
     std::shared_ptr<AutomationObject> grid_;
 };

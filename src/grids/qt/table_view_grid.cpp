@@ -158,7 +158,7 @@ GridLook TableViewGrid::gridLook()
     const QColor color = QColor::fromRgb(static_cast<QRgb>(hint));
     constexpr std::int16_t Styles[] = { 5, 0, 1, 2, 3, 4 }; // in the order of Qt::PenStyle
     const auto style = static_cast<std::size_t>(table.gridStyle());
-    return { .showsLines = true,
+    return GridLook { .showsLines = true,
         .lineStyle = style < std::size(Styles) ? Styles[style] : SolidPen,
         .lineColor = rgb(color.red(), color.green(), color.blue()) };
 }
@@ -177,6 +177,11 @@ void TableViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& lo
     if (span)
         look.box = CellBox { span->firstPlace.row + 1, span->lastPlace.row + 1,
             span->firstPlace.column, span->lastPlace.column };
+}
+
+TextView TableViewGrid::text(std::int32_t row, std::int32_t column)
+{
+    return hasCell(row, column) ? cell(row, columns_.logical(column)) : TextView();
 }
 
 CellAlignment TableViewGrid::titleAlignment(std::int32_t column)

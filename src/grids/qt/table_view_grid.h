@@ -38,12 +38,14 @@ public:
     const void* memberTable() const override;
     Value get(MemberId member, std::span<const Value> arguments) override;
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
+    CellLooks* cellLooks() override { return this; }
 
     void readRow(std::int32_t row, std::span<const int> columns,
         const std::function<void(TextView text)>& take) override;
 
     GridLook gridLook() override;
     void readLook(std::int32_t row, std::int32_t column, CellLook& look) override;
+    TextView text(std::int32_t row, std::int32_t column) override;
     CellAlignment titleAlignment(std::int32_t column) override;
     bool isMarked(std::int32_t row) override;
     std::optional<double> number(std::int32_t row, std::int32_t column) override;

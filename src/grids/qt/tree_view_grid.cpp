@@ -421,6 +421,12 @@ void TreeViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& loo
         source_->readBranch(index, look);
 }
 
+TextView TreeViewGrid::text(std::int32_t row, std::int32_t column)
+{
+    const QModelIndex& index = source_->row(row - 1);
+    return source_->text.of(source_->view(), index.siblingAtColumn(source_->logical(column)));
+}
+
 CellAlignment TreeViewGrid::titleAlignment(std::int32_t column)
 {
     source_->view();

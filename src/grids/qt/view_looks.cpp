@@ -3,19 +3,27 @@
 
 #include "grids/qt/view_looks.h"
 
+#include "platform/qt/picture_files.h"
+
 #include <QAbstractItemView>
 #include <QHeaderView>
+#include <QIcon>
 #include <QListView>
+#include <QPainter>
+#include <QPixmap>
 #include <QStyledItemDelegate>
 #include <QTableView>
 #include <QTreeView>
 
+#include <algorithm>
 #include <array>
 #include <typeinfo>
 
 namespace pelloric::qt {
 
 namespace {
+
+constexpr int IconPixels = 64; ///< of a side; enough for paper at the height of a text
 
 /// The members through which a view asks its delegate are protected; a derived type may name them.
 struct OptionOfView : QAbstractItemView {
@@ -48,8 +56,9 @@ TooWide tooWideOf(const QAbstractItemView& view)
     case Qt::ElideMiddle:
         return TooWide::CutMiddle;
     case Qt::ElideRight:
-    case Qt::ElideNone:
         break;
+    case Qt::ElideNone:
+        return TooWide::CutPlainly;
     }
     return TooWide::CutRight;
 }
@@ -81,6 +90,57 @@ CheckMark markOf(Qt::CheckState state)
     return CheckMark::On;
 }
 
+/// What a cell may be decorated with, as a picture; null: nothing that is shown.
+QImage imageOf(const QVariant& decoration)
+{
+    switch (decoration.typeId()) {
+    case QMetaType::QIcon:
+        return decoration.value<QIcon>().pixmap(IconPixels, IconPixels).toImage();
+    case QMetaType::QPixmap:
+        return decoration.value<QPixmap>().toImage();
+    case QMetaType::QImage:
+        return decoration.value<QImage>();
+    case QMetaType::QColor: {
+        QImage plain(1, 1, QImage::Format_ARGB32);
+        plain.fill(decoration.value<QColor>());
+        return plain;
+    }
+    default:
+        return {};
+    }
+}
+
+qint64 keyOf(const QVariant& decoration)
+{
+    switch (decoration.typeId()) {
+    case QMetaType::QIcon:
+        return decoration.value<QIcon>().cacheKey();
+    case QMetaType::QPixmap:
+        return decoration.value<QPixmap>().cacheKey();
+    case QMetaType::QImage:
+        return decoration.value<QImage>().cacheKey();
+    case QMetaType::QColor:
+        return decoration.value<QColor>().rgba();
+    default:
+        return 0;
+    }
+}
+
+/// A picture in the middle of a transparent square.
+QImage squareOf(const QImage& picture)
+{
+    if (picture.width() == picture.height())
+        return picture;
+    const int side = std::max(picture.width(), picture.height());
+    QImage square(side, side, QImage::Format_ARGB32_Premultiplied);
+    square.fill(Qt::transparent);
+    QImage pixels = picture;
+    pixels.setDevicePixelRatio(1);
+    QPainter painter(&square);
+    painter.drawImage((side - picture.width()) / 2, (side - picture.height()) / 2, pixels);
+    return square;
+}
+
 CellAlignment horizontalOf(Qt::Alignment alignment)
 {
     if (alignment & Qt::AlignRight)
@@ -95,6 +155,7 @@ void ViewLooks::take(const QAbstractItemView& view)
     option_ = QStyleOptionViewItem();
     (view.*OptionOfView::init)(&option_);
     tooWide_ = tooWideOf(view);
+    iconFiles_.clear();
     alternates_ = view.alternatingRowColors();
     alternateColor_ = colorOf(option_.palette.color(QPalette::AlternateBase));
 }
@@ -119,9 +180,10 @@ void ViewLooks::alternate(std::int32_t row, CellLook& look) const
 
 void ViewLooks::readPlain(const QModelIndex& index, CellLook& look)
 {
-    std::array<QModelRoleData, 5> roles { QModelRoleData(Qt::FontRole),
+    std::array<QModelRoleData, 6> roles { QModelRoleData(Qt::FontRole),
         QModelRoleData(Qt::TextAlignmentRole), QModelRoleData(Qt::ForegroundRole),
-        QModelRoleData(Qt::BackgroundRole), QModelRoleData(Qt::CheckStateRole) };
+        QModelRoleData(Qt::BackgroundRole), QModelRoleData(Qt::CheckStateRole),
+        QModelRoleData(Qt::DecorationRole) };
     index.multiData(roles);
     if (!roles[0].data().isNull())
         setFont(roles[0].data().value<QFont>().resolve(option_.font), look);
@@ -137,6 +199,7 @@ void ViewLooks::readPlain(const QModelIndex& index, CellLook& look)
         setBackground(roles[3].data().value<QBrush>(), look);
     if (!roles[4].data().isNull())
         look.check = markOf(static_cast<Qt::CheckState>(roles[4].data().toInt()));
+    setDecoration(roles[5].data(), look);
 }
 
 void ViewLooks::readStyled(
@@ -153,6 +216,8 @@ void ViewLooks::readStyled(
     setBackground(option.backgroundBrush, look);
     if (option.features.testFlag(QStyleOptionViewItem::HasCheckIndicator))
         look.check = markOf(option.checkState);
+    if (option.features.testFlag(QStyleOptionViewItem::HasDecoration))
+        setDecoration(option.icon, look);
 }
 
 /// Where the alignment says nothing, texts stand as the writing runs.
@@ -167,6 +232,19 @@ void ViewLooks::setAlignment(Qt::Alignment alignment, CellLook& look) const
     look.place = alignment & Qt::AlignVCenter ? CellPlace::Middle
         : alignment & Qt::AlignBottom         ? CellPlace::Bottom
                                               : CellPlace::Top;
+}
+
+void ViewLooks::setDecoration(const QVariant& decoration, CellLook& look)
+{
+    if (decoration.isNull())
+        return;
+    const auto [place, isNew]
+        = iconFiles_.try_emplace(IconKey { decoration.typeId(), keyOf(decoration) });
+    if (isNew) {
+        const QImage picture = imageOf(decoration);
+        place->second = picture.isNull() ? Text() : keepPicture(squareOf(picture));
+    }
+    look.icon = place->second;
 }
 
 GridLook ViewLooks::withoutLines() { return { .showsLines = false }; }

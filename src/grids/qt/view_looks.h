@@ -8,6 +8,9 @@
 #include <QPalette>
 #include <QStyleOptionViewItem>
 
+#include <map>
+#include <utility>
+
 class QAbstractItemDelegate;
 class QAbstractItemView;
 class QHeaderView;
@@ -43,11 +46,16 @@ private:
     void readStyled(
         const QAbstractItemDelegate& delegate, const QModelIndex& index, CellLook& look);
     void setAlignment(Qt::Alignment alignment, CellLook& look) const;
+    void setDecoration(const QVariant& decoration, CellLook& look);
+
+    /// What makes two decorations the same one: the kind of value and its key.
+    using IconKey = std::pair<int, qint64>;
 
     QStyleOptionViewItem option_; ///< of every cell of the view that was taken
     TooWide tooWide_ = TooWide::Wrapped;
     bool alternates_ = false;
     Color alternateColor_ = 0;
+    std::map<IconKey, Text> iconFiles_; ///< of the decorations that were met
 };
 
 } // namespace pelloric::qt

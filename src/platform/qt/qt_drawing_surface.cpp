@@ -4,6 +4,7 @@
 #include "platform/qt/qt_drawing_surface.h"
 
 #include "platform/qt/glyph_runs.h"
+#include "platform/qt/picture_files.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_text.h"
 #include "platform/units.h"
@@ -226,11 +227,13 @@ void QtDrawingSurface::picture(TextView filePath, Tpoint topLeft, Tpoint size)
 {
     if (imagePath_ != filePath) {
         imagePath_ = filePath;
-        image_ = QImage(toQString(filePath));
+        image_ = loadPicture(filePath);
     }
     const QRectF area(pointOf(topLeft), QSizeF(size.x, size.y));
-    if (!image_.isNull() && isVisible(area))
-        painter_.drawImage(area, image_);
+    if (image_.isNull() || !isVisible(area))
+        return;
+    painter_.setRenderHint(QPainter::SmoothPixmapTransform);
+    painter_.drawImage(area, image_);
 }
 
 double QtDrawingSurface::emOfSize() const

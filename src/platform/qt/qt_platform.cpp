@@ -37,7 +37,8 @@ Platform QtPlatform::record()
         .printer = *printer_,
         .printers = *printers_,
         .library = library_,
-        .decimalSeparator = point.isEmpty() ? u'.' : point.front().unicode() };
+        .decimalSeparator = point.isEmpty() ? u'.' : point.front().unicode(),
+        .pictures = &pictures_ };
 }
 
 } // namespace pelloric::qt

@@ -5,6 +5,7 @@
 
 #include "platform/no_printer.h"
 #include "platform/platform.h"
+#include "platform/qt/picture_files.h"
 #include "platform/qt/qt_files.h"
 #include "platform/qt/qt_fonts.h"
 #include "platform/qt/qt_services.h"
@@ -47,6 +48,7 @@ private:
     NoPrinter noPrinter_;
     NoPrinters noPrinters_;
     LibraryState library_;
+    QtPictures pictures_;
     MessageService* messages_; ///< never null
     Printer* printer_; ///< never null
     PrinterSystem* printers_; ///< never null

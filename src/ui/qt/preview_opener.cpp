@@ -80,6 +80,13 @@ void QtPreviewOpener::openPreview(std::unique_ptr<AutomationObject> grid)
     window.preview(std::move(grid));
 }
 
+void QtPreviewOpener::setReportOptions(const ReportOptions& options)
+{
+    options_ = options;
+    if (PreviewWindow* const open = window())
+        open->setReportOptions(options);
+}
+
 PreviewWindow& QtPreviewOpener::showWindow()
 {
     if (!window()) {
@@ -87,6 +94,7 @@ PreviewWindow& QtPreviewOpener::showWindow()
         window_->setPrompts(prompts_);
         window_->useFolders(folders_);
         window_->canvas().canvas().useSettings(settings_);
+        window_->setReportOptions(options_);
     }
     if (!showing_)
         return *window_;

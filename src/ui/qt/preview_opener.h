@@ -5,6 +5,7 @@
 
 #include "controls/facade.h"
 #include "ui/qt/preview_prompts.h"
+#include <pelloric/options.h>
 #include <pelloric/settings.h>
 
 #include <QPointer>
@@ -38,6 +39,9 @@ public:
     /// @throws RunTimeError as `PreviewWindow::preview`
     void openPreview(std::unique_ptr<AutomationObject> grid) override;
 
+    /// What the window's reports do beyond the plain page from the next one on.
+    void setReportOptions(const ReportOptions& options) override;
+
     /// Shows the window, which is made if need be, and raises it.
     PreviewWindow& showWindow();
 
@@ -47,6 +51,7 @@ public:
 private:
     QtPlatform& platform_;
     PreviewPrompts prompts_;
+    ReportOptions options_;
     bool showing_ = true;
     std::shared_ptr<UsedFolders> folders_;
     std::optional<ReportSettings> settings_;

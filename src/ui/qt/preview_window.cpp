@@ -21,6 +21,7 @@
 #include "ui/qt/print_options_dialog.h"
 #include "ui/qt/reader_tools.h"
 #include "ui/qt/reading_input.h"
+#include "ui/qt/report_tools.h"
 #include "ui/tool_table.h"
 #include <pelloric/sorvane.h>
 
@@ -115,8 +116,11 @@ PreviewWindow::PreviewWindow(QtPlatform& platform, QWidget* parent)
     connectStrip();
     session_.emplace(canvas_->canvas(), static_cast<PreviewHost&>(*this));
     reading_ = std::make_unique<ReadingInput>(*canvas_, *session_, [this] { return isBusy(); });
-    tools_ = new ReaderTools({ *this, *contextMenu_, *canvas_, *session_, platform.fonts(),
-        [this] { return isBusy(); }, [this] { savePages(); } });
+    reports_ = new ReportTools({ *this, *canvas_, platform_.messages, [this] { rebuildKeptGrid(); },
+        [this] { return isBusy(); } });
+    tools_ = new ReaderTools(
+        { *this, *contextMenu_, *canvas_, *session_, platform.fonts(), [this] { return isBusy(); },
+            [this] { savePages(); }, [this] { reports_->togglePanel(); } });
     navigationChanged();
     restorePlace();
     canvas_->setFocus();
@@ -218,6 +222,18 @@ void PreviewWindow::openDocument(const std::filesystem::path& path)
     session_->documentOpened();
 }
 
+void PreviewWindow::setReportOptions(const ReportOptions& options)
+{
+    if (!isBusy())
+        reports_->setOptions(options);
+}
+
+void PreviewWindow::rebuildKeptGrid()
+{
+    if (grid_)
+        refresh(true);
+}
+
 void PreviewWindow::refresh(bool rebuild)
 {
     if (isBusy())
@@ -264,7 +280,7 @@ void PreviewWindow::click(int id)
 /// further row goes, then what runs is ended, and only then the preview.
 void PreviewWindow::escape()
 {
-    if (toolbar_->closeFurtherRow() || tools_->escape())
+    if (toolbar_->closeFurtherRow() || reports_->escape() || tools_->escape())
         return;
     if (isBusy())
         services_.loop().cancel();
@@ -331,7 +347,11 @@ void PreviewWindow::navigationChanged()
     strip_->showNotice(session_->notice());
     if (tools_)
         tools_->viewChanged();
+    if (reports_)
+        reports_->viewChanged();
 }
+
+void PreviewWindow::documentSaved() { reports_->documentSaved(); }
 
 DialogEnd PreviewWindow::showGridStyle()
 {

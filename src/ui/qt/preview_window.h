@@ -16,6 +16,7 @@ class QMenu;
 
 namespace pelloric {
 struct PrintArguments;
+struct ReportOptions;
 }
 
 namespace pelloric::qt {
@@ -26,6 +27,7 @@ class PrintOptionsDialog;
 class QtPlatform;
 class ReaderTools;
 class ReadingInput;
+class ReportTools;
 class Sorvane;
 class UsedFolders;
 struct PrintPages;
@@ -55,6 +57,10 @@ public:
     /// Opens a document file and shows its first page.
     /// @throws RunTimeError as `Canvas::OpenFile`
     void openDocument(const std::filesystem::path& path);
+
+    /// What builds from now on do beyond the plain page; while a command runs it is refused without
+    /// a word.
+    void setReportOptions(const ReportOptions& options);
 
     /// Builds again from the kept grid, or only takes the layout anew.
     /// @throws RunTimeError ObjectMissing: no grid is kept; or of the build
@@ -100,6 +106,7 @@ private:
     std::filesystem::path chooseFileToSave() override;
     void unload() override;
     void beforeBuild(AutomationObject& grid) override;
+    void documentSaved() override;
     void navigationChanged() override;
 
     bool printPages(const PrintArguments& arguments);
@@ -108,6 +115,7 @@ private:
     QWidget* makeCentre();
     void connectTools();
     void connectStrip();
+    void rebuildKeptGrid();
     bool mayWritePages(const std::filesystem::path& path);
     void writePages(const std::filesystem::path& path);
     void click(int id);
@@ -130,6 +138,7 @@ private:
     std::optional<PreviewSession> session_;
     std::unique_ptr<ReadingInput> reading_; ///< works on the session
     ReaderTools* tools_ = nullptr; ///< works on the session
+    ReportTools* reports_ = nullptr;
     int running_ = 0; ///< commands that have not ended
     bool closesAfterwards_ = false;
     bool isClosed_ = false;

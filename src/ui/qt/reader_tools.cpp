@@ -85,6 +85,8 @@ std::vector<ViewCommand> ReaderTools::commands()
         { "Copy", tr("Copy"), keys({ "Ctrl+C", "Ctrl+Ins" }), [this] { copy(); } },
         { "Thumbnails", tr("Pictures of the Pages"), keys({ "F9" }),
             [this] { stripDock_->setVisible(!stripDock_->isVisible()); }, true },
+        { "ReportOptionsPanel", tr("Report Options"), keys({ "F4" }),
+            [this] { guarded(parts_.showOptions); } },
         { "Keys", tr("Keys"), keys({ "F1" }),
             [this] { showKeys(parts_.window, allKeys(commands_)); } },
     };

@@ -42,6 +42,7 @@ public:
         QtFonts& fonts;
         std::function<bool()> isBusy; ///< commands are refused meanwhile
         std::function<void()> savePages; ///< asks for a file, see `PreviewWindow::savePages`
+        std::function<void()> showOptions; ///< shows or hides the panel of report options
     };
 
     explicit ReaderTools(const Window& window);

@@ -34,8 +34,13 @@ public:
     void openPreview(std::unique_ptr<AutomationObject> grid) override
     {
         grids.push_back(std::move(grid));
+        previewed.push_back(options);
     }
 
+    void setReportOptions(const ReportOptions& now) override { options = now; }
+
+    ReportOptions options;
+    std::vector<ReportOptions> previewed; ///< the options of each preview
     std::vector<std::unique_ptr<AutomationObject>> grids;
 };
 
@@ -388,6 +393,30 @@ TEST(Kestrane, HandsGridsToWhoeverOpensTheWindow)
     EXPECT_EQ(byDefault.grids.size(), 1U);
     ASSERT_EQ(own.grids.size(), 1U);
     EXPECT_TRUE(own.grids[0]->findMember(u"TextMatrix"));
+}
+
+TEST(Kestrane, HandsItsOwnReportOptionsToEachPreview)
+{
+    QuietPlatform platform;
+    Kestrane plain(platform);
+    Kestrane shown(platform);
+    FakeOpener opener;
+    plain.setPreviewOpener(&opener);
+    shown.setPreviewOpener(&opener);
+    ReportOptions options;
+    options.asShown = true;
+    options.keyColumns = 2;
+    shown.setReportOptions(options);
+    QTableWidget table(1, 1);
+    shown.doPreview(&table);
+    plain.doPreview(&table);
+    shown.doPreview(&table);
+    ASSERT_EQ(opener.previewed.size(), 3U);
+    EXPECT_TRUE(opener.previewed[0].asShown);
+    EXPECT_EQ(opener.previewed[0].keyColumns, 2);
+    EXPECT_FALSE(opener.previewed[1].asShown) << "the other control has none";
+    EXPECT_TRUE(opener.previewed[2].asShown);
+    EXPECT_TRUE(shown.reportOptions().asShown);
 }
 
 TEST(Kestrane, WritesWhatItIsTold)

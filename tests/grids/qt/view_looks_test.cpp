@@ -5,8 +5,12 @@
 
 #include "grids/qt/grid_for.h"
 #include "grids/qt/late_bound.h"
+#include "platform/qt/qt_text.h"
 
 #include <QHeaderView>
+#include <QIcon>
+#include <QImage>
+#include <QPixmap>
 #include <QStyledItemDelegate>
 #include <QTableWidget>
 #include <QTreeWidget>
@@ -34,7 +38,7 @@ protected:
 CellLook lookOf(AutomationObject& grid, std::int32_t row, std::int32_t column)
 {
     CellLook look;
-    dynamic_cast<CellLooks&>(grid).readLook(row, column, look);
+    grid.looks()->readLook(row, column, look);
     return look;
 }
 
@@ -104,6 +108,27 @@ TEST_F(TableLooks, AreThoseThatADelegateGives)
     table_.setItemDelegateForColumn(0, nullptr);
 }
 
+TEST_F(TableLooks, ShowIconsPicturesAndColoursAsSquarePictures)
+{
+    QPixmap wide(40, 20);
+    wide.fill(Qt::red);
+    item(0, 0, QStringLiteral("icon"))->setIcon(QIcon(wide));
+    item(1, 0, QStringLiteral("the same"))->setIcon(table_.item(0, 0)->icon());
+    item(2, 0, QStringLiteral("colour"))->setData(Qt::DecorationRole, QColor(0, 0, 255));
+    item(3, 0, QStringLiteral("none"));
+    const auto made = grid();
+    const Text file(lookOf(*made, 1, 0).icon);
+    ASSERT_FALSE(file.empty());
+    const QImage shown(toQString(file));
+    EXPECT_EQ(shown.size(), QSize(40, 40));
+    EXPECT_EQ(shown.pixelColor(20, 20), QColor(Qt::red));
+    EXPECT_EQ(shown.pixelColor(20, 1).alpha(), 0);
+    EXPECT_EQ(lookOf(*made, 2, 0).icon, file);
+    const QImage blue(toQString(lookOf(*made, 3, 0).icon));
+    EXPECT_EQ(blue.pixelColor(0, 0), QColor(Qt::blue));
+    EXPECT_TRUE(lookOf(*made, 4, 0).icon.empty());
+}
+
 TEST_F(TableLooks, ShowSpansAsOneBoxOfTheRowsAndColumnsThatAreSeen)
 {
     table_.setSpan(1, 0, 3, 2);
@@ -125,7 +150,7 @@ TEST_F(TableLooks, TellLinesMarksTitlesAndNumbers)
     table_.horizontalHeaderItem(1)->setTextAlignment(Qt::AlignRight);
     item(0, 0, {})->setData(Qt::DisplayRole, 2.5);
     const auto made = grid();
-    auto& looks = dynamic_cast<CellLooks&>(*made);
+    CellLooks& looks = *made->cellLooks();
     EXPECT_FALSE(looks.gridLook().showsLines);
     EXPECT_FALSE(looks.isMarked(2));
     EXPECT_TRUE(looks.isMarked(3));

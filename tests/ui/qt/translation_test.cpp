@@ -58,6 +58,8 @@ const std::set<std::pair<QString, QString>> SameWords {
     { "pelloric::qt::AboutBox", "About" }, // the box behind the tool, whose title is left open
     { "pelloric::qt::FontChooser", "OK" }, { "pelloric::qt::FontChooser", "Cancel" },
     { "pelloric::qt::GridStyleDialog", "Fonts" }, // what a screen reader calls the list
+    { "pelloric::qt::OptionsPanel", "All" }, // rows
+    { "pelloric::qt::OptionsPanel", "Minimum" }, // of a column
     { "pelloric::qt::PreviewWindow", "Cancel" }, // of saving pages
     { "pelloric::qt::PrintOptionsDialog", "Cancel" }, // of the print job that runs
 };

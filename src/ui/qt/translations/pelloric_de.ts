@@ -343,6 +343,237 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::OptionsPanel</name>
+    <message>
+        <source>Report Options</source>
+        <translation>Berichtsoptionen</translation>
+    </message>
+    <message>
+        <source>Look</source>
+        <translation>Aussehen</translation>
+    </message>
+    <message>
+        <source>Cells &amp;as the view shows them</source>
+        <translation>Zellen wie in der &amp;Ansicht</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Breite</translation>
+    </message>
+    <message>
+        <source>As it is, in bands</source>
+        <translation>Wie sie ist, in Bändern</translation>
+    </message>
+    <message>
+        <source>Turn, then shrink</source>
+        <translation>Drehen, dann verkleinern</translation>
+    </message>
+    <message>
+        <source>Shrink to pages across</source>
+        <translation>Auf Seiten nebeneinander verkleinern</translation>
+    </message>
+    <message>
+        <source>Across, then down</source>
+        <translation>Erst quer, dann abwärts</translation>
+    </message>
+    <message>
+        <source>Down, then across</source>
+        <translation>Erst abwärts, dann quer</translation>
+    </message>
+    <message>
+        <source>&amp;Fit:</source>
+        <translation>An&amp;passen:</translation>
+    </message>
+    <message>
+        <source>Pages a&amp;cross:</source>
+        <translation>Seiten &amp;nebeneinander:</translation>
+    </message>
+    <message>
+        <source>&amp;Key columns:</source>
+        <translation>&amp;Kopfspalten:</translation>
+    </message>
+    <message>
+        <source>Page or&amp;der:</source>
+        <translation>&amp;Reihenfolge:</translation>
+    </message>
+    <message>
+        <source>Rows and Columns</source>
+        <translation>Zeilen und Spalten</translation>
+    </message>
+    <message>
+        <source>All</source>
+        <translation>Alle</translation>
+    </message>
+    <message>
+        <source>Selected in the view</source>
+        <translation>In der Ansicht ausgewählte</translation>
+    </message>
+    <message>
+        <source>Range</source>
+        <translation>Bereich</translation>
+    </message>
+    <message>
+        <source>all, or titles: Name, Price</source>
+        <translation>alle, oder Titel: Name, Preis</translation>
+    </message>
+    <message>
+        <source>&amp;Rows:</source>
+        <translation>&amp;Zeilen:</translation>
+    </message>
+    <message>
+        <source>From:</source>
+        <translation>&amp;Von:</translation>
+    </message>
+    <message>
+        <source>&amp;To:</source>
+        <translation>&amp;Bis:</translation>
+    </message>
+    <message>
+        <source>Co&amp;lumns:</source>
+        <translation>&amp;Spalten:</translation>
+    </message>
+    <message>
+        <source>Groups and Totals</source>
+        <translation>Gruppen und Summen</translation>
+    </message>
+    <message>
+        <source>titles: Country</source>
+        <translation>Titel: Land</translation>
+    </message>
+    <message>
+        <source>K&amp;eep groups on a page</source>
+        <translation>Gruppen auf einer Seite &amp;halten</translation>
+    </message>
+    <message>
+        <source>Sum</source>
+        <translation>Summe</translation>
+    </message>
+    <message>
+        <source>Count</source>
+        <translation>Anzahl</translation>
+    </message>
+    <message>
+        <source>Mean</source>
+        <translation>Mittelwert</translation>
+    </message>
+    <message>
+        <source>Minimum</source>
+        <translation>Kleinster Wert</translation>
+    </message>
+    <message>
+        <source>Maximum</source>
+        <translation>Größter Wert</translation>
+    </message>
+    <message>
+        <source>titles: Price</source>
+        <translation>Titel: Preis</translation>
+    </message>
+    <message>
+        <source>Group b&amp;y:</source>
+        <translation>&amp;Gruppieren nach:</translation>
+    </message>
+    <message>
+        <source>T&amp;otal:</source>
+        <translation>S&amp;umme:</translation>
+    </message>
+    <message>
+        <source>of col&amp;umns:</source>
+        <translation>der Spa&amp;lten:</translation>
+    </message>
+    <message>
+        <source>Watermark and Logo</source>
+        <translation>Wasserzeichen und Logo</translation>
+    </message>
+    <message>
+        <source>a text, such as Draft</source>
+        <translation>ein Text, etwa Entwurf</translation>
+    </message>
+    <message>
+        <source>or a picture file</source>
+        <translation>oder eine Bilddatei</translation>
+    </message>
+    <message>
+        <source>A&amp;bove the table</source>
+        <translation>Über der &amp;Tabelle</translation>
+    </message>
+    <message>
+        <source>a picture file</source>
+        <translation>eine Bilddatei</translation>
+    </message>
+    <message>
+        <source>Left</source>
+        <translation>Links</translation>
+    </message>
+    <message>
+        <source>Centre</source>
+        <translation>Mitte</translation>
+    </message>
+    <message>
+        <source>Right</source>
+        <translation>Rechts</translation>
+    </message>
+    <message>
+        <source>Text:</source>
+        <translation>Text:</translation>
+    </message>
+    <message>
+        <source>&amp;Picture:</source>
+        <translation>B&amp;ild:</translation>
+    </message>
+    <message>
+        <source>Picture of the watermark</source>
+        <translation>Bild des Wasserzeichens</translation>
+    </message>
+    <message>
+        <source>Opac&amp;ity:</source>
+        <translation>&amp;Deckkraft:</translation>
+    </message>
+    <message>
+        <source>Lo&amp;go:</source>
+        <translation>Lo&amp;go:</translation>
+    </message>
+    <message>
+        <source>Picture of the logo</source>
+        <translation>Bild des Logos</translation>
+    </message>
+    <message>
+        <source>&amp;Slot:</source>
+        <translation>Pl&amp;atz:</translation>
+    </message>
+    <message>
+        <source>Choose: %1</source>
+        <translation>Wählen: %1</translation>
+    </message>
+    <message>
+        <source>Choose a file</source>
+        <translation>Eine Datei wählen</translation>
+    </message>
+    <message>
+        <source>Pictures (*.png *.jpg *.jpeg *.bmp *.gif *.svg)</source>
+        <translation>Bilder (*.png *.jpg *.jpeg *.bmp *.gif *.svg)</translation>
+    </message>
+    <message>
+        <source>The table fits as it is.</source>
+        <translation>Die Tabelle passt, wie sie ist.</translation>
+    </message>
+    <message>
+        <source>The table fits on turned paper.</source>
+        <translation>Die Tabelle passt auf gedrehtes Papier.</translation>
+    </message>
+    <message>
+        <source>Shrunk to %1 % on turned paper.</source>
+        <translation>Auf %1 % verkleinert, auf gedrehtem Papier.</translation>
+    </message>
+    <message>
+        <source>Shrunk to %1 %.</source>
+        <translation>Auf %1 % verkleinert.</translation>
+    </message>
+    <message>
+        <source>Too wide to be shrunk: printed in bands.</source>
+        <translation>Zum Verkleinern zu breit: in Bändern gedruckt.</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::PageFiles</name>
     <message>
         <source>PDF document</source>
@@ -615,6 +846,10 @@
         <translation>Bilder der Seiten</translation>
     </message>
     <message>
+        <source>Report Options</source>
+        <translation>Berichtsoptionen</translation>
+    </message>
+    <message>
         <source>Keys</source>
         <translation>Tasten</translation>
     </message>
@@ -640,6 +875,13 @@
     <message>
         <source>&amp;Replace</source>
         <translation>E&amp;rsetzen</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::ReportTools</name>
+    <message>
+        <source>The file holds the pages without watermark, logo and icons; save them as PDF to keep those.</source>
+        <translation>Die Datei enthält die Seiten ohne Wasserzeichen, Logo und Symbole; als PDF gespeichert bleiben sie erhalten.</translation>
     </message>
 </context>
 <context>

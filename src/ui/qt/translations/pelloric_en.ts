@@ -343,6 +343,237 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::OptionsPanel</name>
+    <message>
+        <source>Report Options</source>
+        <translation>Report Options</translation>
+    </message>
+    <message>
+        <source>Look</source>
+        <translation>Look</translation>
+    </message>
+    <message>
+        <source>Cells &amp;as the view shows them</source>
+        <translation>Cells &amp;as the view shows them</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>Width</translation>
+    </message>
+    <message>
+        <source>As it is, in bands</source>
+        <translation>As it is, in bands</translation>
+    </message>
+    <message>
+        <source>Turn, then shrink</source>
+        <translation>Turn, then shrink</translation>
+    </message>
+    <message>
+        <source>Shrink to pages across</source>
+        <translation>Shrink to pages across</translation>
+    </message>
+    <message>
+        <source>Across, then down</source>
+        <translation>Across, then down</translation>
+    </message>
+    <message>
+        <source>Down, then across</source>
+        <translation>Down, then across</translation>
+    </message>
+    <message>
+        <source>&amp;Fit:</source>
+        <translation>&amp;Fit:</translation>
+    </message>
+    <message>
+        <source>Pages a&amp;cross:</source>
+        <translation>Pages a&amp;cross:</translation>
+    </message>
+    <message>
+        <source>&amp;Key columns:</source>
+        <translation>&amp;Key columns:</translation>
+    </message>
+    <message>
+        <source>Page or&amp;der:</source>
+        <translation>Page or&amp;der:</translation>
+    </message>
+    <message>
+        <source>Rows and Columns</source>
+        <translation>Rows and Columns</translation>
+    </message>
+    <message>
+        <source>All</source>
+        <translation>All</translation>
+    </message>
+    <message>
+        <source>Selected in the view</source>
+        <translation>Selected in the view</translation>
+    </message>
+    <message>
+        <source>Range</source>
+        <translation>Range</translation>
+    </message>
+    <message>
+        <source>all, or titles: Name, Price</source>
+        <translation>all, or titles: Name, Price</translation>
+    </message>
+    <message>
+        <source>&amp;Rows:</source>
+        <translation>&amp;Rows:</translation>
+    </message>
+    <message>
+        <source>From:</source>
+        <translation>From:</translation>
+    </message>
+    <message>
+        <source>&amp;To:</source>
+        <translation>&amp;To:</translation>
+    </message>
+    <message>
+        <source>Co&amp;lumns:</source>
+        <translation>Co&amp;lumns:</translation>
+    </message>
+    <message>
+        <source>Groups and Totals</source>
+        <translation>Groups and Totals</translation>
+    </message>
+    <message>
+        <source>titles: Country</source>
+        <translation>titles: Country</translation>
+    </message>
+    <message>
+        <source>K&amp;eep groups on a page</source>
+        <translation>K&amp;eep groups on a page</translation>
+    </message>
+    <message>
+        <source>Sum</source>
+        <translation>Sum</translation>
+    </message>
+    <message>
+        <source>Count</source>
+        <translation>Count</translation>
+    </message>
+    <message>
+        <source>Mean</source>
+        <translation>Mean</translation>
+    </message>
+    <message>
+        <source>Minimum</source>
+        <translation>Minimum</translation>
+    </message>
+    <message>
+        <source>Maximum</source>
+        <translation>Maximum</translation>
+    </message>
+    <message>
+        <source>titles: Price</source>
+        <translation>titles: Price</translation>
+    </message>
+    <message>
+        <source>Group b&amp;y:</source>
+        <translation>Group b&amp;y:</translation>
+    </message>
+    <message>
+        <source>T&amp;otal:</source>
+        <translation>T&amp;otal:</translation>
+    </message>
+    <message>
+        <source>of col&amp;umns:</source>
+        <translation>of col&amp;umns:</translation>
+    </message>
+    <message>
+        <source>Watermark and Logo</source>
+        <translation>Watermark and Logo</translation>
+    </message>
+    <message>
+        <source>a text, such as Draft</source>
+        <translation>a text, such as Draft</translation>
+    </message>
+    <message>
+        <source>or a picture file</source>
+        <translation>or a picture file</translation>
+    </message>
+    <message>
+        <source>A&amp;bove the table</source>
+        <translation>A&amp;bove the table</translation>
+    </message>
+    <message>
+        <source>a picture file</source>
+        <translation>a picture file</translation>
+    </message>
+    <message>
+        <source>Left</source>
+        <translation>Left</translation>
+    </message>
+    <message>
+        <source>Centre</source>
+        <translation>Centre</translation>
+    </message>
+    <message>
+        <source>Right</source>
+        <translation>Right</translation>
+    </message>
+    <message>
+        <source>Text:</source>
+        <translation>Text:</translation>
+    </message>
+    <message>
+        <source>&amp;Picture:</source>
+        <translation>&amp;Picture:</translation>
+    </message>
+    <message>
+        <source>Picture of the watermark</source>
+        <translation>Picture of the watermark</translation>
+    </message>
+    <message>
+        <source>Opac&amp;ity:</source>
+        <translation>Opac&amp;ity:</translation>
+    </message>
+    <message>
+        <source>Lo&amp;go:</source>
+        <translation>Lo&amp;go:</translation>
+    </message>
+    <message>
+        <source>Picture of the logo</source>
+        <translation>Picture of the logo</translation>
+    </message>
+    <message>
+        <source>&amp;Slot:</source>
+        <translation>&amp;Slot:</translation>
+    </message>
+    <message>
+        <source>Choose: %1</source>
+        <translation>Choose: %1</translation>
+    </message>
+    <message>
+        <source>Choose a file</source>
+        <translation>Choose a file</translation>
+    </message>
+    <message>
+        <source>Pictures (*.png *.jpg *.jpeg *.bmp *.gif *.svg)</source>
+        <translation>Pictures (*.png *.jpg *.jpeg *.bmp *.gif *.svg)</translation>
+    </message>
+    <message>
+        <source>The table fits as it is.</source>
+        <translation>The table fits as it is.</translation>
+    </message>
+    <message>
+        <source>The table fits on turned paper.</source>
+        <translation>The table fits on turned paper.</translation>
+    </message>
+    <message>
+        <source>Shrunk to %1 % on turned paper.</source>
+        <translation>Shrunk to %1 % on turned paper.</translation>
+    </message>
+    <message>
+        <source>Shrunk to %1 %.</source>
+        <translation>Shrunk to %1 %.</translation>
+    </message>
+    <message>
+        <source>Too wide to be shrunk: printed in bands.</source>
+        <translation>Too wide to be shrunk: printed in bands.</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::PageFiles</name>
     <message>
         <source>PDF document</source>
@@ -615,6 +846,10 @@
         <translation>Pictures of the Pages</translation>
     </message>
     <message>
+        <source>Report Options</source>
+        <translation>Report Options</translation>
+    </message>
+    <message>
         <source>Keys</source>
         <translation>Keys</translation>
     </message>
@@ -640,6 +875,13 @@
     <message>
         <source>&amp;Replace</source>
         <translation>&amp;Replace</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::ReportTools</name>
+    <message>
+        <source>The file holds the pages without watermark, logo and icons; save them as PDF to keep those.</source>
+        <translation>The file holds the pages without watermark, logo and icons; save them as PDF to keep those.</translation>
     </message>
 </context>
 <context>

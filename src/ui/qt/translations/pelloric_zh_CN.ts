@@ -343,6 +343,237 @@
     </message>
 </context>
 <context>
+    <name>pelloric::qt::OptionsPanel</name>
+    <message>
+        <source>Report Options</source>
+        <translation>报表选项</translation>
+    </message>
+    <message>
+        <source>Look</source>
+        <translation>外观</translation>
+    </message>
+    <message>
+        <source>Cells &amp;as the view shows them</source>
+        <translation>单元格与视图一致(&amp;A)</translation>
+    </message>
+    <message>
+        <source>Width</source>
+        <translation>宽度</translation>
+    </message>
+    <message>
+        <source>As it is, in bands</source>
+        <translation>保持原宽，分栏打印</translation>
+    </message>
+    <message>
+        <source>Turn, then shrink</source>
+        <translation>先横向，再缩小</translation>
+    </message>
+    <message>
+        <source>Shrink to pages across</source>
+        <translation>缩小到指定页宽</translation>
+    </message>
+    <message>
+        <source>Across, then down</source>
+        <translation>先横后竖</translation>
+    </message>
+    <message>
+        <source>Down, then across</source>
+        <translation>先竖后横</translation>
+    </message>
+    <message>
+        <source>&amp;Fit:</source>
+        <translation>适应(&amp;F)：</translation>
+    </message>
+    <message>
+        <source>Pages a&amp;cross:</source>
+        <translation>横向页数(&amp;C)：</translation>
+    </message>
+    <message>
+        <source>&amp;Key columns:</source>
+        <translation>重复列数(&amp;K)：</translation>
+    </message>
+    <message>
+        <source>Page or&amp;der:</source>
+        <translation>页序(&amp;D)：</translation>
+    </message>
+    <message>
+        <source>Rows and Columns</source>
+        <translation>行和列</translation>
+    </message>
+    <message>
+        <source>All</source>
+        <translation>全部</translation>
+    </message>
+    <message>
+        <source>Selected in the view</source>
+        <translation>视图中选中的行</translation>
+    </message>
+    <message>
+        <source>Range</source>
+        <translation>范围</translation>
+    </message>
+    <message>
+        <source>all, or titles: Name, Price</source>
+        <translation>全部，或标题：名称, 价格</translation>
+    </message>
+    <message>
+        <source>&amp;Rows:</source>
+        <translation>行(&amp;R)：</translation>
+    </message>
+    <message>
+        <source>From:</source>
+        <translation>从(&amp;M)：</translation>
+    </message>
+    <message>
+        <source>&amp;To:</source>
+        <translation>到(&amp;T)：</translation>
+    </message>
+    <message>
+        <source>Co&amp;lumns:</source>
+        <translation>列(&amp;L)：</translation>
+    </message>
+    <message>
+        <source>Groups and Totals</source>
+        <translation>分组与合计</translation>
+    </message>
+    <message>
+        <source>titles: Country</source>
+        <translation>标题：国家</translation>
+    </message>
+    <message>
+        <source>K&amp;eep groups on a page</source>
+        <translation>同组行保持在一页(&amp;E)</translation>
+    </message>
+    <message>
+        <source>Sum</source>
+        <translation>合计</translation>
+    </message>
+    <message>
+        <source>Count</source>
+        <translation>计数</translation>
+    </message>
+    <message>
+        <source>Mean</source>
+        <translation>平均值</translation>
+    </message>
+    <message>
+        <source>Minimum</source>
+        <translation>最小值</translation>
+    </message>
+    <message>
+        <source>Maximum</source>
+        <translation>最大值</translation>
+    </message>
+    <message>
+        <source>titles: Price</source>
+        <translation>标题：价格</translation>
+    </message>
+    <message>
+        <source>Group b&amp;y:</source>
+        <translation>分组依据(&amp;Y)：</translation>
+    </message>
+    <message>
+        <source>T&amp;otal:</source>
+        <translation>汇总(&amp;O)：</translation>
+    </message>
+    <message>
+        <source>of col&amp;umns:</source>
+        <translation>汇总列(&amp;U)：</translation>
+    </message>
+    <message>
+        <source>Watermark and Logo</source>
+        <translation>水印与徽标</translation>
+    </message>
+    <message>
+        <source>a text, such as Draft</source>
+        <translation>文字，如“草稿”</translation>
+    </message>
+    <message>
+        <source>or a picture file</source>
+        <translation>或图片文件</translation>
+    </message>
+    <message>
+        <source>A&amp;bove the table</source>
+        <translation>置于表格之上(&amp;B)</translation>
+    </message>
+    <message>
+        <source>a picture file</source>
+        <translation>图片文件</translation>
+    </message>
+    <message>
+        <source>Left</source>
+        <translation>左</translation>
+    </message>
+    <message>
+        <source>Centre</source>
+        <translation>中</translation>
+    </message>
+    <message>
+        <source>Right</source>
+        <translation>右</translation>
+    </message>
+    <message>
+        <source>Text:</source>
+        <translation>文字(&amp;X)：</translation>
+    </message>
+    <message>
+        <source>&amp;Picture:</source>
+        <translation>图片(&amp;P)：</translation>
+    </message>
+    <message>
+        <source>Picture of the watermark</source>
+        <translation>水印图片</translation>
+    </message>
+    <message>
+        <source>Opac&amp;ity:</source>
+        <translation>不透明度(&amp;I)：</translation>
+    </message>
+    <message>
+        <source>Lo&amp;go:</source>
+        <translation>徽标(&amp;G)：</translation>
+    </message>
+    <message>
+        <source>Picture of the logo</source>
+        <translation>徽标图片</translation>
+    </message>
+    <message>
+        <source>&amp;Slot:</source>
+        <translation>位置(&amp;S)：</translation>
+    </message>
+    <message>
+        <source>Choose: %1</source>
+        <translation>选择：%1</translation>
+    </message>
+    <message>
+        <source>Choose a file</source>
+        <translation>选择文件</translation>
+    </message>
+    <message>
+        <source>Pictures (*.png *.jpg *.jpeg *.bmp *.gif *.svg)</source>
+        <translation>图片 (*.png *.jpg *.jpeg *.bmp *.gif *.svg)</translation>
+    </message>
+    <message>
+        <source>The table fits as it is.</source>
+        <translation>表格无需调整即可放下。</translation>
+    </message>
+    <message>
+        <source>The table fits on turned paper.</source>
+        <translation>表格在横向纸上可以放下。</translation>
+    </message>
+    <message>
+        <source>Shrunk to %1 % on turned paper.</source>
+        <translation>已在横向纸上缩小到 %1 %。</translation>
+    </message>
+    <message>
+        <source>Shrunk to %1 %.</source>
+        <translation>已缩小到 %1 %。</translation>
+    </message>
+    <message>
+        <source>Too wide to be shrunk: printed in bands.</source>
+        <translation>表格太宽，无法缩小：分栏打印。</translation>
+    </message>
+</context>
+<context>
     <name>pelloric::qt::PageFiles</name>
     <message>
         <source>PDF document</source>
@@ -615,6 +846,10 @@
         <translation>页面缩略图</translation>
     </message>
     <message>
+        <source>Report Options</source>
+        <translation>报表选项</translation>
+    </message>
+    <message>
         <source>Keys</source>
         <translation>快捷键</translation>
     </message>
@@ -640,6 +875,13 @@
     <message>
         <source>&amp;Replace</source>
         <translation>替换(&amp;R)</translation>
+    </message>
+</context>
+<context>
+    <name>pelloric::qt::ReportTools</name>
+    <message>
+        <source>The file holds the pages without watermark, logo and icons; save them as PDF to keep those.</source>
+        <translation>文件中的页面不含水印、徽标和图标；另存为 PDF 可保留它们。</translation>
     </message>
 </context>
 <context>

@@ -1,0 +1,98 @@
+// SPDX-FileCopyrightText: The Pelloric authors
+// SPDX-License-Identifier: MIT
+
+#include "ui/qt/report_tools.h"
+
+#include "controls/messages.h"
+#include "controls/qt/sorvane.h"
+#include "platform/run_time_error.h"
+#include "platform/services.h"
+#include "ui/qt/options_panel.h"
+
+#include <QApplication>
+#include <QMainWindow>
+#include <QStatusBar>
+
+namespace pelloric::qt {
+
+ReportTools::ReportTools(const Window& window)
+    : QObject(&window.window)
+    , parts_(window)
+    , panel_(new OptionsPanel(&window.window))
+{
+    parts_.window.addDockWidget(Qt::RightDockWidgetArea, panel_);
+    panel_->hide();
+    connect(panel_, &OptionsPanel::changed, this, &ReportTools::apply);
+}
+
+void ReportTools::setOptions(const ReportOptions& options)
+{
+    parts_.canvas.setReportOptions(options);
+    panel_->setOptions(options);
+}
+
+void ReportTools::togglePanel()
+{
+    panel_->setVisible(!panel_->isVisible());
+    if (panel_->isVisible())
+        panel_->enter();
+    else
+        parts_.canvas.setFocus();
+}
+
+bool ReportTools::escape()
+{
+    const QWidget* const focused = QApplication::focusWidget();
+    if (!panel_->isVisible() || focused == nullptr || !panel_->isAncestorOf(focused))
+        return false;
+    togglePanel();
+    return true;
+}
+
+/// An error of the build is told, and leaves the pages and their options as they were.
+void ReportTools::apply()
+{
+    if (parts_.isBusy())
+        return;
+    const ReportOptions earlier = parts_.canvas.reportOptions();
+    parts_.canvas.setReportOptions(panel_->options());
+    try {
+        parts_.rebuild();
+    } catch (const RunTimeError& error) {
+        parts_.canvas.setReportOptions(earlier);
+        if (error.number() != ErrorNumber::Cancelled)
+            parts_.messages.show(messageOf(error));
+    }
+}
+
+void ReportTools::viewChanged()
+{
+    const Canvas& canvas = parts_.canvas.canvas();
+    if (canvas.isBuilding() || documentNumber_ == canvas.documentNumber())
+        return;
+    documentNumber_ = canvas.documentNumber();
+    panel_->showFit(canvas.fit());
+    showStatus(fitText(canvas.fit()));
+}
+
+void ReportTools::documentSaved()
+{
+    if (parts_.canvas.canvas().document().hasReportPictures())
+        showStatus(tr("The file holds the pages without watermark, logo and icons; save them as "
+                      "PDF to keep those."));
+}
+
+/// There is no line as long as there is nothing to tell.
+void ReportTools::showStatus(const QString& text)
+{
+    auto* bar = parts_.window.findChild<QStatusBar*>(QString(), Qt::FindDirectChildrenOnly);
+    if (!bar && text.isEmpty())
+        return;
+    bar = parts_.window.statusBar();
+    bar->setObjectName(QStringLiteral("ReportStatus"));
+    bar->setSizeGripEnabled(false);
+    bar->showMessage(text);
+    bar->setVisible(!text.isEmpty());
+}
+
+} // namespace pelloric::qt
