@@ -271,7 +271,9 @@ void DemoWindow::addPage(const Page& page, QAbstractItemView* view)
     parts->setStretchFactor(1, CodeShare);
     layout->addWidget(parts, 1);
     connect(button, &QPushButton::clicked, this, [this, preview = page.preview] {
-        facade_->setReportOptions({ .asShown = asShown_->isChecked() });
+        ReportOptions options;
+        options.asShown = asShown_->isChecked();
+        facade_->setReportOptions(options);
         preview();
     });
     pages_->addTab(holder, page.title);

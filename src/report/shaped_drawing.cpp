@@ -27,6 +27,8 @@ void ShapedLayout::printRows()
     for (std::size_t at = 0; at < page_.size() && source_.looks != nullptr; ++at)
         fillBackgrounds(at);
     usePen(gridPen_);
+    if (drawsHor_ && !page_.empty() && hasBackground(page_.front()))
+        drawLine({ tableLeft_, top_ }, { tableRight_, top_ }); // half of it was filled over
     for (std::size_t at = 0; at < page_.size(); ++at) {
         usePen(gridPen_);
         drawRowLines(at);
@@ -49,16 +51,10 @@ void ShapedLayout::fillBackgrounds(std::size_t at)
     const ShapedRow& row = page_[at];
     if (row.looks.empty())
         return;
-    const auto colorOf = [&](const BandColumn& column) {
-        const CellLook* look = lookOf(row, column.field);
-        if (const BoxContent* const box = boxOf(look))
-            look = &box->look;
-        return look->background;
-    };
     for (std::size_t first = 0; first < columns_.size();) {
-        const auto color = colorOf(columns_[first]);
+        const auto color = backgroundOf(row, columns_[first]);
         std::size_t end = first + 1;
-        while (end < columns_.size() && colorOf(columns_[end]) == color)
+        while (end < columns_.size() && backgroundOf(row, columns_[end]) == color)
             ++end;
         const double right = end < columns_.size() ? columns_[end].left : tableRight_;
         if (color)
@@ -67,6 +63,23 @@ void ShapedLayout::fillBackgrounds(std::size_t at)
                 *color);
         first = end;
     }
+}
+
+bool ShapedLayout::hasBackground(const ShapedRow& row) const
+{
+    return std::any_of(columns_.begin(), columns_.end(),
+        [&](const BandColumn& column) { return backgroundOf(row, column).has_value(); });
+}
+
+std::optional<Color> ShapedLayout::backgroundOf(
+    const ShapedRow& row, const BandColumn& column) const
+{
+    const CellLook* look = lookOf(row, column.field);
+    if (look == nullptr)
+        return std::nullopt;
+    if (const BoxContent* const box = boxOf(look))
+        look = &box->look;
+    return look->background;
 }
 
 void ShapedLayout::drawRowLines(std::size_t at)

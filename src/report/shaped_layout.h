@@ -100,6 +100,8 @@ private:
     void fillBox(const Area& area, Color color);
 
     const CellLook* lookOf(const ShapedRow& row, int field) const;
+    std::optional<Color> backgroundOf(const ShapedRow& row, const BandColumn& column) const;
+    bool hasBackground(const ShapedRow& row) const;
     const BoxContent* boxOf(const CellLook* look) const;
     bool isSameBox(const ShapedRow& row, int field, const ShapedRow& other, int otherField) const;
     bool isBlanked(std::size_t at, int field) const;

@@ -332,6 +332,26 @@ TEST_F(ShapedReportTest, PrintsCellsAsTheirViewShowsThem)
     EXPECT_EQ(box.pt2.x, left + 3000);
 }
 
+TEST_F(ShapedReportTest, DrawsTheLineAboveAColouredRowOverItsColour)
+{
+    ShownGrid grid(gridOf(columnsOf(1, 3000), { { u"coloured" } }));
+    grid.look(1, 0).background = rgb(0, 255, 0);
+    canvas.options.asShown = true;
+    canvas.doPreview(grid);
+    const PageDocument& document = canvas.document();
+    std::optional<Lineobj> box;
+    bool isLineOverIt = false;
+    for (std::size_t at = 0; at < document.lines(0).size(); ++at) {
+        const Lineobj line = document.line(0, at);
+        if (line.FillStyle == SolidFill)
+            box = line;
+        else if (box && line.pt1.y == box->pt1.y && line.pt2.y == box->pt1.y)
+            isLineOverIt = line.pt1.x == box->pt1.x && line.pt2.x == box->pt2.x;
+    }
+    ASSERT_TRUE(box.has_value());
+    EXPECT_TRUE(isLineOverIt);
+}
+
 TEST_F(ShapedReportTest, DrawsCheckBoxesInPlaceOfTheirCharacters)
 {
     ShownGrid grid(gridOf(columnsOf(1, 3000), { { u"☑ done" }, { u"☐" }, { u"☑ text" } }));

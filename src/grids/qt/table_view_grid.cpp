@@ -181,7 +181,10 @@ void TableViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& lo
 
 TextView TableViewGrid::text(std::int32_t row, std::int32_t column)
 {
-    return hasCell(row, column) ? cell(row, columns_.logical(column)) : TextView();
+    if (!hasCell(row, column))
+        return {};
+    const QTableView& table = view();
+    return text(table, table.rootIndex(), { rows_.logical(row - 1), columns_.logical(column) });
 }
 
 CellAlignment TableViewGrid::titleAlignment(std::int32_t column)
