@@ -271,9 +271,7 @@ void DemoWindow::addPage(const Page& page, QAbstractItemView* view)
     parts->setStretchFactor(1, CodeShare);
     layout->addWidget(parts, 1);
     connect(button, &QPushButton::clicked, this, [this, preview = page.preview] {
-        ReportOptions options;
-        options.asShown = asShown_->isChecked();
-        facade_->setReportOptions(options);
+        facade_->setReportOptions({ .asShown = asShown_->isChecked() });
         preview();
     });
     pages_->addTab(holder, page.title);

@@ -56,7 +56,7 @@ enum class AggregateFunction : std::uint8_t { Sum, Count, Mean, Minimum, Maximum
 
 /// A total of one column: it stands in that column, behind every group and at the end.
 struct Aggregation {
-    std::u16string column; ///< its title
+    std::u16string column {}; ///< its title
     AggregateFunction function = AggregateFunction::Sum;
 
     bool operator==(const Aggregation&) const = default;
@@ -64,8 +64,8 @@ struct Aggregation {
 
 /// A text or a picture on every page, centred on the paper.
 struct Watermark {
-    std::u16string text; ///< stands across the page, from the lower left to the upper right
-    std::u16string imageFile; ///< counts where there is no text
+    std::u16string text {}; ///< stands across the page, from the lower left to the upper right
+    std::u16string imageFile {}; ///< counts where there is no text
     double opacity = 0.15; ///< 0 to 1
     bool isAbove = false; ///< above what is printed; else behind it
 
@@ -75,10 +75,10 @@ struct Watermark {
 
 /// A picture in a slot of the page header, at the top margin; the header's texts stand below it.
 struct Logo {
-    std::u16string imageFile; ///< empty: no logo
+    std::u16string imageFile {}; ///< empty: no logo
     int slot = 0; ///< 0 left, 1 centre, any other right
-    std::int32_t height
-        = 567; ///< twips, a centimetre at first; the width follows; less where that needs more room
+    /// Twips, a centimetre at first. The width follows; less where that needs more room.
+    std::int32_t height = 567;
 
     bool operator==(const Logo&) const = default;
 };
@@ -90,24 +90,24 @@ using RowFilter = std::function<bool(std::int64_t row, std::span<const std::u16s
 /// the plain one.
 struct ReportOptions {
     bool asShown = false; ///< cells look as the view shows them, where the grid is a view
-    FitOptions fit;
+    FitOptions fit {};
     int keyColumns = 0; ///< so many columns from the left stand at the left of every band
-    std::vector<std::u16string> keyColumnNames; ///< or these
-    std::vector<std::u16string>
-        columns; ///< the titles of those to print, in order; empty: all as they stand
+    std::vector<std::u16string> keyColumnNames {}; ///< or these
+    /// The titles of the columns to print, in order. Empty: all as they stand.
+    std::vector<std::u16string> columns {};
     RowChoice rows = RowChoice::All;
     std::int64_t firstRow = 1; ///< of a range, from 1
     std::int64_t lastRow = 0; ///< of a range
-    RowFilter filter; ///< empty: every row that is chosen
-    std::u16string
-        whereColumn; ///< not empty: only rows that hold `whereText` in the column of this title
-    std::u16string whereText;
+    RowFilter filter {}; ///< empty: every row that is chosen
+    /// Not empty: only rows that hold `whereText` in the column of this title.
+    std::u16string whereColumn {};
+    std::u16string whereText {};
     PageOrder pageOrder = PageOrder::AcrossThenDown;
-    std::vector<std::u16string> groupColumns; ///< rows with equal texts in these make a group
+    std::vector<std::u16string> groupColumns {}; ///< rows with equal texts in these make a group
     bool keepsGroups = false; ///< a group stays on a page where one can hold it
-    std::vector<Aggregation> totals;
-    Watermark watermark;
-    Logo logo;
+    std::vector<Aggregation> totals {};
+    Watermark watermark {};
+    Logo logo {};
 
     /// Whether rows or columns are left out or moved.
     bool choosesCells() const

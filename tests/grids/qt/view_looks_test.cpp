@@ -38,7 +38,7 @@ protected:
 CellLook lookOf(AutomationObject& grid, std::int32_t row, std::int32_t column)
 {
     CellLook look;
-    grid.looks()->readLook(row, column, look);
+    grid.cellLooks()->readLook(row, column, look);
     return look;
 }
 
