@@ -167,11 +167,7 @@ protected:
     /// A page as it reaches the spooler, on paper that can be printed on up to its edges.
     QImage paperPicture()
     {
-        EXPECT_TRUE(cups.addPrinter(QStringLiteral("Edges"),
-            { { "*ImageableArea A4/A4: \"18 24 575 812\"",
-                "*ImageableArea A4/A4: \"0 0 595 842\"" } }));
-        EXPECT_TRUE(cups.command(
-            QStringLiteral("lpadmin"), { QStringLiteral("-d"), QStringLiteral("Edges") }));
+        useEdgeToEdgePrinter();
         Platform services = platform.record();
         Canvas canvas(services);
         canvas.clear();

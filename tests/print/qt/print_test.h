@@ -28,6 +28,16 @@ protected:
             QStringLiteral("lpadmin"), { QStringLiteral("-d"), QStringLiteral("T1") }));
     }
 
+    /// Makes a printer the default one that prints up to the edges of A4.
+    void useEdgeToEdgePrinter()
+    {
+        const QString name = QStringLiteral("Edges");
+        ASSERT_TRUE(cups.addPrinter(name,
+            { { "*ImageableArea A4/A4: \"18 24 575 812\"",
+                "*ImageableArea A4/A4: \"0 0 595 842\"" } }));
+        ASSERT_TRUE(cups.command(QStringLiteral("lpadmin"), { QStringLiteral("-d"), name }));
+    }
+
     PrivateCups cups;
     QtPlatform platform;
     QtPrinting printing { platform };

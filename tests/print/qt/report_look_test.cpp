@@ -140,6 +140,7 @@ TEST_F(ReportLook, IsThatOfThePictureInFiles)
 
 TEST_F(ReportLook, IsThatOfThePictureOnPaper)
 {
+    useEdgeToEdgePrinter();
     const PrintJob job { .pageWidth = setup().myWidth, .pageHeight = setup().myHeight };
     doPrint(document(), job, Font {}, platform.record().printer);
     ASSERT_EQ(cups.jobs().size(), 1U);
