@@ -87,7 +87,7 @@
         <translation>Bericht</translation>
     </message>
     <message>
-        <source>Column &amp;titles</source>
+        <source>Colum&amp;n titles</source>
         <translation>Spalten&amp;titel</translation>
     </message>
     <message>

@@ -87,8 +87,8 @@
         <translation>Report</translation>
     </message>
     <message>
-        <source>Column &amp;titles</source>
-        <translation>Column &amp;titles</translation>
+        <source>Colum&amp;n titles</source>
+        <translation>Colum&amp;n titles</translation>
     </message>
     <message>
         <source>&amp;Merge equal cells</source>

@@ -87,7 +87,7 @@
         <translation>报表</translation>
     </message>
     <message>
-        <source>Column &amp;titles</source>
+        <source>Colum&amp;n titles</source>
         <translation>列标题(&amp;T)</translation>
     </message>
     <message>

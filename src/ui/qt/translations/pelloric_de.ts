@@ -422,7 +422,7 @@
     </message>
     <message>
         <source>From:</source>
-        <translation>&amp;Von:</translation>
+        <translation>Von:</translation>
     </message>
     <message>
         <source>&amp;To:</source>

@@ -422,7 +422,7 @@
     </message>
     <message>
         <source>From:</source>
-        <translation>从(&amp;M)：</translation>
+        <translation>从：</translation>
     </message>
     <message>
         <source>&amp;To:</source>
@@ -514,7 +514,7 @@
     </message>
     <message>
         <source>Text:</source>
-        <translation>文字(&amp;X)：</translation>
+        <translation>文字：</translation>
     </message>
     <message>
         <source>&amp;Picture:</source>
