@@ -215,7 +215,7 @@ QWidget* DemoWindow::makeReportBox()
     // A host places the control where it likes; it previews just as well when it is not shown.
     facade_->setParent(box);
     facade_->hide();
-    showHeader_ = new QCheckBox(tr("Colum&n titles"));
+    showHeader_ = new QCheckBox(tr("Col&umn titles"));
     showHeader_->setObjectName(QStringLiteral("ShowHeader"));
     mergeGrid_ = new QCheckBox(tr("&Merge equal cells"));
     mergeGrid_->setObjectName(QStringLiteral("MergeGrid"));

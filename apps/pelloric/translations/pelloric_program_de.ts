@@ -87,7 +87,7 @@
         <translation>Bericht</translation>
     </message>
     <message>
-        <source>Colum&amp;n titles</source>
+        <source>Col&amp;umn titles</source>
         <translation>Spalten&amp;titel</translation>
     </message>
     <message>

@@ -87,8 +87,8 @@
         <translation>Report</translation>
     </message>
     <message>
-        <source>Colum&amp;n titles</source>
-        <translation>Colum&amp;n titles</translation>
+        <source>Col&amp;umn titles</source>
+        <translation>Col&amp;umn titles</translation>
     </message>
     <message>
         <source>&amp;Merge equal cells</source>

@@ -87,7 +87,7 @@
         <translation>报表</translation>
     </message>
     <message>
-        <source>Colum&amp;n titles</source>
+        <source>Col&amp;umn titles</source>
         <translation>列标题(&amp;T)</translation>
     </message>
     <message>
