@@ -8,6 +8,7 @@
 #include "platform/row_set.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
+#include "report/page_frame.h"
 #include "report/page_limit.h"
 #include "report/report_style.h"
 
@@ -18,20 +19,6 @@ namespace pelloric {
 namespace {
 
 constexpr Twips Padding = CellPadding / 2; ///< above, below and left of a cell's text
-constexpr Twips LineGap = 144; ///< between header line and titles, and above the footer
-
-/// A position further down, checked for 32 bits.
-Twips below(Twips y, double distance) { return roundToInt32(static_cast<double>(y) + distance); }
-
-LinePen gridPen(const ReportStyle& style)
-{
-    return { .LineColor = style.GridLineColor, .FillColor = style.HeaderColor };
-}
-
-bool hasText(const SlotTexts& slots)
-{
-    return std::any_of(slots.begin(), slots.end(), [](const Text& text) { return !text.empty(); });
-}
 
 } // namespace
 

@@ -4,6 +4,7 @@
 // What is drawn of the rows of a page; what they are is decided in shaped_layout.cpp.
 
 #include "platform/numbers.h"
+#include "report/page_frame.h"
 #include "report/report_style.h"
 #include "report/shaped_layout.h"
 
@@ -14,8 +15,6 @@ namespace pelloric {
 namespace {
 
 constexpr double Trace = 1e-6; ///< rounding leaves of a line's height
-
-Twips below(Twips y, double distance) { return roundToInt32(static_cast<double>(y) + distance); }
 
 } // namespace
 

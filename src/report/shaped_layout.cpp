@@ -8,6 +8,7 @@
 #include "platform/row_set.h"
 #include "platform/services.h"
 #include "report/chosen_rows.h"
+#include "report/page_frame.h"
 #include "report/report_style.h"
 #include "report/shown_text.h"
 
@@ -18,14 +19,6 @@ namespace pelloric {
 namespace {
 
 constexpr double Padding = CellPadding / 2.0; ///< above, below and left of a cell's text
-constexpr Twips LineGap = 144; ///< between header line and titles, and above the footer
-
-Twips below(Twips y, double distance) { return roundToInt32(static_cast<double>(y) + distance); }
-
-bool hasText(const SlotTexts& slots)
-{
-    return std::any_of(slots.begin(), slots.end(), [](const Text& text) { return !text.empty(); });
-}
 
 } // namespace
 
@@ -81,7 +74,7 @@ void ShapedLayout::resolve()
 void ShapedLayout::resolveLines()
 {
     const ReportStyle& style = source_.style;
-    gridPen_ = { .LineColor = style.GridLineColor, .FillColor = style.HeaderColor };
+    gridPen_ = gridPen(style);
     drawsHor_ = style.GridHor;
     drawsVer_ = style.GridVer;
     if (source_.looks == nullptr)
