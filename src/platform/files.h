@@ -15,6 +15,9 @@ namespace pelloric {
 /// Why a file could not be opened or written.
 enum class FileFault { None, Exists, NoRights, DiskFull, Other };
 
+/// The reason behind an error number of the system.
+FileFault faultOf(int error);
+
 /// A file that is open for writing; closed when it goes.
 class OpenFile {
 public:

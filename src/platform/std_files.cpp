@@ -14,23 +14,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-FileFault faultOf(int error)
-{
-    switch (error) {
-    case EEXIST:
-        return FileFault::Exists;
-    case EACCES:
-    case EPERM:
-    case EROFS:
-        return FileFault::NoRights;
-    case ENOSPC:
-    case EFBIG:
-        return FileFault::DiskFull;
-    default:
-        return FileFault::Other;
-    }
-}
-
 struct CloseFile {
     void operator()(std::FILE* file) const { std::fclose(file); }
 };

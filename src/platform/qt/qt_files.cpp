@@ -26,26 +26,6 @@ namespace fs = std::filesystem;
 constexpr auto LongestLockWait = std::chrono::seconds(5);
 constexpr auto LockPause = std::chrono::milliseconds(5);
 
-FileFault faultOf(int error)
-{
-    switch (error) {
-    case EEXIST:
-        return FileFault::Exists;
-    case EACCES:
-    case EPERM:
-    case EROFS:
-        return FileFault::NoRights;
-    case ENOSPC:
-    case EFBIG:
-#ifdef EDQUOT
-    case EDQUOT:
-#endif
-        return FileFault::DiskFull;
-    default:
-        return FileFault::Other;
-    }
-}
-
 OpenedFile opened(std::unique_ptr<QFile> file, bool isOpen)
 {
     if (!isOpen)
