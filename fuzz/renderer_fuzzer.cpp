@@ -7,6 +7,7 @@
 #include "fuzz_platform.h"
 
 #include "document/text_search.h"
+#include "platform/drawing_state.h"
 #include "platform/run_time_error.h"
 #include "view/joined_lines.h"
 #include "view/missing_glyphs.h"
@@ -18,25 +19,14 @@ using namespace pelloric;
 namespace {
 
 /// Counts what is drawn; texts have no line ends and sizes are numbers.
-class CountingSurface final : public DrawingSurface {
+class CountingSurface final : public StatefulSurface {
 public:
     std::size_t lines = 0;
     std::size_t texts = 0;
     bool hasPageCount = false;
 
     void clear() override { }
-    void setFontName(TextView) override { }
     void setFontSize(float size) override { fuzz::require(size == size); }
-    void setFontBold(bool) override { }
-    void setFontItalic(bool) override { }
-    void setFontTransparent(bool) override { }
-    void setForeColor(Color) override { }
-    void setDrawWidth(std::int16_t) override { }
-    void setDrawStyle(std::int16_t) override { }
-    void setFillStyle(std::int16_t) override { }
-    void setFillColor(Color) override { }
-    void setCurrentX(Twips) override { }
-    void setCurrentY(Twips) override { }
     void line(Tpoint, Tpoint) override { ++lines; }
     void box(Tpoint, Tpoint, Color) override { ++lines; }
     void print(TextView text) override

@@ -3,6 +3,8 @@
 
 #include "view/joined_lines.h"
 
+#include "platform/drawing_state.h"
+
 #include <gtest/gtest.h>
 
 #include <vector>
@@ -12,31 +14,18 @@ namespace pelloric {
 namespace {
 
 /// Notes lines with their pens, and when a text is printed.
-class LineNotes final : public DrawingSurface {
+class LineNotes final : public StatefulSurface {
 public:
     std::vector<std::string> notes;
 
     void clear() override { }
-    void setFontName(TextView) override { }
-    void setFontSize(float) override { }
-    void setFontBold(bool) override { }
-    void setFontItalic(bool) override { }
-    void setFontTransparent(bool) override { }
-    void setForeColor(Color color) override { color_ = color; }
-    void setDrawWidth(std::int16_t) override { }
-    void setDrawStyle(std::int16_t) override { }
-    void setFillStyle(std::int16_t) override { }
-    void setFillColor(Color) override { }
-    void setCurrentX(Twips) override { }
-    void setCurrentY(Twips) override { }
-
     void line(Tpoint from, Tpoint to) override
     {
-        notes.push_back(point(from) + " " + point(to) + " " + std::to_string(color_));
+        notes.push_back(point(from) + " " + point(to) + " " + std::to_string(state_.foreColor));
     }
 
     void box(Tpoint, Tpoint, Color) override { notes.emplace_back("box"); }
-    void print(TextView) override { notes.push_back("text " + std::to_string(color_)); }
+    void print(TextView) override { notes.push_back("text " + std::to_string(state_.foreColor)); }
     void picture(TextView, Tpoint, Tpoint) override { }
 
 private:
@@ -44,8 +33,6 @@ private:
     {
         return std::to_string(point.x) + "," + std::to_string(point.y);
     }
-
-    Color color_ = 0;
 };
 
 using Notes = std::vector<std::string>;
