@@ -7,63 +7,22 @@
 # The program's state log tells what came of each step; screenshots stay in the folder.
 
 set -euo pipefail
+Tests=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
+# shellcheck source=tests/e2e/window_server.sh
+. "$Tests/e2e/window_server.sh"
 
 Program=$1
 Folder=$2
 Log=$Folder/state.log
-Patience=200 # looks at the log, 50 ms apart, before a step has failed
 
-fail() {
-    printf 'preview_e2e: %s\n' "$1" >&2
-    [ ! -f "$Log" ] || tail -n 3 "$Log" >&2
-    exit 1
-}
-
-# needTool PROGRAM PACKAGE
-needTool() {
-    command -v "$1" > /dev/null 2>&1 || fail "$1 is missing; install the Debian package $2"
-}
-
-needTool Xvfb xvfb
-needTool openbox openbox
-needTool xdotool xdotool
-needTool import imagemagick
 needTool lpadmin cups-client
-
-rm -rf "$Folder"
-mkdir -p "$Folder/config"
-mkdir -m 700 "$Folder/run"
-Processes=()
-
-# Only what this script started is ended, by its number.
-finish() {
-    local process
-    for process in "${Processes[@]}"; do
-        kill "$process" 2> /dev/null || true
-    done
-    wait 2> /dev/null || true
-    [ -z "${Cups:-}" ] || rm -rf "$Cups"
-}
-trap finish EXIT
-
-Xvfb -displayfd 3 -screen 0 1400x1000x24 -nolisten tcp 3> "$Folder/display" 2> "$Folder/server.log" &
-Processes+=($!)
-for ((look = 0; look < Patience; look++)); do
-    [ ! -s "$Folder/display" ] || break
-    sleep 0.05
-done
-[ -s "$Folder/display" ] || fail "the window server did not start"
-DISPLAY=:$(cat "$Folder/display")
-export DISPLAY
-export XDG_RUNTIME_DIR=$Folder/run XDG_CONFIG_HOME=$Folder/config QT_QPA_PLATFORM=xcb LC_ALL=C.UTF-8
-unset QT_SCALE_FACTOR QT_FONT_DPI WAYLAND_DISPLAY
-
-openbox --sm-disable > "$Folder/openbox.log" 2>&1 &
-Processes+=($!)
+startDisplay "$Folder"
+mkdir "$Folder/config"
+export XDG_CONFIG_HOME=$Folder/config
 
 # A print scheduler of its own, with one queue that keeps its jobs.
-Tests=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
 Cups=$(mktemp -d)
+trap 'finish; rm -rf "$Cups"' EXIT
 "$Tests/support/private_cups.sh" "$Cups" > "$Folder/cups.log" 2>&1 &
 Processes+=($!)
 export CUPS_SERVER=$Cups/cups.sock
@@ -89,7 +48,7 @@ waitFor() {
         kill -0 "$Demo" 2> /dev/null || fail "the program has ended; waited for: $1"
         sleep 0.05
     done
-    fail "waited for: $1"
+    fail "waited for: $1; the last states are: $(tail -n 3 "$Log" 2> /dev/null)"
 }
 
 # valueOf NAME: a value of the last state.
@@ -99,9 +58,7 @@ valueOf() {
 
 # toWindow TITLE: waits for the window and makes it the active one.
 toWindow() {
-    Window=$(timeout 20 xdotool search --all --sync --onlyvisible --pid "$Demo" --name "$1" | head -n 1) ||
-        fail "no window named $1"
-    timeout 10 xdotool windowactivate --sync "$Window" || fail "the window $1 does not come up"
+    toWindowOf "$Demo" "$1"
 }
 
 # pointAt NAME NUMBER: the pointer over a control of the preview window.
@@ -127,13 +84,8 @@ clickTool() {
 
 # needEnd: until the program has ended, with nothing to say.
 needEnd() {
-    local look
-    for ((look = 0; look < Patience; look++)); do
-        kill -0 "$Demo" 2> /dev/null || break
-        sleep 0.05
-    done
-    ! kill -0 "$Demo" 2> /dev/null || fail "the program does not end"
-    wait "$Demo" || fail "the program ended with status $?"
+    waitForEnd "$Demo"
+    [ "$Status" -eq 0 ] || fail "the program ended with status $Status"
     [ ! -s "$Folder/program.log" ] || fail "the program said: $(head -n 1 "$Folder/program.log")"
 }
 
