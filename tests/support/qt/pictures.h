@@ -41,12 +41,13 @@ inline QImage paperPicture(const QString& document, const QString& folder, int p
 inline int shadeAt(const QImage& image, int x, int y) { return image.constScanLine(y)[x]; }
 
 /// The smallest rectangle that holds all ink.
-inline QRect inkOf(const QImage& image)
+/// @param lightest  lighter than this is paper
+inline QRect inkOf(const QImage& image, int lightest = InkShade)
 {
     QRect ink;
     for (int y = 0; y < image.height(); ++y) {
         for (int x = 0; x < image.width(); ++x) {
-            if (shadeAt(image, x, y) < InkShade)
+            if (shadeAt(image, x, y) < lightest)
                 ink |= QRect(x, y, 1, 1);
         }
     }
