@@ -9,6 +9,7 @@
 #include "platform/automation_object.h"
 #include "platform/file_bytes.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
 #include "platform/safe_file.h"
@@ -159,7 +160,7 @@ void Canvas::ReDrawZoom(AutomationObject& grid)
     if (isBusy())
         return;
     if (!table_)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"no report was built yet");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"no report was built yet"));
     build(grid, false, { page, style_ });
 }
 
@@ -272,7 +273,7 @@ void Canvas::scaleReport(double factor)
     if (isBusy())
         return;
     if (!table_)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"no report was built yet");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"no report was built yet"));
     ColoredFont body = style_.body;
     body.font.size = static_cast<float>(static_cast<double>(body.font.size) * factor);
     recorder_.setTextFont(body.font, roundToInt32(body.color));

@@ -8,6 +8,7 @@
 #include "document/page_document.h"
 #include "platform/file_bytes.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "platform/text_codec.h"
 
@@ -218,8 +219,8 @@ OstlResult readNamed(const TextCodec& codec, std::istream& stream, PageDocument&
         return readOstl(codec, stream, document, setup);
     } catch (const RunTimeError& error) {
         throw RunTimeError(error.number(),
-            pathText(path) + u" is damaged: " + Text(error.detail())
-                + u"; what stands before it was read");
+            phrase(u"%1 is damaged: %2; what stands before it was read",
+                { pathText(path), error.detail() }));
     }
 }
 

@@ -4,6 +4,7 @@
 #include "document/page_document.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -33,15 +34,16 @@ namespace {
 /// @param page  from 0
 RunTimeError noSuchPage(int page, int count)
 {
-    return RunTimeError(
-        ErrorNumber::SubscriptOutOfRange, noSuchItem(u"page", std::int64_t { page } + 1, count));
+    return RunTimeError(ErrorNumber::SubscriptOutOfRange,
+        noSuchItem(phrase(u"page"), std::int64_t { page } + 1, count));
 }
 
+/// @param what   the phrase of the record with its page, counted from 1
 /// @param page   from 0
 /// @param index  from 0
 RunTimeError noSuchRecord(TextView what, std::size_t index, std::size_t count, int page)
 {
-    const Text place = u"on page " + decimal(std::int64_t { page } + 1) + u" " + Text(what);
+    const Text place = phrase(what, { decimal(std::int64_t { page } + 1) });
     return RunTimeError(ErrorNumber::SubscriptOutOfRange,
         noSuchItem(place, static_cast<std::int64_t>(index) + 1, static_cast<std::int64_t>(count)));
 }
@@ -63,7 +65,7 @@ PageDocument::PageDocument()
 void PageDocument::newPage()
 {
     if (Totalpages == std::numeric_limits<std::int16_t>::max())
-        throw RunTimeError(ErrorNumber::Overflow, u"a document holds at most 32767 pages");
+        throw RunTimeError(ErrorNumber::Overflow, phrase(u"a document holds at most 32767 pages"));
     Totalpages = narrowToInt16(std::int64_t { Totalpages } + 1);
     Page next;
     if (!pages_.empty()) {
@@ -93,7 +95,7 @@ Lineobj PageDocument::line(int page, std::size_t index) const
 {
     const auto records = lines(page);
     if (index >= records.size())
-        throw noSuchRecord(u"line", index, records.size(), page);
+        throw noSuchRecord(phraseText(u"on page %1 line"), index, records.size(), page);
     const LineRecord record = records[index];
     const LinePen& lines = pen(record.pen);
     return { record.pt1, record.pt2, lines.LineStyle, lines.LineColor, lines.LineWidth,
@@ -104,7 +106,7 @@ Textobj PageDocument::text(int page, std::size_t index) const
 {
     const auto records = texts(page);
     if (index >= records.size())
-        throw noSuchRecord(u"text", index, records.size(), page);
+        throw noSuchRecord(phraseText(u"on page %1 text"), index, records.size(), page);
     const TextRecord record = records[index];
     const TextStyle& look = style(record.style);
     return { record.pt, Text(record.text()), look.font, look.color };

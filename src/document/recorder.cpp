@@ -5,6 +5,7 @@
 
 #include "platform/drawing_surface.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/row_set.h"
 #include "platform/run_time_error.h"
 #include "platform/text_runs.h"
@@ -31,8 +32,8 @@ Twips lineHeightOf(FaceMetrics& face, const Font& font)
         return pelloric::textHeight(face, font.size);
     } catch (const RunTimeError& error) {
         throw RunTimeError(error.number(),
-            u"a font of " + formatSingle(font.size)
-                + u" points is too large to be measured; choose a smaller size");
+            phrase(u"a font of %1 points is too large to be measured; choose a smaller size",
+                { formatSingle(font.size) }));
     }
 }
 
@@ -224,8 +225,8 @@ double Recorder::rowTextHeight(
 void Recorder::record(TextView stored)
 {
     if (stored.size() > 0xFFFFFFFFU)
-        throw RunTimeError(
-            ErrorNumber::Overflow, u"a text of more than 4294967295 characters cannot be recorded");
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"a text of more than 4294967295 characters cannot be recorded"));
     applyTextFont();
     document_.append(TextRecord {
         point_, stored.data(), static_cast<std::uint32_t>(stored.size()), styleNumber_ });

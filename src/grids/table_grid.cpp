@@ -5,6 +5,7 @@
 
 #include "platform/member_names.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -59,14 +60,14 @@ void TableGrid::addRow(std::span<const TextView> cells, std::span<const std::uin
 {
     if (cells.size() > columns_.size())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            u"a row of " + decimal(static_cast<std::int64_t>(cells.size())) + u" cells; there are "
-                + decimal(columnCount()) + u" columns");
+            phrase(u"a row of %1 cells; there are %2 columns",
+                { decimal(static_cast<std::int64_t>(cells.size())), decimal(columnCount()) }));
     std::uint64_t length = 0;
     for (const TextView cell : cells)
         length += cell.size();
     if (length > std::numeric_limits<std::uint32_t>::max())
         throw RunTimeError(ErrorNumber::Overflow,
-            u"row " + decimal(rowCount() + 1) + u" holds more than 4294967295 characters");
+            phrase(u"row %1 holds more than 4294967295 characters", { decimal(rowCount() + 1) }));
 
     char16_t* const texts = store_->room(length);
     rowStarts_.push_back(texts);
@@ -109,7 +110,7 @@ const TableColumn& TableGrid::column(int column) const
 {
     if (column < 0 || column >= columnCount())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"column", std::int64_t { column } + 1, columnCount()));
+            noSuchItem(phrase(u"column"), std::int64_t { column } + 1, columnCount()));
     return columns_[static_cast<std::size_t>(column)];
 }
 
@@ -117,10 +118,10 @@ TextView TableGrid::cell(std::int64_t row, int column) const
 {
     if (row < 0 || row >= rowCount())
         throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", row + 1, rowCount()));
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), row + 1, rowCount()));
     if (column < 0 || column >= columnCount())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"column", std::int64_t { column } + 1, columnCount()));
+            noSuchItem(phrase(u"column"), std::int64_t { column } + 1, columnCount()));
     const auto at = static_cast<std::size_t>(row);
     const std::size_t first = at * columns_.size();
     const std::size_t cell = first + static_cast<std::size_t>(column);
@@ -131,7 +132,8 @@ TextView TableGrid::cell(std::int64_t row, int column) const
 void TableGrid::rowTexts(std::int32_t row, std::span<TextView> into) const
 {
     if (row < 1 || row > rowCount())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", row, rowCount()));
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), row, rowCount()));
     const auto at = static_cast<std::size_t>(row - 1);
     const std::uint32_t* end = cellEnds_.data() + at * columns_.size();
     std::uint32_t begin = 0;

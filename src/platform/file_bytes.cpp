@@ -3,6 +3,7 @@
 
 #include "platform/file_bytes.h"
 
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <array>
@@ -26,8 +27,8 @@ std::string readFileBytes(const std::filesystem::path& path, std::size_t most)
         bytes.append(chunk.data(), static_cast<std::size_t>(stream.gcount()));
         if (bytes.size() > most)
             throw RunTimeError(ErrorNumber::Overflow,
-                pathText(path) + u" holds more than " + decimal(static_cast<std::int64_t>(most))
-                    + u" bytes");
+                phrase(u"%1 holds more than %2 bytes",
+                    { pathText(path), decimal(static_cast<std::int64_t>(most)) }));
     }
     if (!stream.is_open() || stream.bad())
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(path));

@@ -4,6 +4,7 @@
 #include "platform/member_names.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 namespace pelloric {
@@ -20,11 +21,11 @@ std::optional<MemberId> findMemberName(std::span<const TextView> names, TextView
 int indexArgument(std::span<const Value> arguments, std::size_t position, int first, int last)
 {
     if (position >= arguments.size())
-        throw RunTimeError(ErrorNumber::NoSuchMember, u"an index is missing");
+        throw RunTimeError(ErrorNumber::NoSuchMember, phrase(u"an index is missing"));
     const double index = roundHalfEven(arguments[position].toNumber());
     if (!(index >= first && index <= last))
-        throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, u"index " + outsideLimits(index, first, last));
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            phrase(u"index %1", { outsideLimits(index, first, last) }));
     return static_cast<int>(index);
 }
 

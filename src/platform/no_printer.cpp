@@ -3,6 +3,7 @@
 
 #include "platform/no_printer.h"
 
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <utility>
@@ -20,13 +21,13 @@ void NoPrinter::picture(TextView, Tpoint, Tpoint) { begun_ = true; }
 void NoPrinter::newPage()
 {
     begun_ = false;
-    throw RunTimeError(ErrorNumber::InvalidCall, u"there is no printer");
+    throw RunTimeError(ErrorNumber::InvalidCall, phrase(u"there is no printer"));
 }
 
 void NoPrinter::endDoc()
 {
     if (std::exchange(begun_, false))
-        throw RunTimeError(ErrorNumber::InvalidCall, u"there is no printer");
+        throw RunTimeError(ErrorNumber::InvalidCall, phrase(u"there is no printer"));
 }
 
 } // namespace pelloric

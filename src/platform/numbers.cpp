@@ -3,6 +3,7 @@
 
 #include "platform/numbers.h"
 
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -237,15 +238,15 @@ float toSingle(double value, TextView what)
         return static_cast<float>(value);
     Text detail(what);
     detail.append(detail.empty() ? u"" : u": ").append(formatNumber(value));
-    throw RunTimeError(
-        ErrorNumber::Overflow, detail.append(u" is past what a single-precision number holds"));
+    throw RunTimeError(ErrorNumber::Overflow,
+        phrase(u"%1 is past what a single-precision number holds", { detail }));
 }
 
 namespace {
 
 Text notWhole(TextView text)
 {
-    return Text(u"\"").append(text).append(u"\" is no whole number between -32768 and 32767");
+    return phrase(u"\"%1\" is no whole number between -32768 and 32767", { text });
 }
 
 } // namespace

@@ -3,6 +3,7 @@
 
 #include "platform/row_set.h"
 
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 namespace pelloric {
@@ -12,9 +13,9 @@ void requireCellLength(TextView text, std::int64_t record, int field)
     if (text.size() <= MostCellUnits)
         return;
     throw RunTimeError(ErrorNumber::Overflow,
-        u"row " + decimal(record) + u", column " + decimal(field + 1) + u" holds "
-            + decimal(static_cast<std::int64_t>(text.size())) + u" characters, at most "
-            + decimal(std::int64_t { MostCellUnits }) + u" can be printed");
+        phrase(u"row %1, column %2 holds %3 characters, at most %4 can be printed",
+            { decimal(record), decimal(field + 1), decimal(static_cast<std::int64_t>(text.size())),
+                decimal(std::int64_t { MostCellUnits }) }));
 }
 
 } // namespace pelloric

@@ -4,6 +4,7 @@
 #include "platform/run_time_error.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 
 namespace pelloric {
 
@@ -15,23 +16,23 @@ struct ErrorRow {
 };
 
 constexpr ErrorRow Errors[] = {
-    { ErrorNumber::InvalidCall, u"Invalid procedure call or argument" },
-    { ErrorNumber::Overflow, u"Overflow" },
-    { ErrorNumber::SubscriptOutOfRange, u"Subscript out of range" },
-    { ErrorNumber::DivisionByZero, u"Division by zero" },
-    { ErrorNumber::TypeMismatch, u"Type mismatch" },
-    { ErrorNumber::FileNotFound, u"File not found" },
-    { ErrorNumber::WriteFailed, u"The file cannot be written" },
-    { ErrorNumber::DiskFull, u"Disk full" },
-    { ErrorNumber::PermissionDenied, u"Permission denied" },
-    { ErrorNumber::ObjectMissing, u"Object variable not set" },
-    { ErrorNumber::NoSuchMember, u"Object doesn't support this property or method" },
-    { ErrorNumber::Cancelled, u"Cancel was selected" },
+    { ErrorNumber::InvalidCall, phraseText(u"Invalid procedure call or argument") },
+    { ErrorNumber::Overflow, phraseText(u"Overflow") },
+    { ErrorNumber::SubscriptOutOfRange, phraseText(u"Subscript out of range") },
+    { ErrorNumber::DivisionByZero, phraseText(u"Division by zero") },
+    { ErrorNumber::TypeMismatch, phraseText(u"Type mismatch") },
+    { ErrorNumber::FileNotFound, phraseText(u"File not found") },
+    { ErrorNumber::WriteFailed, phraseText(u"The file cannot be written") },
+    { ErrorNumber::DiskFull, phraseText(u"Disk full") },
+    { ErrorNumber::PermissionDenied, phraseText(u"Permission denied") },
+    { ErrorNumber::ObjectMissing, phraseText(u"Object variable not set") },
+    { ErrorNumber::NoSuchMember, phraseText(u"Object doesn't support this property or method") },
+    { ErrorNumber::Cancelled, phraseText(u"Cancel was selected") },
 };
 
 Text describe(ErrorNumber number, TextView detail)
 {
-    Text text(errorText(number));
+    Text text = phrase(errorText(number));
     if (!detail.empty())
         text.append(u": ").append(detail);
     return text;
@@ -45,22 +46,20 @@ TextView errorText(ErrorNumber number)
         if (row.number == number)
             return row.text;
     }
-    return u"Error";
+    return phraseText(u"Error");
 }
 
 Text noSuchItem(TextView what, std::int64_t number, std::int64_t count)
 {
-    Text text(what);
-    text.append(u" ").append(decimal(number)).append(u"; there ");
-    text.append(count == 1 ? TextView(u"is ") : TextView(u"are ")).append(decimal(count));
-    return text;
+    return phrase(
+        count == 1 ? phraseText(u"%1 %2; there is %3") : phraseText(u"%1 %2; there are %3"),
+        { what, decimal(number), decimal(count) });
 }
 
 Text outsideLimits(double number, std::int64_t least, std::int64_t most)
 {
-    Text text = formatNumber(number);
-    text.append(u" is not between ").append(decimal(least));
-    return text.append(u" and ").append(decimal(most));
+    return phrase(
+        u"%1 is not between %2 and %3", { formatNumber(number), decimal(least), decimal(most) });
 }
 
 RunTimeError::RunTimeError(ErrorNumber number)
@@ -77,8 +76,9 @@ RunTimeError::RunTimeError(ErrorNumber number, TextView detail)
 
 std::u16string_view RunTimeError::detail() const
 {
-    const std::size_t plain = errorText(number_).size();
-    return text_.size() > plain ? TextView(text_).substr(plain + 2) : TextView();
+    // The number's text may be one of another language; none holds a colon.
+    const std::size_t colon = text_.find(u": ");
+    return colon != Text::npos ? TextView(text_).substr(colon + 2) : TextView();
 }
 
 RunTimeError::~RunTimeError() = default;

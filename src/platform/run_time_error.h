@@ -11,12 +11,12 @@
 
 namespace pelloric {
 
-/// The plain English text of an error number, without a full stop.
+/// The plain English text of an error number, a phrase without a full stop and without a colon.
 TextView errorText(ErrorNumber number);
 
 /// "page 9; there are 5": the detail of an error about something that is not there.
 ///
-/// @param what    in the singular, as a person calls it
+/// @param what    a phrase in the singular
 /// @param number  as a person counts it
 Text noSuchItem(TextView what, std::int64_t number, std::int64_t count);
 

@@ -4,6 +4,7 @@
 #include "platform/value.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <cstdio>
@@ -117,7 +118,7 @@ double Value::toNumber() const
         return leadingNumber(text());
     case ValueKind::Object:
     case ValueKind::Rows:
-        throw RunTimeError(ErrorNumber::TypeMismatch, u"an object is no number");
+        throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"an object is no number"));
     case ValueKind::Null:
     case ValueKind::Truth:
     case ValueKind::Number:
@@ -130,14 +131,14 @@ double Value::toNumber() const
 AutomationObject& Value::toObject() const
 {
     if (kind_ != ValueKind::Object)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"an object was expected");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"an object was expected"));
     return *static_cast<AutomationObject*>(borrowed_);
 }
 
 RowSet& Value::toRows() const
 {
     if (kind_ != ValueKind::Rows)
-        throw RunTimeError(ErrorNumber::TypeMismatch, u"a row set was expected");
+        throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"a row set was expected"));
     return *static_cast<RowSet*>(borrowed_);
 }
 
@@ -158,7 +159,7 @@ TextView displayText(const Value& value, char16_t separator, Text& buffer)
         return {};
     case ValueKind::Object:
     case ValueKind::Rows:
-        throw RunTimeError(ErrorNumber::TypeMismatch, u"an object has no text");
+        throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"an object has no text"));
     }
     return {};
 }

@@ -4,6 +4,7 @@
 #include "print/page_list.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 namespace pelloric {
@@ -31,8 +32,8 @@ void appendBetween(double first, double last, Text& list)
         list += decimal(roundToInt32(page));
     }
     if (list.size() > LongestList)
-        throw RunTimeError(
-            ErrorNumber::Overflow, u"the page list names too many pages; write fewer ranges");
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"the page list names too many pages; write fewer ranges"));
 }
 
 /// Appends a piece behind the piece at its left, and the run between the two.

@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/units.h"
 
 #include <algorithm>
@@ -43,11 +44,14 @@ Text paperWarning(const PaperRequest& pages, const std::optional<PaperForm>& she
         return {};
     const double width = pages.width / TwipsPerMm;
     const double height = pages.height / TwipsPerMm;
-    Text text = u"The pages are " + sizeText(width, height) + u", the printer's sheet is "
-        + sheet->name + u" (" + sizeText(sheet->widthMm, sheet->heightMm) + u")";
     const bool isLost
         = width > sheet->widthMm + SamePaperMm || height > sheet->heightMm + SamePaperMm;
-    return text + (isLost ? u": what does not fit on it is lost." : u".");
+    return phrase(isLost
+            ? phraseText(
+                u"The pages are %1, the printer's sheet is %2 (%3): what does not fit on it is "
+                u"lost.")
+            : phraseText(u"The pages are %1, the printer's sheet is %2 (%3)."),
+        { sizeText(width, height), sheet->name, sizeText(sheet->widthMm, sheet->heightMm) });
 }
 
 } // namespace pelloric

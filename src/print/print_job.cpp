@@ -4,6 +4,7 @@
 #include "print/print_job.h"
 
 #include "document/page_document.h"
+#include "platform/phrase.h"
 #include "platform/printer.h"
 #include "platform/run_time_error.h"
 #include "view/page_renderer.h"
@@ -47,12 +48,10 @@ Text documentTitle(TextView name, int page)
 /// The printer's error with the number of pages that it took before.
 RunTimeError errorAfter(const RunTimeError& error, std::int64_t sent, std::int64_t wanted)
 {
-    const std::size_t plain = errorText(error.number()).size();
-    const TextView text = error.text();
-    Text detail;
-    if (text.size() > plain + 2)
-        detail.append(text.substr(plain + 2)).append(u", ");
-    detail += u"after " + decimal(sent) + u" of " + decimal(wanted) + u" pages";
+    Text detail(error.detail());
+    if (!detail.empty())
+        detail.append(u", ");
+    detail += phrase(u"after %1 of %2 pages", { decimal(sent), decimal(wanted) });
     return RunTimeError(error.number(), detail);
 }
 

@@ -4,6 +4,7 @@
 #include "report/chosen_rows.h"
 
 #include "platform/cell_look.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -68,7 +69,7 @@ Value ChosenRows::value(int field)
 {
     if (isBeforeFirst() || isAfterLast())
         throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, recordCount()));
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), position_, recordCount()));
     return rows_.value(fieldOf(field));
 }
 
@@ -76,7 +77,7 @@ int ChosenRows::fieldOf(int field) const
 {
     if (field < 0 || field >= fieldCount())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
+            noSuchItem(phrase(u"field"), std::int64_t { field } + 1, fieldCount()));
     return fields_[static_cast<std::size_t>(field)];
 }
 
@@ -87,7 +88,7 @@ std::vector<int> fieldsNamed(std::span<const Text> titles, std::span<const Text>
         const auto found = std::find(titles.begin(), titles.end(), name);
         if (found == titles.end())
             throw RunTimeError(
-                ErrorNumber::InvalidCall, u"the grid prints no column \"" + name + u"\"");
+                ErrorNumber::InvalidCall, phrase(u"the grid prints no column \"%1\"", { name }));
         const auto field = static_cast<int>(found - titles.begin());
         if (std::find(fields.begin(), fields.end(), field) == fields.end())
             fields.push_back(field);
@@ -116,8 +117,8 @@ std::vector<std::int64_t> chosenRecords(RowSet& rows, const ReportOptions& optio
     }
     const bool isMarked = options.rows == RowChoice::Marked;
     if (isMarked && looks == nullptr)
-        throw RunTimeError(
-            ErrorNumber::InvalidCall, u"this grid does not tell which of its rows are marked");
+        throw RunTimeError(ErrorNumber::InvalidCall,
+            phrase(u"this grid does not tell which of its rows are marked"));
     FilteredRows filtered(rows, options.filter, decimalSeparator);
     std::vector<std::int64_t> records;
     for (std::int64_t record = first; record <= last; ++record) {
@@ -127,8 +128,8 @@ std::vector<std::int64_t> chosenRecords(RowSet& rows, const ReportOptions& optio
             records.push_back(record);
     }
     if (isMarked && records.empty() && !options.filter)
-        throw RunTimeError(
-            ErrorNumber::InvalidCall, u"no row of the grid is marked; mark rows, or print all");
+        throw RunTimeError(ErrorNumber::InvalidCall,
+            phrase(u"no row of the grid is marked; mark rows, or print all"));
     return records;
 }
 

@@ -7,6 +7,7 @@
 #include "platform/automation_object.h"
 #include "platform/cell_look.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "report/flex_rows.h"
 #include "report/late_bound_rows.h"
@@ -64,7 +65,7 @@ void addColumn(std::vector<PrintedColumn>& columns, const PrintedColumn& column)
 {
     if (columns.size() == MostColumns)
         throw RunTimeError(
-            ErrorNumber::Overflow, u"more than 32767 columns are printed; leave some out");
+            ErrorNumber::Overflow, phrase(u"more than 32767 columns are printed; leave some out"));
     columns.push_back(column);
 }
 
@@ -75,8 +76,8 @@ std::int32_t columnCount(std::int32_t count)
 {
     if (count > MostGridColumns)
         throw RunTimeError(ErrorNumber::Overflow,
-            u"the grid has " + decimal(count) + u" columns, at most " + decimal(MostGridColumns)
-                + u" can be read");
+            phrase(u"the grid has %1 columns, at most %2 can be read",
+                { decimal(count), decimal(MostGridColumns) }));
     return count;
 }
 
@@ -113,9 +114,9 @@ void setWidths(GridTable& result, std::vector<double> gridWidths, const GridRequ
     if (request.keptWidths) {
         if (request.keptWidths->size() != gridWidths.size())
             throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-                u"the grid prints " + decimal(std::ssize(gridWidths))
-                    + u" columns now, the report was built with "
-                    + decimal(std::ssize(*request.keptWidths)) + u"; preview it anew");
+                phrase(u"the grid prints %1 columns now, the report was built with %2; preview it "
+                       u"anew",
+                    { decimal(std::ssize(gridWidths)), decimal(std::ssize(*request.keptWidths)) }));
         gridWidths.assign(request.keptWidths->begin(), request.keptWidths->end());
     }
     result.ColumnWidths = std::move(gridWidths);
@@ -308,8 +309,8 @@ GridTable readDataGrid(AutomationObject& object, const GridRequest& request)
     GridTable result;
     GridTableParts::takeSource(result, object.get(source, {}));
     if (static_cast<std::size_t>(result.rows->fieldCount()) < widths.size())
-        throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, u"the data grid has more columns than fields");
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
+            phrase(u"the data grid has more columns than fields"));
     result.gridColumns.resize(widths.size());
     std::iota(result.gridColumns.begin(), result.gridColumns.end(), 0);
     setWidths(result, std::move(widths), request);
@@ -361,7 +362,7 @@ GridTable readGrid(AutomationObject& grid, const GridRequest& request)
             table.fieldNames.emplace_back(table.rows->fieldName(field));
         return table;
     }
-    throw RunTimeError(ErrorNumber::InvalidCall, u"m_PrintObj names no kind of grid");
+    throw RunTimeError(ErrorNumber::InvalidCall, phrase(u"m_PrintObj names no kind of grid"));
 }
 
 } // namespace pelloric

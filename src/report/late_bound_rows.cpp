@@ -4,6 +4,7 @@
 #include "report/late_bound_rows.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -77,8 +78,8 @@ std::int64_t LateBoundRows::countedPosition()
     std::int64_t position = 0;
     while (!isTrue(steps_->isBeforeFirst)) {
         if (position == records_)
-            throw RunTimeError(
-                ErrorNumber::InvalidCall, u"the data source never comes to its first record");
+            throw RunTimeError(ErrorNumber::InvalidCall,
+                phrase(u"the data source never comes to its first record"));
         call(steps_->previous);
         ++position;
     }
@@ -92,7 +93,7 @@ TextView LateBoundRows::fieldName(int field) const
 {
     if (field < 0 || field >= fieldCount())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
+            noSuchItem(phrase(u"field"), std::int64_t { field } + 1, fieldCount()));
     return names_[static_cast<std::size_t>(field)];
 }
 
@@ -161,7 +162,7 @@ Value LateBoundRows::value(int field)
 {
     if (isBeforeFirst() || isAfterLast())
         throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, records_));
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), position_, records_));
     AutomationObject& fields = object_.get(fieldsMember_, {}).toObject();
     const Value index = Value::ofNumber(field);
     AutomationObject& item = fields.get(item_.of(fields), { &index, 1 }).toObject();

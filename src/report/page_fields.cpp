@@ -5,6 +5,7 @@
 
 #include "document/recorder.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 #include "report/report_style.h"
@@ -63,8 +64,8 @@ Color inkOf(const ColoredFont& font)
         return roundToInt32(font.color);
     } catch (const RunTimeError& error) {
         throw RunTimeError(error.number(),
-            u"the colour " + formatNumber(font.color) + u" of the font " + font.font.name
-                + u" is not between 0 and 16777215");
+            phrase(u"the colour %1 of the font %2 is not between 0 and 16777215",
+                { formatNumber(font.color), font.font.name }));
     }
 }
 

@@ -3,6 +3,8 @@
 
 #include "report/page_limit.h"
 
+#include "platform/phrase.h"
+
 #include <cmath>
 
 namespace pelloric {
@@ -22,21 +24,18 @@ Text grouped(std::int64_t number)
 
 Text tooManyPages(std::int64_t rowsThatFit, std::int64_t rows)
 {
-    Text text;
     if (rowsThatFit > 0) {
         const double part = static_cast<double>(rows) / static_cast<double>(rowsThatFit);
-        text.append(u"the report needs about ")
-            .append(grouped(static_cast<std::int64_t>(std::ceil(part * MostPages))))
-            .append(u" pages, a document holds ")
-            .append(grouped(MostPages))
-            .append(u"; print rows 1 to ")
-            .append(grouped(rowsThatFit));
-    } else {
-        text.append(u"not even the first rows fit on the ")
-            .append(grouped(MostPages))
-            .append(u" pages that a document holds; choose larger paper");
+        return phrase(
+            u"the report needs about %1 pages, a document holds %2; print rows 1 to %3, or "
+            u"leave out columns",
+            { grouped(static_cast<std::int64_t>(std::ceil(part * MostPages))), grouped(MostPages),
+                grouped(rowsThatFit) });
     }
-    return text.append(u", or leave out columns");
+    return phrase(
+        u"not even the first rows fit on the %1 pages that a document holds; choose larger "
+        u"paper, or leave out columns",
+        { grouped(MostPages) });
 }
 
 } // namespace pelloric

@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/file_bytes.h"
+#include "platform/phrase.h"
 #include "platform/platform.h"
 #include "report/report_style.h"
 #include "settings/default_settings.h"
@@ -35,14 +36,15 @@ struct LimitRow {
 };
 
 constexpr auto Limits = std::to_array<LimitRow>({
-    { SettingKey::PagerOrientation, u"1 is portrait and 2 is landscape" },
-    { SettingKey::PagerSizeValue, u"the number of a paper is a whole number, such as 9" },
-    { SettingKey::Top, u"this margin is at most 361 mm" },
-    { SettingKey::Buttom, u"this margin is at most 321 mm" },
-    { SettingKey::Left, u"this margin is at most 481 mm" },
-    { SettingKey::Right, u"this margin is at most 481 mm" },
-    { SettingKey::PagerWidth, u"a sheet is wider than 0 and no wider than 5779 mm" },
-    { SettingKey::PagerHeight, u"a sheet is higher than 0 and no higher than 5779 mm" },
+    { SettingKey::PagerOrientation, phraseText(u"1 is portrait and 2 is landscape") },
+    { SettingKey::PagerSizeValue,
+        phraseText(u"the number of a paper is a whole number, such as 9") },
+    { SettingKey::Top, phraseText(u"this margin is at most 361 mm") },
+    { SettingKey::Buttom, phraseText(u"this margin is at most 321 mm") },
+    { SettingKey::Left, phraseText(u"this margin is at most 481 mm") },
+    { SettingKey::Right, phraseText(u"this margin is at most 481 mm") },
+    { SettingKey::PagerWidth, phraseText(u"a sheet is wider than 0 and no wider than 5779 mm") },
+    { SettingKey::PagerHeight, phraseText(u"a sheet is higher than 0 and no higher than 5779 mm") },
 });
 
 TextView limitOf(SettingKey key)
@@ -52,9 +54,9 @@ TextView limitOf(SettingKey key)
         return row->limit;
     switch (settingOf(key).unit) {
     case SettingUnit::Color:
-        return u"a colour is a number from 0 to 16777215";
+        return phraseText(u"a colour is a number from 0 to 16777215");
     case SettingUnit::Points:
-        return u"a font size is a number of points above 0, at most 16000";
+        return phraseText(u"a font size is a number of points above 0, at most 16000");
     case SettingUnit::Switch:
     case SettingUnit::Millimetres:
     case SettingUnit::Code:
@@ -78,17 +80,18 @@ Text assignment(const Judged& judged, SettingKey key)
     return Text(name).append(u"= ").append(value);
 }
 
-Text inFile(const SettingsSource* source)
+/// "Top= 4000 in /…/OstlConfig.ini".
+Text inFile(const Text& what, const SettingsSource* source)
 {
-    return source != nullptr ? u" in " + source->file : Text();
+    return source != nullptr ? phrase(u"%1 in %2", { what, source->file }) : what;
 }
 
 /// "Top= 4000 in /…/OstlConfig.ini: this margin is at most 361 mm".
 Text describeValue(const Judged& judged, SettingKey key)
 {
-    Text text = assignment(judged, key).append(inFile(judged.source));
+    Text text = inFile(assignment(judged, key), judged.source);
     const TextView limit = limitOf(key);
-    return limit.empty() ? text : text.append(u": ").append(limit);
+    return limit.empty() ? text : text.append(u": ").append(phrase(limit));
 }
 
 /// The line that begins with a key, without the key and what stands up to its "=".
@@ -120,19 +123,21 @@ std::vector<SettingKey> missingKeys(const SettingsSource* source)
 SettingProblem problemOfMissing(std::span<const SettingKey> keys, const SettingsSource* source)
 {
     constexpr std::size_t MostNamed = 3;
-    Text text;
-    const std::size_t named = std::min(keys.size(), MostNamed);
-    for (std::size_t at = 0; at < named; ++at) {
-        const bool isLast = at + 1 == keys.size();
-        text.append(at == 0 ? TextView() : isLast ? TextView(u" and ") : TextView(u", "));
-        text.append(settingName(keys[at]));
-    }
-    if (keys.size() > named)
-        text.append(u" and ")
-            .append(decimal(static_cast<std::int64_t>(keys.size() - named)))
-            .append(u" more settings");
-    text.append(keys.size() == 1 ? TextView(u" is missing") : TextView(u" are missing"));
-    return { .text = text.append(inFile(source)).append(u"."), .key = {} };
+    const bool isCut = keys.size() > MostNamed;
+    const std::size_t listed = isCut ? MostNamed : keys.size() - 1;
+    Text names;
+    for (const SettingKey key : keys.first(listed))
+        names.append(names.empty() ? u"" : u", ").append(settingName(key));
+    if (isCut)
+        names = phrase(u"%1 and %2 more settings",
+            { names, decimal(static_cast<std::int64_t>(keys.size() - listed)) });
+    else if (listed > 0)
+        names = phrase(u"%1 and %2", { names, settingName(keys.back()) });
+    else
+        names = settingName(keys.back());
+    const TextView missing
+        = keys.size() == 1 ? phraseText(u"%1 is missing") : phraseText(u"%1 are missing");
+    return { .text = inFile(phrase(missing, { names }), source).append(u"."), .key = {} };
 }
 
 /// Whether a style takes settings.
@@ -193,9 +198,10 @@ std::optional<SettingProblem> marginProblem(const Judged& judged)
     for (const SettingKey key : { isHigh ? SettingKey::Buttom : SettingKey::Right,
              isHigh ? SettingKey::PagerHeight : SettingKey::PagerWidth })
         text.append(u", ").append(assignment(judged, key));
-    text.append(inFile(judged.source));
-    text.append(u": the margins leave no room on the sheet; they are printed larger than stored, ");
-    text.append(u"1.6 times at the top, 1.8 times at the bottom and 1.2 times at the sides.");
+    text = inFile(text, judged.source).append(u": ");
+    text.append(
+        phrase(u"the margins leave no room on the sheet; they are printed larger than stored, "
+               u"1.6 times at the top, 1.8 times at the bottom and 1.2 times at the sides."));
     return SettingProblem { .text = text, .key = first, .isInPageSetup = true };
 }
 
@@ -229,10 +235,11 @@ std::vector<SettingProblem> settingProblems(const Platform& platform)
     const SettingsSource source = sourceOf(platform, *snapshot);
     std::vector<SettingProblem> problems = settingProblems(readReportSettings(*snapshot), &source);
     if (hasByteOrderMark(platform))
-        problems.push_back({ .text = source.file
-                + u" begins with a byte-order mark, which belongs to another encoding; settings "
-                  u"are written in GB18030.",
-            .key = {} });
+        problems.push_back(
+            { .text = phrase(u"%1 begins with a byte-order mark, which belongs to another "
+                             u"encoding; settings are written in GB18030.",
+                  { source.file }),
+                .key = {} });
     return problems;
 }
 
@@ -263,20 +270,21 @@ RunTimeError settingError(ErrorNumber number, SettingKey key, const ReportSettin
     const SettingsSource* source)
 {
     if (source != nullptr && !ownValue(source->snapshot.text(), settingName(key))) {
-        Text detail(settingName(key));
-        detail.append(u" is missing").append(inFile(source));
-        return RunTimeError(number, detail.append(u"; restore the defaults"));
+        const Text missing = phrase(u"%1 is missing", { settingName(key) });
+        return RunTimeError(
+            number, phrase(u"%1; restore the defaults", { inFile(missing, source) }));
     }
-    Text detail = describeValue({ settings, source }, key).append(u"; correct it in ");
-    detail.append(isInGridStyle(key) ? TextView(u"Design Report") : TextView(u"Page Setup"));
-    return RunTimeError(number, detail.append(u" or restore the defaults"));
+    return RunTimeError(number,
+        phrase(u"%1; correct it in %2 or restore the defaults",
+            { describeValue({ settings, source }, key),
+                isInGridStyle(key) ? TextView(u"Design Report") : TextView(u"Page Setup") }));
 }
 
 RunTimeError missingSettings(const RunTimeError& cause, const Platform& platform)
 {
-    Text detail = pathText(settingsPath(platform));
-    detail.append(u", which holds paper, margins and style; restore the defaults");
-    return RunTimeError(cause.number(), detail);
+    return RunTimeError(cause.number(),
+        phrase(u"%1, which holds paper, margins and style; restore the defaults",
+            { pathText(settingsPath(platform)) }));
 }
 
 std::vector<SettingChange> settingsIn(TextView text)

@@ -4,6 +4,7 @@
 #include "report/table_row_set.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -99,7 +100,7 @@ TableRowSet::Cell TableRowSet::cellOf(const Value& value)
     case ValueKind::Rows:
         break;
     }
-    throw RunTimeError(ErrorNumber::TypeMismatch, u"a cell holds an object");
+    throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"a cell holds an object"));
 }
 
 /// Dates of four thousand years on either side of 1970 need nothing beside their cell.
@@ -164,7 +165,7 @@ TextView TableRowSet::fieldName(int field) const
 {
     if (field < 0 || field >= fieldCount())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
+            noSuchItem(phrase(u"field"), std::int64_t { field } + 1, fieldCount()));
     return names_[static_cast<std::size_t>(field)];
 }
 
@@ -177,7 +178,7 @@ Value TableRowSet::value(int field)
 {
     if (field < 0 || field >= fieldCount())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"field", std::int64_t { field } + 1, fieldCount()));
+            noSuchItem(phrase(u"field"), std::int64_t { field } + 1, fieldCount()));
     requireRecord();
     const auto record = static_cast<std::size_t>(position_ - 1);
     return valueOf(cells_[record * names_.size() + static_cast<std::size_t>(field)]);
@@ -187,7 +188,7 @@ void TableRowSet::requireRecord() const
 {
     if (isBeforeFirst() || isAfterLast())
         throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, records_));
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), position_, records_));
 }
 
 void TableRowSet::values(int first, std::span<Value> into)
@@ -195,7 +196,7 @@ void TableRowSet::values(int first, std::span<Value> into)
     const auto end = static_cast<std::size_t>(first) + into.size();
     if (first < 0 || end > names_.size())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"fields " + decimal(std::int64_t { first } + 1) + u" to",
+            noSuchItem(phrase(u"fields %1 to", { decimal(std::int64_t { first } + 1) }),
                 static_cast<std::int64_t>(end), fieldCount()));
     requireRecord();
     const auto record = static_cast<std::size_t>(position_ - 1);

@@ -3,6 +3,8 @@
 
 #include "tables/file_kinds.h"
 
+#include "platform/phrase.h"
+
 #include <algorithm>
 #include <array>
 
@@ -12,11 +14,11 @@ namespace {
 
 constexpr std::string_view Blanks = " \t\r\n";
 
-constexpr TextView Picture = u"this is a picture, not a table";
+constexpr TextView Picture = phraseText(u"this is a picture, not a table");
 constexpr TextView Packed
-    = u"this is a packed file; unpack it first, for example with: gunzip -c FILE";
+    = phraseText(u"this is a packed file; unpack it first, for example with: gunzip -c FILE");
 constexpr TextView Document
-    = u"this is an HTML or XML document, not a table; save its table as CSV";
+    = phraseText(u"this is an HTML or XML document, not a table; save its table as CSV");
 
 struct FileKind {
     std::string_view mark;
@@ -26,8 +28,9 @@ struct FileKind {
 
 constexpr auto Kinds = std::to_array<FileKind>({
     { "%PDF-", false,
-        u"this is a PDF file; take the file that it was made from, or save its table as CSV" },
-    { "PK\x03\x04", false, u"this is a ZIP archive; unpack it first" },
+        phraseText(
+            u"this is a PDF file; take the file that it was made from, or save its table as CSV") },
+    { "PK\x03\x04", false, phraseText(u"this is a ZIP archive; unpack it first") },
     { "\x1F\x8B", false, Packed },
     { "BZh91AY", false, Packed },
     { "\xFD"
@@ -39,9 +42,9 @@ constexpr auto Kinds = std::to_array<FileKind>({
     { "GIF89a", false, Picture },
     { "\x7F"
       "ELF",
-        false, u"this is a program, not a table" },
-    { "PAR1\x15", false, u"this is a Parquet file; save its table as CSV" },
-    { "{\\rtf", false, u"this is a text document, not a table; save its table as CSV" },
+        false, phraseText(u"this is a program, not a table") },
+    { "PAR1\x15", false, phraseText(u"this is a Parquet file; save its table as CSV") },
+    { "{\\rtf", false, phraseText(u"this is a text document, not a table; save its table as CSV") },
     { "<?xml", true, Document },
     { "<!doctype", true, Document },
     { "<html", true, Document },

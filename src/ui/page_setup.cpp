@@ -4,6 +4,7 @@
 #include "ui/page_setup.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
 #include "report/settings_check.h"
@@ -50,7 +51,7 @@ Text fileHintOf(const Platform& platform)
 {
     for (const SettingProblem& problem : settingProblems(platform)) {
         if (!problem.key)
-            return problem.text + u" OK will save nothing.";
+            return phrase(u"%1 OK will save nothing.", { problem.text });
     }
     return {};
 }

@@ -4,6 +4,7 @@
 #include "ui/page_setup_hints.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/units.h"
 #include "report/report_style.h"
 #include "settings/settings_table.h"
@@ -61,19 +62,21 @@ std::optional<double> lengthOf(TextView box)
 
 Text sizeHint(TextView name, TextView box)
 {
-    Text text(name);
     if (box.empty())
-        return text.append(u" is empty: OK keeps the stored one.");
+        return phrase(u"%1 is empty: OK keeps the stored one.", { name });
     if (box.find(u"mm") == TextView::npos)
-        return text.append(u" \"").append(box).append(
-            u"\" lacks its unit, as in \"210mm\": OK will save nothing of all three tabs.");
+        return phrase(
+            u"%1 \"%2\" lacks its unit, as in \"210mm\": OK will save nothing of all three "
+            u"tabs.",
+            { name, box });
     const double length = leadingNumber(box);
     if (!(length > 0))
-        return text.append(u" must be above 0: OK will store it, and no page can be laid out.");
+        return phrase(
+            u"%1 must be above 0: OK will store it, and no page can be laid out.", { name });
     if (length > LongestSheetMm)
-        return text.append(u" is at most ")
-            .append(millimetres(LongestSheetMm))
-            .append(u": OK will store it, and no page can be built until it is smaller.");
+        return phrase(u"%1 is at most %2: OK will store it, and no page can be built until it is "
+                      u"smaller.",
+            { name, millimetres(LongestSheetMm) });
     return {};
 }
 
@@ -101,11 +104,9 @@ double printedMargin(const PageSetupState& state, Margin margin)
 /// "Top 120 mm is printed as 192 mm".
 Text printedAs(const PageSetupState& state, const MarginName& name)
 {
-    return Text(settingName(name.key))
-        .append(u" ")
-        .append(millimetres(storedMargin(state, name.margin)))
-        .append(u" is printed as ")
-        .append(millimetres(printedMargin(state, name.margin)));
+    return phrase(u"%1 %2 is printed as %3",
+        { settingName(name.key), millimetres(storedMargin(state, name.margin)),
+            millimetres(printedMargin(state, name.margin)) });
 }
 
 /// The margin across from one; to the room of the columns the left one counts twice.
@@ -120,32 +121,36 @@ Text marginHint(const PageSetupState& state, const Sheet& sheet, const MarginNam
 {
     const double stored = storedMargin(state, name.margin);
     const double printed = printedMargin(state, name.margin);
-    Text text = printedAs(state, name);
+    const Text margin = printedAs(state, name);
     if (twipsOfMm(printed) > std::numeric_limits<std::int16_t>::max())
-        return text.append(u"; a margin is at most ")
-            .append(millimetres(std::floor(
-                std::numeric_limits<std::int16_t>::max() / twipsOfMm(1) / marginFactor(name.key))))
-            .append(u" here. OK will store it, and no page can be built until it is smaller.");
+        return phrase(
+            u"%1; a margin is at most %2 here. OK will store it, and no page can be built until "
+            u"it is smaller.",
+            { margin,
+                millimetres(std::floor(std::numeric_limits<std::int16_t>::max() / twipsOfMm(1)
+                    / marginFactor(name.key))) });
     if (std::abs(twipsOfMm(printed)) < 0.5)
-        return Text(settingName(name.key)).append(u" 0 mm is printed as 20 mm.");
+        return phrase(u"%1 0 mm is printed as 20 mm.", { settingName(name.key) });
     if (stored < 0)
-        return Text(settingName(name.key))
-            .append(u" lies outside the sheet. OK will store it all the same.");
+        return phrase(u"%1 lies outside the sheet. OK will store it all the same.",
+            { settingName(name.key) });
     const std::optional<double> room = sheet.along(name);
     if (!room)
         return {};
-    text.append(u", and the sheet is ").append(millimetres(*room));
-    text.append(name.isHorizontal ? TextView(u" high") : TextView(u" wide"));
+    const Text facts = phrase(name.isHorizontal ? phraseText(u"%1, and the sheet is %2 high")
+                                                : phraseText(u"%1, and the sheet is %2 wide"),
+        { margin, millimetres(*room) });
     if (printed >= *room)
-        return text.append(u": it lies outside. OK will store it all the same.");
+        return phrase(u"%1: it lies outside. OK will store it all the same.", { facts });
     if (name.margin == Margin::Right)
         return {}; // takes no room from the columns
     const double opposite = printedMargin(state, oppositeOf(name));
     if (printed + opposite >= *room && printed >= opposite) // said once, of the larger one
-        return text
-            .append(name.isHorizontal ? TextView(u": there is no room left for a row.")
-                                      : TextView(u": there is no room left for a column."))
-            .append(u" OK will store it all the same.");
+        return phrase(name.isHorizontal
+                ? phraseText(u"%1: there is no room left for a row. OK will store it all the same.")
+                : phraseText(u"%1: there is no room left for a column. OK will store it all the "
+                             u"same."),
+            { facts });
     return {};
 }
 

@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "platform/automation_object.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "report/settings_check.h"
 #include "ui/tool_table.h"
@@ -279,7 +280,7 @@ void PreviewSession::print(bool allPages, TextView pageList, std::int16_t copies
 AutomationObject& PreviewSession::keptGrid() const
 {
     if (grid_ == nullptr)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"no grid is previewed");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"no grid is previewed"));
     return *grid_;
 }
 

@@ -3,6 +3,7 @@
 
 #include "ui/preview_notice.h"
 
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "report/settings_check.h"
 
@@ -25,9 +26,8 @@ PreviewNotice noticeOf(Text text, const std::vector<SettingProblem>& problems)
         notice.text.append(problems[at].text);
     }
     if (problems.size() > told)
-        notice.text.append(u" There are ")
-            .append(decimal(static_cast<std::int64_t>(problems.size() - told)))
-            .append(u" more like this.");
+        notice.text.append(u" ").append(phrase(u"There are %1 more like this.",
+            { decimal(static_cast<std::int64_t>(problems.size() - told)) }));
     for (const SettingProblem& problem : problems) {
         notice.offersPageSetup = notice.offersPageSetup || problem.isInPageSetup;
         notice.offersGridStyle = notice.offersGridStyle || problem.isInGridStyle;
@@ -53,9 +53,9 @@ PreviewNotice noticeOfFailure(
 {
     const std::vector<SettingProblem> problems = problemsOf(platform, own);
     if (!problems.empty())
-        return noticeOf(u"The pages could not be built.", problems);
+        return noticeOf(phrase(u"The pages could not be built."), problems);
     PreviewNotice notice = noticeOfError(error);
-    notice.text.insert(0, u"The pages could not be built. ");
+    notice.text.insert(0, phrase(u"The pages could not be built.") + u" ");
     notice.offersPageSetup = notice.offersGridStyle = dependsOnStyle(error);
     return notice;
 }

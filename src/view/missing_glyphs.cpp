@@ -4,6 +4,7 @@
 #include "view/missing_glyphs.h"
 
 #include "document/page_document.h"
+#include "platform/phrase.h"
 #include "platform/services.h"
 #include "platform/text_metrics.h"
 
@@ -167,14 +168,20 @@ Text missingGlyphsText(const std::vector<MissingScript>& scripts)
             && std::ranges::find(packages, script.package) == packages.end())
             packages.push_back(script.package);
     }
-    Text text = decimal(total)
-        + (total == 1
-                ? u" character has no glyph in any installed font and shows as a hollow box ("
-                : u" characters have no glyph in any installed font and show as hollow boxes (")
-        + list + u")";
-    for (std::size_t at = 0; at < packages.size(); ++at)
-        text.append(at == 0 ? u"; install " : u", ").append(packages[at]);
-    return text;
+    const Text text = phrase(total == 1
+            ? phraseText(
+                u"%1 character has no glyph in any installed font and shows as a hollow box "
+                u"(%2)")
+            : phraseText(
+                u"%1 characters have no glyph in any installed font and show as hollow boxes "
+                u"(%2)"),
+        { decimal(total), list });
+    if (packages.empty())
+        return text;
+    Text names;
+    for (const TextView package : packages)
+        names.append(names.empty() ? u"" : u", ").append(package);
+    return phrase(u"%1; install %2", { text, names });
 }
 
 } // namespace pelloric

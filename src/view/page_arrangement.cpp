@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -20,7 +21,7 @@ constexpr std::int32_t CentringEdge = 100;
 PageGrid gridOfAllPages(double innerWidth, const PageFacts& facts)
 {
     if (facts.myWidth == 0)
-        throw RunTimeError(ErrorNumber::DivisionByZero, u"the paper has no width");
+        throw RunTimeError(ErrorNumber::DivisionByZero, phrase(u"the paper has no width"));
     const std::int64_t fitting = std::int64_t { roundToInt32(innerWidth) } / facts.myWidth;
     const std::int64_t columns = std::max<std::int64_t>(1, fitting);
     const std::int64_t rows = (std::int64_t { facts.Totalpages } - 1) / columns + 1;
@@ -32,7 +33,8 @@ double ratio(Twips viewport, std::int16_t pages, Twips paper)
     const double extent = static_cast<double>(pages) * paper;
     const double room = static_cast<double>(viewport) - FittingEdge;
     if (extent == 0)
-        throw RunTimeError(ErrorNumber::DivisionByZero, u"the paper has no width or no height");
+        throw RunTimeError(
+            ErrorNumber::DivisionByZero, phrase(u"the paper has no width or no height"));
     return room / extent;
 }
 
@@ -81,7 +83,8 @@ float fittingDivisor(
     const double down = ratio(viewportHeight, grid.rows, facts.myHeight);
     const double larger = std::max(across, down);
     if (larger == 0)
-        throw RunTimeError(ErrorNumber::DivisionByZero, u"the window has no room for a page");
+        throw RunTimeError(
+            ErrorNumber::DivisionByZero, phrase(u"the window has no room for a page"));
     return static_cast<float>(1 / larger);
 }
 

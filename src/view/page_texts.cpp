@@ -6,6 +6,7 @@
 #include "document/page_document.h"
 #include "document/text_search.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "platform/text_metrics.h"
 
@@ -82,7 +83,7 @@ PageRect areaOf(
     const auto records = document.texts(page);
     if (match.text >= records.size())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"on page " + decimal(page + 1) + u" text",
+            noSuchItem(phrase(u"on page %1 text", { decimal(page + 1) }),
                 static_cast<std::int64_t>(match.text) + 1,
                 static_cast<std::int64_t>(records.size())));
     const TextRecord& record = records[match.text];

@@ -4,6 +4,7 @@
 #include "view/view_state.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "report/report_style.h"
 
@@ -214,7 +215,7 @@ void showPage(ViewState& view, const PageFacts& facts)
     view.style = OrderStyle::One;
     if (!existing(facts, facts.currentPage))
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"page", std::int64_t { facts.currentPage } + 1, facts.Totalpages));
+            noSuchItem(phrase(u"page"), std::int64_t { facts.currentPage } + 1, facts.Totalpages));
     view.shownPage = facts.currentPage;
     endArrangement(view);
     view.baseVisible = true;
@@ -279,7 +280,7 @@ void zoomIn(ViewState& view, const PageFacts& facts)
 {
     const float divisor = view.divisor + view.divisor;
     if (!std::isfinite(divisor))
-        throw RunTimeError(ErrorNumber::Overflow, u"the pages cannot be shown any smaller");
+        throw RunTimeError(ErrorNumber::Overflow, phrase(u"the pages cannot be shown any smaller"));
     view.divisor = divisor;
     layOutAgain(view, facts);
 }
@@ -293,11 +294,11 @@ void zoomOut(ViewState& view, const PageFacts& facts)
 void setDispScale(ViewState& view, const PageFacts& facts, float scale)
 {
     if (scale == 0)
-        throw RunTimeError(ErrorNumber::DivisionByZero, u"a scale of 0 shows nothing");
+        throw RunTimeError(ErrorNumber::DivisionByZero, phrase(u"a scale of 0 shows nothing"));
     const float divisor = 1 / scale;
     if (!std::isfinite(divisor))
         throw RunTimeError(
-            ErrorNumber::Overflow, u"a scale of " + formatSingle(scale) + u" is too small");
+            ErrorNumber::Overflow, phrase(u"a scale of %1 is too small", { formatSingle(scale) }));
     view.divisor = divisor;
     layOutAgain(view, facts);
 }

@@ -9,6 +9,7 @@
 #include "controls/qt/plain_calls.h"
 #include "controls/qt/published_values.h"
 #include "grids/qt/grid_for.h"
+#include "platform/phrase.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
@@ -35,7 +36,8 @@ struct CurrentOpener final : PreviewOpener {
     {
         PreviewOpener* const opener = own ? own : defaultOpener;
         if (!opener)
-            throw RunTimeError(ErrorNumber::InvalidCall, u"nobody opens the preview window");
+            throw RunTimeError(
+                ErrorNumber::InvalidCall, phrase(u"nobody opens the preview window"));
         opener->setReportOptions(options);
         opener->openPreview(std::move(grid));
     }
@@ -107,7 +109,7 @@ void Kestrane::doPreview(std::unique_ptr<AutomationObject> PrintObj)
 {
     parts_->calls.run([&] {
         if (!PrintObj)
-            throw RunTimeError(ErrorNumber::ObjectMissing, u"doPreview was given no grid");
+            throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"doPreview was given no grid"));
         parts_->core->facade.doPreview(std::move(PrintObj));
     });
 }
@@ -116,7 +118,7 @@ void Kestrane::doPreview(QObject* PrintObj)
 {
     parts_->calls.run([&] {
         if (!PrintObj)
-            throw RunTimeError(ErrorNumber::ObjectMissing, u"doPreview was given no grid");
+            throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"doPreview was given no grid"));
         parts_->core->facade.doPreview(gridFor(*PrintObj));
     });
 }

@@ -7,6 +7,7 @@
 #include "grids/qt/grid_for.h"
 #include "grids/qt/held_value.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -16,14 +17,13 @@ namespace pelloric::qt {
 
 namespace {
 
-/// @param wanted  what the member takes
+/// @param wanted  the phrase that says what the member takes
 [[noreturn]] void refuseType(const QVariant& argument, TextView wanted)
 {
     const bool isText = argument.typeId() == QMetaType::QString;
     const QString given = isText ? QStringLiteral("\"%1\"").arg(argument.toString())
                                  : QString::fromLatin1(argument.metaType().name());
-    throw RunTimeError(
-        ErrorNumber::TypeMismatch, toText(given) + u" was given where " + Text(wanted));
+    throw RunTimeError(ErrorNumber::TypeMismatch, phrase(wanted, { toText(given) }));
 }
 
 bool isScriptValue(const QVariant& argument)
@@ -63,7 +63,7 @@ Value simple(const QVariant& argument, HeldValue& held)
     }
     if (value.metaType().flags() & QMetaType::IsEnumeration)
         return Value::ofNumber(value.toInt());
-    refuseType(value, u"a plain value is wanted");
+    refuseType(value, phraseText(u"%1 was given where a plain value is wanted"));
 }
 
 double numberOf(const QVariant& argument)
@@ -71,7 +71,7 @@ double numberOf(const QVariant& argument)
     HeldValue held;
     const Value value = simple(argument, held);
     if (value.kind() == ValueKind::Text && !isNumber(value.text()))
-        refuseType(plain(argument), u"a number is wanted");
+        refuseType(plain(argument), phraseText(u"%1 was given where a number is wanted"));
     return value.toNumber();
 }
 
@@ -105,12 +105,12 @@ std::unique_ptr<AutomationObject> toGrid(const QVariant& argument, const QObject
         return scriptCaller()->object(argument, control);
     const QVariant value = plain(argument);
     if (value.typeId() == QMetaType::Nullptr)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"no grid was given");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"no grid was given"));
     if (!(value.metaType().flags() & QMetaType::PointerToQObject))
-        refuseType(value, u"a grid is wanted");
+        refuseType(value, phraseText(u"%1 was given where a grid is wanted"));
     auto* const object = value.value<QObject*>();
     if (!object)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"no grid was given");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"no grid was given"));
     return gridFor(*object);
 }
 

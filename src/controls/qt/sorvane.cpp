@@ -11,6 +11,7 @@
 #include "controls/qt/plain_calls.h"
 #include "controls/qt/published_values.h"
 #include "grids/qt/grid_for.h"
+#include "platform/phrase.h"
 #include "platform/platform.h"
 #include "platform/qt/file_names.h"
 #include "platform/qt/qt_platform.h"
@@ -50,7 +51,7 @@ constexpr int FocusEdge = 2; ///< shows whether the control has the focus: pixel
 QObject& objectOf(QObject* object)
 {
     if (!object)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"no grid was given");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"no grid was given"));
     return *object;
 }
 

@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <algorithm>
@@ -23,9 +24,9 @@ void checkPaper(const PageSetup& setup)
     const auto fits = [](Twips length) { return length > 0 && length <= LargestPaper; };
     if (!fits(setup.myWidth) || !fits(setup.myHeight))
         throw RunTimeError(ErrorNumber::Overflow,
-            u"paper of " + decimal(setup.myWidth) + u" by " + decimal(setup.myHeight)
-                + u" twips cannot be written; each side is 1 to " + decimal(LargestPaper)
-                + u" twips (200 inches)");
+            phrase(u"paper of %1 by %2 twips cannot be written; each side is 1 to %3 twips (200 "
+                   u"inches)",
+                { decimal(setup.myWidth), decimal(setup.myHeight), decimal(LargestPaper) }));
 }
 
 std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& options)
@@ -37,11 +38,12 @@ std::vector<int> pagesOf(const PageDocument& document, const ExportOptions& opti
         std::iota(pages.begin(), pages.end(), 0);
     }
     if (pages.empty())
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the document has no page to write");
+        throw RunTimeError(
+            ErrorNumber::SubscriptOutOfRange, phrase(u"the document has no page to write"));
     for (const int page : pages) {
         if (!document.hasPage(page))
             throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-                noSuchItem(u"page", std::int64_t { page } + 1, document.pageCount()));
+                noSuchItem(phrase(u"page"), std::int64_t { page } + 1, document.pageCount()));
     }
     return pages;
 }

@@ -11,6 +11,7 @@
 #include "export/qt/png_bytes.h"
 #include "export/qt/svg_page.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_drawing_surface.h"
 #include "platform/qt/qt_files.h"
 #include "platform/qt/qt_fonts.h"
@@ -94,8 +95,9 @@ public:
     {
         if (image_.isNull())
             throw RunTimeError(ErrorNumber::Overflow,
-                u"there is no memory for an image of " + decimal(size.width()) + u" by "
-                    + decimal(size.height()) + u" pixels; choose a lower resolution");
+                phrase(u"there is no memory for an image of %1 by %2 pixels; choose a lower "
+                       u"resolution",
+                    { decimal(size.width()), decimal(size.height()) }));
         const int dotsPerMetre = roundToInt32(dpi * 1000 / MmPerInch);
         image_.setDotsPerMeterX(dotsPerMetre);
         image_.setDotsPerMeterY(dotsPerMetre);
@@ -166,9 +168,10 @@ QSize pixelsOf(const PageSetup& setup, int dpi)
     const double height = roundHalfEven(setup.myHeight / TwipsPerInch * dpi);
     if (dpi < 1 || width < 1 || height < 1 || width * height > MostPixels)
         throw RunTimeError(ErrorNumber::Overflow,
-            u"an image of " + formatNumber(width) + u" by " + formatNumber(height) + u" pixels ("
-                + decimal(dpi) + u" per inch) cannot be made; it has 1 to "
-                + formatNumber(MostPixels) + u", so choose another resolution");
+            phrase(u"an image of %1 by %2 pixels (%3 per inch) cannot be made; it has 1 to %4, so "
+                   u"choose another resolution",
+                { formatNumber(width), formatNumber(height), decimal(dpi),
+                    formatNumber(MostPixels) }));
     return QSize(roundToInt32(width), roundToInt32(height));
 }
 

@@ -6,6 +6,7 @@
 #include "export/qt/pending_files.h"
 #include "export/qt/qt_glyph_faces.h"
 #include "export/qt/qt_pdf_writer.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "view/joined_lines.h"
 #include "view/page_renderer.h"
@@ -62,7 +63,7 @@ PdfExport exportPdf(const PageDocument& document, const PageSetup& setup, QtFont
         files.putInPlace();
         return {};
     } catch (const pdf::CannotEmbed& obstacle) {
-        const Text reason = u"the font " + obstacle.font + u" " + obstacle.reason;
+        const Text reason = phrase(obstacle.reason, { obstacle.font });
         if (options.isTagged || options.isArchive)
             throw RunTimeError(ErrorNumber::InvalidCall, reason);
         exportPdfByToolkit(document, setup, fonts, options, path);

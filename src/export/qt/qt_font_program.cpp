@@ -4,6 +4,7 @@
 #include "export/qt/qt_font_program.h"
 
 #include "export/cff_charset.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -157,7 +158,7 @@ pdf::FontSubset QtFontProgram::subset(std::span<const std::uint32_t> glyphs)
         plan ? hb_subset_plan_execute_or_fail(plan.get()) : nullptr);
     if (!left)
         throw RunTimeError(ErrorNumber::WriteFailed,
-            toText(QStringLiteral("the font %1 is damaged").arg(font_.familyName())));
+            phrase(u"the font %1 is damaged", { toText(font_.familyName()) }));
     const bool isCff = facts_.outlines == pdf::Outlines::Cff;
     pdf::FontSubset subset;
     subset.bytes = bytesOf(Blob(isCff ? hb_face_reference_table(left.get(), CffGlyphs)
@@ -197,13 +198,13 @@ void QtFontProgram::refuseUnlessEmbeddable()
     };
     const unsigned rights = numberAt<quint16>(table(Os2), 8);
     if ((rights & UsageRights) == NoEmbedding || (rights & BitmapsOnly) != 0)
-        refuse(u"may not be embedded");
+        refuse(phraseText(u"the font %1 may not be embedded"));
     isSubsettingAllowed_ = (rights & NoSubsetting) == 0;
     const auto has = [&](hb_tag_t tag) { return !table(tag).isEmpty(); };
     if (std::ranges::any_of(UnsuitableTables, has))
-        refuse(u"is a variable or coloured font");
+        refuse(phraseText(u"the font %1 is a variable or coloured font"));
     if (!has(Head) || !has(HorizontalMetrics) || (!has(TrueTypeGlyphs) && !has(CffGlyphs)))
-        refuse(u"has no outlines of a kind that can be embedded");
+        refuse(phraseText(u"the font %1 has no outlines of a kind that can be embedded"));
     facts_.outlines = has(TrueTypeGlyphs) ? pdf::Outlines::TrueType : pdf::Outlines::Cff;
 }
 

@@ -7,6 +7,7 @@
 #include "grids/qt/held_grid.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -36,7 +37,7 @@ static_assert(std::size(ColumnNames) == ColumnMemberCount);
 QTableView& alive(const QPointer<QTableView>& view)
 {
     if (!view || !view->model())
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid is gone");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"the grid is gone"));
     return *view;
 }
 

@@ -4,6 +4,7 @@
 #include "grids/qt/held_value.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -28,8 +29,8 @@ double wholeIn(double number, double smallest, double largest)
 {
     const double rounded = roundHalfEven(number);
     if (!(rounded >= smallest && rounded <= largest))
-        throw RunTimeError(
-            ErrorNumber::Overflow, formatNumber(number) + u" is past what the member holds");
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"%1 is past what the member holds", { formatNumber(number) }));
     return rounded;
 }
 
@@ -66,7 +67,7 @@ QVariant plainVariant(const Value& value)
     case ValueKind::Rows:
         break;
     }
-    throw RunTimeError(ErrorNumber::TypeMismatch, u"an object is no plain value");
+    throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"an object is no plain value"));
 }
 
 } // namespace
@@ -144,8 +145,8 @@ QVariant toVariant(const Value& value, QMetaType type)
     QVariant variant = plainVariant(value);
     if (type.id() != QMetaType::QVariant && variant.metaType() != type && !variant.convert(type))
         throw RunTimeError(ErrorNumber::TypeMismatch,
-            toText(QStringLiteral("\"%1\" is no %2")
-                       .arg(plainVariant(value).toString(), QLatin1String(type.name()))));
+            phrase(u"\"%1\" is no %2",
+                { toText(plainVariant(value).toString()), fromUtf8(type.name()) }));
     return variant;
 }
 

@@ -3,6 +3,7 @@
 
 #include "grids/qt/model_row_set.h"
 
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -35,7 +36,7 @@ TextView ModelRowSet::fieldName(int field) const
 {
     if (field < 0 || field >= columns_.count())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"column", std::int64_t { field } + 1, columns_.count()));
+            noSuchItem(phrase(u"column"), std::int64_t { field } + 1, columns_.count()));
     return viewOf(names_[field]);
 }
 
@@ -47,17 +48,17 @@ void ModelRowSet::setPosition(std::int64_t position)
 Value ModelRowSet::value(int field)
 {
     if (!model_)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid's model is gone");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"the grid's model is gone"));
     const bool isField = field >= 0 && field < columns_.count();
     if (!isField)
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"column", std::int64_t { field } + 1, columns_.count()));
+            noSuchItem(phrase(u"column"), std::int64_t { field } + 1, columns_.count()));
     if (isBeforeFirst() || isAfterLast())
         throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", position_, recordCount()));
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), position_, recordCount()));
     const int row = rows_.logical(static_cast<int>(position_ - 1));
     if (row >= model_->rowCount(root_))
-        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the grid has lost rows");
+        throw RunTimeError(ErrorNumber::SubscriptOutOfRange, phrase(u"the grid has lost rows"));
     return held_.hold(model_->index(row, columns_.logical(field), root_).data(Qt::DisplayRole));
 }
 

@@ -4,6 +4,7 @@
 #include "grids/qt/object_class.h"
 
 #include "grids/qt/held_value.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -100,7 +101,8 @@ const ObjectMember& ObjectClass::member(MemberId member)
 {
     if (member < 0 || static_cast<std::size_t>(member) >= members_.size())
         throw RunTimeError(ErrorNumber::NoSuchMember,
-            noSuchItem(u"member number", member, static_cast<std::int64_t>(members_.size())));
+            noSuchItem(
+                phrase(u"member number"), member, static_cast<std::int64_t>(members_.size())));
     auto& known = members_[static_cast<std::size_t>(member)];
     if (!known)
         known = describe(nameOf(member));

@@ -5,6 +5,7 @@
 
 #include "grids/qt/model_row_set.h"
 #include "grids/qt/object_class.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -123,7 +124,7 @@ void ObjectGrid::pointAt(QObject& object)
 QObject& ObjectGrid::alive() const
 {
     if (!object_)
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"the object is gone");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"the object is gone"));
     return *object_;
 }
 

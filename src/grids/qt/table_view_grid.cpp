@@ -7,6 +7,7 @@
 #include "platform/drawing_surface.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -86,7 +87,7 @@ void TableViewGrid::put(MemberId member, std::span<const Value> arguments, const
 QTableView& TableViewGrid::view() const
 {
     if (!view_ || !view_->model())
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid is gone");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"the grid is gone"));
     return *view_;
 }
 
@@ -121,13 +122,13 @@ void TableViewGrid::readRow(
     const QModelIndex root = table.rootIndex();
     if (row < 1 || row > rows_.count())
         throw RunTimeError(
-            ErrorNumber::SubscriptOutOfRange, noSuchItem(u"row", row, rows_.count()));
+            ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), row, rows_.count()));
     const int modelRow = rows_.logical(row - 1);
     const int modelColumns = model.columnCount(root);
     for (const int column : columns) {
         const int modelColumn = columns_.logical(column);
         if (modelRow >= model.rowCount(root) || modelColumn >= modelColumns)
-            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the grid has lost rows");
+            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, phrase(u"the grid has lost rows"));
         take(text(table, root, { modelRow, modelColumn }));
     }
 }

@@ -9,6 +9,7 @@
 #include "grids/qt/view_sections.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -86,7 +87,7 @@ struct TreeViewGrid::Source {
     {
         QAbstractItemView* const view = tree ? static_cast<QAbstractItemView*>(tree.data()) : list;
         if (!view || !view->model())
-            throw RunTimeError(ErrorNumber::ObjectMissing, u"the grid is gone");
+            throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"the grid is gone"));
         return *view;
     }
 
@@ -212,7 +213,7 @@ struct TreeViewGrid::Source {
     {
         const auto at = static_cast<std::size_t>(place);
         if (watch.isChanged() || at >= rows.size())
-            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the list has changed");
+            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, phrase(u"the list has changed"));
         return rows[at];
     }
 };

@@ -6,6 +6,7 @@
 #include "controls/qt/default_platform.h"
 #include "host/qt/host_canvas.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/platform.h"
 #include "platform/printer.h"
 #include "platform/qt/qt_text.h"
@@ -25,9 +26,11 @@ void choosePrinter(const QString& name)
     const std::vector<Text> names = system.printerNames();
     if (std::ranges::find(names, wanted) == names.end())
         throw RunTimeError(ErrorNumber::InvalidCall,
-            wanted.empty() ? Text(u"there is no printer") : u"there is no printer " + wanted);
+            wanted.empty() ? phrase(u"there is no printer")
+                           : phrase(u"there is no printer %1", { wanted }));
     if (!system.opens(wanted))
-        throw RunTimeError(ErrorNumber::InvalidCall, u"the printer " + wanted + u" takes no jobs");
+        throw RunTimeError(
+            ErrorNumber::InvalidCall, phrase(u"the printer %1 takes no jobs", { wanted }));
     system.makeCurrent(wanted);
 }
 

@@ -9,6 +9,7 @@
 #include "document/records.h"
 #include "grids/qt/grid_for.h"
 #include "platform/file_bytes.h"
+#include "platform/phrase.h"
 #include "platform/platform.h"
 #include "platform/qt/file_names.h"
 #include "platform/qt/qt_text.h"
@@ -49,8 +50,8 @@ void Report::build(QObject& grid)
     canvas.m_PrintObj = gridKindOf(*object);
     canvas.doPreview(*object);
     if (canvas.table() == nullptr)
-        throw RunTimeError(
-            ErrorNumber::ObjectMissing, u"no column of the grid is wide enough to be printed");
+        throw RunTimeError(ErrorNumber::ObjectMissing,
+            phrase(u"no column of the grid is wide enough to be printed"));
 }
 
 void Report::open(const QString& path)
@@ -60,7 +61,8 @@ void Report::open(const QString& path)
     const std::filesystem::path file = pathOf(path);
     if (readOstl(canvas.platform().codec, file, canvas.document(), canvas.page)
         == OstlResult::BadHeader)
-        throw RunTimeError(ErrorNumber::TypeMismatch, pathText(file) + u" is no document file");
+        throw RunTimeError(
+            ErrorNumber::TypeMismatch, phrase(u"%1 is no document file", { pathText(file) }));
 }
 
 int Report::pageCount() const { return parts_->canvas.Totalpages(); }

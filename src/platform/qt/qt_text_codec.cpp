@@ -3,6 +3,7 @@
 
 #include "platform/qt/qt_text_codec.h"
 
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -44,7 +45,8 @@ QtTextCodec::QtTextCodec()
     , encoder_(CodePage)
 {
     if (!decoder_.isValid() || !encoder_.isValid())
-        throw RunTimeError(ErrorNumber::InvalidCall, u"this Qt has no converter for GB18030");
+        throw RunTimeError(
+            ErrorNumber::InvalidCall, phrase(u"this Qt has no converter for GB18030"));
 }
 
 Text QtTextCodec::decode(std::string_view bytes) const

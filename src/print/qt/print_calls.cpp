@@ -3,6 +3,7 @@
 
 #include "print/qt/print_calls.h"
 
+#include "platform/qt/qt_phrase.h"
 #include "print/qt/spooler.h"
 
 #include <algorithm>
@@ -195,8 +196,8 @@ bool PrintCalls::run(std::function<void()> work, milliseconds patience)
 
 QString silenceAfter(milliseconds time)
 {
-    return QStringLiteral("the print system does not answer (nothing came within %1 seconds)")
-        .arg(static_cast<double>(time.count()) / 1000);
+    return phrased(u"the print system does not answer (nothing came within %1 seconds)",
+        { QString::number(static_cast<double>(time.count()) / 1000) });
 }
 
 } // namespace pelloric::qt

@@ -3,6 +3,7 @@
 
 #include "print/qt/qt_printer.h"
 
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/units.h"
@@ -40,7 +41,7 @@ void requireRoom(const QString& printer)
     const QString folder = QDir::tempPath();
     const QStorageInfo storage(folder);
     if (storage.isValid() && storage.bytesAvailable() < RoomForDocument)
-        refuse(printer, QStringLiteral("no room for the document in %1").arg(folder));
+        refuse(printer, phrased(u"no room for the document in %1", { folder }));
 }
 
 /// What a printer says before a document begins.
@@ -236,7 +237,7 @@ void QtPrinter::endDoc()
     const std::unique_ptr<Document> document = std::move(document_);
     attributes_.current = {};
     if (!document->spool->draw(document->pages, { fonts_, faces_ }))
-        refuse(document->printer, QStringLiteral("the document could not be ended"));
+        refuse(document->printer, phrased(u"the document could not be ended"));
     const QString error = handOver(*document);
     if (!error.isEmpty())
         refuse(document->printer, error);
@@ -314,7 +315,7 @@ void QtPrinter::begin()
     document->asksForPassword = place_->asksForPassword;
     document->spool = newSpoolDocument({ printer, toQString(title_), place_->sheet });
     if (!document->spool)
-        refuse(printer, QStringLiteral("the document could not be begun"));
+        refuse(printer, phrased(u"the document could not be begun"));
     applyAttributes(document->pages.back());
     document_ = std::move(document);
 }

@@ -5,6 +5,7 @@
 
 #include "export/qt/qt_glyph_faces.h"
 #include "export/qt/qt_pdf_writer.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/units.h"
 #include "print/qt/held_pages.h"
@@ -43,13 +44,13 @@ using Destination = std::unique_ptr<cups_dest_t, FreeDestination>;
 struct RefusingState {
     const char* option;
     const char* value;
-    const char* meaning;
+    TextView meaning; ///< a phrase
 };
 
 /// In the order in which they are told.
 constexpr RefusingState RefusingStates[] = {
-    { "printer-is-accepting-jobs", "false", "the printer rejects jobs" },
-    { "printer-state", "5", "the printer is stopped" },
+    { "printer-is-accepting-jobs", "false", phraseText(u"the printer rejects jobs") },
+    { "printer-state", "5", phraseText(u"the printer is stopped") },
 };
 
 QString queueOf(const QString& printer) { return printer.section(u'/', 0, 0); }
@@ -70,10 +71,7 @@ const char* optionOf(const Destination& destination, const char* option)
 
 QString lastError() { return QString::fromUtf8(cupsLastErrorString()); }
 
-QString noAnswer()
-{
-    return QStringLiteral("the print system does not answer (%1)").arg(lastError());
-}
+QString noAnswer() { return phrased(u"the print system does not answer (%1)", { lastError() }); }
 
 int giveUp(http_t*, void*) { return 0; }
 
@@ -149,7 +147,7 @@ public:
         cupsFreeOptions(count, options);
         return job != 0
             ? QString()
-            : QStringLiteral("the print system did not take the document (%1)").arg(lastError());
+            : phrased(u"the print system did not take the document (%1)", { lastError() });
     }
 
 private:
@@ -223,16 +221,16 @@ QString silenceOfSystem()
 QString refusalOf(const QString& printer)
 {
     if (printer.isEmpty())
-        return QStringLiteral("there is no printer");
+        return phrased(u"there is no printer");
     const Destination destination = destinationOf(printer);
     if (!destination) {
         const QString silence = silenceOfSystem();
-        return silence.isEmpty() ? QStringLiteral("there is no such printer") : silence;
+        return silence.isEmpty() ? phrased(u"there is no such printer") : silence;
     }
     for (const RefusingState& state : RefusingStates) {
         const char* const value = optionOf(destination, state.option);
         if (value != nullptr && qstrcmp(value, state.value) == 0)
-            return QString::fromLatin1(state.meaning);
+            return phrased(state.meaning);
     }
     return {};
 }

@@ -3,6 +3,7 @@
 
 #include "print/qt/spooler.h"
 
+#include "platform/qt/qt_phrase.h"
 #include "print/qt/held_pages.h"
 
 #include <QPrinter>
@@ -52,12 +53,12 @@ QString silenceOfSystem() { return {}; }
 QString refusalOf(const QString& printer)
 {
     if (printer.isEmpty())
-        return QStringLiteral("there is no printer");
+        return phrased(u"there is no printer");
     const QPrinterInfo info = QPrinterInfo::printerInfo(printer);
     if (info.isNull())
-        return QStringLiteral("there is no such printer");
+        return phrased(u"there is no such printer");
     if (info.state() == QPrinter::Error)
-        return QStringLiteral("the printer is stopped");
+        return phrased(u"the printer is stopped");
     return {};
 }
 

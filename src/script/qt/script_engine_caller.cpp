@@ -4,6 +4,7 @@
 #include <pelloric/preview.h>
 
 #include "controls/qt/script_caller.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "script/qt/script_object.h"
@@ -45,7 +46,7 @@ public:
     {
         const auto value = argument.value<QJSValue>();
         if (value.isQObject() && value.toQObject() == nullptr)
-            throw RunTimeError(ErrorNumber::ObjectMissing, u"the object is gone");
+            throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"the object is gone"));
         return objectOfScript(value, qjsEngine(&control));
     }
 

@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "controls/member_table.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/file_names.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
@@ -144,7 +145,7 @@ Canvas& canvasOf(QObject* object)
 {
     auto* const control = qobject_cast<Sorvane*>(object);
     if (control == nullptr)
-        throw RunTimeError(ErrorNumber::TypeMismatch, u"a Sorvane was expected");
+        throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"a Sorvane was expected"));
     return control->canvas();
 }
 

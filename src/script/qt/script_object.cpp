@@ -5,6 +5,7 @@
 
 #include "grids/qt/grid_for.h"
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -38,8 +39,8 @@ QJSValue toScript(const Value& value)
     case ValueKind::Rows:
         break;
     }
-    throw RunTimeError(
-        ErrorNumber::TypeMismatch, u"an object of the library cannot be handed to a script's grid");
+    throw RunTimeError(ErrorNumber::TypeMismatch,
+        phrase(u"an object of the library cannot be handed to a script's grid"));
 }
 
 bool isPlain(const QJSValue& value)
@@ -132,7 +133,7 @@ Value ScriptObject::arrayMember(Member& member, std::span<const Value> arguments
     if (member.name == QLatin1String("Count"))
         return Value::ofNumber(value_.property(QStringLiteral("length")).toNumber());
     if (arguments.empty())
-        throw RunTimeError(ErrorNumber::NoSuchMember, u"Item needs an index");
+        throw RunTimeError(ErrorNumber::NoSuchMember, phrase(u"Item needs an index"));
     return answer(member, itemAt(value_, arguments.front(), firstItem_));
 }
 
@@ -146,7 +147,7 @@ Value ScriptObject::answer(Member& member, const QJSValue& result)
     if (isPlain(result))
         return member.held.hold(result.toVariant());
     if (!result.isObject())
-        throw RunTimeError(ErrorNumber::TypeMismatch, u"a symbol is no value");
+        throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"a symbol is no value"));
     member.answer = objectOfScript(result, engine_, countsFromOne(member.name) ? 1 : 0);
     return Value::ofObject(*member.answer);
 }
@@ -187,11 +188,11 @@ void ScriptObject::checkThrown() const
 QJSValue ScriptObject::itemAt(const QJSValue& array, const Value& index, int first) const
 {
     if (!array.isArray())
-        throw RunTimeError(ErrorNumber::NoSuchMember, u"only an array takes an index");
+        throw RunTimeError(ErrorNumber::NoSuchMember, phrase(u"only an array takes an index"));
     const int position = roundToInt32(index.toNumber()) - first;
     if (position < 0 || position >= array.property(QStringLiteral("length")).toInt())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
-            noSuchItem(u"item", std::int64_t { position } + first,
+            noSuchItem(phrase(u"item"), std::int64_t { position } + first,
                 array.property(QStringLiteral("length")).toInt()));
     return array.property(static_cast<quint32>(position));
 }
@@ -202,7 +203,7 @@ std::unique_ptr<AutomationObject> objectOfScript(
     if (value.isQObject() && value.toQObject() != nullptr)
         return gridFor(*value.toQObject());
     if (!value.isObject())
-        throw RunTimeError(ErrorNumber::ObjectMissing, u"an object was expected");
+        throw RunTimeError(ErrorNumber::ObjectMissing, phrase(u"an object was expected"));
     return std::make_unique<ScriptObject>(value, engine, firstItem);
 }
 

@@ -3,6 +3,7 @@
 
 #include "tables/qt/csv_table.h"
 
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "tables/separated_values.h"
@@ -73,8 +74,8 @@ bool nextRow(SeparatedValues& values)
     if (!values.nextRow())
         return false;
     if (values.valueCount() > MostColumns)
-        throw RunTimeError(
-            ErrorNumber::Overflow, atLine(values.line(), u"more than 32767 values in a row"));
+        throw RunTimeError(ErrorNumber::Overflow,
+            atLine(values.line(), phrase(u"more than 32767 values in a row")));
     return true;
 }
 
@@ -126,7 +127,7 @@ TableGrid makeGrid(
 {
     SeparatedValues values(text, dialect);
     if (!nextRow(values))
-        refuse(u"the file is empty");
+        refuse(phrase(u"the file is empty"));
     RowTexts row;
     TableGrid grid = gridOf(row.of(values));
     const std::size_t titles = values.valueCount();
@@ -152,7 +153,7 @@ void refuseZeroBytes(std::string_view text)
     if (zero == std::string_view::npos)
         return;
     const auto line = std::ranges::count(text.substr(0, zero), '\n') + 1;
-    refuse(atLine(line, u"a zero byte; this is no text file"));
+    refuse(atLine(line, phrase(u"a zero byte; this is no text file")));
 }
 
 Text gluedNote(const OddRows& odd)
@@ -161,20 +162,27 @@ Text gluedNote(const OddRows& odd)
     for (const std::int64_t line : odd.gluedLines)
         lines.append(lines.empty() ? u"" : u", ").append(decimal(line));
     if (odd.glued > odd.gluedLines.size())
-        lines.append(u" and others");
-    return (odd.glued == 1 ? u"the row at line " : u"the rows at lines ") + lines
-        + u" may be several rows glued together: a quoted value goes on over a line break, and the "
-          u"row has not as many values as the titles";
+        lines = phrase(u"%1 and others", { lines });
+    return phrase(odd.glued == 1
+            ? phraseText(
+                u"the row at line %1 may be several rows glued together: a quoted value goes "
+                u"on over a line break, and the row has not as many values as the titles")
+            : phraseText(
+                u"the rows at lines %1 may be several rows glued together: a quoted value goes "
+                u"on over a line break, and the row has not as many values as the titles"),
+        { lines });
 }
 
 Text raggedNote(const OddRows& odd, std::int64_t rows, char delimiter)
 {
     const Text between = delimiter == '\t'
-        ? Text(u"a tab")
+        ? phrase(u"a tab")
         : Text(u"\"") + Text(1, static_cast<char16_t>(delimiter)) + u"\"";
-    return decimal(static_cast<std::int64_t>(odd.ragged)) + u" of " + decimal(rows)
-        + u" rows have not as many values as the titles, the first at line "
-        + decimal(odd.raggedLine) + u"; is this a table with " + between + u" between its values?";
+    return phrase(
+        u"%1 of %2 rows have not as many values as the titles, the first at line %3; is this a "
+        u"table with %4 between its values?",
+        { decimal(static_cast<std::int64_t>(odd.ragged)), decimal(rows), decimal(odd.raggedLine),
+            between });
 }
 
 } // namespace
@@ -196,8 +204,9 @@ TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
     OddRows odd;
     TableGrid grid = makeGrid(file.text, dialect, options, odd);
     if (options.notes != nullptr && file.isGuessed)
-        options.notes->push_back(u"the encoding was guessed to be " + toText(file.encoding)
-            + u"; name another one if letters look wrong");
+        options.notes->push_back(
+            phrase(u"the encoding was guessed to be %1; name another one if letters look wrong",
+                { toText(file.encoding) }));
     if (options.notes != nullptr && odd.glued > 0)
         options.notes->push_back(gluedNote(odd));
     if (options.notes != nullptr && odd.ragged > 0)

@@ -3,6 +3,7 @@
 
 #include "tables/qt/json_table.h"
 
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <nlohmann/json.hpp>
@@ -20,8 +21,8 @@ namespace {
 constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max();
 constexpr std::string_view Blanks = " \t\r\n";
 
-constexpr TextView WantedShape
-    = u"a table is an array of objects, [{\"name\": value, …}, …], or one object a line";
+constexpr TextView WantedShape = phraseText(
+    u"a table is an array of objects, [{\"name\": value, …}, …], or one object a line");
 
 [[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::TypeMismatch, what); }
 
@@ -105,7 +106,7 @@ public:
             return true;
         }
         column_ = names_.columnOf(name);
-        return column_ < MostColumns || refuseWith(u"more than 32767 different names");
+        return column_ < MostColumns || refuseWith(phrase(u"more than 32767 different names"));
     }
     bool end_object() override
     {
@@ -142,7 +143,7 @@ private:
         return false;
     }
 
-    bool refuseShape() { return refuseWith(WantedShape); }
+    bool refuseShape() { return refuseWith(phrase(WantedShape)); }
 
     /// @param json   as it stands in a nested value
     /// @param plain  as a cell shows it
@@ -223,8 +224,8 @@ std::int64_t lineAt(std::string_view text, std::size_t position)
 Text explained(const std::string& error)
 {
     const std::size_t colon = error.rfind(": ");
-    return u"this is no JSON: "
-        + fromUtf8(colon == std::string::npos ? error : error.substr(colon + 2));
+    return phrase(u"this is no JSON: %1",
+        { fromUtf8(colon == std::string::npos ? error : error.substr(colon + 2)) });
 }
 
 /// @param firstLine  of the text in its file
@@ -245,7 +246,7 @@ void parseAll(std::string_view text, bool isOne, Names& names, TableGrid* grid)
 {
     const std::size_t first = text.find_first_not_of(Blanks);
     if (first == std::string_view::npos)
-        refuse(u"the file is empty");
+        refuse(phrase(u"the file is empty"));
     if (isOne || text[first] == '[') {
         TableReceiver receiver(names, grid, isOne);
         parse(text, receiver, 1);
@@ -295,8 +296,9 @@ void refuseNestedObject(std::string_view text)
     const nlohmann::json object = nlohmann::json::parse(text);
     const auto isPlain = [](const nlohmann::json& value) { return value.is_primitive(); };
     if (!std::ranges::all_of(object, isPlain))
-        refuse(u"the file is one object; " + Text(WantedShape)
-            + u"; take the array out of it, for example with: jq " + pathOfRows(object));
+        refuse(
+            phrase(u"the file is one object; %1; take the array out of it, for example with: jq %2",
+                { phrase(WantedShape), pathOfRows(object) }));
 }
 
 bool hasLineName(const std::filesystem::path& path)

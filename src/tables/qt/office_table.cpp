@@ -4,6 +4,7 @@
 #include "tables/qt/office_table.h"
 
 #include "platform/file_bytes.h"
+#include "platform/phrase.h"
 #include "platform/qt/file_names.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -44,13 +45,14 @@ std::filesystem::path converted(const std::filesystem::path& path, const QTempor
 {
     const QString program = QStandardPaths::findExecutable(QStringLiteral("soffice"));
     if (program.isEmpty())
-        refuse(u"this office file has to be converted by LibreOffice, which is not installed; "
-               u"install libreoffice-calc, or save the file as .xlsx, .ods or CSV");
+        refuse(
+            phrase(u"this office file has to be converted by LibreOffice, which is not installed; "
+                   u"install libreoffice-calc, or save the file as .xlsx, .ods or CSV"));
     // Under a name of our own, for LibreOffice takes a name that begins with "-" for an option.
     const QString name = folder.filePath(QStringLiteral("table")) + extensionOf(path);
     std::error_code error;
     if (!std::filesystem::copy_file(path, pathOf(name), error))
-        refuse(u"the file cannot be copied to convert it");
+        refuse(phrase(u"the file cannot be copied to convert it"));
     QProcess process;
     process.start(program,
         { QStringLiteral("--headless"), QStringLiteral("--convert-to"), QStringLiteral("xlsx"),
@@ -58,7 +60,7 @@ std::filesystem::path converted(const std::filesystem::path& path, const QTempor
     const bool hasEnded = process.waitForFinished(ConversionTime);
     const QString made = folder.filePath(QStringLiteral("table.xlsx"));
     if (!hasEnded || process.exitCode() != 0 || !QFileInfo::exists(made))
-        refuse(u"LibreOffice could not convert this file; save it as .xlsx, .ods or CSV");
+        refuse(phrase(u"LibreOffice could not convert this file; save it as .xlsx, .ods or CSV"));
     return pathOf(made);
 }
 

@@ -3,6 +3,7 @@
 
 #include "tables/qt/sheet_cells.h"
 
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -42,7 +43,7 @@ void SheetCells::put(
     std::int64_t row, std::int64_t column, Text text, const SheetLook& look, SheetValue value)
 {
     if (row < 0 || row >= MostRows || column < 0 || column >= MostSheetColumns)
-        throw RunTimeError(ErrorNumber::Overflow, u"a cell past the end of its sheet");
+        throw RunTimeError(ErrorNumber::Overflow, phrase(u"a cell past the end of its sheet"));
     if (text.empty())
         return;
     if (rows_.size() <= static_cast<std::size_t>(row))
@@ -70,7 +71,7 @@ TableGrid SheetCells::toTable() const
     const auto titles = std::ranges::find_if(rows_,
         [&](const std::vector<Cell>& cells) { return std::ranges::any_of(cells, isFilled); });
     if (titles == rows_.end())
-        throw RunTimeError(ErrorNumber::TypeMismatch, u"the sheet is empty");
+        throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"the sheet is empty"));
     std::vector<TableColumn> columns(end - first, TableColumn { .title = {}, .width = -1 });
     for (std::size_t column = first; column < titles->size(); ++column)
         columns[column - first] = { .title = (*titles)[column].text,
@@ -95,14 +96,15 @@ TableGrid SheetCells::toTable() const
 void refuseSheet(const QString& sheet, const QStringList& present)
 {
     throw RunTimeError(ErrorNumber::InvalidCall,
-        toText(QStringLiteral("no sheet %1; the file has: %2")
-                   .arg(sheet, present.join(QStringLiteral(", ")))));
+        phrase(u"no sheet %1; the file has: %2",
+            { toText(sheet), toText(present.join(QStringLiteral(", "))) }));
 }
 
 void refuseDamaged()
 {
     throw RunTimeError(ErrorNumber::TypeMismatch,
-        u"the office file is damaged; open it in its program and save it again, or save it as CSV");
+        phrase(u"the office file is damaged; open it in its program and save it again, or save it "
+               u"as CSV"));
 }
 
 } // namespace pelloric::qt

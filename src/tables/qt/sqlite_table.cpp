@@ -5,6 +5,7 @@
 
 #include "grids/qt/held_value.h"
 #include "platform/file_bytes.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -35,17 +36,14 @@ constexpr const char* ReadingWords[] = { "SELECT", "WITH", "VALUES", "PRAGMA", "
 constexpr char NoDatabase[] = "26";
 constexpr char Misuse[] = "21"; ///< the driver's own: more than one statement
 
-[[noreturn]] void refuse(const QString& what)
-{
-    throw RunTimeError(ErrorNumber::InvalidCall, toText(what));
-}
+[[noreturn]] void refuse(const Text& what) { throw RunTimeError(ErrorNumber::InvalidCall, what); }
 
 /// Refuses what the database refused, in its words.
 [[noreturn]] void refuse(const QSqlError& error)
 {
     if (error.nativeErrorCode() == QLatin1String(Misuse))
-        refuse(QStringLiteral("give one statement only"));
-    refuse(error.databaseText());
+        refuse(phrase(u"give one statement only"));
+    refuse(toText(error.databaseText()));
 }
 
 bool isReading(const QString& statement)
@@ -101,8 +99,8 @@ Opening openingOf(const std::filesystem::path& path, std::optional<QTemporaryDir
     if (!none)
         std::filesystem::copy_file(log, beside(copy, "-wal"), none);
     if (none)
-        refuse(QStringLiteral("the database cannot be copied to read its log: ")
-            + QString::fromStdString(none.message()));
+        refuse(phrase(
+            u"the database cannot be copied to read its log: %1", { fromUtf8(none.message()) }));
     return { copy };
 }
 
@@ -155,7 +153,7 @@ QStringList tablesOf(const QSqlDatabase& database)
                                              "ESCAPE '\\' ORDER BY name");
     if (!query.exec(statement)) {
         if (query.lastError().nativeErrorCode() == QLatin1String(NoDatabase))
-            refuse(QStringLiteral("this is no SQLite database"));
+            refuse(phrase(u"this is no SQLite database"));
         refuse(query.lastError());
     }
     QStringList names;
@@ -167,15 +165,16 @@ QStringList tablesOf(const QSqlDatabase& database)
 QString chosenTable(const SqliteSource& source, const QStringList& tables)
 {
     if (tables.isEmpty())
-        refuse(QStringLiteral("the database has no table"));
+        refuse(phrase(u"the database has no table"));
     const QString list = tables.join(QStringLiteral(", "));
     if (source.table.isEmpty()) {
         if (tables.size() != 1)
-            refuse(QStringLiteral("name one of the database's tables: ") + list);
+            refuse(phrase(u"name one of the database's tables: %1", { toText(list) }));
         return tables.front();
     }
     if (!tables.contains(source.table, Qt::CaseInsensitive))
-        refuse(QStringLiteral("no table %1; the database has: %2").arg(source.table, list));
+        refuse(
+            phrase(u"no table %1; the database has: %2", { toText(source.table), toText(list) }));
     return source.table;
 }
 
@@ -248,7 +247,7 @@ TableGrid readSqlite(const SqliteSource& source)
         throw RunTimeError(ErrorNumber::FileNotFound, pathText(source.path));
     const QStringList tables = tablesOf(connection.database());
     if (!source.query.isEmpty() && !isReading(source.query))
-        refuse(QStringLiteral("the statement is no query; give a SELECT"));
+        refuse(phrase(u"the statement is no query; give a SELECT"));
     const QString statement = source.query.isEmpty()
         ? QStringLiteral("SELECT * FROM ") + quoted(chosenTable(source, tables))
         : source.query;
@@ -257,7 +256,7 @@ TableGrid readSqlite(const SqliteSource& source)
     if (!query.exec(statement))
         refuse(query.lastError());
     if (!query.isSelect() || query.record().isEmpty())
-        refuse(QStringLiteral("the statement answers no rows; give a SELECT"));
+        refuse(phrase(u"the statement answers no rows; give a SELECT"));
     return readRows(source, query);
 }
 

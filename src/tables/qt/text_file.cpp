@@ -4,6 +4,7 @@
 #include "tables/qt/text_file.h"
 
 #include "platform/file_bytes.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "tables/file_kinds.h"
@@ -137,8 +138,7 @@ TextFile decodeAs(std::string bytes, const QByteArray& encoding, TextView whoSay
     Decoded decoded = decode(bytes, encoding);
     const std::size_t unit = unitOf(encoding);
     if (!decoded.isWhole || bytes.size() % unit != 0)
-        refuseBytes(unit > 1 ? 0 : badLine(bytes, encoding),
-            u"bytes that are no " + named(encoding) + Text(whoSays));
+        refuseBytes(unit > 1 ? 0 : badLine(bytes, encoding), phrase(whoSays, { named(encoding) }));
     return { std::move(decoded.text), QString::fromLatin1(encoding) };
 }
 
@@ -206,31 +206,34 @@ TextFile decodeGuessed(std::string_view bytes)
     }
     // The encoding that fits longer is the likelier one.
     refuseBytes(std::max(badLine(bytes, Utf8), badLine(bytes, Gb18030)),
-        u"bytes that are neither UTF-8 nor GB18030 text; name the encoding");
+        phrase(u"bytes that are neither UTF-8 nor GB18030 text; name the encoding"));
 }
 
 } // namespace
 
 Text atLine(std::int64_t line, TextView what)
 {
-    return (u"line " + decimal(line) + u": ").append(what);
+    return phrase(u"line %1: %2", { decimal(line), what });
 }
 
 TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options)
 {
     std::string bytes = readAll(path, options);
     if (const TextView kind = notATable(bytes); !kind.empty())
-        refuse(Text(kind));
+        refuse(phrase(kind));
     if (!options.encoding.isEmpty()) {
         const QByteArray encoding = options.encoding.toLatin1();
         if (!QStringDecoder(encoding.constData()).isValid())
-            refuse(u"unknown encoding " + toText(options.encoding)
-                + u"; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others");
-        return decodeAs(std::move(bytes), encoding, u"");
+            refuse(phrase(
+                u"unknown encoding %1; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, "
+                u"among others",
+                { toText(options.encoding) }));
+        return decodeAs(std::move(bytes), encoding, phraseText(u"bytes that are no %1"));
     }
     if (const QByteArray marked = encodingOfMark(std::string_view(bytes).substr(0, 4));
         !marked.isEmpty())
-        return decodeAs(std::move(bytes), marked, u", which the file's mark says it is");
+        return decodeAs(std::move(bytes), marked,
+            phraseText(u"bytes that are no %1, which the file's mark says it is"));
     if (isUtf8(bytes))
         return { std::move(bytes), QString::fromLatin1(Utf8) };
     return decodeGuessed(bytes);

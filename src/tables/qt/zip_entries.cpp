@@ -3,6 +3,7 @@
 
 #include "tables/qt/zip_entries.h"
 
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <zip.h>
@@ -17,7 +18,8 @@ constexpr zip_uint64_t LargestEntry = 1ULL << 31U;
 [[noreturn]] void refuse()
 {
     throw RunTimeError(ErrorNumber::TypeMismatch,
-        u"the office file is damaged; open it in its program and save it again, or save it as CSV");
+        phrase(u"the office file is damaged; open it in its program and save it again, or save it "
+               u"as CSV"));
 }
 
 struct CloseEntry {
@@ -49,7 +51,7 @@ QByteArray ZipEntries::read(const QByteArray& name) const
     if (zip_stat(archive_.get(), name.constData(), 0, &facts) != 0)
         return {};
     if (facts.size >= LargestEntry)
-        throw RunTimeError(ErrorNumber::Overflow, u"the office file holds more than 2 GB");
+        throw RunTimeError(ErrorNumber::Overflow, phrase(u"the office file holds more than 2 GB"));
     const std::unique_ptr<zip_file, CloseEntry> file(
         zip_fopen(archive_.get(), name.constData(), 0));
     QByteArray bytes(static_cast<qsizetype>(facts.size), Qt::Uninitialized);

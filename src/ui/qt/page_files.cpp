@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "export/qt/page_export.h"
 #include "platform/file_bytes.h"
+#include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "ui/qt/preview_prompts.h"
@@ -123,7 +124,7 @@ void savePages(
     const PageFile* const kind = kindOf(path);
     if (kind == nullptr)
         throw RunTimeError(ErrorNumber::InvalidCall,
-            pathText(path) + u": the name must end in .pdf, .png or .svg");
+            phrase(u"%1: the name must end in .pdf, .png or .svg", { pathText(path) }));
     const ExportOptions options { .title = canvas.documentTitle(), .progress = progress };
     canvas.keepDocument([&] { kind->write(canvas, fonts, options, path); });
 }

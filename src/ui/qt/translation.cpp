@@ -3,6 +3,9 @@
 
 #include "ui/qt/translation.h"
 
+#include "platform/phrase.h"
+#include "platform/qt/qt_text.h"
+
 #include <QCoreApplication>
 #include <QTranslator>
 
@@ -14,9 +17,20 @@ static void initCatalogues() { Q_INIT_RESOURCE(pelloric_catalogues); }
 
 namespace pelloric::qt {
 
+namespace {
+
+/// What the core says, in the language of the catalogues that are installed.
+Text translatedPhrase(TextView english)
+{
+    return toText(QCoreApplication::translate(PhraseContext, toUtf8(english).c_str()));
+}
+
+} // namespace
+
 bool installTranslation(const QLocale& locale)
 {
     initCatalogues();
+    usePhraseTranslator(translatedPhrase);
     return installTranslation(locale, QStringLiteral("pelloric"));
 }
 

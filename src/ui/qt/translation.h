@@ -10,6 +10,9 @@
 
 namespace pelloric::qt {
 
+/// The context of the phrases of the core in the catalogues.
+inline constexpr char PhraseContext[] = "Phrase";
+
 /// The same as `installTranslation` of one argument from another catalogue that is compiled in, for
 /// programs that add texts of their own.
 /// @param name  of the files ":/pelloric/translations/NAME_LANGUAGE.qm"; one catalogue of each name

@@ -4,7 +4,10 @@
 #include "ui/qt/translation.h"
 
 #include "fakes/fake_platform.h"
+#include "platform/phrase.h"
+#include "platform/run_time_error.h"
 #include "support/test_paths.h"
+#include "ui/preview_notice.h"
 #include "ui/qt/font_chooser.h"
 #include "ui/qt/grid_style_dialog.h"
 #include "ui/qt/page_setup_dialog.h"
@@ -180,6 +183,20 @@ TEST_F(TranslationTest, GoesBackToEnglishForALanguageThatIsNotThere)
     EXPECT_TRUE(installTranslation(QLocale("de")));
     EXPECT_TRUE(installTranslation(QLocale("en_GB")));
     EXPECT_EQ(FontChooser(ColoredFont {}).windowTitle(), "Font");
+}
+
+TEST_F(TranslationTest, TranslatesWhatTheCoreSays)
+{
+    ASSERT_TRUE(installTranslation(QLocale("de")));
+    EXPECT_EQ(
+        RunTimeError(ErrorNumber::FileNotFound, u"a.ini").text(), u"Datei nicht gefunden: a.ini");
+    const auto notice = noticeOfError(
+        RunTimeError(ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"page"), 9, 5)));
+    EXPECT_EQ(notice.text, u"Index außerhalb des Bereichs: Seite 9; es gibt 5.");
+    ASSERT_TRUE(installTranslation(QLocale("zh_CN")));
+    EXPECT_EQ(RunTimeError(ErrorNumber::FileNotFound, u"a.ini").text(), u"文件未找到: a.ini");
+    installTranslation(QLocale("fi"));
+    EXPECT_EQ(RunTimeError(ErrorNumber::FileNotFound, u"a.ini").text(), u"File not found: a.ini");
 }
 
 TEST_F(TranslationTest, LeavesWhatIsPublishedAsItStandsInEveryLanguage)

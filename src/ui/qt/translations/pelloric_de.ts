@@ -49,6 +49,765 @@
     </message>
 </context>
 <context>
+    <name>Phrase</name>
+    <message>
+        <source>no report was built yet</source>
+        <translation>es wurde noch kein Bericht aufgebaut</translation>
+    </message>
+    <message>
+        <source>nobody opens the preview window</source>
+        <translation>niemand öffnet das Vorschaufenster</translation>
+    </message>
+    <message>
+        <source>doPreview was given no grid</source>
+        <translation>doPreview hat kein Gitter bekommen</translation>
+    </message>
+    <message>
+        <source>%1 was given where a plain value is wanted</source>
+        <translation>%1 wurde übergeben, verlangt ist ein einfacher Wert</translation>
+    </message>
+    <message>
+        <source>%1 was given where a number is wanted</source>
+        <translation>%1 wurde übergeben, verlangt ist eine Zahl</translation>
+    </message>
+    <message>
+        <source>no grid was given</source>
+        <translation>es wurde kein Gitter übergeben</translation>
+    </message>
+    <message>
+        <source>%1 was given where a grid is wanted</source>
+        <translation>%1 wurde übergeben, verlangt ist ein Gitter</translation>
+    </message>
+    <message>
+        <source>%1 is damaged: %2; what stands before it was read</source>
+        <translation>%1 ist beschädigt: %2; was davor steht, wurde gelesen</translation>
+    </message>
+    <message>
+        <source>page</source>
+        <translation>Seite</translation>
+    </message>
+    <message>
+        <source>a document holds at most 32767 pages</source>
+        <translation>ein Dokument fasst höchstens 32767 Seiten</translation>
+    </message>
+    <message>
+        <source>on page %1 line</source>
+        <translation>auf Seite %1 Linie</translation>
+    </message>
+    <message>
+        <source>on page %1 text</source>
+        <translation>auf Seite %1 Text</translation>
+    </message>
+    <message>
+        <source>a font of %1 points is too large to be measured; choose a smaller size</source>
+        <translation>eine Schrift von %1 Punkt ist zu groß, um gemessen zu werden; wählen Sie eine kleinere</translation>
+    </message>
+    <message>
+        <source>a text of more than 4294967295 characters cannot be recorded</source>
+        <translation>ein Text von mehr als 4294967295 Zeichen kann nicht aufgenommen werden</translation>
+    </message>
+    <message>
+        <source>paper of %1 by %2 twips cannot be written; each side is 1 to %3 twips (200 inches)</source>
+        <translation>Papier von %1 mal %2 Twips kann nicht geschrieben werden; jede Seite ist 1 bis %3 Twips lang (200 Zoll)</translation>
+    </message>
+    <message>
+        <source>the document has no page to write</source>
+        <translation>das Dokument hat keine Seite, die geschrieben werden könnte</translation>
+    </message>
+    <message>
+        <source>there is no memory for an image of %1 by %2 pixels; choose a lower resolution</source>
+        <translation>für ein Bild von %1 mal %2 Pixeln reicht der Speicher nicht; wählen Sie eine niedrigere Auflösung</translation>
+    </message>
+    <message>
+        <source>an image of %1 by %2 pixels (%3 per inch) cannot be made; it has 1 to %4, so choose another resolution</source>
+        <translation>ein Bild von %1 mal %2 Pixeln (%3 je Zoll) kann nicht gemacht werden; es hat 1 bis %4, wählen Sie also eine andere Auflösung</translation>
+    </message>
+    <message>
+        <source>the font %1 is damaged</source>
+        <translation>die Schrift %1 ist beschädigt</translation>
+    </message>
+    <message>
+        <source>the font %1 may not be embedded</source>
+        <translation>die Schrift %1 darf nicht eingebettet werden</translation>
+    </message>
+    <message>
+        <source>the font %1 is a variable or coloured font</source>
+        <translation>die Schrift %1 ist eine variable oder farbige Schrift</translation>
+    </message>
+    <message>
+        <source>the font %1 has no outlines of a kind that can be embedded</source>
+        <translation>die Schrift %1 hat keine Umrisse, die eingebettet werden können</translation>
+    </message>
+    <message>
+        <source>the grid is gone</source>
+        <translation>das Gitter gibt es nicht mehr</translation>
+    </message>
+    <message>
+        <source>%1 is past what the member holds</source>
+        <translation>%1 ist mehr, als das Element fasst</translation>
+    </message>
+    <message>
+        <source>an object is no plain value</source>
+        <translation>ein Objekt ist kein einfacher Wert</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no %2</source>
+        <translation>„%1“ ist kein %2</translation>
+    </message>
+    <message>
+        <source>column</source>
+        <translation>Spalte</translation>
+    </message>
+    <message>
+        <source>the grid&apos;s model is gone</source>
+        <translation>das Modell des Gitters gibt es nicht mehr</translation>
+    </message>
+    <message>
+        <source>row</source>
+        <translation>Zeile</translation>
+    </message>
+    <message>
+        <source>the grid has lost rows</source>
+        <translation>das Gitter hat Zeilen verloren</translation>
+    </message>
+    <message>
+        <source>member number</source>
+        <translation>Element Nummer</translation>
+    </message>
+    <message>
+        <source>the object is gone</source>
+        <translation>das Objekt gibt es nicht mehr</translation>
+    </message>
+    <message>
+        <source>the list has changed</source>
+        <translation>die Liste hat sich geändert</translation>
+    </message>
+    <message>
+        <source>a row of %1 cells; there are %2 columns</source>
+        <translation>eine Zeile von %1 Zellen; es gibt %2 Spalten</translation>
+    </message>
+    <message>
+        <source>row %1 holds more than 4294967295 characters</source>
+        <translation>Zeile %1 enthält mehr als 4294967295 Zeichen</translation>
+    </message>
+    <message>
+        <source>there is no printer</source>
+        <translation>es gibt keinen Drucker</translation>
+    </message>
+    <message>
+        <source>there is no printer %1</source>
+        <translation>es gibt keinen Drucker %1</translation>
+    </message>
+    <message>
+        <source>the printer %1 takes no jobs</source>
+        <translation>der Drucker %1 nimmt keine Aufträge an</translation>
+    </message>
+    <message>
+        <source>no column of the grid is wide enough to be printed</source>
+        <translation>keine Spalte des Gitters ist breit genug, um gedruckt zu werden</translation>
+    </message>
+    <message>
+        <source>%1 is no document file</source>
+        <translation>%1 ist keine Dokumentdatei</translation>
+    </message>
+    <message>
+        <source>%1 holds more than %2 bytes</source>
+        <translation>%1 enthält mehr als %2 Byte</translation>
+    </message>
+    <message>
+        <source>an index is missing</source>
+        <translation>ein Index fehlt</translation>
+    </message>
+    <message>
+        <source>index %1</source>
+        <translation>Index %1</translation>
+    </message>
+    <message>
+        <source>%1 is past what a single-precision number holds</source>
+        <translation>%1 ist mehr, als eine Zahl einfacher Genauigkeit fasst</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no whole number between -32768 and 32767</source>
+        <translation>„%1“ ist keine ganze Zahl zwischen -32768 und 32767</translation>
+    </message>
+    <message>
+        <source>this Qt has no converter for GB18030</source>
+        <translation>dieses Qt kann GB18030 nicht umwandeln</translation>
+    </message>
+    <message>
+        <source>row %1, column %2 holds %3 characters, at most %4 can be printed</source>
+        <translation>Zeile %1, Spalte %2 enthält %3 Zeichen, höchstens %4 können gedruckt werden</translation>
+    </message>
+    <message>
+        <source>Invalid procedure call or argument</source>
+        <translation>Ungültiger Aufruf oder ungültiges Argument</translation>
+    </message>
+    <message>
+        <source>Overflow</source>
+        <translation>Überlauf</translation>
+    </message>
+    <message>
+        <source>Subscript out of range</source>
+        <translation>Index außerhalb des Bereichs</translation>
+    </message>
+    <message>
+        <source>Division by zero</source>
+        <translation>Division durch null</translation>
+    </message>
+    <message>
+        <source>Type mismatch</source>
+        <translation>Typen unverträglich</translation>
+    </message>
+    <message>
+        <source>File not found</source>
+        <translation>Datei nicht gefunden</translation>
+    </message>
+    <message>
+        <source>The file cannot be written</source>
+        <translation>Die Datei kann nicht geschrieben werden</translation>
+    </message>
+    <message>
+        <source>Disk full</source>
+        <translation>Datenträger voll</translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation>Zugriff verweigert</translation>
+    </message>
+    <message>
+        <source>Object variable not set</source>
+        <translation>Objektvariable nicht gesetzt</translation>
+    </message>
+    <message>
+        <source>Object doesn&apos;t support this property or method</source>
+        <translation>Objekt unterstützt diese Eigenschaft oder Methode nicht</translation>
+    </message>
+    <message>
+        <source>Cancel was selected</source>
+        <translation>Abbrechen wurde gewählt</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Fehler</translation>
+    </message>
+    <message>
+        <source>%1 %2; there is %3</source>
+        <translation>%1 %2; es gibt %3</translation>
+    </message>
+    <message>
+        <source>%1 %2; there are %3</source>
+        <translation>%1 %2; es gibt %3</translation>
+    </message>
+    <message>
+        <source>%1 is not between %2 and %3</source>
+        <translation>%1 liegt nicht zwischen %2 und %3</translation>
+    </message>
+    <message>
+        <source>an object is no number</source>
+        <translation>ein Objekt ist keine Zahl</translation>
+    </message>
+    <message>
+        <source>an object was expected</source>
+        <translation>ein Objekt wurde erwartet</translation>
+    </message>
+    <message>
+        <source>a row set was expected</source>
+        <translation>eine Zeilenmenge wurde erwartet</translation>
+    </message>
+    <message>
+        <source>an object has no text</source>
+        <translation>ein Objekt hat keinen Text</translation>
+    </message>
+    <message>
+        <source>the page list names too many pages; write fewer ranges</source>
+        <translation>die Seitenliste nennt zu viele Seiten; schreiben Sie weniger Bereiche</translation>
+    </message>
+    <message>
+        <source>The pages are %1, the printer&apos;s sheet is %2 (%3): what does not fit on it is lost.</source>
+        <translation>Die Seiten sind %1 groß, das Blatt des Druckers ist %2 (%3): Was nicht darauf passt, geht verloren.</translation>
+    </message>
+    <message>
+        <source>The pages are %1, the printer&apos;s sheet is %2 (%3).</source>
+        <translation>Die Seiten sind %1 groß, das Blatt des Druckers ist %2 (%3).</translation>
+    </message>
+    <message>
+        <source>after %1 of %2 pages</source>
+        <translation>nach %1 von %2 Seiten</translation>
+    </message>
+    <message>
+        <source>the print system does not answer (nothing came within %1 seconds)</source>
+        <translation>das Drucksystem antwortet nicht (%1 Sekunden lang kam nichts)</translation>
+    </message>
+    <message>
+        <source>no room for the document in %1</source>
+        <translation>kein Platz für das Dokument in %1</translation>
+    </message>
+    <message>
+        <source>the document could not be ended</source>
+        <translation>das Dokument konnte nicht beendet werden</translation>
+    </message>
+    <message>
+        <source>the document could not be begun</source>
+        <translation>das Dokument konnte nicht begonnen werden</translation>
+    </message>
+    <message>
+        <source>the printer rejects jobs</source>
+        <translation>der Drucker weist Aufträge ab</translation>
+    </message>
+    <message>
+        <source>the printer is stopped</source>
+        <translation>der Drucker ist angehalten</translation>
+    </message>
+    <message>
+        <source>the print system does not answer (%1)</source>
+        <translation>das Drucksystem antwortet nicht (%1)</translation>
+    </message>
+    <message>
+        <source>the print system did not take the document (%1)</source>
+        <translation>das Drucksystem hat das Dokument nicht angenommen (%1)</translation>
+    </message>
+    <message>
+        <source>there is no such printer</source>
+        <translation>diesen Drucker gibt es nicht</translation>
+    </message>
+    <message>
+        <source>field</source>
+        <translation>Feld</translation>
+    </message>
+    <message>
+        <source>the grid prints no column &quot;%1&quot;</source>
+        <translation>das Gitter druckt keine Spalte „%1“</translation>
+    </message>
+    <message>
+        <source>this grid does not tell which of its rows are marked</source>
+        <translation>dieses Gitter sagt nicht, welche seiner Zeilen markiert sind</translation>
+    </message>
+    <message>
+        <source>no row of the grid is marked; mark rows, or print all</source>
+        <translation>keine Zeile des Gitters ist markiert; markieren Sie Zeilen, oder drucken Sie alle</translation>
+    </message>
+    <message>
+        <source>more than 32767 columns are printed; leave some out</source>
+        <translation>mehr als 32767 Spalten werden gedruckt; lassen Sie welche weg</translation>
+    </message>
+    <message>
+        <source>the grid has %1 columns, at most %2 can be read</source>
+        <translation>das Gitter hat %1 Spalten, höchstens %2 können gelesen werden</translation>
+    </message>
+    <message>
+        <source>the grid prints %1 columns now, the report was built with %2; preview it anew</source>
+        <translation>das Gitter druckt jetzt %1 Spalten, der Bericht hat %2; öffnen Sie die Vorschau neu</translation>
+    </message>
+    <message>
+        <source>the data grid has more columns than fields</source>
+        <translation>das Datengitter hat mehr Spalten als Felder</translation>
+    </message>
+    <message>
+        <source>m_PrintObj names no kind of grid</source>
+        <translation>m_PrintObj nennt keine Art von Gitter</translation>
+    </message>
+    <message>
+        <source>the data source never comes to its first record</source>
+        <translation>die Datenquelle kommt nie zu ihrem ersten Datensatz</translation>
+    </message>
+    <message>
+        <source>the colour %1 of the font %2 is not between 0 and 16777215</source>
+        <translation>die Farbe %1 der Schrift %2 liegt nicht zwischen 0 und 16777215</translation>
+    </message>
+    <message>
+        <source>the report needs about %1 pages, a document holds %2; print rows 1 to %3, or leave out columns</source>
+        <translation>der Bericht braucht etwa %1 Seiten, ein Dokument fasst %2; drucken Sie die Zeilen 1 bis %3, oder lassen Sie Spalten weg</translation>
+    </message>
+    <message>
+        <source>not even the first rows fit on the %1 pages that a document holds; choose larger paper, or leave out columns</source>
+        <translation>nicht einmal die ersten Zeilen passen auf die %1 Seiten, die ein Dokument fasst; wählen Sie größeres Papier, oder lassen Sie Spalten weg</translation>
+    </message>
+    <message>
+        <source>1 is portrait and 2 is landscape</source>
+        <translation>1 ist Hochformat und 2 ist Querformat</translation>
+    </message>
+    <message>
+        <source>the number of a paper is a whole number, such as 9</source>
+        <translation>die Nummer eines Papiers ist eine ganze Zahl, etwa 9</translation>
+    </message>
+    <message>
+        <source>this margin is at most 361 mm</source>
+        <translation>dieser Rand ist höchstens 361 mm</translation>
+    </message>
+    <message>
+        <source>this margin is at most 321 mm</source>
+        <translation>dieser Rand ist höchstens 321 mm</translation>
+    </message>
+    <message>
+        <source>this margin is at most 481 mm</source>
+        <translation>dieser Rand ist höchstens 481 mm</translation>
+    </message>
+    <message>
+        <source>a sheet is wider than 0 and no wider than 5779 mm</source>
+        <translation>ein Blatt ist breiter als 0 und höchstens 5779 mm breit</translation>
+    </message>
+    <message>
+        <source>a sheet is higher than 0 and no higher than 5779 mm</source>
+        <translation>ein Blatt ist höher als 0 und höchstens 5779 mm hoch</translation>
+    </message>
+    <message>
+        <source>a colour is a number from 0 to 16777215</source>
+        <translation>eine Farbe ist eine Zahl von 0 bis 16777215</translation>
+    </message>
+    <message>
+        <source>a font size is a number of points above 0, at most 16000</source>
+        <translation>eine Schriftgröße ist eine Zahl von Punkten über 0, höchstens 16000</translation>
+    </message>
+    <message>
+        <source>%1 in %2</source>
+        <translation>%1 in %2</translation>
+    </message>
+    <message>
+        <source>%1 and %2 more settings</source>
+        <translation>%1 und %2 weitere Einstellungen</translation>
+    </message>
+    <message>
+        <source>%1 and %2</source>
+        <translation>%1 und %2</translation>
+    </message>
+    <message>
+        <source>%1 is missing</source>
+        <translation>%1 fehlt</translation>
+    </message>
+    <message>
+        <source>%1 are missing</source>
+        <translation>%1 fehlen</translation>
+    </message>
+    <message>
+        <source>the margins leave no room on the sheet; they are printed larger than stored, 1.6 times at the top, 1.8 times at the bottom and 1.2 times at the sides.</source>
+        <translation>die Ränder lassen auf dem Blatt keinen Platz; sie werden größer gedruckt als gespeichert, oben das 1,6fache, unten das 1,8fache und an den Seiten das 1,2fache.</translation>
+    </message>
+    <message>
+        <source>%1 begins with a byte-order mark, which belongs to another encoding; settings are written in GB18030.</source>
+        <translation>%1 beginnt mit einem Byte-Order-Mark, das zu einer anderen Kodierung gehört; Einstellungen sind in GB18030 geschrieben.</translation>
+    </message>
+    <message>
+        <source>%1; restore the defaults</source>
+        <translation>%1; stellen Sie die Vorgaben wieder her</translation>
+    </message>
+    <message>
+        <source>%1; correct it in %2 or restore the defaults</source>
+        <translation>%1; berichtigen Sie dies in „%2“, oder stellen Sie die Vorgaben wieder her</translation>
+    </message>
+    <message>
+        <source>%1, which holds paper, margins and style; restore the defaults</source>
+        <translation>%1 mit Papier, Rändern und Stil; stellen Sie die Vorgaben wieder her</translation>
+    </message>
+    <message>
+        <source>a cell holds an object</source>
+        <translation>eine Zelle enthält ein Objekt</translation>
+    </message>
+    <message>
+        <source>fields %1 to</source>
+        <translation>Felder %1 bis</translation>
+    </message>
+    <message>
+        <source>a Sorvane was expected</source>
+        <translation>ein Sorvane wurde erwartet</translation>
+    </message>
+    <message>
+        <source>an object of the library cannot be handed to a script&apos;s grid</source>
+        <translation>ein Objekt der Bibliothek kann nicht an das Gitter eines Skripts gegeben werden</translation>
+    </message>
+    <message>
+        <source>Item needs an index</source>
+        <translation>Item braucht einen Index</translation>
+    </message>
+    <message>
+        <source>a symbol is no value</source>
+        <translation>ein Symbol ist kein Wert</translation>
+    </message>
+    <message>
+        <source>only an array takes an index</source>
+        <translation>nur ein Array nimmt einen Index</translation>
+    </message>
+    <message>
+        <source>item</source>
+        <translation>Eintrag</translation>
+    </message>
+    <message>
+        <source>this is a picture, not a table</source>
+        <translation>das ist ein Bild, keine Tabelle</translation>
+    </message>
+    <message>
+        <source>this is a packed file; unpack it first, for example with: gunzip -c FILE</source>
+        <translation>das ist eine gepackte Datei; entpacken Sie sie zuerst, zum Beispiel mit: gunzip -c DATEI</translation>
+    </message>
+    <message>
+        <source>this is an HTML or XML document, not a table; save its table as CSV</source>
+        <translation>das ist ein HTML- oder XML-Dokument, keine Tabelle; speichern Sie seine Tabelle als CSV</translation>
+    </message>
+    <message>
+        <source>this is a PDF file; take the file that it was made from, or save its table as CSV</source>
+        <translation>das ist eine PDF-Datei; nehmen Sie die Datei, aus der sie gemacht wurde, oder speichern Sie ihre Tabelle als CSV</translation>
+    </message>
+    <message>
+        <source>this is a ZIP archive; unpack it first</source>
+        <translation>das ist ein ZIP-Archiv; entpacken Sie es zuerst</translation>
+    </message>
+    <message>
+        <source>this is a program, not a table</source>
+        <translation>das ist ein Programm, keine Tabelle</translation>
+    </message>
+    <message>
+        <source>this is a Parquet file; save its table as CSV</source>
+        <translation>das ist eine Parquet-Datei; speichern Sie ihre Tabelle als CSV</translation>
+    </message>
+    <message>
+        <source>this is a text document, not a table; save its table as CSV</source>
+        <translation>das ist ein Textdokument, keine Tabelle; speichern Sie seine Tabelle als CSV</translation>
+    </message>
+    <message>
+        <source>more than 32767 values in a row</source>
+        <translation>mehr als 32767 Werte in einer Zeile</translation>
+    </message>
+    <message>
+        <source>the file is empty</source>
+        <translation>die Datei ist leer</translation>
+    </message>
+    <message>
+        <source>a zero byte; this is no text file</source>
+        <translation>ein Nullbyte; das ist keine Textdatei</translation>
+    </message>
+    <message>
+        <source>%1 and others</source>
+        <translation>%1 und andere</translation>
+    </message>
+    <message>
+        <source>the row at line %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</source>
+        <translation>die Zeile bei Dateizeile %1 besteht vielleicht aus mehreren aneinandergeklebten: Ein Wert in Anführungszeichen geht über einen Zeilenumbruch, und die Zeile hat nicht so viele Werte wie die Titelzeile</translation>
+    </message>
+    <message>
+        <source>the rows at lines %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</source>
+        <translation>die Zeilen bei den Dateizeilen %1 bestehen vielleicht aus mehreren aneinandergeklebten: Ein Wert in Anführungszeichen geht über einen Zeilenumbruch, und die Zeile hat nicht so viele Werte wie die Titelzeile</translation>
+    </message>
+    <message>
+        <source>a tab</source>
+        <translation>einem Tabulator</translation>
+    </message>
+    <message>
+        <source>%1 of %2 rows have not as many values as the titles, the first at line %3; is this a table with %4 between its values?</source>
+        <translation>%1 von %2 Zeilen haben nicht so viele Werte wie die Titelzeile, die erste bei Dateizeile %3; ist das eine Tabelle mit %4 zwischen den Werten?</translation>
+    </message>
+    <message>
+        <source>the encoding was guessed to be %1; name another one if letters look wrong</source>
+        <translation>die Kodierung wurde als %1 erraten; nennen Sie eine andere, wenn Buchstaben falsch aussehen</translation>
+    </message>
+    <message>
+        <source>a table is an array of objects, [{&quot;name&quot;: value, …}, …], or one object a line</source>
+        <translation>eine Tabelle ist ein Array von Objekten, [{&quot;Name&quot;: Wert, …}, …], oder ein Objekt je Zeile</translation>
+    </message>
+    <message>
+        <source>more than 32767 different names</source>
+        <translation>mehr als 32767 verschiedene Namen</translation>
+    </message>
+    <message>
+        <source>this is no JSON: %1</source>
+        <translation>das ist kein JSON: %1</translation>
+    </message>
+    <message>
+        <source>the file is one object; %1; take the array out of it, for example with: jq %2</source>
+        <translation>die Datei ist ein einziges Objekt; %1; nehmen Sie das Array heraus, zum Beispiel mit: jq %2</translation>
+    </message>
+    <message>
+        <source>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</source>
+        <translation>diese Office-Datei muss von LibreOffice umgewandelt werden, das nicht installiert ist; installieren Sie libreoffice-calc, oder speichern Sie die Datei als .xlsx, .ods oder CSV</translation>
+    </message>
+    <message>
+        <source>the file cannot be copied to convert it</source>
+        <translation>die Datei kann nicht zum Umwandeln kopiert werden</translation>
+    </message>
+    <message>
+        <source>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</source>
+        <translation>LibreOffice konnte diese Datei nicht umwandeln; speichern Sie sie als .xlsx, .ods oder CSV</translation>
+    </message>
+    <message>
+        <source>a cell past the end of its sheet</source>
+        <translation>eine Zelle hinter dem Ende ihres Blatts</translation>
+    </message>
+    <message>
+        <source>the sheet is empty</source>
+        <translation>das Blatt ist leer</translation>
+    </message>
+    <message>
+        <source>no sheet %1; the file has: %2</source>
+        <translation>kein Blatt %1; die Datei hat: %2</translation>
+    </message>
+    <message>
+        <source>the office file is damaged; open it in its program and save it again, or save it as CSV</source>
+        <translation>die Office-Datei ist beschädigt; öffnen Sie sie in ihrem Programm und speichern Sie sie neu, oder speichern Sie sie als CSV</translation>
+    </message>
+    <message>
+        <source>give one statement only</source>
+        <translation>geben Sie nur eine Anweisung an</translation>
+    </message>
+    <message>
+        <source>the database cannot be copied to read its log: %1</source>
+        <translation>die Datenbank kann nicht kopiert werden, um ihr Protokoll zu lesen: %1</translation>
+    </message>
+    <message>
+        <source>this is no SQLite database</source>
+        <translation>das ist keine SQLite-Datenbank</translation>
+    </message>
+    <message>
+        <source>the database has no table</source>
+        <translation>die Datenbank hat keine Tabelle</translation>
+    </message>
+    <message>
+        <source>name one of the database&apos;s tables: %1</source>
+        <translation>nennen Sie eine der Tabellen der Datenbank: %1</translation>
+    </message>
+    <message>
+        <source>no table %1; the database has: %2</source>
+        <translation>keine Tabelle %1; die Datenbank hat: %2</translation>
+    </message>
+    <message>
+        <source>the statement is no query; give a SELECT</source>
+        <translation>die Anweisung ist keine Abfrage; geben Sie ein SELECT an</translation>
+    </message>
+    <message>
+        <source>the statement answers no rows; give a SELECT</source>
+        <translation>die Anweisung liefert keine Zeilen; geben Sie ein SELECT an</translation>
+    </message>
+    <message>
+        <source>bytes that are neither UTF-8 nor GB18030 text; name the encoding</source>
+        <translation>Bytes, die weder UTF-8 noch GB18030 sind; nennen Sie die Kodierung</translation>
+    </message>
+    <message>
+        <source>line %1: %2</source>
+        <translation>Zeile %1: %2</translation>
+    </message>
+    <message>
+        <source>unknown encoding %1; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others</source>
+        <translation>unbekannte Kodierung %1; bekannt sind unter anderem UTF-8, GB18030, GBK, Big5, UTF-16 und ISO-8859-1</translation>
+    </message>
+    <message>
+        <source>bytes that are no %1</source>
+        <translation>Bytes, die kein %1 sind</translation>
+    </message>
+    <message>
+        <source>bytes that are no %1, which the file&apos;s mark says it is</source>
+        <translation>Bytes, die kein %1 sind, wie es die Marke der Datei sagt</translation>
+    </message>
+    <message>
+        <source>the office file holds more than 2 GB</source>
+        <translation>die Office-Datei enthält mehr als 2 GB</translation>
+    </message>
+    <message>
+        <source>%1 OK will save nothing.</source>
+        <translation>%1 OK wird nichts speichern.</translation>
+    </message>
+    <message>
+        <source>%1 is empty: OK keeps the stored one.</source>
+        <translation>%1 ist leer: OK behält den gespeicherten Wert.</translation>
+    </message>
+    <message>
+        <source>%1 &quot;%2&quot; lacks its unit, as in &quot;210mm&quot;: OK will save nothing of all three tabs.</source>
+        <translation>%1 „%2“ fehlt die Einheit, wie in „210mm“: OK wird von allen drei Reitern nichts speichern.</translation>
+    </message>
+    <message>
+        <source>%1 must be above 0: OK will store it, and no page can be laid out.</source>
+        <translation>%1 muss über 0 liegen: OK wird den Wert speichern, und keine Seite kann aufgebaut werden.</translation>
+    </message>
+    <message>
+        <source>%1 is at most %2: OK will store it, and no page can be built until it is smaller.</source>
+        <translation>%1 ist höchstens %2: OK wird den Wert speichern, und keine Seite kann aufgebaut werden, bis er kleiner ist.</translation>
+    </message>
+    <message>
+        <source>%1 %2 is printed as %3</source>
+        <translation>%1 %2 wird als %3 gedruckt</translation>
+    </message>
+    <message>
+        <source>%1; a margin is at most %2 here. OK will store it, and no page can be built until it is smaller.</source>
+        <translation>%1; ein Rand ist hier höchstens %2. OK wird den Wert speichern, und keine Seite kann aufgebaut werden, bis er kleiner ist.</translation>
+    </message>
+    <message>
+        <source>%1 0 mm is printed as 20 mm.</source>
+        <translation>%1 0 mm wird als 20 mm gedruckt.</translation>
+    </message>
+    <message>
+        <source>%1 lies outside the sheet. OK will store it all the same.</source>
+        <translation>%1 liegt außerhalb des Blatts. OK wird den Wert trotzdem speichern.</translation>
+    </message>
+    <message>
+        <source>%1, and the sheet is %2 high</source>
+        <translation>%1, und das Blatt ist %2 hoch</translation>
+    </message>
+    <message>
+        <source>%1, and the sheet is %2 wide</source>
+        <translation>%1, und das Blatt ist %2 breit</translation>
+    </message>
+    <message>
+        <source>%1: it lies outside. OK will store it all the same.</source>
+        <translation>%1: Der Rand liegt außerhalb. OK wird den Wert trotzdem speichern.</translation>
+    </message>
+    <message>
+        <source>%1: there is no room left for a row. OK will store it all the same.</source>
+        <translation>%1: Für eine Zeile bleibt kein Platz. OK wird den Wert trotzdem speichern.</translation>
+    </message>
+    <message>
+        <source>%1: there is no room left for a column. OK will store it all the same.</source>
+        <translation>%1: Für eine Spalte bleibt kein Platz. OK wird den Wert trotzdem speichern.</translation>
+    </message>
+    <message>
+        <source>no grid is previewed</source>
+        <translation>kein Gitter ist in der Vorschau</translation>
+    </message>
+    <message>
+        <source>There are %1 more like this.</source>
+        <translation>Es gibt %1 weitere dieser Art.</translation>
+    </message>
+    <message>
+        <source>The pages could not be built.</source>
+        <translation>Die Seiten konnten nicht aufgebaut werden.</translation>
+    </message>
+    <message>
+        <source>%1: the name must end in .pdf, .png or .svg</source>
+        <translation>%1: der Name muss auf .pdf, .png oder .svg enden</translation>
+    </message>
+    <message>
+        <source>%1 character has no glyph in any installed font and shows as a hollow box (%2)</source>
+        <translation>%1 Zeichen hat in keiner installierten Schrift ein Bild und erscheint als leeres Kästchen (%2)</translation>
+    </message>
+    <message>
+        <source>%1 characters have no glyph in any installed font and show as hollow boxes (%2)</source>
+        <translation>%1 Zeichen haben in keiner installierten Schrift ein Bild und erscheinen als leere Kästchen (%2)</translation>
+    </message>
+    <message>
+        <source>%1; install %2</source>
+        <translation>%1; installieren Sie %2</translation>
+    </message>
+    <message>
+        <source>the paper has no width</source>
+        <translation>das Papier hat keine Breite</translation>
+    </message>
+    <message>
+        <source>the paper has no width or no height</source>
+        <translation>das Papier hat keine Breite oder keine Höhe</translation>
+    </message>
+    <message>
+        <source>the window has no room for a page</source>
+        <translation>das Fenster hat keinen Platz für eine Seite</translation>
+    </message>
+    <message>
+        <source>the pages cannot be shown any smaller</source>
+        <translation>die Seiten können nicht noch kleiner gezeigt werden</translation>
+    </message>
+    <message>
+        <source>a scale of 0 shows nothing</source>
+        <translation>ein Maßstab von 0 zeigt nichts</translation>
+    </message>
+    <message>
+        <source>a scale of %1 is too small</source>
+        <translation>ein Maßstab von %1 ist zu klein</translation>
+    </message>
+</context>
+<context>
     <name>ToolMeanings</name>
     <message>
         <source>Fonts, colours and grid lines of the report</source>

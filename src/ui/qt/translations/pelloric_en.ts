@@ -49,6 +49,765 @@
     </message>
 </context>
 <context>
+    <name>Phrase</name>
+    <message>
+        <source>no report was built yet</source>
+        <translation>no report was built yet</translation>
+    </message>
+    <message>
+        <source>nobody opens the preview window</source>
+        <translation>nobody opens the preview window</translation>
+    </message>
+    <message>
+        <source>doPreview was given no grid</source>
+        <translation>doPreview was given no grid</translation>
+    </message>
+    <message>
+        <source>%1 was given where a plain value is wanted</source>
+        <translation>%1 was given where a plain value is wanted</translation>
+    </message>
+    <message>
+        <source>%1 was given where a number is wanted</source>
+        <translation>%1 was given where a number is wanted</translation>
+    </message>
+    <message>
+        <source>no grid was given</source>
+        <translation>no grid was given</translation>
+    </message>
+    <message>
+        <source>%1 was given where a grid is wanted</source>
+        <translation>%1 was given where a grid is wanted</translation>
+    </message>
+    <message>
+        <source>%1 is damaged: %2; what stands before it was read</source>
+        <translation>%1 is damaged: %2; what stands before it was read</translation>
+    </message>
+    <message>
+        <source>page</source>
+        <translation>page</translation>
+    </message>
+    <message>
+        <source>a document holds at most 32767 pages</source>
+        <translation>a document holds at most 32767 pages</translation>
+    </message>
+    <message>
+        <source>on page %1 line</source>
+        <translation>on page %1 line</translation>
+    </message>
+    <message>
+        <source>on page %1 text</source>
+        <translation>on page %1 text</translation>
+    </message>
+    <message>
+        <source>a font of %1 points is too large to be measured; choose a smaller size</source>
+        <translation>a font of %1 points is too large to be measured; choose a smaller size</translation>
+    </message>
+    <message>
+        <source>a text of more than 4294967295 characters cannot be recorded</source>
+        <translation>a text of more than 4294967295 characters cannot be recorded</translation>
+    </message>
+    <message>
+        <source>paper of %1 by %2 twips cannot be written; each side is 1 to %3 twips (200 inches)</source>
+        <translation>paper of %1 by %2 twips cannot be written; each side is 1 to %3 twips (200 inches)</translation>
+    </message>
+    <message>
+        <source>the document has no page to write</source>
+        <translation>the document has no page to write</translation>
+    </message>
+    <message>
+        <source>there is no memory for an image of %1 by %2 pixels; choose a lower resolution</source>
+        <translation>there is no memory for an image of %1 by %2 pixels; choose a lower resolution</translation>
+    </message>
+    <message>
+        <source>an image of %1 by %2 pixels (%3 per inch) cannot be made; it has 1 to %4, so choose another resolution</source>
+        <translation>an image of %1 by %2 pixels (%3 per inch) cannot be made; it has 1 to %4, so choose another resolution</translation>
+    </message>
+    <message>
+        <source>the font %1 is damaged</source>
+        <translation>the font %1 is damaged</translation>
+    </message>
+    <message>
+        <source>the font %1 may not be embedded</source>
+        <translation>the font %1 may not be embedded</translation>
+    </message>
+    <message>
+        <source>the font %1 is a variable or coloured font</source>
+        <translation>the font %1 is a variable or coloured font</translation>
+    </message>
+    <message>
+        <source>the font %1 has no outlines of a kind that can be embedded</source>
+        <translation>the font %1 has no outlines of a kind that can be embedded</translation>
+    </message>
+    <message>
+        <source>the grid is gone</source>
+        <translation>the grid is gone</translation>
+    </message>
+    <message>
+        <source>%1 is past what the member holds</source>
+        <translation>%1 is past what the member holds</translation>
+    </message>
+    <message>
+        <source>an object is no plain value</source>
+        <translation>an object is no plain value</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no %2</source>
+        <translation>&quot;%1&quot; is no %2</translation>
+    </message>
+    <message>
+        <source>column</source>
+        <translation>column</translation>
+    </message>
+    <message>
+        <source>the grid&apos;s model is gone</source>
+        <translation>the grid&apos;s model is gone</translation>
+    </message>
+    <message>
+        <source>row</source>
+        <translation>row</translation>
+    </message>
+    <message>
+        <source>the grid has lost rows</source>
+        <translation>the grid has lost rows</translation>
+    </message>
+    <message>
+        <source>member number</source>
+        <translation>member number</translation>
+    </message>
+    <message>
+        <source>the object is gone</source>
+        <translation>the object is gone</translation>
+    </message>
+    <message>
+        <source>the list has changed</source>
+        <translation>the list has changed</translation>
+    </message>
+    <message>
+        <source>a row of %1 cells; there are %2 columns</source>
+        <translation>a row of %1 cells; there are %2 columns</translation>
+    </message>
+    <message>
+        <source>row %1 holds more than 4294967295 characters</source>
+        <translation>row %1 holds more than 4294967295 characters</translation>
+    </message>
+    <message>
+        <source>there is no printer</source>
+        <translation>there is no printer</translation>
+    </message>
+    <message>
+        <source>there is no printer %1</source>
+        <translation>there is no printer %1</translation>
+    </message>
+    <message>
+        <source>the printer %1 takes no jobs</source>
+        <translation>the printer %1 takes no jobs</translation>
+    </message>
+    <message>
+        <source>no column of the grid is wide enough to be printed</source>
+        <translation>no column of the grid is wide enough to be printed</translation>
+    </message>
+    <message>
+        <source>%1 is no document file</source>
+        <translation>%1 is no document file</translation>
+    </message>
+    <message>
+        <source>%1 holds more than %2 bytes</source>
+        <translation>%1 holds more than %2 bytes</translation>
+    </message>
+    <message>
+        <source>an index is missing</source>
+        <translation>an index is missing</translation>
+    </message>
+    <message>
+        <source>index %1</source>
+        <translation>index %1</translation>
+    </message>
+    <message>
+        <source>%1 is past what a single-precision number holds</source>
+        <translation>%1 is past what a single-precision number holds</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no whole number between -32768 and 32767</source>
+        <translation>&quot;%1&quot; is no whole number between -32768 and 32767</translation>
+    </message>
+    <message>
+        <source>this Qt has no converter for GB18030</source>
+        <translation>this Qt has no converter for GB18030</translation>
+    </message>
+    <message>
+        <source>row %1, column %2 holds %3 characters, at most %4 can be printed</source>
+        <translation>row %1, column %2 holds %3 characters, at most %4 can be printed</translation>
+    </message>
+    <message>
+        <source>Invalid procedure call or argument</source>
+        <translation>Invalid procedure call or argument</translation>
+    </message>
+    <message>
+        <source>Overflow</source>
+        <translation>Overflow</translation>
+    </message>
+    <message>
+        <source>Subscript out of range</source>
+        <translation>Subscript out of range</translation>
+    </message>
+    <message>
+        <source>Division by zero</source>
+        <translation>Division by zero</translation>
+    </message>
+    <message>
+        <source>Type mismatch</source>
+        <translation>Type mismatch</translation>
+    </message>
+    <message>
+        <source>File not found</source>
+        <translation>File not found</translation>
+    </message>
+    <message>
+        <source>The file cannot be written</source>
+        <translation>The file cannot be written</translation>
+    </message>
+    <message>
+        <source>Disk full</source>
+        <translation>Disk full</translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation>Permission denied</translation>
+    </message>
+    <message>
+        <source>Object variable not set</source>
+        <translation>Object variable not set</translation>
+    </message>
+    <message>
+        <source>Object doesn&apos;t support this property or method</source>
+        <translation>Object doesn&apos;t support this property or method</translation>
+    </message>
+    <message>
+        <source>Cancel was selected</source>
+        <translation>Cancel was selected</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Error</translation>
+    </message>
+    <message>
+        <source>%1 %2; there is %3</source>
+        <translation>%1 %2; there is %3</translation>
+    </message>
+    <message>
+        <source>%1 %2; there are %3</source>
+        <translation>%1 %2; there are %3</translation>
+    </message>
+    <message>
+        <source>%1 is not between %2 and %3</source>
+        <translation>%1 is not between %2 and %3</translation>
+    </message>
+    <message>
+        <source>an object is no number</source>
+        <translation>an object is no number</translation>
+    </message>
+    <message>
+        <source>an object was expected</source>
+        <translation>an object was expected</translation>
+    </message>
+    <message>
+        <source>a row set was expected</source>
+        <translation>a row set was expected</translation>
+    </message>
+    <message>
+        <source>an object has no text</source>
+        <translation>an object has no text</translation>
+    </message>
+    <message>
+        <source>the page list names too many pages; write fewer ranges</source>
+        <translation>the page list names too many pages; write fewer ranges</translation>
+    </message>
+    <message>
+        <source>The pages are %1, the printer&apos;s sheet is %2 (%3): what does not fit on it is lost.</source>
+        <translation>The pages are %1, the printer&apos;s sheet is %2 (%3): what does not fit on it is lost.</translation>
+    </message>
+    <message>
+        <source>The pages are %1, the printer&apos;s sheet is %2 (%3).</source>
+        <translation>The pages are %1, the printer&apos;s sheet is %2 (%3).</translation>
+    </message>
+    <message>
+        <source>after %1 of %2 pages</source>
+        <translation>after %1 of %2 pages</translation>
+    </message>
+    <message>
+        <source>the print system does not answer (nothing came within %1 seconds)</source>
+        <translation>the print system does not answer (nothing came within %1 seconds)</translation>
+    </message>
+    <message>
+        <source>no room for the document in %1</source>
+        <translation>no room for the document in %1</translation>
+    </message>
+    <message>
+        <source>the document could not be ended</source>
+        <translation>the document could not be ended</translation>
+    </message>
+    <message>
+        <source>the document could not be begun</source>
+        <translation>the document could not be begun</translation>
+    </message>
+    <message>
+        <source>the printer rejects jobs</source>
+        <translation>the printer rejects jobs</translation>
+    </message>
+    <message>
+        <source>the printer is stopped</source>
+        <translation>the printer is stopped</translation>
+    </message>
+    <message>
+        <source>the print system does not answer (%1)</source>
+        <translation>the print system does not answer (%1)</translation>
+    </message>
+    <message>
+        <source>the print system did not take the document (%1)</source>
+        <translation>the print system did not take the document (%1)</translation>
+    </message>
+    <message>
+        <source>there is no such printer</source>
+        <translation>there is no such printer</translation>
+    </message>
+    <message>
+        <source>field</source>
+        <translation>field</translation>
+    </message>
+    <message>
+        <source>the grid prints no column &quot;%1&quot;</source>
+        <translation>the grid prints no column &quot;%1&quot;</translation>
+    </message>
+    <message>
+        <source>this grid does not tell which of its rows are marked</source>
+        <translation>this grid does not tell which of its rows are marked</translation>
+    </message>
+    <message>
+        <source>no row of the grid is marked; mark rows, or print all</source>
+        <translation>no row of the grid is marked; mark rows, or print all</translation>
+    </message>
+    <message>
+        <source>more than 32767 columns are printed; leave some out</source>
+        <translation>more than 32767 columns are printed; leave some out</translation>
+    </message>
+    <message>
+        <source>the grid has %1 columns, at most %2 can be read</source>
+        <translation>the grid has %1 columns, at most %2 can be read</translation>
+    </message>
+    <message>
+        <source>the grid prints %1 columns now, the report was built with %2; preview it anew</source>
+        <translation>the grid prints %1 columns now, the report was built with %2; preview it anew</translation>
+    </message>
+    <message>
+        <source>the data grid has more columns than fields</source>
+        <translation>the data grid has more columns than fields</translation>
+    </message>
+    <message>
+        <source>m_PrintObj names no kind of grid</source>
+        <translation>m_PrintObj names no kind of grid</translation>
+    </message>
+    <message>
+        <source>the data source never comes to its first record</source>
+        <translation>the data source never comes to its first record</translation>
+    </message>
+    <message>
+        <source>the colour %1 of the font %2 is not between 0 and 16777215</source>
+        <translation>the colour %1 of the font %2 is not between 0 and 16777215</translation>
+    </message>
+    <message>
+        <source>the report needs about %1 pages, a document holds %2; print rows 1 to %3, or leave out columns</source>
+        <translation>the report needs about %1 pages, a document holds %2; print rows 1 to %3, or leave out columns</translation>
+    </message>
+    <message>
+        <source>not even the first rows fit on the %1 pages that a document holds; choose larger paper, or leave out columns</source>
+        <translation>not even the first rows fit on the %1 pages that a document holds; choose larger paper, or leave out columns</translation>
+    </message>
+    <message>
+        <source>1 is portrait and 2 is landscape</source>
+        <translation>1 is portrait and 2 is landscape</translation>
+    </message>
+    <message>
+        <source>the number of a paper is a whole number, such as 9</source>
+        <translation>the number of a paper is a whole number, such as 9</translation>
+    </message>
+    <message>
+        <source>this margin is at most 361 mm</source>
+        <translation>this margin is at most 361 mm</translation>
+    </message>
+    <message>
+        <source>this margin is at most 321 mm</source>
+        <translation>this margin is at most 321 mm</translation>
+    </message>
+    <message>
+        <source>this margin is at most 481 mm</source>
+        <translation>this margin is at most 481 mm</translation>
+    </message>
+    <message>
+        <source>a sheet is wider than 0 and no wider than 5779 mm</source>
+        <translation>a sheet is wider than 0 and no wider than 5779 mm</translation>
+    </message>
+    <message>
+        <source>a sheet is higher than 0 and no higher than 5779 mm</source>
+        <translation>a sheet is higher than 0 and no higher than 5779 mm</translation>
+    </message>
+    <message>
+        <source>a colour is a number from 0 to 16777215</source>
+        <translation>a colour is a number from 0 to 16777215</translation>
+    </message>
+    <message>
+        <source>a font size is a number of points above 0, at most 16000</source>
+        <translation>a font size is a number of points above 0, at most 16000</translation>
+    </message>
+    <message>
+        <source>%1 in %2</source>
+        <translation>%1 in %2</translation>
+    </message>
+    <message>
+        <source>%1 and %2 more settings</source>
+        <translation>%1 and %2 more settings</translation>
+    </message>
+    <message>
+        <source>%1 and %2</source>
+        <translation>%1 and %2</translation>
+    </message>
+    <message>
+        <source>%1 is missing</source>
+        <translation>%1 is missing</translation>
+    </message>
+    <message>
+        <source>%1 are missing</source>
+        <translation>%1 are missing</translation>
+    </message>
+    <message>
+        <source>the margins leave no room on the sheet; they are printed larger than stored, 1.6 times at the top, 1.8 times at the bottom and 1.2 times at the sides.</source>
+        <translation>the margins leave no room on the sheet; they are printed larger than stored, 1.6 times at the top, 1.8 times at the bottom and 1.2 times at the sides.</translation>
+    </message>
+    <message>
+        <source>%1 begins with a byte-order mark, which belongs to another encoding; settings are written in GB18030.</source>
+        <translation>%1 begins with a byte-order mark, which belongs to another encoding; settings are written in GB18030.</translation>
+    </message>
+    <message>
+        <source>%1; restore the defaults</source>
+        <translation>%1; restore the defaults</translation>
+    </message>
+    <message>
+        <source>%1; correct it in %2 or restore the defaults</source>
+        <translation>%1; correct it in %2 or restore the defaults</translation>
+    </message>
+    <message>
+        <source>%1, which holds paper, margins and style; restore the defaults</source>
+        <translation>%1, which holds paper, margins and style; restore the defaults</translation>
+    </message>
+    <message>
+        <source>a cell holds an object</source>
+        <translation>a cell holds an object</translation>
+    </message>
+    <message>
+        <source>fields %1 to</source>
+        <translation>fields %1 to</translation>
+    </message>
+    <message>
+        <source>a Sorvane was expected</source>
+        <translation>a Sorvane was expected</translation>
+    </message>
+    <message>
+        <source>an object of the library cannot be handed to a script&apos;s grid</source>
+        <translation>an object of the library cannot be handed to a script&apos;s grid</translation>
+    </message>
+    <message>
+        <source>Item needs an index</source>
+        <translation>Item needs an index</translation>
+    </message>
+    <message>
+        <source>a symbol is no value</source>
+        <translation>a symbol is no value</translation>
+    </message>
+    <message>
+        <source>only an array takes an index</source>
+        <translation>only an array takes an index</translation>
+    </message>
+    <message>
+        <source>item</source>
+        <translation>item</translation>
+    </message>
+    <message>
+        <source>this is a picture, not a table</source>
+        <translation>this is a picture, not a table</translation>
+    </message>
+    <message>
+        <source>this is a packed file; unpack it first, for example with: gunzip -c FILE</source>
+        <translation>this is a packed file; unpack it first, for example with: gunzip -c FILE</translation>
+    </message>
+    <message>
+        <source>this is an HTML or XML document, not a table; save its table as CSV</source>
+        <translation>this is an HTML or XML document, not a table; save its table as CSV</translation>
+    </message>
+    <message>
+        <source>this is a PDF file; take the file that it was made from, or save its table as CSV</source>
+        <translation>this is a PDF file; take the file that it was made from, or save its table as CSV</translation>
+    </message>
+    <message>
+        <source>this is a ZIP archive; unpack it first</source>
+        <translation>this is a ZIP archive; unpack it first</translation>
+    </message>
+    <message>
+        <source>this is a program, not a table</source>
+        <translation>this is a program, not a table</translation>
+    </message>
+    <message>
+        <source>this is a Parquet file; save its table as CSV</source>
+        <translation>this is a Parquet file; save its table as CSV</translation>
+    </message>
+    <message>
+        <source>this is a text document, not a table; save its table as CSV</source>
+        <translation>this is a text document, not a table; save its table as CSV</translation>
+    </message>
+    <message>
+        <source>more than 32767 values in a row</source>
+        <translation>more than 32767 values in a row</translation>
+    </message>
+    <message>
+        <source>the file is empty</source>
+        <translation>the file is empty</translation>
+    </message>
+    <message>
+        <source>a zero byte; this is no text file</source>
+        <translation>a zero byte; this is no text file</translation>
+    </message>
+    <message>
+        <source>%1 and others</source>
+        <translation>%1 and others</translation>
+    </message>
+    <message>
+        <source>the row at line %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</source>
+        <translation>the row at line %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</translation>
+    </message>
+    <message>
+        <source>the rows at lines %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</source>
+        <translation>the rows at lines %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</translation>
+    </message>
+    <message>
+        <source>a tab</source>
+        <translation>a tab</translation>
+    </message>
+    <message>
+        <source>%1 of %2 rows have not as many values as the titles, the first at line %3; is this a table with %4 between its values?</source>
+        <translation>%1 of %2 rows have not as many values as the titles, the first at line %3; is this a table with %4 between its values?</translation>
+    </message>
+    <message>
+        <source>the encoding was guessed to be %1; name another one if letters look wrong</source>
+        <translation>the encoding was guessed to be %1; name another one if letters look wrong</translation>
+    </message>
+    <message>
+        <source>a table is an array of objects, [{&quot;name&quot;: value, …}, …], or one object a line</source>
+        <translation>a table is an array of objects, [{&quot;name&quot;: value, …}, …], or one object a line</translation>
+    </message>
+    <message>
+        <source>more than 32767 different names</source>
+        <translation>more than 32767 different names</translation>
+    </message>
+    <message>
+        <source>this is no JSON: %1</source>
+        <translation>this is no JSON: %1</translation>
+    </message>
+    <message>
+        <source>the file is one object; %1; take the array out of it, for example with: jq %2</source>
+        <translation>the file is one object; %1; take the array out of it, for example with: jq %2</translation>
+    </message>
+    <message>
+        <source>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</source>
+        <translation>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</translation>
+    </message>
+    <message>
+        <source>the file cannot be copied to convert it</source>
+        <translation>the file cannot be copied to convert it</translation>
+    </message>
+    <message>
+        <source>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</source>
+        <translation>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</translation>
+    </message>
+    <message>
+        <source>a cell past the end of its sheet</source>
+        <translation>a cell past the end of its sheet</translation>
+    </message>
+    <message>
+        <source>the sheet is empty</source>
+        <translation>the sheet is empty</translation>
+    </message>
+    <message>
+        <source>no sheet %1; the file has: %2</source>
+        <translation>no sheet %1; the file has: %2</translation>
+    </message>
+    <message>
+        <source>the office file is damaged; open it in its program and save it again, or save it as CSV</source>
+        <translation>the office file is damaged; open it in its program and save it again, or save it as CSV</translation>
+    </message>
+    <message>
+        <source>give one statement only</source>
+        <translation>give one statement only</translation>
+    </message>
+    <message>
+        <source>the database cannot be copied to read its log: %1</source>
+        <translation>the database cannot be copied to read its log: %1</translation>
+    </message>
+    <message>
+        <source>this is no SQLite database</source>
+        <translation>this is no SQLite database</translation>
+    </message>
+    <message>
+        <source>the database has no table</source>
+        <translation>the database has no table</translation>
+    </message>
+    <message>
+        <source>name one of the database&apos;s tables: %1</source>
+        <translation>name one of the database&apos;s tables: %1</translation>
+    </message>
+    <message>
+        <source>no table %1; the database has: %2</source>
+        <translation>no table %1; the database has: %2</translation>
+    </message>
+    <message>
+        <source>the statement is no query; give a SELECT</source>
+        <translation>the statement is no query; give a SELECT</translation>
+    </message>
+    <message>
+        <source>the statement answers no rows; give a SELECT</source>
+        <translation>the statement answers no rows; give a SELECT</translation>
+    </message>
+    <message>
+        <source>bytes that are neither UTF-8 nor GB18030 text; name the encoding</source>
+        <translation>bytes that are neither UTF-8 nor GB18030 text; name the encoding</translation>
+    </message>
+    <message>
+        <source>line %1: %2</source>
+        <translation>line %1: %2</translation>
+    </message>
+    <message>
+        <source>unknown encoding %1; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others</source>
+        <translation>unknown encoding %1; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others</translation>
+    </message>
+    <message>
+        <source>bytes that are no %1</source>
+        <translation>bytes that are no %1</translation>
+    </message>
+    <message>
+        <source>bytes that are no %1, which the file&apos;s mark says it is</source>
+        <translation>bytes that are no %1, which the file&apos;s mark says it is</translation>
+    </message>
+    <message>
+        <source>the office file holds more than 2 GB</source>
+        <translation>the office file holds more than 2 GB</translation>
+    </message>
+    <message>
+        <source>%1 OK will save nothing.</source>
+        <translation>%1 OK will save nothing.</translation>
+    </message>
+    <message>
+        <source>%1 is empty: OK keeps the stored one.</source>
+        <translation>%1 is empty: OK keeps the stored one.</translation>
+    </message>
+    <message>
+        <source>%1 &quot;%2&quot; lacks its unit, as in &quot;210mm&quot;: OK will save nothing of all three tabs.</source>
+        <translation>%1 &quot;%2&quot; lacks its unit, as in &quot;210mm&quot;: OK will save nothing of all three tabs.</translation>
+    </message>
+    <message>
+        <source>%1 must be above 0: OK will store it, and no page can be laid out.</source>
+        <translation>%1 must be above 0: OK will store it, and no page can be laid out.</translation>
+    </message>
+    <message>
+        <source>%1 is at most %2: OK will store it, and no page can be built until it is smaller.</source>
+        <translation>%1 is at most %2: OK will store it, and no page can be built until it is smaller.</translation>
+    </message>
+    <message>
+        <source>%1 %2 is printed as %3</source>
+        <translation>%1 %2 is printed as %3</translation>
+    </message>
+    <message>
+        <source>%1; a margin is at most %2 here. OK will store it, and no page can be built until it is smaller.</source>
+        <translation>%1; a margin is at most %2 here. OK will store it, and no page can be built until it is smaller.</translation>
+    </message>
+    <message>
+        <source>%1 0 mm is printed as 20 mm.</source>
+        <translation>%1 0 mm is printed as 20 mm.</translation>
+    </message>
+    <message>
+        <source>%1 lies outside the sheet. OK will store it all the same.</source>
+        <translation>%1 lies outside the sheet. OK will store it all the same.</translation>
+    </message>
+    <message>
+        <source>%1, and the sheet is %2 high</source>
+        <translation>%1, and the sheet is %2 high</translation>
+    </message>
+    <message>
+        <source>%1, and the sheet is %2 wide</source>
+        <translation>%1, and the sheet is %2 wide</translation>
+    </message>
+    <message>
+        <source>%1: it lies outside. OK will store it all the same.</source>
+        <translation>%1: it lies outside. OK will store it all the same.</translation>
+    </message>
+    <message>
+        <source>%1: there is no room left for a row. OK will store it all the same.</source>
+        <translation>%1: there is no room left for a row. OK will store it all the same.</translation>
+    </message>
+    <message>
+        <source>%1: there is no room left for a column. OK will store it all the same.</source>
+        <translation>%1: there is no room left for a column. OK will store it all the same.</translation>
+    </message>
+    <message>
+        <source>no grid is previewed</source>
+        <translation>no grid is previewed</translation>
+    </message>
+    <message>
+        <source>There are %1 more like this.</source>
+        <translation>There are %1 more like this.</translation>
+    </message>
+    <message>
+        <source>The pages could not be built.</source>
+        <translation>The pages could not be built.</translation>
+    </message>
+    <message>
+        <source>%1: the name must end in .pdf, .png or .svg</source>
+        <translation>%1: the name must end in .pdf, .png or .svg</translation>
+    </message>
+    <message>
+        <source>%1 character has no glyph in any installed font and shows as a hollow box (%2)</source>
+        <translation>%1 character has no glyph in any installed font and shows as a hollow box (%2)</translation>
+    </message>
+    <message>
+        <source>%1 characters have no glyph in any installed font and show as hollow boxes (%2)</source>
+        <translation>%1 characters have no glyph in any installed font and show as hollow boxes (%2)</translation>
+    </message>
+    <message>
+        <source>%1; install %2</source>
+        <translation>%1; install %2</translation>
+    </message>
+    <message>
+        <source>the paper has no width</source>
+        <translation>the paper has no width</translation>
+    </message>
+    <message>
+        <source>the paper has no width or no height</source>
+        <translation>the paper has no width or no height</translation>
+    </message>
+    <message>
+        <source>the window has no room for a page</source>
+        <translation>the window has no room for a page</translation>
+    </message>
+    <message>
+        <source>the pages cannot be shown any smaller</source>
+        <translation>the pages cannot be shown any smaller</translation>
+    </message>
+    <message>
+        <source>a scale of 0 shows nothing</source>
+        <translation>a scale of 0 shows nothing</translation>
+    </message>
+    <message>
+        <source>a scale of %1 is too small</source>
+        <translation>a scale of %1 is too small</translation>
+    </message>
+</context>
+<context>
     <name>ToolMeanings</name>
     <message>
         <source>Fonts, colours and grid lines of the report</source>

@@ -49,6 +49,765 @@
     </message>
 </context>
 <context>
+    <name>Phrase</name>
+    <message>
+        <source>no report was built yet</source>
+        <translation>尚未生成报表</translation>
+    </message>
+    <message>
+        <source>nobody opens the preview window</source>
+        <translation>没有打开预览窗口的程序</translation>
+    </message>
+    <message>
+        <source>doPreview was given no grid</source>
+        <translation>doPreview 没有得到表格</translation>
+    </message>
+    <message>
+        <source>%1 was given where a plain value is wanted</source>
+        <translation>给出的是 %1，需要的是简单值</translation>
+    </message>
+    <message>
+        <source>%1 was given where a number is wanted</source>
+        <translation>给出的是 %1，需要的是数字</translation>
+    </message>
+    <message>
+        <source>no grid was given</source>
+        <translation>没有给出表格</translation>
+    </message>
+    <message>
+        <source>%1 was given where a grid is wanted</source>
+        <translation>给出的是 %1，需要的是表格</translation>
+    </message>
+    <message>
+        <source>%1 is damaged: %2; what stands before it was read</source>
+        <translation>%1 已损坏：%2；之前的内容已读取</translation>
+    </message>
+    <message>
+        <source>page</source>
+        <translation>页</translation>
+    </message>
+    <message>
+        <source>a document holds at most 32767 pages</source>
+        <translation>一个文档最多有 32767 页</translation>
+    </message>
+    <message>
+        <source>on page %1 line</source>
+        <translation>第 %1 页上的线条</translation>
+    </message>
+    <message>
+        <source>on page %1 text</source>
+        <translation>第 %1 页上的文字</translation>
+    </message>
+    <message>
+        <source>a font of %1 points is too large to be measured; choose a smaller size</source>
+        <translation>%1 磅的字体太大，无法测量；请选择更小的字号</translation>
+    </message>
+    <message>
+        <source>a text of more than 4294967295 characters cannot be recorded</source>
+        <translation>超过 4294967295 个字符的文字无法记录</translation>
+    </message>
+    <message>
+        <source>paper of %1 by %2 twips cannot be written; each side is 1 to %3 twips (200 inches)</source>
+        <translation>无法写出 %1 × %2 缇的纸张；每边为 1 到 %3 缇（200 英寸）</translation>
+    </message>
+    <message>
+        <source>the document has no page to write</source>
+        <translation>文档中没有可写出的页</translation>
+    </message>
+    <message>
+        <source>there is no memory for an image of %1 by %2 pixels; choose a lower resolution</source>
+        <translation>内存不足以生成 %1 × %2 像素的图像；请选择较低的分辨率</translation>
+    </message>
+    <message>
+        <source>an image of %1 by %2 pixels (%3 per inch) cannot be made; it has 1 to %4, so choose another resolution</source>
+        <translation>无法生成 %1 × %2 像素（每英寸 %3）的图像；像素数为 1 到 %4，请选择其他分辨率</translation>
+    </message>
+    <message>
+        <source>the font %1 is damaged</source>
+        <translation>字体 %1 已损坏</translation>
+    </message>
+    <message>
+        <source>the font %1 may not be embedded</source>
+        <translation>字体 %1 不允许嵌入</translation>
+    </message>
+    <message>
+        <source>the font %1 is a variable or coloured font</source>
+        <translation>字体 %1 是可变字体或彩色字体</translation>
+    </message>
+    <message>
+        <source>the font %1 has no outlines of a kind that can be embedded</source>
+        <translation>字体 %1 没有可以嵌入的轮廓</translation>
+    </message>
+    <message>
+        <source>the grid is gone</source>
+        <translation>表格已不存在</translation>
+    </message>
+    <message>
+        <source>%1 is past what the member holds</source>
+        <translation>%1 超出了成员的范围</translation>
+    </message>
+    <message>
+        <source>an object is no plain value</source>
+        <translation>对象不是简单值</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no %2</source>
+        <translation>“%1”不是 %2</translation>
+    </message>
+    <message>
+        <source>column</source>
+        <translation>列</translation>
+    </message>
+    <message>
+        <source>the grid&apos;s model is gone</source>
+        <translation>表格的模型已不存在</translation>
+    </message>
+    <message>
+        <source>row</source>
+        <translation>行</translation>
+    </message>
+    <message>
+        <source>the grid has lost rows</source>
+        <translation>表格的行变少了</translation>
+    </message>
+    <message>
+        <source>member number</source>
+        <translation>成员编号</translation>
+    </message>
+    <message>
+        <source>the object is gone</source>
+        <translation>对象已不存在</translation>
+    </message>
+    <message>
+        <source>the list has changed</source>
+        <translation>列表已改变</translation>
+    </message>
+    <message>
+        <source>a row of %1 cells; there are %2 columns</source>
+        <translation>一行有 %1 个单元格；共有 %2 列</translation>
+    </message>
+    <message>
+        <source>row %1 holds more than 4294967295 characters</source>
+        <translation>第 %1 行超过 4294967295 个字符</translation>
+    </message>
+    <message>
+        <source>there is no printer</source>
+        <translation>没有打印机</translation>
+    </message>
+    <message>
+        <source>there is no printer %1</source>
+        <translation>没有打印机 %1</translation>
+    </message>
+    <message>
+        <source>the printer %1 takes no jobs</source>
+        <translation>打印机 %1 不接受任务</translation>
+    </message>
+    <message>
+        <source>no column of the grid is wide enough to be printed</source>
+        <translation>表格中没有一列宽到可以打印</translation>
+    </message>
+    <message>
+        <source>%1 is no document file</source>
+        <translation>%1 不是文档文件</translation>
+    </message>
+    <message>
+        <source>%1 holds more than %2 bytes</source>
+        <translation>%1 超过 %2 字节</translation>
+    </message>
+    <message>
+        <source>an index is missing</source>
+        <translation>缺少索引</translation>
+    </message>
+    <message>
+        <source>index %1</source>
+        <translation>索引 %1</translation>
+    </message>
+    <message>
+        <source>%1 is past what a single-precision number holds</source>
+        <translation>%1 超出了单精度数的范围</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no whole number between -32768 and 32767</source>
+        <translation>“%1”不是 -32768 到 32767 之间的整数</translation>
+    </message>
+    <message>
+        <source>this Qt has no converter for GB18030</source>
+        <translation>此 Qt 没有 GB18030 转换器</translation>
+    </message>
+    <message>
+        <source>row %1, column %2 holds %3 characters, at most %4 can be printed</source>
+        <translation>第 %1 行第 %2 列有 %3 个字符，最多可打印 %4 个</translation>
+    </message>
+    <message>
+        <source>Invalid procedure call or argument</source>
+        <translation>无效的过程调用或参数</translation>
+    </message>
+    <message>
+        <source>Overflow</source>
+        <translation>溢出</translation>
+    </message>
+    <message>
+        <source>Subscript out of range</source>
+        <translation>下标越界</translation>
+    </message>
+    <message>
+        <source>Division by zero</source>
+        <translation>除数为零</translation>
+    </message>
+    <message>
+        <source>Type mismatch</source>
+        <translation>类型不匹配</translation>
+    </message>
+    <message>
+        <source>File not found</source>
+        <translation>文件未找到</translation>
+    </message>
+    <message>
+        <source>The file cannot be written</source>
+        <translation>无法写入文件</translation>
+    </message>
+    <message>
+        <source>Disk full</source>
+        <translation>磁盘已满</translation>
+    </message>
+    <message>
+        <source>Permission denied</source>
+        <translation>没有权限</translation>
+    </message>
+    <message>
+        <source>Object variable not set</source>
+        <translation>未设置对象变量</translation>
+    </message>
+    <message>
+        <source>Object doesn&apos;t support this property or method</source>
+        <translation>对象不支持该属性或方法</translation>
+    </message>
+    <message>
+        <source>Cancel was selected</source>
+        <translation>已选择取消</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>错误</translation>
+    </message>
+    <message>
+        <source>%1 %2; there is %3</source>
+        <translation>%1 %2；共有 %3</translation>
+    </message>
+    <message>
+        <source>%1 %2; there are %3</source>
+        <translation>%1 %2；共有 %3</translation>
+    </message>
+    <message>
+        <source>%1 is not between %2 and %3</source>
+        <translation>%1 不在 %2 与 %3 之间</translation>
+    </message>
+    <message>
+        <source>an object is no number</source>
+        <translation>对象不是数字</translation>
+    </message>
+    <message>
+        <source>an object was expected</source>
+        <translation>应为对象</translation>
+    </message>
+    <message>
+        <source>a row set was expected</source>
+        <translation>应为行集</translation>
+    </message>
+    <message>
+        <source>an object has no text</source>
+        <translation>对象没有文字</translation>
+    </message>
+    <message>
+        <source>the page list names too many pages; write fewer ranges</source>
+        <translation>页码列表包含的页太多；请减少范围</translation>
+    </message>
+    <message>
+        <source>The pages are %1, the printer&apos;s sheet is %2 (%3): what does not fit on it is lost.</source>
+        <translation>页面为 %1，打印机的纸张为 %2（%3）：放不下的部分将丢失。</translation>
+    </message>
+    <message>
+        <source>The pages are %1, the printer&apos;s sheet is %2 (%3).</source>
+        <translation>页面为 %1，打印机的纸张为 %2（%3）。</translation>
+    </message>
+    <message>
+        <source>after %1 of %2 pages</source>
+        <translation>已打印 %1 页，共 %2 页</translation>
+    </message>
+    <message>
+        <source>the print system does not answer (nothing came within %1 seconds)</source>
+        <translation>打印系统没有响应（%1 秒内没有回应）</translation>
+    </message>
+    <message>
+        <source>no room for the document in %1</source>
+        <translation>%1 中没有存放文档的空间</translation>
+    </message>
+    <message>
+        <source>the document could not be ended</source>
+        <translation>文档无法结束</translation>
+    </message>
+    <message>
+        <source>the document could not be begun</source>
+        <translation>文档无法开始</translation>
+    </message>
+    <message>
+        <source>the printer rejects jobs</source>
+        <translation>打印机拒绝任务</translation>
+    </message>
+    <message>
+        <source>the printer is stopped</source>
+        <translation>打印机已停止</translation>
+    </message>
+    <message>
+        <source>the print system does not answer (%1)</source>
+        <translation>打印系统没有响应（%1）</translation>
+    </message>
+    <message>
+        <source>the print system did not take the document (%1)</source>
+        <translation>打印系统没有接受文档（%1）</translation>
+    </message>
+    <message>
+        <source>there is no such printer</source>
+        <translation>没有这台打印机</translation>
+    </message>
+    <message>
+        <source>field</source>
+        <translation>字段</translation>
+    </message>
+    <message>
+        <source>the grid prints no column &quot;%1&quot;</source>
+        <translation>表格没有打印列“%1”</translation>
+    </message>
+    <message>
+        <source>this grid does not tell which of its rows are marked</source>
+        <translation>此表格不提供哪些行被选中</translation>
+    </message>
+    <message>
+        <source>no row of the grid is marked; mark rows, or print all</source>
+        <translation>表格中没有选中的行；请选中行，或打印全部</translation>
+    </message>
+    <message>
+        <source>more than 32767 columns are printed; leave some out</source>
+        <translation>要打印的列超过 32767；请去掉一些</translation>
+    </message>
+    <message>
+        <source>the grid has %1 columns, at most %2 can be read</source>
+        <translation>表格有 %1 列，最多可读取 %2 列</translation>
+    </message>
+    <message>
+        <source>the grid prints %1 columns now, the report was built with %2; preview it anew</source>
+        <translation>表格现在打印 %1 列，而报表有 %2 列；请重新预览</translation>
+    </message>
+    <message>
+        <source>the data grid has more columns than fields</source>
+        <translation>数据表格的列多于字段</translation>
+    </message>
+    <message>
+        <source>m_PrintObj names no kind of grid</source>
+        <translation>m_PrintObj 不是任何表格类型</translation>
+    </message>
+    <message>
+        <source>the data source never comes to its first record</source>
+        <translation>数据源始终到不了第一条记录</translation>
+    </message>
+    <message>
+        <source>the colour %1 of the font %2 is not between 0 and 16777215</source>
+        <translation>字体 %2 的颜色 %1 不在 0 与 16777215 之间</translation>
+    </message>
+    <message>
+        <source>the report needs about %1 pages, a document holds %2; print rows 1 to %3, or leave out columns</source>
+        <translation>报表约需 %1 页，而一个文档最多 %2 页；请打印第 1 到 %3 行，或去掉一些列</translation>
+    </message>
+    <message>
+        <source>not even the first rows fit on the %1 pages that a document holds; choose larger paper, or leave out columns</source>
+        <translation>一个文档的 %1 页连前几行都放不下；请选择更大的纸张，或去掉一些列</translation>
+    </message>
+    <message>
+        <source>1 is portrait and 2 is landscape</source>
+        <translation>1 为纵向，2 为横向</translation>
+    </message>
+    <message>
+        <source>the number of a paper is a whole number, such as 9</source>
+        <translation>纸张编号是整数，例如 9</translation>
+    </message>
+    <message>
+        <source>this margin is at most 361 mm</source>
+        <translation>此边距最大为 361 mm</translation>
+    </message>
+    <message>
+        <source>this margin is at most 321 mm</source>
+        <translation>此边距最大为 321 mm</translation>
+    </message>
+    <message>
+        <source>this margin is at most 481 mm</source>
+        <translation>此边距最大为 481 mm</translation>
+    </message>
+    <message>
+        <source>a sheet is wider than 0 and no wider than 5779 mm</source>
+        <translation>纸张宽度大于 0，不超过 5779 mm</translation>
+    </message>
+    <message>
+        <source>a sheet is higher than 0 and no higher than 5779 mm</source>
+        <translation>纸张高度大于 0，不超过 5779 mm</translation>
+    </message>
+    <message>
+        <source>a colour is a number from 0 to 16777215</source>
+        <translation>颜色是 0 到 16777215 之间的数</translation>
+    </message>
+    <message>
+        <source>a font size is a number of points above 0, at most 16000</source>
+        <translation>字号是大于 0、不超过 16000 的磅数</translation>
+    </message>
+    <message>
+        <source>%1 in %2</source>
+        <translation>%1（在 %2 中）</translation>
+    </message>
+    <message>
+        <source>%1 and %2 more settings</source>
+        <translation>%1 以及另外 %2 项设置</translation>
+    </message>
+    <message>
+        <source>%1 and %2</source>
+        <translation>%1 和 %2</translation>
+    </message>
+    <message>
+        <source>%1 is missing</source>
+        <translation>缺少 %1</translation>
+    </message>
+    <message>
+        <source>%1 are missing</source>
+        <translation>缺少 %1</translation>
+    </message>
+    <message>
+        <source>the margins leave no room on the sheet; they are printed larger than stored, 1.6 times at the top, 1.8 times at the bottom and 1.2 times at the sides.</source>
+        <translation>边距在纸上没有留下空间；打印时边距比保存的值大：上边 1.6 倍，下边 1.8 倍，两侧 1.2 倍。</translation>
+    </message>
+    <message>
+        <source>%1 begins with a byte-order mark, which belongs to another encoding; settings are written in GB18030.</source>
+        <translation>%1 以字节顺序标记开头，那属于另一种编码；设置使用 GB18030 编码。</translation>
+    </message>
+    <message>
+        <source>%1; restore the defaults</source>
+        <translation>%1；请恢复默认设置</translation>
+    </message>
+    <message>
+        <source>%1; correct it in %2 or restore the defaults</source>
+        <translation>%1；请在“%2”中更正，或恢复默认设置</translation>
+    </message>
+    <message>
+        <source>%1, which holds paper, margins and style; restore the defaults</source>
+        <translation>%1（保存纸张、边距和样式）；请恢复默认设置</translation>
+    </message>
+    <message>
+        <source>a cell holds an object</source>
+        <translation>单元格中是对象</translation>
+    </message>
+    <message>
+        <source>fields %1 to</source>
+        <translation>字段 %1 到</translation>
+    </message>
+    <message>
+        <source>a Sorvane was expected</source>
+        <translation>应为 Sorvane</translation>
+    </message>
+    <message>
+        <source>an object of the library cannot be handed to a script&apos;s grid</source>
+        <translation>库的对象不能交给脚本的表格</translation>
+    </message>
+    <message>
+        <source>Item needs an index</source>
+        <translation>Item 需要索引</translation>
+    </message>
+    <message>
+        <source>a symbol is no value</source>
+        <translation>符号不是值</translation>
+    </message>
+    <message>
+        <source>only an array takes an index</source>
+        <translation>只有数组接受索引</translation>
+    </message>
+    <message>
+        <source>item</source>
+        <translation>项</translation>
+    </message>
+    <message>
+        <source>this is a picture, not a table</source>
+        <translation>这是图片，不是表格</translation>
+    </message>
+    <message>
+        <source>this is a packed file; unpack it first, for example with: gunzip -c FILE</source>
+        <translation>这是压缩文件；请先解压，例如：gunzip -c 文件</translation>
+    </message>
+    <message>
+        <source>this is an HTML or XML document, not a table; save its table as CSV</source>
+        <translation>这是 HTML 或 XML 文档，不是表格；请把其中的表格另存为 CSV</translation>
+    </message>
+    <message>
+        <source>this is a PDF file; take the file that it was made from, or save its table as CSV</source>
+        <translation>这是 PDF 文件；请使用生成它的原文件，或把其中的表格另存为 CSV</translation>
+    </message>
+    <message>
+        <source>this is a ZIP archive; unpack it first</source>
+        <translation>这是 ZIP 压缩包；请先解压</translation>
+    </message>
+    <message>
+        <source>this is a program, not a table</source>
+        <translation>这是程序，不是表格</translation>
+    </message>
+    <message>
+        <source>this is a Parquet file; save its table as CSV</source>
+        <translation>这是 Parquet 文件；请把其中的表格另存为 CSV</translation>
+    </message>
+    <message>
+        <source>this is a text document, not a table; save its table as CSV</source>
+        <translation>这是文字文档，不是表格；请把其中的表格另存为 CSV</translation>
+    </message>
+    <message>
+        <source>more than 32767 values in a row</source>
+        <translation>一行中的值超过 32767 个</translation>
+    </message>
+    <message>
+        <source>the file is empty</source>
+        <translation>文件是空的</translation>
+    </message>
+    <message>
+        <source>a zero byte; this is no text file</source>
+        <translation>含有零字节；这不是文本文件</translation>
+    </message>
+    <message>
+        <source>%1 and others</source>
+        <translation>%1 等</translation>
+    </message>
+    <message>
+        <source>the row at line %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</source>
+        <translation>第 %1 行处的记录可能是几行粘在一起：带引号的值跨越了换行，而且值的个数与标题不同</translation>
+    </message>
+    <message>
+        <source>the rows at lines %1 may be several rows glued together: a quoted value goes on over a line break, and the row has not as many values as the titles</source>
+        <translation>第 %1 行处的记录可能是几行粘在一起：带引号的值跨越了换行，而且值的个数与标题不同</translation>
+    </message>
+    <message>
+        <source>a tab</source>
+        <translation>制表符</translation>
+    </message>
+    <message>
+        <source>%1 of %2 rows have not as many values as the titles, the first at line %3; is this a table with %4 between its values?</source>
+        <translation>%2 行中有 %1 行的值与标题的个数不同，第一处在第 %3 行；这张表的值之间用的是 %4 吗？</translation>
+    </message>
+    <message>
+        <source>the encoding was guessed to be %1; name another one if letters look wrong</source>
+        <translation>编码猜测为 %1；如果文字显示不对，请指定其他编码</translation>
+    </message>
+    <message>
+        <source>a table is an array of objects, [{&quot;name&quot;: value, …}, …], or one object a line</source>
+        <translation>表格是对象的数组 [{&quot;名称&quot;: 值, …}, …]，或每行一个对象</translation>
+    </message>
+    <message>
+        <source>more than 32767 different names</source>
+        <translation>不同的名称超过 32767 个</translation>
+    </message>
+    <message>
+        <source>this is no JSON: %1</source>
+        <translation>这不是 JSON：%1</translation>
+    </message>
+    <message>
+        <source>the file is one object; %1; take the array out of it, for example with: jq %2</source>
+        <translation>文件是一个对象；%1；请取出其中的数组，例如：jq %2</translation>
+    </message>
+    <message>
+        <source>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</source>
+        <translation>此办公文件需要由 LibreOffice 转换，但未安装 LibreOffice；请安装 libreoffice-calc，或把文件另存为 .xlsx、.ods 或 CSV</translation>
+    </message>
+    <message>
+        <source>the file cannot be copied to convert it</source>
+        <translation>无法复制文件以进行转换</translation>
+    </message>
+    <message>
+        <source>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</source>
+        <translation>LibreOffice 无法转换此文件；请把它另存为 .xlsx、.ods 或 CSV</translation>
+    </message>
+    <message>
+        <source>a cell past the end of its sheet</source>
+        <translation>单元格超出了工作表的末尾</translation>
+    </message>
+    <message>
+        <source>the sheet is empty</source>
+        <translation>工作表是空的</translation>
+    </message>
+    <message>
+        <source>no sheet %1; the file has: %2</source>
+        <translation>没有工作表 %1；文件中有：%2</translation>
+    </message>
+    <message>
+        <source>the office file is damaged; open it in its program and save it again, or save it as CSV</source>
+        <translation>办公文件已损坏；请用原程序打开并重新保存，或另存为 CSV</translation>
+    </message>
+    <message>
+        <source>give one statement only</source>
+        <translation>只能给出一条语句</translation>
+    </message>
+    <message>
+        <source>the database cannot be copied to read its log: %1</source>
+        <translation>无法复制数据库以读取其日志：%1</translation>
+    </message>
+    <message>
+        <source>this is no SQLite database</source>
+        <translation>这不是 SQLite 数据库</translation>
+    </message>
+    <message>
+        <source>the database has no table</source>
+        <translation>数据库中没有表</translation>
+    </message>
+    <message>
+        <source>name one of the database&apos;s tables: %1</source>
+        <translation>请指定数据库中的一张表：%1</translation>
+    </message>
+    <message>
+        <source>no table %1; the database has: %2</source>
+        <translation>没有表 %1；数据库中有：%2</translation>
+    </message>
+    <message>
+        <source>the statement is no query; give a SELECT</source>
+        <translation>该语句不是查询；请给出 SELECT</translation>
+    </message>
+    <message>
+        <source>the statement answers no rows; give a SELECT</source>
+        <translation>该语句不返回行；请给出 SELECT</translation>
+    </message>
+    <message>
+        <source>bytes that are neither UTF-8 nor GB18030 text; name the encoding</source>
+        <translation>既不是 UTF-8 也不是 GB18030 的字节；请指定编码</translation>
+    </message>
+    <message>
+        <source>line %1: %2</source>
+        <translation>第 %1 行：%2</translation>
+    </message>
+    <message>
+        <source>unknown encoding %1; known are UTF-8, GB18030, GBK, Big5, UTF-16 and ISO-8859-1, among others</source>
+        <translation>未知的编码 %1；已知的有 UTF-8、GB18030、GBK、Big5、UTF-16 和 ISO-8859-1 等</translation>
+    </message>
+    <message>
+        <source>bytes that are no %1</source>
+        <translation>不是 %1 的字节</translation>
+    </message>
+    <message>
+        <source>bytes that are no %1, which the file&apos;s mark says it is</source>
+        <translation>不是 %1 的字节，而文件标记说它是</translation>
+    </message>
+    <message>
+        <source>the office file holds more than 2 GB</source>
+        <translation>办公文件超过 2 GB</translation>
+    </message>
+    <message>
+        <source>%1 OK will save nothing.</source>
+        <translation>%1 OK 将不会保存任何内容。</translation>
+    </message>
+    <message>
+        <source>%1 is empty: OK keeps the stored one.</source>
+        <translation>%1 为空：OK 保留已保存的值。</translation>
+    </message>
+    <message>
+        <source>%1 &quot;%2&quot; lacks its unit, as in &quot;210mm&quot;: OK will save nothing of all three tabs.</source>
+        <translation>%1“%2”缺少单位（例如“210mm”）：OK 不会保存三个选项卡中的任何内容。</translation>
+    </message>
+    <message>
+        <source>%1 must be above 0: OK will store it, and no page can be laid out.</source>
+        <translation>%1 必须大于 0：OK 会保存它，但无法排出任何页面。</translation>
+    </message>
+    <message>
+        <source>%1 is at most %2: OK will store it, and no page can be built until it is smaller.</source>
+        <translation>%1 最大为 %2：OK 会保存它，但在改小之前无法生成任何页面。</translation>
+    </message>
+    <message>
+        <source>%1 %2 is printed as %3</source>
+        <translation>%1 %2 打印为 %3</translation>
+    </message>
+    <message>
+        <source>%1; a margin is at most %2 here. OK will store it, and no page can be built until it is smaller.</source>
+        <translation>%1；此处边距最大为 %2。OK 会保存它，但在改小之前无法生成任何页面。</translation>
+    </message>
+    <message>
+        <source>%1 0 mm is printed as 20 mm.</source>
+        <translation>%1 0 mm 打印为 20 mm。</translation>
+    </message>
+    <message>
+        <source>%1 lies outside the sheet. OK will store it all the same.</source>
+        <translation>%1 在纸张之外。OK 仍会保存它。</translation>
+    </message>
+    <message>
+        <source>%1, and the sheet is %2 high</source>
+        <translation>%1，而纸张高 %2</translation>
+    </message>
+    <message>
+        <source>%1, and the sheet is %2 wide</source>
+        <translation>%1，而纸张宽 %2</translation>
+    </message>
+    <message>
+        <source>%1: it lies outside. OK will store it all the same.</source>
+        <translation>%1：边距在纸张之外。OK 仍会保存它。</translation>
+    </message>
+    <message>
+        <source>%1: there is no room left for a row. OK will store it all the same.</source>
+        <translation>%1：没有放下一行的空间。OK 仍会保存它。</translation>
+    </message>
+    <message>
+        <source>%1: there is no room left for a column. OK will store it all the same.</source>
+        <translation>%1：没有放下一列的空间。OK 仍会保存它。</translation>
+    </message>
+    <message>
+        <source>no grid is previewed</source>
+        <translation>没有正在预览的表格</translation>
+    </message>
+    <message>
+        <source>There are %1 more like this.</source>
+        <translation>还有 %1 处类似的问题。</translation>
+    </message>
+    <message>
+        <source>The pages could not be built.</source>
+        <translation>无法生成页面。</translation>
+    </message>
+    <message>
+        <source>%1: the name must end in .pdf, .png or .svg</source>
+        <translation>%1：文件名必须以 .pdf、.png 或 .svg 结尾</translation>
+    </message>
+    <message>
+        <source>%1 character has no glyph in any installed font and shows as a hollow box (%2)</source>
+        <translation>%1 个字符在已安装的字体中没有字形，显示为空框（%2）</translation>
+    </message>
+    <message>
+        <source>%1 characters have no glyph in any installed font and show as hollow boxes (%2)</source>
+        <translation>%1 个字符在已安装的字体中没有字形，显示为空框（%2）</translation>
+    </message>
+    <message>
+        <source>%1; install %2</source>
+        <translation>%1；请安装 %2</translation>
+    </message>
+    <message>
+        <source>the paper has no width</source>
+        <translation>纸张没有宽度</translation>
+    </message>
+    <message>
+        <source>the paper has no width or no height</source>
+        <translation>纸张没有宽度或没有高度</translation>
+    </message>
+    <message>
+        <source>the window has no room for a page</source>
+        <translation>窗口放不下一页</translation>
+    </message>
+    <message>
+        <source>the pages cannot be shown any smaller</source>
+        <translation>页面无法显示得更小</translation>
+    </message>
+    <message>
+        <source>a scale of 0 shows nothing</source>
+        <translation>比例为 0 时什么也不显示</translation>
+    </message>
+    <message>
+        <source>a scale of %1 is too small</source>
+        <translation>比例 %1 太小</translation>
+    </message>
+</context>
+<context>
     <name>ToolMeanings</name>
     <message>
         <source>Fonts, colours and grid lines of the report</source>
