@@ -24,8 +24,9 @@ std::uint64_t TextStore::place(TextView text)
 /// Texts are mostly looked for in the order in which they were copied.
 std::optional<std::uint64_t> TextStore::placeOf(TextView text, std::size_t& block) const
 {
-    for (std::size_t looked = 0; looked < blocks_.size(); ++looked) {
-        const std::size_t at = (block + looked) % blocks_.size();
+    std::size_t at = block < blocks_.size() ? block : 0;
+    for (std::size_t looked = 0; looked < blocks_.size();
+         ++looked, at = at + 1 < blocks_.size() ? at + 1 : 0) {
         const auto first = reinterpret_cast<std::uintptr_t>(blocks_[at].units.get());
         const auto units = reinterpret_cast<std::uintptr_t>(text.data());
         if (units < first || units >= first + blocks_[at].size * sizeof(char16_t))

@@ -56,7 +56,8 @@ SeparatedValues::SeparatedValues(std::string_view text, ValuesDialect dialect)
     , dialect_(dialect)
 {
     for (const char end : { '\n', '\r', dialect.delimiter })
-        ends_[static_cast<unsigned char>(end)] = true;
+        kinds_[static_cast<unsigned char>(end)] |= EndsValue;
+    kinds_[static_cast<unsigned char>('"')] |= IsQuote;
 }
 
 bool SeparatedValues::nextRow()
@@ -71,12 +72,6 @@ bool SeparatedValues::nextRow()
         return false;
     readRow();
     return true;
-}
-
-std::string_view SeparatedValues::value(std::size_t index) const
-{
-    const Piece& piece = values_[index];
-    return (piece.isScratch ? std::string_view(scratch_) : text_).substr(piece.begin, piece.length);
 }
 
 /// Goes behind all line ends that follow.
@@ -141,14 +136,19 @@ void SeparatedValues::readPlain()
 {
     const std::size_t begin = position_;
     std::size_t end = begin;
-    while (!endsValue(end))
-        ++end;
+    unsigned seen = Plain;
+    for (; end < text_.size(); ++end) {
+        const unsigned kind = kindAt(end);
+        if ((kind & EndsValue) != 0)
+            break;
+        seen |= kind;
+    }
     position_ = end;
     const std::string_view value = withoutBlanks(text_.substr(begin, end - begin));
     const std::size_t offset
         = value.empty() ? begin : static_cast<std::size_t>(value.data() - text_.data());
     values_.push_back({ offset, value.size(), false });
-    hasStrayQuote_ = hasStrayQuote_ || value.find('"') != std::string_view::npos;
+    hasStrayQuote_ = hasStrayQuote_ || (seen & IsQuote) != 0;
 }
 
 /// Adds a value with its doubled quotes made single.

@@ -36,7 +36,11 @@ public:
 
     std::size_t valueCount() const { return values_.size(); }
     /// A value of the row, from 0; borrowed until the next row.
-    std::string_view value(std::size_t index) const;
+    std::string_view value(std::size_t index) const
+    {
+        const Piece& piece = values_[index];
+        return { (piece.isScratch ? scratch_.data() : text_.data()) + piece.begin, piece.length };
+    }
 
     /// The line on which the row begins, from 1.
     std::int64_t line() const { return rowLine_; }
@@ -56,9 +60,16 @@ private:
     };
 
     bool isLineEnd(std::size_t at) const { return text_[at] == '\n' || text_[at] == '\r'; }
+    /// What a byte may mean: bits.
+    enum ByteKind : std::uint8_t { Plain = 0, EndsValue = 1, IsQuote = 2 };
+
+    std::uint8_t kindAt(std::size_t at) const
+    {
+        return kinds_[static_cast<unsigned char>(text_[at])];
+    }
     bool endsValue(std::size_t at) const
     {
-        return at == text_.size() || ends_[static_cast<unsigned char>(text_[at])];
+        return at == text_.size() || (kindAt(at) & EndsValue) != 0;
     }
     void skipLineEnds();
     void readRow();
@@ -68,7 +79,7 @@ private:
 
     std::string_view text_;
     ValuesDialect dialect_;
-    std::array<bool, 256> ends_ {}; ///< by byte: whether a value ends before it
+    std::array<std::uint8_t, 256> kinds_ {}; ///< by byte
     std::size_t position_ = 0;
     std::int64_t line_ = 1;
     std::int64_t rowLine_ = 1;

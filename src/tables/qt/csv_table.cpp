@@ -6,6 +6,7 @@
 #include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "platform/utf8.h"
 #include "tables/separated_values.h"
 
 #include <algorithm>
@@ -91,26 +92,26 @@ std::size_t widestFrom(SeparatedValues values)
 /// The values of a row as texts, the buffers kept from row to row.
 class RowTexts {
 public:
+    /// @return  valid until the next row
     std::span<const TextView> of(const SeparatedValues& values)
     {
-        units_.clear();
-        ends_.clear();
-        for (std::size_t at = 0; at < values.valueCount(); ++at) {
-            appendUtf8(units_, values.value(at));
-            ends_.push_back(units_.size());
-        }
+        std::size_t most = 0;
+        for (std::size_t at = 0; at < values.valueCount(); ++at)
+            most += values.value(at).size();
+        if (units_.size() < most)
+            units_.resize(most);
         cells_.clear();
-        std::size_t begin = 0;
-        for (const std::size_t end : ends_) {
-            cells_.push_back(TextView(units_).substr(begin, end - begin));
+        char16_t* begin = units_.data();
+        for (std::size_t at = 0; at < values.valueCount(); ++at) {
+            char16_t* const end = putUtf8(begin, values.value(at));
+            cells_.emplace_back(begin, static_cast<std::size_t>(end - begin));
             begin = end;
         }
         return cells_;
     }
 
 private:
-    Text units_; ///< the cells of the row, one behind the other
-    std::vector<std::size_t> ends_;
+    Text units_; ///< the cells of the row, one behind the other, and room
     std::vector<TextView> cells_;
 };
 

@@ -11,6 +11,7 @@
 #include <algorithm>
 #include <atomic>
 #include <chrono>
+#include <ctime>
 #include <functional>
 #include <thread>
 
@@ -42,8 +43,12 @@ public:
     Beside(const Beside&) = delete;
     Beside& operator=(const Beside&) = delete;
 
-    /// Milliseconds.
+    /// Milliseconds of the clock.
     qint64 longest() const { return std::max(longest_, since_.elapsed()); }
+
+    /// Milliseconds for which a processor worked at most in between: other work on the machine does
+    /// not count.
+    qint64 longestWork() const { return std::max(longestWork_, worked()); }
 
 protected:
     bool event(QEvent* event) override
@@ -51,6 +56,8 @@ protected:
         if (event->type() != QEvent::User)
             return QObject::event(event);
         longest_ = std::max(longest_, since_.restart());
+        longestWork_ = std::max(longestWork_, worked());
+        workedBefore_ = std::clock();
         isPosted_ = false;
         if (look_)
             look_();
@@ -58,9 +65,17 @@ protected:
     }
 
 private:
+    qint64 worked() const
+    {
+        constexpr auto ATick = CLOCKS_PER_SEC / 1000;
+        return static_cast<qint64>((std::clock() - workedBefore_) / ATick);
+    }
+
     std::function<void()> look_;
     QElapsedTimer since_;
     qint64 longest_ = 0;
+    std::clock_t workedBefore_ = std::clock();
+    qint64 longestWork_ = 0;
     std::atomic<bool> isPosted_ = false;
     std::atomic<bool> isOver_ = false;
     std::thread poster_;
