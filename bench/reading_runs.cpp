@@ -8,6 +8,7 @@
 #include "sample_table.h"
 
 #include "grids/qt/table_view_grid.h"
+#include "grids/qt/tree_view_grid.h"
 #include "report/grid_reader.h"
 #include "tables/qt/csv_table.h"
 #include "tables/qt/sqlite_table.h"
@@ -18,6 +19,7 @@
 #include <QStandardItemModel>
 #include <QTableView>
 #include <QTemporaryDir>
+#include <QTreeView>
 
 #include <algorithm>
 #include <cstdio>
@@ -52,10 +54,10 @@ QString stringOf(TextView text)
     return QString::fromUtf16(text.data(), static_cast<qsizetype>(text.size()));
 }
 
-GridTable read(AutomationObject& grid)
+GridTable read(AutomationObject& grid, PrintObjKind kind = PrintObjKind::MSFlexGrid)
 {
     return readGrid(grid,
-        { .kind = PrintObjKind::MSFlexGrid,
+        { .kind = kind,
             .paperWidth = 11500,
             .keptWidths = {},
             .store = std::make_shared<TextStore>() });
@@ -146,22 +148,55 @@ std::size_t walk(const QAbstractItemModel& model)
     return units;
 }
 
-void readView(const TableGrid& table)
+QStandardItemModel* modelOf(const TableGrid& table, QObject& owner)
 {
-    QStandardItemModel model(static_cast<int>(table.rowCount()), table.columnCount());
-    for (int row = 0; row < model.rowCount(); ++row) {
-        for (int column = 0; column < model.columnCount(); ++column)
-            model.setItem(row, column, new QStandardItem(stringOf(table.cell(row, column))));
+    auto* const model
+        = new QStandardItemModel(static_cast<int>(table.rowCount()), table.columnCount(), &owner);
+    for (int row = 0; row < model->rowCount(); ++row) {
+        for (int column = 0; column < model->columnCount(); ++column)
+            model->setItem(row, column, new QStandardItem(stringOf(table.cell(row, column))));
     }
-    QTableView view;
-    view.setModel(&model);
+    return model;
+}
+
+void judgeView(const char* what, double bare, const std::function<void()>& run)
+{
+    const double seconds = secondsOf(run);
+    print(what, seconds, seconds / bare, "bare walks, at most 2", seconds <= MostWalks * bare);
+}
+
+/// The fields of a row set in place, as its document is laid out.
+std::size_t walk(RowSet& rows)
+{
+    std::size_t units = 0;
+    for (rows.moveFirst(); !rows.isAfterLast(); rows.moveNext()) {
+        for (int field = 0; field < rows.fieldCount(); ++field)
+            units += rows.value(field).text().size();
+    }
+    return units;
+}
+
+void readViews(const TableGrid& texts)
+{
+    QObject owner;
+    QStandardItemModel& model = *modelOf(texts, owner);
     const double bare = secondsOf([&] { walk(model); });
-    const double seconds = secondsOf([&] {
-        qt::TableViewGrid grid(view);
+    QTableView table;
+    table.setModel(&model);
+    judgeView("table view to row set", bare, [&] {
+        qt::TableViewGrid grid(table);
         read(grid);
     });
-    print("table view to row set", seconds, seconds / bare, "bare walks, at most 2",
-        seconds <= MostWalks * bare);
+    judgeView("data grid of a table view, walked in place", bare, [&] {
+        qt::TableViewGrid grid(table);
+        walk(*read(grid, PrintObjKind::datagrid).rows);
+    });
+    QTreeView tree;
+    tree.setModel(&model);
+    judgeView("tree view to row set", bare, [&] {
+        qt::TreeViewGrid grid(tree);
+        read(grid, PrintObjKind::ListView);
+    });
 }
 
 } // namespace
@@ -177,6 +212,6 @@ int main(int count, char** arguments)
     const TableGrid table = bench::sampleTable(rows);
     readCsvFile(table, path);
     readDatabase(table, path);
-    readView(table);
+    readViews(table);
     return 0;
 }

@@ -256,8 +256,7 @@ private:
         const fs::path path = fs::path(folder_.path().toStdString()) / "report.ostl";
         const OstlEncoding encoding { record_->codec, u'.' };
         const StopWatch writing;
-        writeOstl(
-            canvas.document(), canvas.page, encoding, {}, SafeFile(canvas.platform().files, path));
+        writeOstl(canvas.document(), canvas.page, encoding, {}, SafeFile(record_->files, path));
         const double written = writing.seconds();
         print("document file: write", rows, written, "(131 pages at most)");
         repeatPages(path, canvas.document().pageCount() / (LastSavedPage + 1));
@@ -281,8 +280,7 @@ private:
             return;
         const fs::path path = fs::path(folder_.path().toStdString()) / "report.pdf";
         const StopWatch watch;
-        qt::exportPdf(canvas.document(), canvas.page, platform_.fonts(), {},
-            SafeFile(canvas.platform().files, path));
+        qt::exportPdf(canvas.document(), canvas.page, platform_.fonts(), {}, path);
         const double seconds = watch.seconds();
         print("PDF export", rows, seconds, "");
         const double pages = canvas.document().pageCount();

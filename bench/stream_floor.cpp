@@ -4,20 +4,17 @@
 #include "stream_floor.h"
 
 #include "document/page_document.h"
-
-#include <libdeflate.h>
+#include "export/qt/zlib_deflater.h"
 
 #include <charconv>
 #include <cstdio>
 #include <ctime>
-#include <memory>
+#include <string_view>
 #include <vector>
 
 namespace pelloric::bench {
 
 namespace {
-
-constexpr int Level = 6;
 
 double processorSeconds() { return static_cast<double>(std::clock()) / CLOCKS_PER_SEC; }
 
@@ -91,19 +88,15 @@ double streamFloorSeconds(const PageDocument& document, const std::filesystem::p
 {
     const double begin = processorSeconds();
     std::FILE* const file = std::fopen(path.c_str(), "wb");
-    libdeflate_compressor* const compressor = libdeflate_alloc_compressor(Level);
+    qt::ZlibDeflater deflater;
     std::vector<char> stream;
-    std::vector<char> packed;
     for (int page = 0; page < document.pageCount(); ++page) {
         stream.resize(std::max(stream.size(), roomFor(document, page)));
         char* const end = putTexts(putLines(stream.data(), document, page), document, page);
         const auto size = static_cast<std::size_t>(end - stream.data());
-        packed.resize(std::max(packed.size(), libdeflate_zlib_compress_bound(compressor, size)));
-        const std::size_t packedSize = libdeflate_zlib_compress(
-            compressor, stream.data(), size, packed.data(), packed.size());
-        std::fwrite(packed.data(), 1, packedSize, file);
+        const std::string_view packed = deflater.deflate({ stream.data(), size });
+        std::fwrite(packed.data(), 1, packed.size(), file);
     }
-    libdeflate_free_compressor(compressor);
     std::fclose(file);
     return processorSeconds() - begin;
 }
