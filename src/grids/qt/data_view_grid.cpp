@@ -5,6 +5,7 @@
 
 #include "grids/collection.h"
 #include "grids/qt/held_grid.h"
+#include "grids/qt/table_view_grid.h"
 #include "platform/member_names.h"
 #include "platform/numbers.h"
 #include "platform/phrase.h"
@@ -151,6 +152,17 @@ void DataViewGrid::put(MemberId member, std::span<const Value>, const Value& val
     const Value index[] = { value };
     setColumn(indexArgument(index, 0, 0, columns_->map().count() - 1));
 }
+
+CellLooks* DataViewGrid::cellLooks()
+{
+    if (shown_)
+        shown_->takeAnew();
+    else
+        shown_ = std::make_unique<TableViewGrid>(view());
+    return shown_.get();
+}
+
+bool DataViewGrid::takesRows(MemberId member) { return member == DataSource; }
 
 QTableView& DataViewGrid::view() const { return alive(view_); }
 

@@ -14,6 +14,8 @@ class QTableView;
 
 namespace pelloric::qt {
 
+class TableViewGrid;
+
 /// A table view as a data grid: `DataSource`, `Columns`, `col`; for a host that wants the data
 /// grid's reader, which prints hidden columns too.
 ///
@@ -32,6 +34,12 @@ public:
     Value get(MemberId member, std::span<const Value> arguments) override;
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
 
+    /// Whether reading a member takes the rows and columns of the view anew.
+    static bool takesRows(MemberId member);
+
+    /// Those of the records and columns as they stand now.
+    CellLooks* cellLooks() override;
+
 private:
     class Columns;
 
@@ -43,6 +51,7 @@ private:
     QPointer<QTableView> view_;
     std::unique_ptr<Columns> columns_;
     ModelRowSet rows_;
+    std::unique_ptr<TableViewGrid> shown_; ///< tells how cells look; null: nobody asked yet
     int column_ = 0; ///< what `col` was set to
 };
 

@@ -14,6 +14,7 @@
 #include <QHeaderView>
 #include <QItemSelectionModel>
 #include <QStyle>
+#include <QStyleOptionViewItem>
 #include <QTableView>
 
 #include <iterator>
@@ -32,7 +33,7 @@ static_assert(std::size(Names) == MemberCount);
 TableViewGrid::TableViewGrid(QTableView& view)
     : view_(&view)
 {
-    takeMaps();
+    takeAnew();
 }
 
 TableViewGrid::~TableViewGrid() = default;
@@ -52,7 +53,7 @@ Value TableViewGrid::get(MemberId member, std::span<const Value> arguments)
 {
     switch (member) {
     case Cols:
-        takeMaps();
+        takeAnew();
         return Value::ofNumber(columns_.count());
     case Rows:
         return Value::ofNumber(rows_.count() + 1);
@@ -68,6 +69,8 @@ Value TableViewGrid::get(MemberId member, std::span<const Value> arguments)
         return Value::ofText(shown);
     }
     default:
+        if (DataViewGrid::takesRows(member - MemberCount))
+            takeAnew();
         return dataGrid().get(member - MemberCount, arguments);
     }
 }
@@ -91,7 +94,7 @@ QTableView& TableViewGrid::view() const
     return *view_;
 }
 
-void TableViewGrid::takeMaps()
+void TableViewGrid::takeAnew()
 {
     QTableView& table = view();
     fetchAll(*table.model(), table.rootIndex());
@@ -155,7 +158,9 @@ GridLook TableViewGrid::gridLook()
     const QTableView& table = view();
     if (!table.showGrid())
         return ViewLooks::withoutLines();
-    const int hint = table.style()->styleHint(QStyle::SH_Table_GridLineColor, nullptr, &table);
+    QStyleOptionViewItem option;
+    option.initFrom(&table); // the palette that styles take the colour from
+    const int hint = table.style()->styleHint(QStyle::SH_Table_GridLineColor, &option, &table);
     const QColor color = QColor::fromRgb(static_cast<QRgb>(hint));
     constexpr std::int16_t Styles[] = { 5, 0, 1, 2, 3, 4 }; // in the order of Qt::PenStyle
     const auto style = static_cast<std::size_t>(table.gridStyle());

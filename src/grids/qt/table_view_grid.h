@@ -40,6 +40,9 @@ public:
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
     CellLooks* cellLooks() override { return this; }
 
+    /// Takes order, rows and looks of the view anew.
+    void takeAnew();
+
     void readRow(std::int32_t row, std::span<const int> columns,
         const std::function<void(TextView text)>& take) override;
 
@@ -54,7 +57,6 @@ private:
     bool hasCell(std::int32_t row, std::int32_t column) const;
     QModelIndex indexOf(std::int32_t row, std::int32_t column) const;
     QTableView& view() const;
-    void takeMaps();
     int columnOf(std::span<const Value> arguments, std::size_t position) const;
     TextView title(int column);
     TextView text(const QTableView& table, const QModelIndex& root, ModelCell cell);

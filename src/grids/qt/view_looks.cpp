@@ -36,6 +36,14 @@ struct OptionOfDelegate : QStyledItemDelegate {
 
 Color colorOf(const QColor& color) { return rgb(color.red(), color.green(), color.blue()); }
 
+/// The colour of every other row on paper, which is white also where a view is dark.
+Color alternateOnPaper(const QPalette& palette)
+{
+    const QColor OnWhite(0xF2, 0xF2, 0xF2);
+    const bool isDark = palette.color(QPalette::Base).lightnessF() < 0.5F;
+    return colorOf(isDark ? OnWhite : palette.color(QPalette::AlternateBase));
+}
+
 bool wrapsWords(const QAbstractItemView& view)
 {
     if (const auto* table = qobject_cast<const QTableView*>(&view))
@@ -157,7 +165,7 @@ void ViewLooks::take(const QAbstractItemView& view)
     tooWide_ = tooWideOf(view);
     iconFiles_.clear();
     alternates_ = view.alternatingRowColors();
-    alternateColor_ = colorOf(option_.palette.color(QPalette::AlternateBase));
+    alternateColor_ = alternateOnPaper(option_.palette);
 }
 
 void ViewLooks::read(const QAbstractItemView& view, const QModelIndex& index, CellLook& look)

@@ -5,9 +5,12 @@
 
 #include "grids/qt/grid_for.h"
 #include "grids/qt/late_bound.h"
+#include "platform/cell_look.h"
 #include "platform/row_set.h"
 #include "report/grid_reader.h"
 #include "support/errors.h"
+
+#include <pelloric/grids.h>
 
 #include <QHeaderView>
 #include <QSortFilterProxyModel>
@@ -15,7 +18,7 @@
 #include <QSqlQuery>
 #include <QSqlTableModel>
 #include <QStyledItemDelegate>
-#include <QTableView>
+#include <QTableWidget>
 
 #include <gtest/gtest.h>
 
@@ -212,6 +215,57 @@ TEST_F(DataViewGridTest, DelegatesOfAnSqlViewAreAsked)
     EXPECT_EQ(grid.get(u"Cols").number(), 3);
     EXPECT_EQ(grid.text(u"TextMatrix", 3, 2), u"1.50 €");
     view_.setItemDelegateForColumn(2, nullptr);
+}
+
+TEST_F(DataViewGridTest, LooksAreThoseOfTheRecordsAndColumnsAsTheyAreSeenAtTheBuild)
+{
+    QTableWidget table(4, 3);
+    for (int row = 0; row < 4; ++row) {
+        for (int column = 0; column < 3; ++column) {
+            auto* const item
+                = new QTableWidgetItem(QString(QChar('a' + column)) + QString::number(row));
+            item->setBackground(QColor(10 * row + 1, 100 + column, 0));
+            table.setItem(row, column, item);
+        }
+    }
+    table.item(2, 1)->setTextAlignment(Qt::AlignRight);
+    table.item(2, 1)->setCheckState(Qt::Checked);
+    const std::unique_ptr<QObject> ofView = dataGrid(table);
+    for (const auto& object : { gridFor(table), gridFor(*ofView) }) {
+        table.horizontalHeader()->moveSection(2, 0);
+        table.setColumnHidden(1, true);
+        table.setRowHidden(1, true);
+        const GridRequest request { .kind = PrintObjKind::datagrid,
+            .paperWidth = 11907,
+            .keptWidths = {},
+            .store = std::make_shared<TextStore>() };
+        GridTable read = readGrid(*object, request);
+        ASSERT_NE(read.looks, nullptr);
+        ASSERT_EQ(read.rows->recordCount(), 3);
+        ASSERT_EQ(read.gridColumns.size(), 3U);
+        Text buffer;
+        for (std::int32_t record = 1; record <= 3; ++record) {
+            read.rows->setPosition(record);
+            for (std::size_t field = 0; field < 3; ++field) {
+                const Text text(
+                    displayText(read.rows->value(static_cast<int>(field)), u'.', buffer));
+                CellLook look;
+                read.looks->readLook(read.firstLookRow + record - 1, read.gridColumns[field], look);
+                const int column = text[0] - u'a';
+                const int row = text[1] - u'0';
+                EXPECT_EQ(look.background, rgb(10 * row + 1, 100 + column, 0)) << toUtf8(text);
+                const bool isSpecial = text == u"b2";
+                EXPECT_EQ(look.alignment == CellAlignment::Right, isSpecial) << toUtf8(text);
+                EXPECT_EQ(look.check == CheckMark::On, isSpecial) << toUtf8(text);
+            }
+        }
+        table.selectRow(2);
+        EXPECT_TRUE(read.looks->isMarked(2));
+        EXPECT_FALSE(read.looks->isMarked(1));
+        table.setRowHidden(1, false);
+        table.horizontalHeader()->moveSection(0, 2);
+        table.clearSelection();
+    }
 }
 
 TEST_F(DataViewGridTest, RefusesMembersThatItDoesNotHave)
