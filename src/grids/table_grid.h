@@ -9,6 +9,7 @@
 #include "platform/cell_look.h"
 #include "platform/units.h"
 
+#include <optional>
 #include <vector>
 
 namespace pelloric {
@@ -18,6 +19,8 @@ struct TableColumn {
     Text title;
     Twips width = 0; ///< -1: the default width, which a reader replaces on the grid
     CellAlignment alignment = CellAlignment::Left; ///< of the title, where cells have looks
+    /// Where cells have looks: how wide the column is shown; 0: it is hidden; nothing: not known.
+    std::optional<Twips> shownWidth {};
 };
 
 /// A flex grid over a table of texts in memory: `Cols`, `Rows`, `ColWidth`, `TextMatrix`.

@@ -38,9 +38,11 @@ bool isCell(QStringView name)
 /// Reads one sheet; the file keeps every cell's text as it looks.
 class SheetReader {
 public:
-    SheetReader(QXmlStreamReader& xml, const QHash<QString, SheetLook>& looks)
+    /// @param file  the one that `xml` reads
+    SheetReader(QXmlStreamReader& xml, const ZipEntries& file)
         : xml_(xml)
-        , looks_(looks)
+        , looks_(readOdsStyles(file))
+        , widths_(readOdsWidths(file))
     {
     }
 
@@ -54,8 +56,7 @@ public:
             if (xml_.name() == QLatin1String("table-row"))
                 row += readRow(row);
             else if (xml_.name() == QLatin1String("table-column"))
-                columns_.emplace_back(repeated(xml_, "number-columns-repeated"),
-                    attribute(xml_, "default-cell-style-name"));
+                readColumns();
         }
         return std::move(cells_);
     }
@@ -90,6 +91,23 @@ private:
         return {};
     }
 
+    /// Columns of one style, and what their cells look like that name none.
+    void readColumns()
+    {
+        const std::int64_t count = repeated(xml_, "number-columns-repeated");
+        const QString style = attribute(xml_, "default-cell-style-name");
+        columns_.emplace_back(count, style);
+        if (!style.isEmpty())
+            cells_.fillBlanks({ 0, columnCount_, MostRepeated, count }, looks_.value(style));
+        const auto width = widths_.constFind(attribute(xml_, "style-name"));
+        const QString visibility = attribute(xml_, "visibility");
+        if (!visibility.isEmpty() && visibility != QLatin1String("visible"))
+            cells_.setWidth(columnCount_, count, 0);
+        else if (width != widths_.constEnd())
+            cells_.setWidth(columnCount_, count, *width);
+        columnCount_ += count;
+    }
+
     /// Goes on. @return  whether it came to the end of the element
     bool atEndOf(const char* element)
     {
@@ -110,7 +128,13 @@ private:
             const std::int64_t columns = repeated(xml_, "number-columns-repeated");
             const SheetValue value = valueHere();
             const QString style = attribute(xml_, "style-name");
+            const SheetArea box { row, column, repeated(xml_, "number-rows-spanned"),
+                repeated(xml_, "number-columns-spanned") };
             const Text text = readCell();
+            if (rows == 1 && columns == 1)
+                cells_.merge(box);
+            if (text.empty() && !style.isEmpty())
+                cells_.fillBlanks({ row, column, rows, columns }, looks_.value(style));
             for (std::int64_t at = 0; at < columns && !text.empty(); ++at)
                 filled.push_back({ column + at, text, value, lookAt(style, column + at) });
             column += columns;
@@ -162,7 +186,9 @@ private:
     }
 
     QXmlStreamReader& xml_;
-    const QHash<QString, SheetLook>& looks_;
+    QHash<QString, SheetLook> looks_;
+    QHash<QString, Twips> widths_;
+    std::int64_t columnCount_ = 0;
     std::vector<std::pair<std::int64_t, QString>> columns_; ///< so many columns, and their style
     SheetCells cells_;
 };
@@ -179,7 +205,7 @@ SheetCells readOdsSheet(const ZipEntries& file, const QString& sheet)
             continue;
         names.append(attribute(xml, "name"));
         if (sheet.isEmpty() || names.last() == sheet)
-            return SheetReader(xml, readOdsStyles(file)).read();
+            return SheetReader(xml, file).read();
         xml.skipCurrentElement();
     }
     if (xml.hasError() || names.isEmpty())

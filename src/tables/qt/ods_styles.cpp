@@ -3,6 +3,7 @@
 
 #include "tables/qt/ods_styles.h"
 
+#include "platform/numbers.h"
 #include "tables/qt/sheet_xml.h"
 #include "tables/qt/zip_entries.h"
 
@@ -120,7 +121,42 @@ SheetLook lookOf(const Styles& styles, const QString& name)
     return look;
 }
 
+/// A length such as "2.26cm": twips.
+std::optional<Twips> twipsOf(const QString& length)
+{
+    struct Unit {
+        const char* name;
+        double twips;
+    };
+    constexpr Unit Units[]
+        = { { "cm", 566.929 }, { "mm", 56.6929 }, { "in", 1440 }, { "pt", 20 }, { "pc", 240 } };
+    constexpr double Widest = 60000; ///< twips
+    for (const Unit& unit : Units) {
+        if (!length.endsWith(QLatin1String(unit.name)))
+            continue;
+        const double twips = length.chopped(2).toDouble() * unit.twips;
+        if (twips > 0 && twips <= Widest)
+            return roundToInt32(twips);
+    }
+    return std::nullopt;
+}
+
 } // namespace
+
+QHash<QString, Twips> readOdsWidths(const ZipEntries& file)
+{
+    QHash<QString, Twips> widths;
+    QString style;
+    forEachElement(file.read("content.xml"), [&](QXmlStreamReader& xml) {
+        if (xml.name() == QLatin1String("style"))
+            style = attribute(xml, "name");
+        if (xml.name() != QLatin1String("table-column-properties"))
+            return;
+        if (const auto width = twipsOf(attribute(xml, "column-width")))
+            widths.insert(style, *width);
+    });
+    return widths;
+}
 
 QHash<QString, SheetLook> readOdsStyles(const ZipEntries& file)
 {

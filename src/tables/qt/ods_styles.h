@@ -17,4 +17,8 @@ class ZipEntries;
 /// @throws RunTimeError TypeMismatch: the file is damaged
 QHash<QString, SheetLook> readOdsStyles(const ZipEntries& file);
 
+/// The widths of columns by the names of their styles: twips.
+/// @throws RunTimeError TypeMismatch: the file is damaged
+QHash<QString, Twips> readOdsWidths(const ZipEntries& file);
+
 } // namespace pelloric::qt

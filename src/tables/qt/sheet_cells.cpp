@@ -11,6 +11,8 @@
 #include <QStringList>
 
 #include <algorithm>
+#include <span>
+#include <utility>
 
 namespace pelloric::qt {
 
@@ -22,6 +24,83 @@ constexpr std::size_t MostLooks = 4000;
 
 constexpr CellAlignment UsualAlignments[]
     = { CellAlignment::Left, CellAlignment::Right, CellAlignment::Centre };
+
+/// The looks of the cells below the titles, and the boxes that they make.
+class ShownCells {
+public:
+    ShownCells(const SheetArea& body, std::vector<CellLook> looks)
+        : body_(body)
+        , looks_(std::move(looks))
+        , numbers_(static_cast<std::size_t>(body.rows * body.columns))
+        , mostChecked_(MostChecks * body.rows * body.columns)
+    {
+    }
+
+    /// @param row  of the body: from 0, as the column
+    std::uint16_t& lookAt(std::int64_t row, std::int64_t column)
+    {
+        return numbers_[static_cast<std::size_t>(row * body_.columns + column)];
+    }
+
+    std::span<const std::uint16_t> row(std::int64_t row) const
+    {
+        return std::span(numbers_).subspan(
+            static_cast<std::size_t>(row * body_.columns), static_cast<std::size_t>(body_.columns));
+    }
+
+    const std::vector<CellLook>& looks() const { return looks_; }
+
+    void fill(const SheetArea& area, std::uint16_t look)
+    {
+        forEachCell(area.within(body_), [&](std::uint16_t& number) {
+            number = look;
+            return true;
+        });
+    }
+
+    /// A box that touches another one is none, as the file is wrong then.
+    void merge(const SheetArea& area)
+    {
+        const SheetArea part = area.within(body_);
+        if (part.isEmpty() || looks_.size() > MostNumbers || mostChecked_ < 0)
+            return;
+        bool isFree = true;
+        forEachCell(part, [&](const std::uint16_t& number) {
+            --mostChecked_;
+            isFree = !looks_[number].box;
+            return isFree;
+        });
+        if (!isFree)
+            return;
+        const auto row = static_cast<std::int32_t>(part.row - body_.row);
+        const auto column = static_cast<std::int32_t>(part.column - body_.column);
+        CellLook look = looks_[lookAt(row, column)];
+        look.box = CellBox { row + 1, row + static_cast<std::int32_t>(part.rows), column,
+            column + static_cast<std::int32_t>(part.columns) - 1 };
+        looks_.push_back(look);
+        fill(part, static_cast<std::uint16_t>(looks_.size() - 1));
+    }
+
+private:
+    static constexpr std::size_t MostNumbers = 65000;
+    static constexpr std::int64_t MostChecks = 4; ///< of a cell, whatever boxes a file names
+
+    template <typename Action> void forEachCell(const SheetArea& area, const Action& action)
+    {
+        for (std::int64_t row = 0; row < area.rows; ++row) {
+            for (std::int64_t column = 0; column < area.columns; ++column) {
+                if (!action(
+                        lookAt(area.row - body_.row + row, area.column - body_.column + column)))
+                    return;
+            }
+        }
+    }
+
+    SheetArea body_;
+    std::vector<CellLook> looks_;
+    std::vector<std::uint16_t> numbers_; ///< of the looks, row by row
+    std::int64_t mostChecked_;
+};
 
 } // namespace
 
@@ -39,13 +118,21 @@ std::uint16_t SheetCells::numberOf(const CellLook& look)
     return static_cast<std::uint16_t>(looks_.size() - 1);
 }
 
+SheetArea SheetArea::within(const SheetArea& other) const
+{
+    SheetArea common { std::max(row, other.row), std::max(column, other.column) };
+    common.rows = std::min(row + rows, other.row + other.rows) - common.row;
+    common.columns = std::min(column + columns, other.column + other.columns) - common.column;
+    return common;
+}
+
 void SheetCells::put(
     std::int64_t row, std::int64_t column, Text text, const SheetLook& look, SheetValue value)
 {
     if (row < 0 || row >= MostRows || column < 0 || column >= MostSheetColumns)
         throw RunTimeError(ErrorNumber::Overflow, phrase(u"a cell past the end of its sheet"));
     if (text.empty())
-        return;
+        return fillBlanks({ row, column }, look);
     if (rows_.size() <= static_cast<std::size_t>(row))
         rows_.resize(static_cast<std::size_t>(row) + 1);
     std::vector<Cell>& cells = rows_[static_cast<std::size_t>(row)];
@@ -57,38 +144,94 @@ void SheetCells::put(
     cells[static_cast<std::size_t>(column)] = { std::move(text), numberOf(seen) };
 }
 
-TableGrid SheetCells::toTable() const
+void SheetCells::fillBlanks(const SheetArea& area, const SheetLook& look)
+{
+    if (!look.cell.background && blanks_.empty())
+        return;
+    CellLook seen;
+    seen.background = look.cell.background;
+    blanks_.push_back({ area, numberOf(seen) });
+}
+
+void SheetCells::merge(const SheetArea& area)
+{
+    if (area.rows > 1 || area.columns > 1)
+        boxes_.push_back(area);
+}
+
+void SheetCells::setWidth(std::int64_t column, std::int64_t columns, Twips width)
+{
+    widths_.push_back({ column, columns, width });
+}
+
+/// From the row of titles to the last row, and from the first to the last column that hold texts.
+SheetArea SheetCells::filledArea() const
 {
     const auto isFilled = [](const Cell& cell) { return !cell.text.empty(); };
-    std::size_t first = MostSheetColumns;
-    std::size_t end = 0;
-    for (const std::vector<Cell>& cells : rows_) {
+    std::int64_t first = MostSheetColumns;
+    std::int64_t end = 0;
+    std::int64_t titles = -1;
+    for (std::size_t row = 0; row < rows_.size(); ++row) {
+        const std::vector<Cell>& cells = rows_[row];
         const auto filled = std::ranges::find_if(cells, isFilled);
-        if (filled != cells.end())
-            first = std::min(first, static_cast<std::size_t>(filled - cells.begin()));
-        end = std::max(end, cells.size());
+        if (filled == cells.end())
+            continue;
+        if (titles < 0)
+            titles = static_cast<std::int64_t>(row);
+        first = std::min<std::int64_t>(first, filled - cells.begin());
+        end = std::max(end, std::ssize(cells));
     }
-    const auto titles = std::ranges::find_if(rows_,
-        [&](const std::vector<Cell>& cells) { return std::ranges::any_of(cells, isFilled); });
-    if (titles == rows_.end())
+    if (titles < 0)
         throw RunTimeError(ErrorNumber::TypeMismatch, phrase(u"the sheet is empty"));
-    std::vector<TableColumn> columns(end - first, TableColumn { .title = {}, .width = -1 });
-    for (std::size_t column = first; column < titles->size(); ++column)
-        columns[column - first] = { .title = (*titles)[column].text,
-            .width = -1,
-            .alignment = looks_[(*titles)[column].look].alignment };
-    TableGrid grid(std::move(columns));
-    grid.setLooks(looks_);
-    std::vector<TextView> texts;
-    std::vector<std::uint16_t> looks;
-    for (auto row = titles + 1; row != rows_.end(); ++row) {
-        texts.clear();
-        looks.clear();
-        for (std::size_t column = first; column < row->size(); ++column) {
-            texts.emplace_back((*row)[column].text);
-            looks.push_back((*row)[column].look);
+    return { titles, first, std::ssize(rows_) - titles, end - first };
+}
+
+std::vector<TableColumn> SheetCells::columnsOf(const SheetArea& area) const
+{
+    std::vector<TableColumn> columns(
+        static_cast<std::size_t>(area.columns), TableColumn { .title = {}, .width = -1 });
+    const std::vector<Cell>& titles = rows_[static_cast<std::size_t>(area.row)];
+    for (auto column = static_cast<std::size_t>(area.column); column < titles.size(); ++column) {
+        TableColumn& made = columns[column - static_cast<std::size_t>(area.column)];
+        made.title = titles[column].text;
+        made.alignment = looks_[titles[column].look].alignment;
+    }
+    for (const Width& width : widths_) {
+        const SheetArea part = SheetArea { area.row, width.column, 1, width.columns }.within(area);
+        for (std::int64_t column = 0; column < part.columns; ++column)
+            columns[static_cast<std::size_t>(part.column - area.column + column)].shownWidth
+                = width.width;
+    }
+    return columns;
+}
+
+TableGrid SheetCells::toTable() const
+{
+    const SheetArea all = filledArea();
+    const SheetArea body { all.row + 1, all.column, all.rows - 1, all.columns };
+    TableGrid grid(columnsOf(all));
+    ShownCells shown(body, looks_);
+    for (const Blanks& blanks : blanks_)
+        shown.fill(blanks.area, blanks.look);
+    std::vector<TextView> texts(static_cast<std::size_t>(body.columns));
+    for (std::int64_t row = 0; row < body.rows; ++row) {
+        const std::vector<Cell>& cells = rows_[static_cast<std::size_t>(body.row + row)];
+        for (std::int64_t column = 0; column < body.columns; ++column) {
+            const auto at = static_cast<std::size_t>(body.column + column);
+            if (at < cells.size() && !cells[at].text.empty())
+                shown.lookAt(row, column) = cells[at].look;
         }
-        grid.addRow(texts, looks);
+    }
+    for (const SheetArea& box : boxes_)
+        shown.merge(box);
+    grid.setLooks(shown.looks());
+    for (std::int64_t row = 0; row < body.rows; ++row) {
+        const std::vector<Cell>& cells = rows_[static_cast<std::size_t>(body.row + row)];
+        for (std::size_t column = 0; column < texts.size(); ++column) {
+            const std::size_t at = static_cast<std::size_t>(body.column) + column;
+            texts[column] = at < cells.size() ? TextView(cells[at].text) : TextView();
+        }
+        grid.addRow(texts, shown.row(row));
     }
     return grid;
 }

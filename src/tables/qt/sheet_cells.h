@@ -28,15 +28,37 @@ Color colorNumber(const QColor& color);
 /// What stands in a cell; it decides where the cell's text stands where nothing else does.
 enum class SheetValue : std::uint8_t { Words, Number, Truth };
 
+/// Cells of a sheet: from 0.
+struct SheetArea {
+    std::int64_t row = 0;
+    std::int64_t column = 0;
+    std::int64_t rows = 1;
+    std::int64_t columns = 1;
+
+    /// What lies in another area, too; without rows or columns where nothing does.
+    SheetArea within(const SheetArea& other) const;
+    bool isEmpty() const { return rows <= 0 || columns <= 0; }
+};
+
 /// The cells of a sheet of an office file, as they look.
 class SheetCells {
 public:
-    /// Puts a text into a cell; rows and columns count from 0.
+    /// Puts a text into a cell; rows and columns count from 0. Of a cell without a text only the
+    /// background is kept.
     /// @throws RunTimeError Overflow: past the last row or column that a sheet has
     void put(
         std::int64_t row, std::int64_t column, Text text, const SheetLook& look, SheetValue value);
 
-    /// A table of the part of the sheet that holds anything; its first row has the titles.
+    /// Gives cells a look as far as they are empty and nothing later says more of them.
+    void fillBlanks(const SheetArea& area, const SheetLook& look);
+
+    /// Makes one box of cells, which shows its first one.
+    void merge(const SheetArea& area);
+
+    /// Says how wide columns are: twips; 0: they are hidden.
+    void setWidth(std::int64_t column, std::int64_t columns, Twips width);
+
+    /// A table of the part of the sheet that holds texts; its first row has the titles.
     /// @throws RunTimeError TypeMismatch: the sheet is empty
     TableGrid toTable() const;
 
@@ -46,10 +68,27 @@ private:
         std::uint16_t look = 0;
     };
 
+    /// Empty cells of one colour.
+    struct Blanks {
+        SheetArea area;
+        std::uint16_t look = 0;
+    };
+
+    struct Width {
+        std::int64_t column = 0;
+        std::int64_t columns = 1;
+        Twips width = 0;
+    };
+
     std::uint16_t numberOf(const CellLook& look);
+    SheetArea filledArea() const;
+    std::vector<TableColumn> columnsOf(const SheetArea& area) const;
 
     std::vector<std::vector<Cell>> rows_;
-    std::vector<CellLook> looks_;
+    std::vector<CellLook> looks_ { CellLook() }; ///< the first is that of cells that say nothing
+    std::vector<Blanks> blanks_; ///< later ones lie above earlier ones
+    std::vector<SheetArea> boxes_;
+    std::vector<Width> widths_;
 };
 
 /// Reads a sheet of an .xlsx file.

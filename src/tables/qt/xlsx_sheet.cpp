@@ -19,6 +19,10 @@ namespace pelloric::qt {
 
 namespace {
 
+constexpr std::int64_t MostRows = 1048576;
+constexpr std::int64_t MostSheetColumns = 16384;
+constexpr double WidestColumn = 255; ///< digits
+
 /// The text of an element with all its runs, but without the readings of Chinese characters.
 Text textOf(QXmlStreamReader& xml)
 {
@@ -113,6 +117,31 @@ Place placeOf(const QString& text)
     return { place.row - 1, place.column - 1 };
 }
 
+/// The cells of a range such as "B2:C7".
+SheetArea areaOf(const QString& range)
+{
+    const auto colon = range.indexOf(u':');
+    const Place first = placeOf(range.left(colon));
+    const Place last = placeOf(range.mid(colon + 1));
+    if (first.row < 0 || first.column < 0)
+        return { 0, 0, 0, 0 };
+    return { first.row, first.column, last.row - first.row + 1, last.column - first.column + 1 };
+}
+
+bool isOn(const QXmlStreamReader& xml, const char* name)
+{
+    const QString value = attribute(xml, name);
+    return value == QLatin1String("1") || value == QLatin1String("true");
+}
+
+/// A column's width counts the digits of the usual font that it holds, each seven pixels wide at 96
+/// an inch, with five pixels around them that are in the number.
+Twips twipsOfDigits(double digits)
+{
+    constexpr double TwipsOfDigit = 7 * 15;
+    return roundToInt32(digits * TwipsOfDigit);
+}
+
 /// Whole seconds; a date at midnight has no time, and a time of the first day no date.
 Text dateText(double days, bool startsIn1904)
 {
@@ -146,8 +175,13 @@ public:
             if (xml.name() == QLatin1String("row")) {
                 const QString number = attribute(xml, "r");
                 next_ = { number.isEmpty() ? next_.row + 1 : number.toLongLong() - 1, 0 };
+                fillFrom(xml, "s", { next_.row, 0, 1, MostSheetColumns });
             } else if (xml.name() == QLatin1String("c")) {
                 readCell(xml);
+            } else if (xml.name() == QLatin1String("col")) {
+                readColumns(xml);
+            } else if (xml.name() == QLatin1String("mergeCell")) {
+                cells_.merge(areaOf(attribute(xml, "ref")));
             }
         });
         return std::move(cells_);
@@ -174,6 +208,30 @@ private:
         const SheetLook look = style < styles_.size() ? styles_[style].look : SheetLook();
         cells_.put(next_.row, next_.column, std::move(text), look, valueOf(type));
         ++next_.column;
+    }
+
+    /// Columns that have a width or a style.
+    void readColumns(const QXmlStreamReader& xml)
+    {
+        const std::int64_t first = attribute(xml, "min").toLongLong() - 1;
+        const std::int64_t last = attribute(xml, "max").toLongLong() - 1;
+        if (first < 0 || last < first || last >= MostSheetColumns)
+            return;
+        fillFrom(xml, "style", { 0, first, MostRows, last - first + 1 });
+        bool isNumber = false;
+        const double width = attribute(xml, "width").toDouble(&isNumber);
+        if (isOn(xml, "hidden"))
+            cells_.setWidth(first, last - first + 1, 0);
+        else if (isNumber && width > 0 && width <= WidestColumn)
+            cells_.setWidth(first, last - first + 1, twipsOfDigits(width));
+    }
+
+    /// The style of a row or column holds for the cells that are not in the file.
+    void fillFrom(const QXmlStreamReader& xml, const char* name, const SheetArea& area)
+    {
+        const QString style = attribute(xml, name);
+        if (!style.isEmpty() && style.toULongLong() < styles_.size())
+            cells_.fillBlanks(area, styles_[style.toULongLong()].look);
     }
 
     static SheetValue valueOf(const QString& type)

@@ -8,6 +8,9 @@
 #include "support/test_paths.h"
 
 #include <gtest/gtest.h>
+#include <zip.h>
+
+#include <algorithm>
 
 namespace pelloric::qt {
 
@@ -35,6 +38,60 @@ std::string read(const std::filesystem::path& path, const QString& sheet = {})
     } catch (const RunTimeError& error) {
         return toUtf8(error.text());
     }
+}
+
+/// Makes an archive of files, by name and content.
+std::filesystem::path zipped(const std::filesystem::path& path,
+    const std::vector<std::pair<std::string, std::string>>& files)
+{
+    zip_t* const archive = zip_open(path.string().c_str(), ZIP_CREATE | ZIP_TRUNCATE, nullptr);
+    EXPECT_NE(archive, nullptr);
+    for (const auto& [name, content] : files) {
+        zip_source_t* const source = zip_source_buffer(archive, content.data(), content.size(), 0);
+        EXPECT_GE(zip_file_add(archive, name.c_str(), source, ZIP_FL_OVERWRITE), 0);
+    }
+    EXPECT_EQ(zip_close(archive), 0);
+    return path;
+}
+
+/// "g" is green, "b" blue and "-" no background; a row ends with "/ ".
+std::string backgroundsOf(TableGrid& grid)
+{
+    std::string all;
+    CellLook look;
+    for (std::int32_t row = 1; row <= grid.rowCount(); ++row) {
+        all += row > 1 ? "/ " : "";
+        for (int column = 0; column < grid.columnCount(); ++column) {
+            grid.readLook(row, column, look);
+            all += !look.background ? "- " : look.background == rgb(0, 255, 0) ? "g " : "b ";
+        }
+    }
+    return all;
+}
+
+/// The boxes as "rows,columns", in the order of their first cells.
+std::string boxesOf(TableGrid& grid)
+{
+    std::string all;
+    std::vector<CellBox> seen;
+    CellLook look;
+    for (std::int32_t row = 1; row <= grid.rowCount(); ++row) {
+        for (int column = 0; column < grid.columnCount(); ++column) {
+            grid.readLook(row, column, look);
+            const CellBox box = look.box.value_or(CellBox());
+            if (!look.box)
+                continue;
+            EXPECT_TRUE(row >= box.firstRow && row <= box.lastRow && column >= box.firstColumn
+                && column <= box.lastColumn);
+            if (std::find(seen.begin(), seen.end(), box) != seen.end())
+                continue;
+            all += (seen.empty() ? "" : "/ ") + std::to_string(box.firstRow) + "-"
+                + std::to_string(box.lastRow) + "," + std::to_string(box.firstColumn) + "-"
+                + std::to_string(box.lastColumn) + " ";
+            seen.push_back(box);
+        }
+    }
+    return all;
 }
 
 } // namespace
@@ -123,6 +180,92 @@ TEST(OfficeTable, TellsFontsColoursAndAlignmentOfOpenDocumentCells)
         (CellLook { .alignment = CellAlignment::Right,
             .place = CellPlace::Bottom,
             .strikethrough = true }));
+}
+
+TEST(OfficeTable, TakesColoursOfEmptyCellsMergedCellsAndWidthsOfExcelSheets)
+{
+    const TempFolder folder;
+    const auto file = zipped(folder.file("shown.xlsx"),
+        { { "xl/workbook.xml",
+              "<workbook xmlns:r='r'><sheets><sheet name='S' r:id='1'/></sheets></workbook>" },
+            { "xl/_rels/workbook.xml.rels",
+                "<Relationships><Relationship Id='1' Target='s.xml'/></Relationships>" },
+            { "xl/styles.xml",
+                "<styleSheet><fonts><font/></fonts>"
+                "<fills><fill/><fill/><fill><patternFill patternType='solid'>"
+                "<fgColor rgb='FF00FF00'/></patternFill></fill>"
+                "<fill><patternFill patternType='solid'><fgColor rgb='FF0000FF'/></patternFill>"
+                "</fill></fills><cellXfs><xf fontId='0' fillId='0'/><xf fontId='0' fillId='2'/>"
+                "<xf fontId='0' fillId='3'/></cellXfs></styleSheet>" },
+            { "xl/s.xml",
+                "<worksheet><cols><col min='1' max='1' width='10.7109375' customWidth='1'/>"
+                "<col min='3' max='3' width='9' hidden='1'/><col min='4' max='4' style='2'/></cols>"
+                "<sheetData><row r='2'>"
+                "<c r='A2' s='1' t='str'><v>A</v></c><c r='B2' t='str'><v>B</v></c>"
+                "<c r='C2' t='str'><v>C</v></c><c r='D2' t='str'><v>D</v></c></row>"
+                "<row r='3'><c r='A3' t='str'><v>box</v></c><c r='B3' s='1'/><c r='C3' "
+                "s='1'/></row>"
+                "<row r='4' s='1' customFormat='1'><c r='C4' t='str'><v>c</v></c>"
+                "<c r='D4' s='0'/></row>"
+                "<row r='5'><c r='A5' t='str'><v>end</v></c></row>"
+                "<row r='1000000'><c r='B1000000' s='1'/></row></sheetData>"
+                "<mergeCells><mergeCell ref='A3:A4'/><mergeCell ref='A4:B5'/>"
+                "<mergeCell ref='C5:XFD1048576'/></mergeCells></worksheet>" } });
+    EXPECT_EQ(read(file), "A|B|C|D|/box||||/||c||/end||||");
+    TableGrid grid = readOffice({ .path = file, .sheet = {} });
+    EXPECT_EQ(grid.column(0).shownWidth, std::optional<Twips>(1125)); // 75 pixels
+    EXPECT_EQ(grid.column(1).shownWidth, std::nullopt);
+    EXPECT_EQ(grid.column(2).shownWidth, std::optional<Twips>(0));
+    EXPECT_EQ(backgroundsOf(grid), "- g g b / - g - - / - - - - ");
+    EXPECT_EQ(boxesOf(grid), "1-2,0-0 / 3-3,2-3 ");
+}
+
+TEST(OfficeTable, TakesColoursOfEmptyCellsMergedCellsAndWidthsOfOpenDocumentSheets)
+{
+    const TempFolder folder;
+    const std::string paragraph = "<text:p>x</text:p>";
+    const auto file = zipped(folder.file("shown.ods"),
+        { { "mimetype", "application/vnd.oasis.opendocument.spreadsheet" },
+            { "content.xml",
+                "<o:d xmlns:o='o' xmlns:table='t' xmlns:style='s' xmlns:f='f' xmlns:text='x'>"
+                "<style:style style:name='wide' style:family='table-column'>"
+                "<style:table-column-properties style:column-width='1in'/></style:style>"
+                "<style:style style:name='g' style:family='table-cell'>"
+                "<style:table-cell-properties f:background-color='#00ff00'/></style:style>"
+                "<style:style style:name='b' style:family='table-cell'>"
+                "<style:table-cell-properties f:background-color='#0000ff'/></style:style>"
+                "<table:table table:name='S'>"
+                "<table:table-column table:style-name='wide'/>"
+                "<table:table-column table:visibility='collapse' table:style-name='wide'/>"
+                "<table:table-column table:number-columns-repeated='16382' "
+                "table:default-cell-style-name='b'/>"
+                "<table:table-row><table:table-cell>"
+                    + paragraph + "</table:table-cell><table:table-cell>" + paragraph
+                    + "</table:table-cell><table:table-cell>" + paragraph
+                    + "</table:table-cell></table:table-row>"
+                      "<table:table-row><table:table-cell table:number-columns-spanned='2' "
+                      "table:number-rows-spanned='2'>"
+                    + paragraph
+                    + "</table:table-cell><table:covered-table-cell/><table:table-cell/>"
+                      "</table:table-row>"
+                      "<table:table-row><table:covered-table-cell "
+                      "table:number-columns-repeated='2'/>"
+                      "<table:table-cell table:style-name='g'/></table:table-row>"
+                      "<table:table-row><table:table-cell table:style-name='g' "
+                      "table:number-columns-repeated='2'/><table:table-cell>"
+                    + paragraph
+                    + "</table:table-cell></table:table-row>"
+                      "<table:table-row table:number-rows-repeated='1048000'>"
+                      "<table:table-cell table:style-name='g' "
+                      "table:number-columns-repeated='16384'/></table:table-row>"
+                      "</table:table></o:d>" } });
+    EXPECT_EQ(read(file), "x|x|x|/x|||/|||/||x|");
+    TableGrid grid = readOffice({ .path = file, .sheet = {} });
+    EXPECT_EQ(grid.column(0).shownWidth, std::optional<Twips>(1440));
+    EXPECT_EQ(grid.column(1).shownWidth, std::optional<Twips>(0));
+    EXPECT_EQ(grid.column(2).shownWidth, std::nullopt);
+    EXPECT_EQ(backgroundsOf(grid), "- - b / - - g / g g b ");
+    EXPECT_EQ(boxesOf(grid), "1-2,0-1 ");
 }
 
 TEST(OfficeTable, IsKnownByItsContentWhereTheNameDoesNotTell)
