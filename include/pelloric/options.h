@@ -23,6 +23,8 @@
 namespace pelloric {
 
 /// How a table that is too wide for the sheet is brought onto it.
+///
+/// Where it is asked for, or key columns are, a column that would leave the paper is narrowed.
 struct FitOptions {
     bool toSheet = false; ///< as it is, else landscape, else shrunk, else in bands
     int pagesAcross = 0; ///< 1 or more: shrunk so far that so many bands hold all columns
@@ -41,6 +43,7 @@ struct FitResult {
     FitRule rule = FitRule::NotAsked;
     double scale = 1; ///< of column widths and body font
     bool isTurned = false; ///< the sheet lies on its long side for this report
+    int pagesAcross = 1; ///< bands of columns, which make so many pages of each run of rows
 
     bool operator==(const FitResult&) const = default;
 };
@@ -55,11 +58,41 @@ enum class PageOrder : std::uint8_t { AcrossThenDown, DownThenAcross };
 enum class AggregateFunction : std::uint8_t { Sum, Count, Mean, Minimum, Maximum };
 
 /// A total of one column: it stands in that column, behind every group and at the end.
+///
+/// Numbers are read as the table shows them. A sign, one currency sign, blanks, and brackets for
+/// "negative" may stand around the digits. Of "." and "," the one that comes last separates the
+/// decimals and the other one groups, as blanks and apostrophes do; one that occurs twice groups.
+/// Where a number may be read in two ways, as "1,234", the first cell of the column that can be
+/// read in one way only decides for all, or else the locale. A view that holds a number tells it
+/// exactly.
+///
+/// Cells that show no number are left out, and counted in `LeftOut`; where no cell shows one, the
+/// total is blank. `Count` counts the cells that are not empty. A total has as many decimals as the
+/// most precise of its cells, a mean up to two more, and is grouped where one of its cells is.
 struct Aggregation {
     std::u16string column {}; ///< its title
     AggregateFunction function = AggregateFunction::Sum;
 
     bool operator==(const Aggregation&) const = default;
+};
+
+/// Cells of a column that are not empty but show no number, so that its totals leave them out.
+struct LeftOut {
+    std::u16string column {}; ///< its title
+    std::int64_t cells = 0; ///< 1 or more
+
+    bool operator==(const LeftOut&) const = default;
+};
+
+/// What a document file (`.ostl`) does not hold of the pages that are saved in it.
+struct OstlLosses {
+    int pages = 0; ///< behind the 131st
+    bool pictures = false; ///< watermark or logo
+    bool icons = false; ///< of cells
+    std::int64_t texts = 0; ///< that hold characters which the file's code page has not
+
+    bool any() const { return pages > 0 || pictures || icons || texts > 0; }
+    bool operator==(const OstlLosses&) const = default;
 };
 
 /// A text or a picture on every page, centred on the paper.

@@ -55,6 +55,8 @@ public:
     const ReportOptions& reportOptions() const;
     /// What was done to bring the table of the last build onto the sheet.
     FitResult fitResult() const;
+    /// The cells that the totals of the last build leave out, because they show no number.
+    std::vector<LeftOut> leftOutOfTotals() const;
 
     /// Lays the pages out from a grid, whose kind is found by the members that it has.
     ///

@@ -120,6 +120,8 @@ public:
     const ReportOptions& reportOptions() const;
     /// What was done to bring the table of the last build onto the sheet.
     FitResult fitResult() const;
+    /// The cells that the totals of the last build leave out, because they show no number.
+    std::vector<LeftOut> leftOutOfTotals() const;
 
     /// Margins: twips (1440 an inch), 1134 at first; a build takes those of the settings.
     std::int16_t intTop() const;

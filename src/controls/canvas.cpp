@@ -121,6 +121,8 @@ void Canvas::clear()
         return;
     recorder_.clear();
     fit_ = {};
+    printedRows_ = 0;
+    leftOut_.clear();
     ++documentNumber_;
     endArrangement(view_);
     if (table_)
@@ -255,11 +257,13 @@ void Canvas::layOut(GridTable& table)
         showProgress(done, total);
         return true;
     };
-    const ReportOutcome outcome
+    ReportOutcome outcome
         = layOutReport(table, wanted, { style, setup, platform_, document_, recorder_ }, step);
     endProgress();
     titleTop_ = outcome.titleTop;
     fit_ = outcome.fit;
+    printedRows_ = outcome.records;
+    leftOut_ = std::move(outcome.leftOut);
     if (!fit_.isTurned)
         return;
     page.myWidth = setup.myWidth;

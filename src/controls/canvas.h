@@ -72,6 +72,12 @@ public:
     /// What was done to bring the table of the pages onto the sheet.
     const FitResult& fit() const { return fit_; }
 
+    /// How many rows of the grid the pages show.
+    std::int64_t printedRows() const { return printedRows_; }
+
+    /// What the totals of the pages leave out.
+    const std::vector<LeftOut>& leftOut() const { return leftOut_; }
+
     /// Tells an observer, too, from now on.
     /// @param observer  borrowed until `forget`
     void observe(CanvasObserver& observer) { observers_.push_back(&observer); }
@@ -252,6 +258,8 @@ private:
     Text openedName_; ///< of the file that the document was opened from
     double titleTop_ = 0;
     FitResult fit_;
+    std::int64_t printedRows_ = 0;
+    std::vector<LeftOut> leftOut_;
     std::uint32_t documentNumber_ = 0;
     bool building_ = false;
     bool printing_ = false;

@@ -141,12 +141,6 @@ void PageDocument::addPicture(int page, const PictureRecord& picture)
     pages_[static_cast<std::size_t>(page)].pictures.push_back(picture);
 }
 
-bool PageDocument::hasReportPictures() const
-{
-    return std::any_of(
-        pages_.begin(), pages_.end(), [](const Page& page) { return !page.pictures.empty(); });
-}
-
 std::uint32_t PageDocument::penNumber(const LinePen& pen)
 {
     const auto [place, isNew]

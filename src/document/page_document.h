@@ -140,8 +140,6 @@ public:
     void addPicture(int page, const PictureRecord& picture);
     /// The pictures that a report draws on a page. @throws RunTimeError SubscriptOutOfRange
     std::span<const PictureRecord> reportPictures(int page) const { return pageAt(page).pictures; }
-    /// Whether a report draws pictures on any page; document files do not hold them.
-    bool hasReportPictures() const;
 
     /// Where new texts are kept.
     TextStore& store() { return *store_; }

@@ -274,6 +274,24 @@ Text formatNumber(double value, char16_t separator)
     return generalForm({ buffer, end.ptr }, separator);
 }
 
+Text formatFixed(double value, int decimals, char16_t separator)
+{
+    constexpr double General = 1e15;
+    constexpr int MostDecimals = 300;
+    if (!(std::abs(value) < General))
+        return formatNumber(value, separator);
+    char buffer[MostDecimals + 64];
+    const auto end = std::to_chars(buffer, buffer + sizeof buffer, value, std::chars_format::fixed,
+        std::clamp(decimals, 0, MostDecimals));
+    std::string_view digits(buffer, static_cast<std::size_t>(end.ptr - buffer));
+    if (digits.front() == '-' && digits.find_first_of("123456789") == std::string_view::npos)
+        digits.remove_prefix(1);
+    Text text(digits.begin(), digits.end());
+    if (const std::size_t point = text.find(u'.'); point != Text::npos)
+        text[point] = separator;
+    return text;
+}
+
 Text formatSingle(float value, char16_t separator)
 {
     if (!std::isfinite(value))

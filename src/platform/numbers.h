@@ -51,6 +51,13 @@ float toSingle(double value, TextView what = {});
 /// @param separator  stands between whole part and fraction
 Text formatNumber(double value, char16_t separator = u'.');
 
+/// With exactly so many decimals, and no sign where all digits are 0.
+///
+/// A number of 1e15 or more has the general form.
+/// @param decimals   0 or more
+/// @param separator  stands between whole part and fraction
+Text formatFixed(double value, int decimals, char16_t separator = u'.');
+
 /// The shortest decimal that reads back as the same single-precision number.
 ///
 /// @param separator  stands between whole part and fraction

@@ -47,6 +47,18 @@ private:
     std::vector<Text> buffers_;
 };
 
+[[noreturn]] void refuseColumn(TextView name, std::span<const Text> titles)
+{
+    constexpr std::size_t MostNames = 12;
+    Text names;
+    for (std::size_t at = 0; at < std::min(titles.size(), MostNames); ++at)
+        names.append(at > 0 ? u", " : u"").append(titles[at]);
+    if (titles.size() > MostNames)
+        names.append(u" …");
+    throw RunTimeError(ErrorNumber::InvalidCall,
+        phrase(u"the grid prints no column \"%1\"; there are: %2", { name, names }));
+}
+
 } // namespace
 
 ChosenRows::ChosenRows(RowSet& rows, std::vector<int> fields, std::vector<std::int64_t> records)
@@ -87,8 +99,7 @@ std::vector<int> fieldsNamed(std::span<const Text> titles, std::span<const Text>
     for (const Text& name : names) {
         const auto found = std::find(titles.begin(), titles.end(), name);
         if (found == titles.end())
-            throw RunTimeError(
-                ErrorNumber::InvalidCall, phrase(u"the grid prints no column \"%1\"", { name }));
+            refuseColumn(name, titles);
         const auto field = static_cast<int>(found - titles.begin());
         if (std::find(fields.begin(), fields.end(), field) == fields.end())
             fields.push_back(field);

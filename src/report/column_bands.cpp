@@ -5,6 +5,8 @@
 
 #include "platform/numbers.h"
 
+#include <algorithm>
+
 namespace pelloric {
 
 double tableWidthOf(std::span<const double> widths)
@@ -13,6 +15,19 @@ double tableWidthOf(std::span<const double> widths)
     for (const double width : widths)
         sum += width;
     return sum;
+}
+
+double widthCap(std::vector<double> widths, double room)
+{
+    std::ranges::sort(widths);
+    double left = room;
+    for (std::size_t at = 0; at < widths.size(); ++at) {
+        const double share = left / static_cast<double>(widths.size() - at);
+        if (widths[at] > share)
+            return share;
+        left -= widths[at];
+    }
+    return room;
 }
 
 std::vector<ColPos> cutColumnBands(std::span<const double> widths, double paper, double left)

@@ -14,6 +14,11 @@ namespace pelloric {
 /// Sum of the widths of columns: twips.
 double tableWidthOf(std::span<const double> widths);
 
+/// The width that no column may exceed for all of them to fit into a room: the widest give way
+/// first.
+/// @param widths  twips, as the room is
+double widthCap(std::vector<double> widths, double room);
+
 /// Cuts columns that are together too wide for the paper into bands, from left to right.
 ///
 /// The room is the paper's width less the left margin taken twice. A table that is exactly as wide

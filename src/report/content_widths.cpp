@@ -9,6 +9,7 @@
 #include "platform/services.h"
 #include "platform/text_metrics.h"
 #include "platform/text_runs.h"
+#include "report/column_bands.h"
 
 #include <algorithm>
 #include <cmath>
@@ -58,20 +59,6 @@ double longestAdvance(const TableGrid& grid, int column, FaceMetrics& face)
     return longest;
 }
 
-/// The width that no column may exceed for all of them to fit in the room.
-double capFor(std::vector<Twips> widths, Twips room)
-{
-    std::ranges::sort(widths);
-    double left = room;
-    for (std::size_t at = 0; at < widths.size(); ++at) {
-        const double share = left / static_cast<double>(widths.size() - at);
-        if (widths[at] > share)
-            return share;
-        left -= widths[at];
-    }
-    return room;
-}
-
 } // namespace
 
 std::vector<Twips> contentWidths(
@@ -92,7 +79,7 @@ std::vector<Twips> contentWidths(
 
 void fitWidths(std::span<Twips> widths, Twips room)
 {
-    const double cap = std::floor(capFor({ widths.begin(), widths.end() }, room));
+    const double cap = std::floor(widthCap({ widths.begin(), widths.end() }, room));
     if (cap < ReadableWidth)
         return;
     for (Twips& width : widths)

@@ -84,6 +84,29 @@ std::vector<BandColumns> cutKeyedBands(
     return bands;
 }
 
+void narrowToSheet(std::span<double> widths, std::span<const int> keys, const PageSetup& setup)
+{
+    const double room = roomOf(setup) - LeastRoom;
+    std::vector<double> keyWidths;
+    double widest = 0;
+    for (int column = 0; column < static_cast<int>(widths.size()); ++column) {
+        const double width = widths[static_cast<std::size_t>(column)];
+        if (isKey(keys, column))
+            keyWidths.push_back(width);
+        else
+            widest = std::max(widest, width);
+    }
+    const double keyWidth = tableWidthOf(keyWidths);
+    if (room <= 0 || keyWidth + widest <= room)
+        return;
+    const double keyRoom = std::min(keyWidth, std::max(room / 2, room - widest));
+    const double keyCap = widthCap(std::move(keyWidths), keyRoom);
+    for (int column = 0; column < static_cast<int>(widths.size()); ++column) {
+        double& width = widths[static_cast<std::size_t>(column)];
+        width = std::min(width, isKey(keys, column) ? keyCap : room - keyRoom);
+    }
+}
+
 FitResult fitReport(std::span<const double> widths, std::span<const int> keys,
     const PageSetup& setup, float size, const FitOptions& options)
 {

@@ -27,6 +27,13 @@ using BandColumns = std::vector<int>;
 std::vector<BandColumns> cutKeyedBands(
     std::span<const double> widths, std::span<const int> keys, double paper, double left);
 
+/// Narrows columns that would leave the paper: where the key columns and another one are wider
+/// than the sheet, the key columns get half of it or what the other one leaves, and no other column
+/// is wider than the rest. The widest columns give way first, and what is narrow enough stays.
+/// @param widths  twips; one per printed column
+/// @param keys    columns from 0, each once
+void narrowToSheet(std::span<double> widths, std::span<const int> keys, const PageSetup& setup);
+
 /// Decides how a table is brought onto the sheet.
 ///
 /// The sheet is turned only from upright to lying; texts and widths shrink to the floors of the

@@ -17,6 +17,9 @@ struct FunctionName {
     TextView name;
 };
 
+constexpr int MeanDecimals = 2; ///< that a mean may have more than its cells
+constexpr std::size_t GroupDigits = 3;
+
 constexpr FunctionName Names[] = {
     { AggregateFunction::Sum, u"Sum" },
     { AggregateFunction::Count, u"Count" },
@@ -27,12 +30,14 @@ constexpr FunctionName Names[] = {
 
 } // namespace
 
-Totals::Totals(std::span<const Aggregation> aggregations, std::span<const int> fields)
+Totals::Totals(std::span<const Aggregation> aggregations, std::span<const int> fields,
+    std::span<const char16_t> separators)
 {
     for (std::size_t place = 0; place < aggregations.size(); ++place) {
         Column& column = columns_.emplace_back();
         column.function = aggregations[place].function;
         column.field = fields[place];
+        column.separator = separators[place];
         if (std::find(functions_.begin(), functions_.end(), column.function) == functions_.end())
             functions_.push_back(column.function);
     }
@@ -41,54 +46,92 @@ Totals::Totals(std::span<const Aggregation> aggregations, std::span<const int> f
 void Totals::clear()
 {
     for (Column& column : columns_) {
-        const auto kept = column;
+        const Column kept = column;
         column = {};
         column.function = kept.function;
         column.field = kept.field;
+        column.separator = kept.separator;
     }
 }
 
-void Totals::add(std::size_t place, std::optional<double> number, bool isText)
+void Totals::add(std::size_t place, std::optional<ShownNumber> number, bool isText)
 {
     Column& column = columns_[place];
-    if (isText)
+    if (isText || number)
         ++column.texts;
     if (!number)
         return;
+    const double value = number->value;
     const double before = column.sum;
-    column.sum += *number;
-    column.lost += std::abs(before) >= std::abs(*number) ? (before - column.sum) + *number
-                                                         : (*number - column.sum) + before;
-    column.least = column.numbers == 0 ? *number : std::min(column.least, *number);
-    column.most = column.numbers == 0 ? *number : std::max(column.most, *number);
+    column.sum += value;
+    column.lost += std::abs(before) >= std::abs(value) ? (before - column.sum) + value
+                                                       : (value - column.sum) + before;
+    column.least = column.numbers == 0 ? value : std::min(column.least, value);
+    column.most = column.numbers == 0 ? value : std::max(column.most, value);
+    column.decimals = std::max(column.decimals, number->decimals);
+    if (column.grouping == 0)
+        column.grouping = number->grouping;
     ++column.numbers;
 }
 
-Text Totals::text(std::size_t row, int field, char16_t decimalSeparator) const
+Text Totals::text(std::size_t row, int field) const
 {
     for (const Column& column : columns_) {
         if (column.field != field || column.function != functions_[row])
             continue;
-        double number = column.sum + column.lost;
+        if (column.function == AggregateFunction::Count)
+            return decimal(column.texts);
+        if (column.numbers == 0)
+            return {};
         switch (column.function) {
         case AggregateFunction::Sum:
-            break;
         case AggregateFunction::Count:
-            return decimal(column.texts);
+            return shown(column, column.sum + column.lost, column.decimals);
         case AggregateFunction::Mean:
-            number /= static_cast<double>(std::max<std::int64_t>(1, column.numbers));
-            break;
+            return meanOf(column);
         case AggregateFunction::Minimum:
-            number = column.least;
-            break;
+            return shown(column, column.least, column.decimals);
         case AggregateFunction::Maximum:
-            number = column.most;
-            break;
+            return shown(column, column.most, column.decimals);
         }
-        const bool isKnown = column.numbers > 0 || column.function == AggregateFunction::Sum;
-        return isKnown ? formatNumber(number, decimalSeparator) : Text();
     }
     return {};
+}
+
+std::int64_t Totals::leftOut(std::size_t place) const
+{
+    const Column& column = columns_[place];
+    return column.function == AggregateFunction::Count ? 0 : column.texts - column.numbers;
+}
+
+/// Without the zeros at the end of the decimals that the cells have not.
+Text Totals::meanOf(const Column& column)
+{
+    const double mean = (column.sum + column.lost) / static_cast<double>(column.numbers);
+    Text text = shown(column, mean, column.decimals + MeanDecimals);
+    const std::size_t point = text.find(column.separator);
+    if (point == Text::npos || text.find(u'E') != Text::npos)
+        return text;
+    const std::size_t least = point + 1 + static_cast<std::size_t>(column.decimals);
+    while (text.size() > least && text.back() == u'0')
+        text.pop_back();
+    if (text.size() == point + 1)
+        text.pop_back();
+    return text;
+}
+
+Text Totals::shown(const Column& column, double number, int decimals)
+{
+    Text text = formatFixed(number, decimals, column.separator);
+    if (column.grouping == 0 || text.find(u'E') != Text::npos)
+        return text;
+    const std::size_t first = text.front() == u'-' ? 1 : 0;
+    for (std::size_t at = std::min(text.find(column.separator), text.size());
+         at > first + GroupDigits;) {
+        at -= GroupDigits;
+        text.insert(at, 1, column.grouping);
+    }
+    return text;
 }
 
 TextView functionName(AggregateFunction function)
@@ -98,15 +141,6 @@ TextView functionName(AggregateFunction function)
             return row.name;
     }
     return {};
-}
-
-std::optional<double> shownNumber(TextView text, char16_t decimalSeparator)
-{
-    Text plain(trimmed(text));
-    std::replace(plain.begin(), plain.end(), decimalSeparator, u'.');
-    if (plain.empty() || !isNumber(plain))
-        return std::nullopt;
-    return leadingNumber(plain);
 }
 
 } // namespace pelloric

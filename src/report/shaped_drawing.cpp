@@ -14,6 +14,10 @@ namespace pelloric {
 
 namespace {
 
+constexpr double BoxEdge = 1.0 / 32; ///< of a check box's side: how thick its frame is
+constexpr double TickWidth = 0.16; ///< of its side: how wide the tick's strokes are
+constexpr double StrokeStep = 2; ///< twips between the lines of a stroke: less than a printer's dot
+
 constexpr double Trace = 1e-6; ///< rounding leaves of a line's height
 
 } // namespace
@@ -265,24 +269,35 @@ TextView ShapedLayout::keptIcon(TextView file)
     return kept;
 }
 
+/// Pens are as wide as a pixel of whatever the page is drawn on: strokes that keep their share of
+/// the box on every printer are made of lines beside each other.
 void ShapedLayout::drawCheckMark(CheckMark mark, double left, double top, double side)
 {
     const auto at = [&](double x, double y) {
         return Tpoint { roundToInt32(left + x * side), roundToInt32(top + y * side) };
     };
     usePen({ .LineColor = 0 });
-    drawLine(at(0, 0), at(1, 0));
-    drawLine(at(1, 0), at(1, 1));
-    drawLine(at(1, 1), at(0, 1));
-    drawLine(at(0, 1), at(0, 0));
+    const int frames = std::max(1, roundToInt32(BoxEdge * side / StrokeStep));
+    for (int frame = 0; frame < frames; ++frame) {
+        const double inset = frame * StrokeStep / side;
+        const double rest = 1 - inset;
+        drawLine(at(inset, inset), at(rest, inset));
+        drawLine(at(rest, inset), at(rest, rest));
+        drawLine(at(rest, rest), at(inset, rest));
+        drawLine(at(inset, rest), at(inset, inset));
+    }
     if (mark == CheckMark::Partly)
         fillBox(
             { left + 0.28 * side, left + 0.72 * side, top + 0.28 * side, top + 0.72 * side }, 0);
     if (mark != CheckMark::On)
         return;
-    usePen({ .LineColor = 0, .LineWidth = 2 });
-    drawLine(at(0.2, 0.5), at(0.43, 0.76));
-    drawLine(at(0.43, 0.76), at(0.82, 0.22));
+    usePen({ .LineColor = 0 });
+    const int lines = 1 + roundToInt32(TickWidth * side / StrokeStep);
+    for (int line = 0; line < lines; ++line) {
+        const double shift = (line - (lines - 1) / 2.0) * StrokeStep / side;
+        drawLine(at(0.22 + shift, 0.5), at(0.43 + shift, 0.76));
+        drawLine(at(0.43 + shift, 0.76), at(0.8 + shift, 0.22));
+    }
 }
 
 /// Draws how a row of a tree hangs below the rows above it.

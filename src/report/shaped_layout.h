@@ -34,6 +34,12 @@ public:
     /// Where the titles of the last page were asked for, when there is a page header: twips.
     double titleTop() const { return titleTop_; }
 
+    /// How many bands the columns were cut into.
+    std::size_t bandCount() const { return bands_.size(); }
+
+    /// What the totals leave out.
+    std::vector<LeftOut> leftOut() const { return rows_.leftOut(); }
+
 private:
     /// What another band needs to lay the same row out again.
     struct PlannedRow {

@@ -114,6 +114,7 @@ ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
     Choice choice = choose(table, options, platform.decimalSeparator);
     RowSet& rows = choice.rows ? static_cast<RowSet&>(*choice.rows) : *table.rows;
     ReportOutcome outcome;
+    outcome.records = rows.recordCount();
     if (!options.shapesPages(table.looks != nullptr)) {
         const ReportPictures placed = placeReportPictures(
             options, target.setup, platform.pictures, target.document.store());
@@ -124,13 +125,15 @@ ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
         engine.build(progress);
         addToPages(placed, target.document);
         outcome.titleTop = engine.titleTop();
+        outcome.fit.pagesAcross = static_cast<int>(bands.size());
         return outcome;
     }
     std::vector<Text> titles;
     for (const int field : choice.fields)
         titles.push_back(table.fieldNames[static_cast<std::size_t>(field)]);
-    outcome.fit = fitReport(choice.widths, keyFieldsOf(options, titles), target.setup,
-        target.style.body.font.size, options.fit);
+    const std::vector<int> keys = keyFieldsOf(options, titles);
+    outcome.fit
+        = fitReport(choice.widths, keys, target.setup, target.style.body.font.size, options.fit);
     if (outcome.fit.isTurned)
         turnSheet(target.style, target.setup);
     const ReportPictures placed
@@ -140,6 +143,8 @@ ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
     style.body.font.size = static_cast<float>(style.body.font.size * outcome.fit.scale);
     for (double& width : choice.widths)
         width *= outcome.fit.scale;
+    if (options.fit.isAsked() || !keys.empty())
+        narrowToSheet(choice.widths, keys, setup);
     ShapedSource source { .style = style,
         .setup = setup,
         .rows = rows,
@@ -164,6 +169,8 @@ ReportOutcome layOutReport(GridTable& table, const ReportOptions& options,
     layout.build(progress);
     addToPages(placed, target.document);
     outcome.titleTop = layout.titleTop();
+    outcome.fit.pagesAcross = static_cast<int>(layout.bandCount());
+    outcome.leftOut = layout.leftOut();
     return outcome;
 }
 

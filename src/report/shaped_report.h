@@ -26,6 +26,8 @@ struct ReportTarget {
 /// What came out of a layout.
 struct ReportOutcome {
     FitResult fit;
+    std::int64_t records = 0; ///< that are printed
+    std::vector<LeftOut> leftOut; ///< of the totals
     double titleTop = 0; ///< where the titles of the last page were asked for: twips
 };
 

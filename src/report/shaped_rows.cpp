@@ -18,6 +18,16 @@ namespace pelloric {
 
 namespace {
 
+/// The characters that stand for check boxes in the texts of views.
+constexpr TextView CheckBoxes = u"☐▣☑";
+
+/// A data grid's texts have no box.
+TextView withoutCheckBox(TextView text)
+{
+    const bool hasBox = !text.empty() && CheckBoxes.find(text.front()) != TextView::npos;
+    return hasBox ? trimmed(text.substr(1)) : text;
+}
+
 constexpr double IconRoom = 1.2; ///< of a line's height: an icon and what keeps the text from it
 
 } // namespace
@@ -36,8 +46,8 @@ ShapedRows::ShapedRows(const ShapedSource& source, const Platform& platform, Pag
     , document_(document)
     , bands_(bands)
     , padding_(CellPadding / 2.0 * source.scale)
-    , groupTotals_({}, {})
-    , allTotals_({}, {})
+    , groupTotals_({}, {}, {})
+    , allTotals_({}, {}, {})
 {
 }
 
@@ -45,10 +55,48 @@ void ShapedRows::resolve(std::span<const Text> titles)
 {
     const ReportOptions& options = source_.options;
     groupFields_ = fieldsNamed(titles, options.groupColumns);
-    for (const Aggregation& total : options.totals)
+    for (const Aggregation& total : options.totals) {
         totalFields_.push_back(fieldsNamed(titles, { &total.column, 1 }).front());
-    groupTotals_ = Totals(options.totals, totalFields_);
+        separators_.push_back(total.function == AggregateFunction::Count
+                ? platform_.decimalSeparator
+                : separatorOf(totalFields_.back()));
+    }
+    groupTotals_ = Totals(options.totals, totalFields_, separators_);
     allTotals_ = groupTotals_;
+}
+
+/// The decimal separator of a field: that of the first text which can be read in one way only, or
+/// the locale's.
+char16_t ShapedRows::separatorOf(int field)
+{
+    const auto found = std::find(totalFields_.begin(), totalFields_.end(), field);
+    const auto place = static_cast<std::size_t>(found - totalFields_.begin());
+    if (place < separators_.size()
+        && source_.options.totals[place].function != AggregateFunction::Count)
+        return separators_[place];
+    for (std::int64_t record = 1; record <= source_.rows.recordCount(); ++record) {
+        platform_.loop.keepAlive();
+        source_.rows.setPosition(record);
+        const Value value = source_.rows.value(field);
+        if (const auto separator
+            = decimalSeparatorOf(displayText(value, platform_.decimalSeparator, buffer_)))
+            return *separator;
+    }
+    return platform_.decimalSeparator;
+}
+
+std::vector<LeftOut> ShapedRows::leftOut() const
+{
+    std::vector<LeftOut> all;
+    for (std::size_t place = 0; place < totalFields_.size(); ++place) {
+        const Text& column = source_.options.totals[place].column;
+        const std::int64_t cells = allTotals_.leftOut(place);
+        const bool isTold = std::any_of(
+            all.begin(), all.end(), [&](const LeftOut& other) { return other.column == column; });
+        if (cells > 0 && !isTold)
+            all.push_back({ column, cells });
+    }
+    return all;
 }
 
 bool ShapedRows::ensure(std::size_t count)
@@ -266,8 +314,8 @@ void ShapedRows::measureShown(int field, ShapedRow& row)
     ShapedCell& cell = row.cells[place];
     const double lineHeight = font(look.bold, look.italic).lineHeight;
     row.textHeight = std::max(row.textHeight, lineHeight);
-    if (look.check != CheckMark::None && !cell.text.empty())
-        cell.text = trimmed(cell.text.substr(1)); // the box is drawn
+    if (look.check != CheckMark::None)
+        cell.text = withoutCheckBox(cell.text); // it is drawn
     if (look.box)
         return openBox(field, row);
     const double room = source_.widths[place] - 2 * padding_ - look.indent - marksWidth(look);
@@ -295,8 +343,8 @@ void ShapedRows::openBox(int field, ShapedRow& row)
     TextView text = row.cells[place].text;
     if (!isAnchor) {
         text = trimmed(source_.looks->text(box.firstRow, box.firstColumn));
-        if (look.check != CheckMark::None && !text.empty())
-            text = trimmed(text.substr(1));
+        if (look.check != CheckMark::None)
+            text = withoutCheckBox(text);
         text = document_.store().add(withoutCarriageReturns(text));
     }
     content->second = { look, text };
@@ -315,14 +363,27 @@ void ShapedRows::noteNumbers(const ShapedRow& row)
     for (std::size_t place = 0; place < totalFields_.size(); ++place) {
         const int field = totalFields_[place];
         const TextView text = row.cells[static_cast<std::size_t>(field)].text;
-        std::optional<double> number;
-        if (source_.number)
-            number = source_.number(row.record, field);
-        if (!number)
-            number = shownNumber(text, platform_.decimalSeparator);
+        const auto number = numberOf(row.record, field, text, separators_[place]);
         groupTotals_.add(place, number, !text.empty());
         allTotals_.add(place, number, !text.empty());
     }
+}
+
+/// What the cell shows; where the view knows its number more exactly, that with the text's
+/// decimals.
+std::optional<ShownNumber> ShapedRows::numberOf(
+    std::int64_t record, int field, TextView text, char16_t separator) const
+{
+    auto shown = readShownNumber(text, separator);
+    const auto known = source_.number ? source_.number(record, field) : std::nullopt;
+    if (!known)
+        return shown;
+    if (!shown)
+        shown = readShownNumber(formatNumber(*known), u'.');
+    if (!shown)
+        shown.emplace(); // an infinite one
+    shown->value = *known;
+    return shown;
 }
 
 /// One row per function; the name stands in the first column that holds no total, or before the
@@ -332,8 +393,7 @@ void ShapedRows::addTotals(const Totals& totals, TextView name)
     for (std::size_t number = 0; number < totals.rowCount(); ++number) {
         TotalTexts texts(source_.widths.size());
         for (std::size_t place = 0; place < texts.size(); ++place)
-            texts[place] = document_.store().add(
-                totals.text(number, static_cast<int>(place), platform_.decimalSeparator));
+            texts[place] = document_.store().add(totals.text(number, static_cast<int>(place)));
         const Text label = Text(name) + u": " + Text(functionName(totals.function(number)));
         const auto first = static_cast<std::size_t>(bands_.front().front());
         texts[first] = document_.store().add(

@@ -86,6 +86,9 @@ public:
     /// @throws RunTimeError InvalidCall: there is no column of that title
     void resolve(std::span<const Text> titles);
 
+    /// What the totals of the rows read so far leave out.
+    std::vector<LeftOut> leftOut() const;
+
     /// Reads ahead. @return  whether there are so many rows to print
     bool ensure(std::size_t count);
 
@@ -134,7 +137,10 @@ private:
     void measureCell(int field, ShapedRow& row);
     void measureShown(int field, ShapedRow& row);
     void openBox(int field, ShapedRow& row);
+    char16_t separatorOf(int field);
     void noteNumbers(const ShapedRow& row);
+    std::optional<ShownNumber> numberOf(
+        std::int64_t record, int field, TextView text, char16_t separator) const;
     void closeGroup();
     void addTotals(const Totals& totals, TextView name);
     void layTotals(std::size_t total, ShapedRow& row);
@@ -150,6 +156,7 @@ private:
     mutable MeasuredFont fonts_[2][2]; ///< of the body: by bold and italic
     std::vector<int> groupFields_;
     std::vector<int> totalFields_;
+    std::vector<char16_t> separators_; ///< decimal ones of the totals' fields
 
     std::deque<ShapedRow> rows_; ///< read, not taken yet
     std::vector<ShapedRow> spare_; ///< their memory is used again

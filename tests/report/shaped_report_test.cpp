@@ -82,6 +82,13 @@ protected:
     /// The texts of a page, in the order in which they were recorded.
     std::string page(int number) { return textsOf(canvas.document(), number - 1); }
 
+    Twips widthOf(const TextRecord& text)
+    {
+        const Font& font = canvas.document().style(text.style).font;
+        FaceMetrics& face = services().metrics.face(font.name, font.bold, font.italic);
+        return roundToInt32(textWidth(face.advanceOf(text.text()), font.size));
+    }
+
     std::vector<TextRecord> textsOn(int number)
     {
         const auto texts = canvas.document().texts(number - 1);
@@ -136,6 +143,15 @@ TEST_F(ShapedReportTest, IsThePlainReportWhereItIsAskedForNothingThatShows)
     }
 }
 
+TEST(ReportOptions, AreAllOffAtFirst)
+{
+    const ReportOptions options;
+    EXPECT_FALSE(options.choosesCells());
+    EXPECT_FALSE(options.shapesPages(true));
+    EXPECT_FALSE(options.watermark.isAsked());
+    EXPECT_TRUE(options.logo.imageFile.empty());
+}
+
 TEST_F(ShapedReportTest, RepeatsKeyColumnsAtTheLeftOfEveryBand)
 {
     TableGrid grid = gridOf(columnsOf(6, 3000), numberedRows(2, 6));
@@ -159,6 +175,108 @@ TEST_F(ShapedReportTest, ABandHoldsAColumnBesideItsKeys)
     ASSERT_EQ(canvas.Totalpages(), 2);
     EXPECT_EQ(page(1), "C1|C2|C3|r1c1|r1c2|r1c3");
     EXPECT_EQ(page(2), "C1|C2|C4|r1c1|r1c2|r1c4");
+}
+
+TEST_F(ShapedReportTest, NarrowsColumnsThatWouldLeaveThePaper)
+{
+    struct Case {
+        std::vector<Twips> widths;
+        int keys;
+        bool isFitted;
+        int pages;
+        std::vector<Twips> edges; ///< of the first page's vertical lines
+    };
+    // 11907 wide with 680 at the sides: 10547 are left, less one so that a table fits.
+    const std::vector<Case> cases {
+        { { 30000 }, 0, true, 1, { 680, 11226 } },
+        { { 30000 }, 0, false, 1, { -9046, 20954 } }, // the plain page
+        { { 2000, 30000 }, 0, true, 2, { 4954, 6954 } },
+        { { 30000, 2000 }, 1, false, 1, { 680, 9226, 11226 } },
+        { { 2000, 30000 }, 1, false, 1, { 680, 2680, 11226 } },
+        { { 3000, 9000, 6000, 500 }, 2, false, 2, { 680, 3317, 5953, 11226 } },
+        { { 30000, 500 }, 2, false, 1, { 680, 10726, 11226 } }, // all are keys
+    };
+    for (const Case& expected : cases) {
+        std::vector<TableColumn> columns;
+        for (const Twips width : expected.widths)
+            columns.push_back({ u"C" + decimal(std::ssize(columns) + 1), width });
+        TableGrid grid = gridOf(columns, numberedRows(1, static_cast<int>(columns.size())));
+        canvas.options = {};
+        canvas.options.keyColumns = expected.keys;
+        canvas.options.fit.toSheet = expected.isFitted;
+        canvas.doPreview(grid);
+        SCOPED_TRACE(expected.widths[0]);
+        EXPECT_EQ(canvas.fit().pagesAcross, expected.pages);
+        EXPECT_EQ(canvas.Totalpages(), expected.pages);
+        EXPECT_EQ(canvas.fit().rule, expected.isFitted ? FitRule::Bands : FitRule::NotAsked);
+        std::vector<Twips> edges;
+        for (std::size_t at = 0; at < canvas.document().lines(0).size(); ++at) {
+            const Lineobj line = canvas.document().line(0, at);
+            if (line.pt1.x == line.pt2.x && std::ranges::find(edges, line.pt1.x) == edges.end())
+                edges.push_back(line.pt1.x);
+        }
+        EXPECT_EQ(edges.size(), expected.edges.size());
+        for (std::size_t at = 0; at < std::min(edges.size(), expected.edges.size()); ++at)
+            EXPECT_NEAR(edges[at], expected.edges[at], 1);
+    }
+}
+
+TEST_F(ShapedReportTest, IsFittedWithOneRowAndWithNone)
+{
+    for (const int rows : { 1, 0 }) {
+        TableGrid grid = gridOf(columnsOf(5, 2900), numberedRows(rows, 5));
+        canvas.options = {};
+        canvas.options.fit.toSheet = true;
+        canvas.options.keyColumns = 1;
+        canvas.options.totals = { { u"C2", AggregateFunction::Count } };
+        canvas.doPreview(grid);
+        EXPECT_EQ(canvas.Totalpages(), 1);
+        EXPECT_EQ(canvas.fit(), (FitResult { FitRule::Landscape, 1, true, 1 }));
+        EXPECT_EQ(canvas.printedRows(), rows);
+        EXPECT_EQ(page(1),
+            rows == 0 ? "C1|C2|C3|C4|C5"
+                      : "C1|C2|C3|C4|C5|r1c1|r1c2|r1c3|r1c4|r1c5|Total: Count|1");
+    }
+}
+
+TEST_F(ShapedReportTest, PrintsTitlesAloneWhereNothingIsChosen)
+{
+    ShownGrid grid(gridOf(columnsOf(2, 2900), numberedRows(5, 2)));
+    canvas.options.whereColumn = u"C1";
+    canvas.options.whereText = u"nowhere";
+    canvas.doPreview(grid);
+    EXPECT_EQ(page(1), "C1|C2");
+    EXPECT_EQ(canvas.printedRows(), 0);
+    canvas.options = {};
+    canvas.options.rows = RowChoice::Range;
+    canvas.options.firstRow = 9;
+    canvas.options.lastRow = 12;
+    canvas.doPreview(grid);
+    EXPECT_EQ(canvas.printedRows(), 0);
+    canvas.options.firstRow = -3;
+    canvas.options.lastRow = 1;
+    canvas.doPreview(grid);
+    EXPECT_EQ(page(1), "C1|C2|r1c1|r1c2");
+}
+
+TEST_F(ShapedReportTest, TellsColumnsOfOneTitleApartAndNamesThoseThereAre)
+{
+    TableGrid grid
+        = gridOf({ { u"A", 2000 }, { u"A", 2000 }, { u"", 2000 } }, { { u"1", u"2", u"3" } });
+    canvas.options.columns = { u"A1", u"NULL2", u"A", u"A1" };
+    canvas.doPreview(grid);
+    EXPECT_EQ(page(1), "A1|NULL2|A|2|3|1");
+    canvas.options = {};
+    canvas.options.keyColumnNames = { u"B" };
+    try {
+        canvas.doPreview(grid);
+        FAIL() << "there is no such column";
+    } catch (const RunTimeError& error) {
+        EXPECT_NE(
+            toUtf8(error.text()).find("the grid prints no column \"B\"; there are: A, A1, NULL2"),
+            std::string::npos)
+            << toUtf8(error.text());
+    }
 }
 
 TEST_F(ShapedReportTest, GoesDownBeforeItGoesAcross)
@@ -269,7 +387,71 @@ TEST_F(ShapedReportTest, AddsTotalsBehindEveryGroupAndAtTheEnd)
         "Kind|Name|Price|fruit|pear|0.1|fruit|plum|0.2|"
         "fruit: Sum|0.3|fruit: Count|2|fruit: Maximum|0.2|"
         "nut||n/a|nut|pecan|3|nut: Sum|3|nut: Count|1|nut: Maximum|3|"
-        "Total: Sum|3.3|Total: Count|3|Total: Maximum|3");
+        "Total: Sum|3.3|Total: Count|3|Total: Maximum|3.0");
+}
+
+TEST_F(ShapedReportTest, ReadsAndWritesTheNumbersOfTotalsAsTheTableShowsThem)
+{
+    struct Case {
+        std::vector<Text> cells;
+        std::string inPointLocale; ///< sum, mean, minimum and maximum
+        std::string inCommaLocale;
+    };
+    const std::vector<Case> cases {
+        { { u"12.50", u"12.50" }, "25.00 12.50 12.50 12.50", "25.00 12.50 12.50 12.50" },
+        { { u"12,50", u"0,25" }, "12,75 6,375 0,25 12,50", "12,75 6,375 0,25 12,50" },
+        { { u"1,234.50", u"12.5", u"7" }, "1,254.00 418.00 7.00 1,234.50",
+            "1,254.00 418.00 7.00 1,234.50" },
+        { { u"1.234,50", u"2" }, "1.236,50 618,25 2,00 1.234,50", "1.236,50 618,25 2,00 1.234,50" },
+        { { u"1", u"2" }, "3 1.5 1 2", "3 1,5 1 2" },
+        { { u"1", u"1", u"2" }, "4 1.33 1 2", "4 1,33 1 2" },
+        { { u"1,234", u"1" }, "1,235 617.5 1 1,234", "2,234 1,117 1,000 1,234" },
+        { { u"1,234", u"0.5" }, "1,234.5 617.25 0.5 1,234.0", "1,234.5 617.25 0.5 1,234.0" },
+        { { u"1,234", u"0,5" }, "1,734 0,867 0,500 1,234", "1,734 0,867 0,500 1,234" },
+        { { u"999,999.99", u"0.02" }, "1,000,000.01 500,000.005 0.02 999,999.99",
+            "1,000,000.01 500,000.005 0.02 999,999.99" },
+        { { u"-0.10", u"0.1" }, "0.00 0.00 -0.10 0.10", "0.00 0.00 -0.10 0.10" },
+        { { u"12,50 €", u"(2,50 €)" }, "10,00 5,00 -2,50 12,50", "10,00 5,00 -2,50 12,50" },
+    };
+    for (const Case& expected : cases) {
+        std::vector<std::vector<Text>> rows;
+        for (const Text& cell : expected.cells)
+            rows.push_back({ u"x", cell });
+        TableGrid grid = gridOf({ { u"A", 3000 }, { u"B", 4000 } }, rows);
+        canvas.options.totals
+            = { { u"B", AggregateFunction::Sum }, { u"B", AggregateFunction::Mean },
+                  { u"B", AggregateFunction::Minimum }, { u"B", AggregateFunction::Maximum } };
+        for (const char16_t locale : { u'.', u',' }) {
+            services().decimalSeparator = locale;
+            canvas.doPreview(grid);
+            std::string totals;
+            const auto texts = textsOn(1);
+            for (std::size_t at = texts.size() - 7; at < texts.size(); at += 2)
+                totals += (totals.empty() ? "" : " ") + toUtf8(texts[at].text());
+            const std::string& wanted
+                = locale == u'.' ? expected.inPointLocale : expected.inCommaLocale;
+            EXPECT_EQ(totals, wanted) << toUtf8(expected.cells[0]);
+            EXPECT_TRUE(canvas.leftOut().empty());
+        }
+    }
+}
+
+TEST_F(ShapedReportTest, CountsWhatTotalsLeaveOutAndLeavesATotalOfNoNumberBlank)
+{
+    TableGrid grid = gridOf({ { u"A", 2000 }, { u"B", 2000 }, { u"C", 2000 } },
+        { { u"1.50", u"x", u"" }, { u"n/a", u"y", u"" }, { u"", u"", u"" },
+            { u"12:30", u"12.05.2024", u"" } });
+    canvas.options.totals = { { u"A", AggregateFunction::Mean }, { u"B", AggregateFunction::Sum },
+        { u"A", AggregateFunction::Sum }, { u"C", AggregateFunction::Maximum },
+        { u"B", AggregateFunction::Count } };
+    canvas.doPreview(grid);
+    EXPECT_NE(page(1).find("Total: Mean 1.50|Total: Sum 1.50|Total: Maximum|Total: Count|3"),
+        std::string::npos)
+        << page(1);
+    EXPECT_EQ(canvas.leftOut(), (std::vector<LeftOut> { { u"A", 2 }, { u"B", 3 } }));
+    canvas.options = {};
+    canvas.doPreview(grid);
+    EXPECT_TRUE(canvas.leftOut().empty());
 }
 
 TEST_F(ShapedReportTest, KeepsGroupsTogetherWhereAPageCanHoldThem)
@@ -362,6 +544,16 @@ TEST_F(ShapedReportTest, DrawsCheckBoxesInPlaceOfTheirCharacters)
     EXPECT_EQ(page(1), "C1|done|☑ text") << "the last one is typed";
 }
 
+TEST_F(ShapedReportTest, DrawsCheckBoxesBesideTextsThatHaveNoCharacterForThem)
+{
+    ShownGrid grid(gridOf(columnsOf(1, 3000), { { u"done" }, { u"" } }));
+    grid.look(1, 0).check = CheckMark::On;
+    grid.look(2, 0).check = CheckMark::Partly;
+    canvas.options.asShown = true;
+    canvas.doPreview(grid);
+    EXPECT_EQ(page(1), "C1|done");
+}
+
 TEST_F(ShapedReportTest, DrawsIconsAtTheHeightOfTheTextBeforeIt)
 {
     ShownGrid grid(gridOf(columnsOf(1, 3000), { { u"with" }, { u"without" }, { u"" } }));
@@ -438,7 +630,7 @@ TEST_F(ShapedReportTest, PutsTheWatermarkBehindOrAboveEveryPageAndChangesNothing
     TableGrid grid = gridOf(columnsOf(2, 2000), numberedRows(90, 2));
     canvas.doPreview(grid);
     const std::string plain = showDocument(canvas.document());
-    EXPECT_FALSE(canvas.document().hasReportPictures());
+    EXPECT_TRUE(canvas.document().reportPictures(0).empty());
     canvas.options.watermark = { .text = u"Draft", .opacity = 0.2 };
     canvas.doPreview(grid);
     EXPECT_EQ(showDocument(canvas.document()), plain);
@@ -527,6 +719,7 @@ TEST_F(ShapedReportTest, EveryChosenCellStandsOncePerBandAndNothingOutsideThePap
         for (int number = 1; number <= canvas.Totalpages(); ++number) {
             for (const TextRecord& text : textsOn(number)) {
                 EXPECT_GE(text.pt.x, 0);
+                EXPECT_LE(text.pt.x + widthOf(text), canvas.page.myWidth);
                 EXPECT_GE(text.pt.y, 0);
                 EXPECT_LT(text.pt.y, canvas.page.myHeight);
                 cell += Text(text.text());
@@ -547,7 +740,7 @@ TEST_F(ShapedReportTest, EveryChosenCellStandsOncePerBandAndNothingOutsideThePap
                     EXPECT_EQ(count, 1) << row << " " << column << " of " << round;
                     ++singles;
                 } else {
-                    EXPECT_GE(count, 1);
+                    EXPECT_EQ(count, canvas.fit().pagesAcross) << row << " " << column;
                 }
             }
         }

@@ -488,6 +488,8 @@ const ReportOptions& Sorvane::reportOptions() const { return canvas().options; }
 
 FitResult Sorvane::fitResult() const { return canvas().fit(); }
 
+std::vector<LeftOut> Sorvane::leftOutOfTotals() const { return canvas().leftOut(); }
+
 QVariant Sorvane::getIntTop() const { return QVariant::fromValue(canvas().page.intTop); }
 
 QVariant Sorvane::getIntButtom() const { return QVariant::fromValue(canvas().page.intButtom); }

@@ -43,6 +43,8 @@ const ReportOptions& Report::reportOptions() const { return parts_->canvas.optio
 
 FitResult Report::fitResult() const { return parts_->canvas.fit(); }
 
+std::vector<LeftOut> Report::leftOutOfTotals() const { return parts_->canvas.leftOut(); }
+
 void Report::build(QObject& grid)
 {
     const std::unique_ptr<AutomationObject> object = gridFor(grid);
