@@ -4,6 +4,7 @@
 #include <pelloric/export.h>
 
 #include "controls/qt/default_platform.h"
+#include "document/ostl_losses.h"
 #include "document/ostl_writer.h"
 #include "export/qt/page_export.h"
 #include "host/qt/host_canvas.h"
@@ -55,11 +56,31 @@ QStringList writeSvgs(const Canvas& canvas, const ExportRequest& request)
         optionsOf(request), pathOf(request.path)));
 }
 
-void writeOstlFile(const Canvas& canvas, const ExportRequest& request)
+OstlLosses writeOstlFile(const Canvas& canvas, const ExportRequest& request)
 {
     const Platform platform = defaultPlatform().record();
     exportOstl(canvas.document(), canvas.page, { platform.codec, platform.decimalSeparator },
         optionsOf(request), pathOf(request.path));
+    return ostlLosses(canvas.document(), platform.codec);
+}
+
+/// Lays a live view out as a request says.
+Report reportOf(QObject& grid, const ExportRequest& request)
+{
+    Report report;
+    report.useSettings(request.settings);
+    report.setReportOptions(request.options);
+    report.build(grid);
+    return report;
+}
+
+ExportResult resultOf(const Report& report, QStringList files)
+{
+    return { .files = std::move(files),
+        .pageCount = report.pageCount(),
+        .rowCount = canvasOf(report).printedRows(),
+        .fit = report.fitResult(),
+        .leftOutOfTotals = report.leftOutOfTotals() };
 }
 
 } // namespace
@@ -74,6 +95,13 @@ void exportPdf(const Sorvane& canvas, const ExportRequest& request)
     writePdf(canvasOf(canvas), request);
 }
 
+ExportResult exportPdf(QObject& grid, const ExportRequest& request)
+{
+    const Report report = reportOf(grid, request);
+    exportPdf(report, request);
+    return resultOf(report, { request.path });
+}
+
 QStringList exportPng(const Report& report, const ExportRequest& request)
 {
     return writePngs(canvasOf(report), request);
@@ -82,6 +110,12 @@ QStringList exportPng(const Report& report, const ExportRequest& request)
 QStringList exportPng(const Sorvane& canvas, const ExportRequest& request)
 {
     return writePngs(canvasOf(canvas), request);
+}
+
+ExportResult exportPng(QObject& grid, const ExportRequest& request)
+{
+    const Report report = reportOf(grid, request);
+    return resultOf(report, exportPng(report, request));
 }
 
 QStringList exportSvg(const Report& report, const ExportRequest& request)
@@ -94,14 +128,28 @@ QStringList exportSvg(const Sorvane& canvas, const ExportRequest& request)
     return writeSvgs(canvasOf(canvas), request);
 }
 
-void exportOstl(const Report& report, const ExportRequest& request)
+ExportResult exportSvg(QObject& grid, const ExportRequest& request)
 {
-    writeOstlFile(canvasOf(report), request);
+    const Report report = reportOf(grid, request);
+    return resultOf(report, exportSvg(report, request));
 }
 
-void exportOstl(const Sorvane& canvas, const ExportRequest& request)
+OstlLosses exportOstl(const Report& report, const ExportRequest& request)
 {
-    writeOstlFile(canvasOf(canvas), request);
+    return writeOstlFile(canvasOf(report), request);
+}
+
+OstlLosses exportOstl(const Sorvane& canvas, const ExportRequest& request)
+{
+    return writeOstlFile(canvasOf(canvas), request);
+}
+
+ExportResult exportOstl(QObject& grid, const ExportRequest& request)
+{
+    const Report report = reportOf(grid, request);
+    ExportResult result = resultOf(report, { request.path });
+    result.ostlLosses = exportOstl(report, request);
+    return result;
 }
 
 } // namespace pelloric::qt

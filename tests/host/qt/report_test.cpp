@@ -10,6 +10,7 @@
 #include <pelloric/grids.h>
 #include <pelloric/printing.h>
 
+#include <QProcess>
 #include <QTableWidget>
 
 #include <gtest/gtest.h>
@@ -93,6 +94,109 @@ TEST(Report, IsExportedPageByPageAndOpenedAgain)
     EXPECT_EQ(opened.pageCount(), report.pageCount());
     EXPECT_EQ(errorOf([&] { opened.open(nameIn(folder, "a.pdf")); }), ErrorNumber::TypeMismatch);
     EXPECT_EQ(errorOf([&] { opened.open(nameIn(folder, "none")); }), ErrorNumber::FileNotFound);
+}
+
+TEST(LiveView, IsExportedInOneCallWithOptions)
+{
+    const TempFolder folder;
+    QTableWidget view(3, 5);
+    view.setHorizontalHeaderLabels({ "Article", "Price", "C", "D", "E" });
+    const char* const prices[] = { "1,234.50", "0.5", "none" };
+    for (int row = 0; row < 3; ++row) {
+        view.setItem(row, 0, new QTableWidgetItem(QStringLiteral("A%1").arg(row + 1)));
+        view.setItem(row, 1, new QTableWidgetItem(QString::fromLatin1(prices[row])));
+    }
+    for (int column = 0; column < 5; ++column)
+        view.setColumnWidth(column, 190);
+    ExportRequest request { .path = nameIn(folder, "live.pdf") };
+    request.settings = ReportSettings();
+    const ExportResult plain = exportPdf(view, request);
+    EXPECT_EQ(plain.pageCount, 2);
+    EXPECT_EQ(plain.fit, (FitResult { .pagesAcross = 2 }));
+    request.options.fit.toSheet = true;
+    request.options.asShown = true;
+    request.options.totals = { { u"Price" } };
+    const ExportResult fitted = exportPdf(view, request);
+    EXPECT_EQ(fitted.files, QStringList { nameIn(folder, "live.pdf") });
+    EXPECT_EQ(fitted.pageCount, 1);
+    EXPECT_EQ(fitted.fit.rule, FitRule::Landscape);
+    EXPECT_TRUE(fitted.fit.isTurned);
+    EXPECT_EQ(fitted.fit.pagesAcross, 1);
+    EXPECT_EQ(fitted.leftOutOfTotals, (std::vector<LeftOut> { { u"Price", 1 } }));
+    QProcess process;
+    process.start(QStringLiteral("pdftotext"), { request.path, QStringLiteral("-") });
+    ASSERT_TRUE(process.waitForFinished());
+    EXPECT_TRUE(process.readAllStandardOutput().contains("1,235.00"));
+    request.path = nameIn(folder, "live.png");
+    EXPECT_EQ(exportPng(view, request).files, QStringList { request.path });
+    request.path = nameIn(folder, "live.svg");
+    EXPECT_EQ(exportSvg(view, request).files, QStringList { request.path });
+    request.path = nameIn(folder, "live.ostl");
+    EXPECT_FALSE(exportOstl(view, request).ostlLosses.any());
+    request.options.watermark.text = u"Draft";
+    EXPECT_EQ(exportOstl(view, request).ostlLosses, (OstlLosses { .pictures = true }));
+    request.options.columns = { u"Nothing" };
+    EXPECT_EQ(errorOf([&] { exportPdf(view, request); }), ErrorNumber::InvalidCall);
+    EXPECT_EQ(folder.names().size(), 4U);
+}
+
+TEST(LiveView, HasTicksThatKeepTheirShareOfTheBoxAtEveryResolution)
+{
+    const TempFolder folder;
+    QTableWidget view(1, 1);
+    view.setShowGrid(false);
+    view.setItem(0, 0, new QTableWidgetItem);
+    view.item(0, 0)->setCheckState(Qt::Checked);
+    ExportRequest request { .path = nameIn(folder, "tick.png") };
+    request.settings = ReportSettings();
+    request.settings->showHeaders = false;
+    request.settings->footerTexts = {};
+    request.settings->paperWidthMm = request.settings->paperHeightMm = 100;
+    request.settings->body.size = 20;
+    request.options.asShown = true;
+    struct Seen {
+        double side = 0; ///< of the box: of an inch
+        double ink = 0; ///< part of the box that is dark
+        double frame = 0; ///< thickness of its left side: part of the box
+        double tick = 0; ///< thickness of the rising stroke: part of the box
+    };
+    const auto look = [&](int dpi) {
+        request.dpi = dpi;
+        exportPng(view, request);
+        const QImage image = QImage(request.path).convertToFormat(QImage::Format_Grayscale8);
+        const auto isDark = [&](int x, int y) { return qGray(image.pixel(x, y)) < 128; };
+        QRect box;
+        qint64 dark = 0;
+        for (int y = 0; y < image.height(); ++y) {
+            for (int x = 0; x < image.width(); ++x) {
+                if (isDark(x, y)) {
+                    box |= QRect(x, y, 1, 1);
+                    ++dark;
+                }
+            }
+        }
+        const double side = box.width();
+        const auto runFrom = [&](double part, int x) {
+            const int y = box.top() + static_cast<int>(part * side);
+            while (x < image.width() && !isDark(x, y))
+                ++x;
+            const int first = x;
+            while (x < image.width() && isDark(x, y))
+                ++x;
+            return (x - first) / side;
+        };
+        EXPECT_NEAR(box.height(), side, 1);
+        return Seen { side / dpi, static_cast<double>(dark) / (side * side),
+            runFrom(0.3, box.left()), runFrom(0.4, box.left() + box.width() / 5) };
+    };
+    const Seen coarse = look(150);
+    const Seen fine = look(600);
+    EXPECT_NEAR(coarse.side, fine.side, 0.01);
+    EXPECT_NEAR(coarse.ink, fine.ink, 0.12); // the pens are a pixel wide
+    EXPECT_NEAR(fine.tick, 0.16, 0.03);
+    EXPECT_NEAR(coarse.tick, fine.tick, 0.06);
+    EXPECT_NEAR(fine.frame, 1.0 / 32, 0.012);
+    EXPECT_NEAR(coarse.frame, fine.frame, 0.04);
 }
 
 TEST(Report, RefusesPagesThatDoNotExistAndAPathThatCannotBeWritten)
