@@ -6,6 +6,7 @@
 #include "controls/canvas.h"
 #include "document/append_pages.h"
 #include "document/ostl_format.h"
+#include "document/ostl_losses.h"
 #include "document/ostl_writer.h"
 #include "export/qt/page_export.h"
 #include "font_notes.h"
@@ -88,13 +89,19 @@ void writeDocument(const Export& job)
     const Platform platform = job.platform.record();
     qt::exportOstl(job.document, job.setup, { platform.codec, platform.decimalSeparator },
         job.options, job.path);
-    const int leftOut = job.document.Totalpages - 1 - ostl::LastPageIndex;
-    if (leftOut > 0)
+    const OstlLosses losses = ostlLosses(job.document, platform.codec);
+    if (losses.pages > 0)
         note(QStringLiteral("a document file holds %1 pages; the last %2 were left out")
                  .arg(ostl::LastPageIndex + 1)
-                 .arg(leftOut));
-    if (job.document.hasReportPictures())
+                 .arg(losses.pages));
+    if (losses.pictures)
         note(QStringLiteral("a document file holds no pictures; watermark and logo were left out"));
+    if (losses.icons)
+        note(QStringLiteral("a document file holds no icons of cells; they were left out"));
+    if (losses.texts > 0)
+        note(QStringLiteral("a document file has no code for some characters; %1 of its texts "
+                            "show \"?\" for them")
+                 .arg(losses.texts));
 }
 
 /// A kind of file that can be made.
@@ -231,9 +238,9 @@ Laid layOut(
     Canvas canvas(record);
     canvas.useSettings(settingsFor(line, record, SettingsBase::Defaults));
     buildReport(canvas, *grid, line, progress);
-    const QJsonObject facts { { QStringLiteral("rows"), rows },
-        { QStringLiteral("columns"), grid->columnCount() },
-        { QStringLiteral("bands"), static_cast<qint64>(canvas.table()->ColumnBands.size()) } };
+    QJsonObject facts = shapeFacts(canvas);
+    facts.insert(QStringLiteral("rows"), rows);
+    facts.insert(QStringLiteral("columns"), grid->columnCount());
     return { std::move(canvas.document()), canvas.page, facts };
 }
 

@@ -9,6 +9,7 @@
 #include "grids/table_grid.h"
 #include "outcome.h"
 #include "platform/automation_object.h"
+#include "platform/numbers.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -16,15 +17,62 @@
 #include "print/page_list.h"
 #include "progress_line.h"
 #include "report/content_widths.h"
+#include "report/report_totals.h"
 #include "report_options.h"
 #include "shape_options.h"
 #include "table_source.h"
+
+#include <array>
 
 namespace pelloric::app {
 
 namespace {
 
+/// A rule of `FitRule` as it is told in JSON, in their order.
+constexpr auto RuleNames
+    = std::to_array<const char*>({ nullptr, "as is", "landscape", "shrunk", "bands" });
+static_assert(RuleNames.size() == static_cast<std::size_t>(FitRule::Bands) + 1);
+
 constexpr double WidestColumn = 100000; ///< twips
+
+QString cellsOf(std::int64_t count)
+{
+    return count == 1 ? QStringLiteral("1 cell") : QStringLiteral("%1 cells").arg(count);
+}
+
+int columnOf(const TableGrid& grid, TextView title)
+{
+    int column = 0;
+    while (column < grid.columnCount() && grid.column(column).title != title)
+        ++column;
+    return column;
+}
+
+/// Makes room for the names of totals, which stand in the first column in bold.
+void widenForTotals(
+    const TableGrid& grid, const ReportOptions& options, Canvas& canvas, std::vector<Twips>& widths)
+{
+    const int first
+        = options.keyColumnNames.empty() ? 0 : columnOf(grid, options.keyColumnNames.front());
+    if (options.totals.empty() || first >= grid.columnCount())
+        return;
+    const Font& font = canvas.style().body.font;
+    FaceMetrics& face = canvas.platform().metrics.face(font.name, true, font.italic);
+    const auto widthOf = [&](TextView text) { return textWidth(face.advanceOf(text), font.size); };
+    double names = widthOf(u"Total");
+    double group = 0;
+    for (const Text& title : options.groupColumns) {
+        if (const int column = columnOf(grid, title); column < grid.columnCount())
+            group += widths[static_cast<std::size_t>(column)];
+    }
+    names = std::max(names, group);
+    Twips& width = widths[static_cast<std::size_t>(first)];
+    for (const Aggregation& total : options.totals) {
+        const Text name = Text(u": ").append(functionName(total.function));
+        const double needed = names + widthOf(name) + CellPadding + 1;
+        width = std::max(width, roundToInt32(std::min<double>(needed, WidestContent)));
+    }
+}
 
 void setWidth(TableGrid& grid, int column, Twips width)
 {
@@ -39,6 +87,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
     const Font& font = canvas.style().body.font;
     FaceMetrics& face = canvas.platform().metrics.face(font.name, font.bold, font.italic);
     std::vector<Twips> widths = contentWidths(grid, face, font.size, &canvas.platform().loop);
+    widenForTotals(grid, shapeOf(line), canvas, widths);
     // A table exactly as wide as the room is divided.
     fitWidths(widths, canvas.page.myWidth - 2 * canvas.page.intLeft - 1);
     const QStringList given
@@ -50,6 +99,8 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
             WrongUsage);
     for (int column = 0; column < grid.columnCount(); ++column) {
         Twips width = widths[static_cast<std::size_t>(column)];
+        if (line.has("as-shown"))
+            width = grid.column(column).shownWidth.value_or(width);
         if (column < given.size())
             width = static_cast<Twips>(
                 numberOf("widths", given.at(column).trimmed(), 0, WidestColumn, true));
@@ -70,6 +121,26 @@ void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, Progr
     if (canvas.table() == nullptr)
         throw CommandError(QStringLiteral("no column is wide enough to be printed; give other "
                                           "--widths"));
+    if (canvas.printedRows() == 0 && grid.rowCount() > 0)
+        note(QStringLiteral("no row is printed: --where %1 holds for none")
+                 .arg(line.value("where")));
+    for (const LeftOut& column : canvas.leftOut())
+        note(QStringLiteral("the total of %1 leaves out %2, being no numbers")
+                 .arg(qt::toQString(column.column), cellsOf(column.cells)));
+}
+
+QJsonObject shapeFacts(const Canvas& canvas)
+{
+    const FitResult& fit = canvas.fit();
+    QJsonObject facts { { QStringLiteral("bands"), fit.pagesAcross },
+        { QStringLiteral("printedRows"), static_cast<qint64>(canvas.printedRows()) } };
+    const char* const rule = RuleNames[static_cast<std::size_t>(fit.rule)];
+    if (rule == nullptr)
+        return facts;
+    facts.insert(QStringLiteral("fit"), QLatin1String(rule));
+    facts.insert(QStringLiteral("scale"), fit.scale);
+    facts.insert(QStringLiteral("turned"), fit.isTurned);
+    return facts;
 }
 
 SavedDocument readDocument(const QString& file, const CommandLine& line, const Platform& platform)

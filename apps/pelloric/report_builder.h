@@ -6,6 +6,8 @@
 #include "command_line.h"
 #include "document/page_document.h"
 
+#include <QJsonObject>
+
 #include <vector>
 
 namespace pelloric {
@@ -32,6 +34,9 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas);
 /// Lays a table out with the settings in force.
 /// @throws CommandError settings that cannot be used; RunTimeError of the layout, or Cancelled
 void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, ProgressLine& progress);
+
+/// What is told in JSON of how a table was brought onto its pages.
+QJsonObject shapeFacts(const Canvas& canvas);
 
 /// A document that was saved.
 struct SavedDocument {

@@ -3,14 +3,18 @@
 
 #include "table_selection.h"
 
-#include "platform/numbers.h"
 #include "platform/qt/qt_text.h"
+#include "report/shown_number.h"
 
 #include <QCollator>
+#include <QLocale>
 
 #include <algorithm>
 #include <array>
 #include <numeric>
+#include <optional>
+#include <span>
+#include <utility>
 #include <vector>
 
 namespace pelloric::app {
@@ -92,16 +96,30 @@ struct SortKey {
     QCollatorSortKey text;
 };
 
+/// The decimal separator of a column: that of the first cell which can be read in one way only, or
+/// the locale's.
+char16_t separatorOf(const TableGrid& table, int column)
+{
+    for (std::int64_t row = 0; row < table.rowCount(); ++row) {
+        if (const auto separator = decimalSeparatorOf(table.cell(row, column)))
+            return *separator;
+    }
+    const QString point = QLocale().decimalPoint();
+    return point.isEmpty() ? u'.' : point.front().unicode();
+}
+
 void sortBy(const TableGrid& table, int column, bool isDown, std::vector<std::int64_t>& rows)
 {
     QCollator collator;
     collator.setNumericMode(true);
+    const char16_t separator = separatorOf(table, column);
     std::vector<SortKey> keys;
     keys.reserve(rows.size());
     for (std::int64_t row = 0; row < table.rowCount(); ++row) {
         const TextView cell = table.cell(row, column);
-        const bool isText = !isNumber(cell);
-        keys.push_back({ isText, isText ? 0 : leadingNumber(cell),
+        const auto number = readShownNumber(cell, separator);
+        const bool isText = !number;
+        keys.push_back({ isText, isText ? 0 : number->value,
             collator.sortKey(isText ? qt::toQString(cell) : QString()) });
     }
     const auto isBefore = [&keys, isDown](std::int64_t one, std::int64_t other) {
@@ -153,6 +171,53 @@ void cutRows(const QString& range, std::vector<std::int64_t>& rows)
     rows.erase(rows.begin(), rows.begin() + (first - 1));
 }
 
+/// Where what stood at a place stands now; -1: it is left out.
+std::vector<std::int64_t> placesOf(std::span<const std::int64_t> taken, std::int64_t count)
+{
+    std::vector<std::int64_t> places(static_cast<std::size_t>(count), -1);
+    for (std::size_t at = 0; at < taken.size(); ++at)
+        places[static_cast<std::size_t>(taken[at])] = static_cast<std::int64_t>(at);
+    return places;
+}
+
+/// First and last place of what stood from one place to another, as far as it is taken.
+/// @return  nothing: none of it is, or it is not side by side and in order any more
+std::optional<std::pair<std::int32_t, std::int32_t>> rangeOf(
+    std::span<const std::int64_t> places, std::int32_t first, std::int32_t last)
+{
+    std::optional<std::pair<std::int32_t, std::int32_t>> range;
+    for (std::int32_t at = first; at <= last; ++at) {
+        const std::int64_t place = places[static_cast<std::size_t>(at)];
+        if (place < 0)
+            continue;
+        if (range && place != range->second + 1)
+            return std::nullopt;
+        range = { range ? range->first : static_cast<std::int32_t>(place),
+            static_cast<std::int32_t>(place) };
+    }
+    return range;
+}
+
+/// Boxes over several cells follow their cells; those that are torn apart are boxes no more.
+std::vector<CellLook> movedLooks(const TableGrid& table, std::span<const std::int64_t> rows,
+    std::span<const std::int64_t> columns)
+{
+    const std::vector<std::int64_t> rowPlaces = placesOf(rows, table.rowCount());
+    const std::vector<std::int64_t> columnPlaces = placesOf(columns, table.columnCount());
+    std::vector<CellLook> looks = table.looks();
+    for (CellLook& look : looks) {
+        if (!look.box)
+            continue;
+        const CellBox old = *look.box;
+        look.box.reset();
+        const auto down = rangeOf(rowPlaces, old.firstRow - 1, old.lastRow - 1);
+        const auto across = rangeOf(columnPlaces, old.firstColumn, old.lastColumn);
+        if (down && across)
+            look.box = CellBox { down->first + 1, down->second + 1, across->first, across->second };
+    }
+    return looks;
+}
+
 } // namespace
 
 OptionTable selectionOptions() { return Options; }
@@ -173,7 +238,8 @@ TableGrid selected(TableGrid table, const CommandLine& line)
     for (const int column : columns)
         taken.push_back(table.column(column));
     TableGrid result(std::move(taken));
-    result.setLooks(table.looks());
+    result.setLooks(
+        movedLooks(table, rows, std::vector<std::int64_t>(columns.begin(), columns.end())));
     std::vector<TextView> cells(columns.size());
     std::vector<std::uint16_t> looks(columns.size());
     for (const std::int64_t row : rows) {

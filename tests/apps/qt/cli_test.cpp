@@ -581,6 +581,33 @@ TEST_F(Program, TellsInJsonWhatItMadeAndNothingWhenQuiet)
     EXPECT_TRUE(has(wrong.errors, "missing.csv"));
 }
 
+TEST_F(Program, AddsUpNumbersAsTheTableShowsThemInEveryLocale)
+{
+    folder_.write("points.csv", "Name,Price\nx,12.50\ny,12.50\nz,\"1,234.50\"\n");
+    folder_.write("commas.csv", "Name;Price\nx;12,50\ny;n/a\nz;1.234,50\n");
+    for (const char* const locale : { "C", "de_DE.UTF-8", "en_US.UTF-8" }) {
+        surround = [locale](QProcess&, QProcessEnvironment& environment) {
+            environment.insert(QStringLiteral("LC_ALL"), QString::fromLatin1(locale));
+        };
+        const Ended points = run(words("export points.csv -o p.pdf --total sum:Price"));
+        EXPECT_EQ(points.status, 0) << points.errors;
+        EXPECT_EQ(points.errors, "");
+        EXPECT_TRUE(has(pdfText("p.pdf"), "1,259.50")) << locale << pdfText("p.pdf");
+        EXPECT_TRUE(has(pdfText("p.pdf"), "Total: Sum")) << "in one line";
+        run(words("export points.csv -o s.pdf --sort Price:desc --columns Name"));
+        EXPECT_LT(pdfText("s.pdf").find('z'), pdfText("s.pdf").find('x')) << locale;
+        const Ended commas
+            = run(words("export commas.csv -o c.pdf --total sum:Price --delimiter ; --json --fit"));
+        EXPECT_TRUE(has(pdfText("c.pdf"), "1.247,00")) << locale << pdfText("c.pdf");
+        const QJsonObject told
+            = QJsonDocument::fromJson(QByteArray::fromStdString(commas.output)).object();
+        EXPECT_EQ(told[QStringLiteral("warnings")].toArray().at(0).toString(),
+            QStringLiteral("the total of Price leaves out 1 cell, being no numbers"));
+        EXPECT_EQ(told[QStringLiteral("fit")].toString(), QStringLiteral("as is"));
+        EXPECT_EQ(told[QStringLiteral("bands")].toInt(), 1);
+    }
+}
+
 TEST_F(Program, TakesQuotationMarksForWhatTheyAreWhenAsked)
 {
     folder_.write("q.csv", "a;b\n\"1\" x;2\"\n");
