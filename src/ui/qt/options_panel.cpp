@@ -79,7 +79,7 @@ QComboBox* choiceBox(const char* name, const QStringList& entries)
 {
     auto* const box = named(new QComboBox, name);
     box->addItems(entries);
-    box->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+    box->setSizeAdjustPolicy(QComboBox::AdjustToContents);
     return box;
 }
 
@@ -365,7 +365,9 @@ void OptionsPanel::showUse()
     logoSlot_->setEnabled(!logo_->text().isEmpty());
 }
 
-QString fitText(const FitResult& fit)
+namespace {
+
+QString ruleText(const FitResult& fit)
 {
     const auto percent = static_cast<int>(std::floor(fit.scale * Percent));
     switch (fit.rule) {
@@ -380,9 +382,21 @@ QString fitText(const FitResult& fit)
         return fit.isTurned ? OptionsPanel::tr("Shrunk to %1 % on turned paper.").arg(percent)
                             : OptionsPanel::tr("Shrunk to %1 %.").arg(percent);
     case FitRule::Bands:
-        return OptionsPanel::tr("Too wide to be shrunk: printed in bands.");
+        return fit.pagesAcross > 1
+            ? OptionsPanel::tr("Too wide to be shrunk: printed in bands.")
+            : OptionsPanel::tr("Too wide to be shrunk: its columns are narrowed.");
     }
     return {};
+}
+
+} // namespace
+
+QString fitText(const FitResult& fit)
+{
+    const QString rule = ruleText(fit);
+    if (rule.isEmpty() || fit.pagesAcross < 2)
+        return rule;
+    return rule + QLatin1Char(' ') + OptionsPanel::tr("Pages across: %1.").arg(fit.pagesAcross);
 }
 
 } // namespace pelloric::qt

@@ -5,6 +5,9 @@
 
 #include "controls/messages.h"
 #include "controls/qt/sorvane.h"
+#include "document/ostl_losses.h"
+#include "platform/platform.h"
+#include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 #include "ui/qt/options_panel.h"
@@ -72,12 +75,19 @@ void ReportTools::viewChanged()
         return;
     documentNumber_ = canvas.documentNumber();
     panel_->showFit(canvas.fit());
-    showStatus(fitText(canvas.fit()));
+    QStringList told { fitText(canvas.fit()) };
+    for (const LeftOut& column : canvas.leftOut())
+        told += tr("Cells of %1 that show no number and that its total leaves out: %2.")
+                    .arg(toQString(column.column))
+                    .arg(column.cells);
+    showStatus(told.join(QLatin1Char(' ')).trimmed());
 }
 
 void ReportTools::documentSaved()
 {
-    if (parts_.canvas.canvas().document().hasReportPictures())
+    Canvas& canvas = parts_.canvas.canvas();
+    const OstlLosses losses = ostlLosses(canvas.document(), canvas.platform().codec);
+    if (losses.pictures || losses.icons)
         showStatus(tr("The file holds the pages without watermark, logo and icons; save them as "
                       "PDF to keep those."));
 }

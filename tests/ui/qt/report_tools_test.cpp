@@ -7,11 +7,15 @@
 #include "ui/qt/options_panel.h"
 #include "ui/qt/preview_world.h"
 
+#include <pelloric/preview.h>
+
 #include <QAccessible>
 #include <QCheckBox>
 #include <QComboBox>
 #include <QSpinBox>
 #include <QStatusBar>
+#include <QStyle>
+#include <QStyleOptionComboBox>
 
 namespace pelloric::qt {
 
@@ -147,6 +151,48 @@ TEST_F(ReportToolsTest, SayThatADocumentFileHoldsNoWatermark)
     EXPECT_EQ(status(), QString());
     click(21);
     EXPECT_EQ(status(), QString()) << "nothing is missing";
+}
+
+TEST_F(ReportToolsTest, ClipNoEntryOfTheirLists)
+{
+    for (const char* const language : { "en", "de", "zh_CN" }) {
+        installTranslation(QLocale(QString::fromLatin1(language)));
+        OptionsPanel own;
+        own.show();
+        own.resize(own.minimumSizeHint().width(), 600);
+        QCoreApplication::processEvents();
+        for (const QComboBox* const box : own.findChildren<QComboBox*>()) {
+            int longest = 0;
+            for (int entry = 0; entry < box->count(); ++entry)
+                longest
+                    = std::max(longest, box->fontMetrics().horizontalAdvance(box->itemText(entry)));
+            QStyleOptionComboBox option;
+            option.initFrom(box);
+            const QRect room = box->style()->subControlRect(
+                QStyle::CC_ComboBox, &option, QStyle::SC_ComboBoxEditField, box);
+            EXPECT_GE(room.width(), longest) << language << " " << box->objectName().toStdString();
+        }
+    }
+    installTranslation(QLocale::c());
+}
+
+TEST_F(ReportToolsTest, SayWhatTotalsLeaveOutAndHowManyPagesLieAcross)
+{
+    ReportOptions options;
+    options.totals = { { u"C2" } };
+    options.fit.toSheet = true;
+    options.fit.leastScale = 1;
+    opener_.setReportOptions(options);
+    std::vector<TableColumn> columns;
+    for (int column = 1; column <= 8; ++column)
+        columns.push_back({ u"C" + decimal(column), 3000 });
+    auto grid = std::make_unique<TableGrid>(std::move(columns));
+    const std::array<TextView, 2> row { u"a", u"no number" };
+    grid->addRow(row);
+    opener_.openPreview(std::move(grid));
+    EXPECT_EQ(status(),
+        QStringLiteral("Too wide to be shrunk: printed in bands. Pages across: 3. Cells of C2 that "
+                       "show no number and that its total leaves out: 1."));
 }
 
 TEST_F(ReportToolsTest, GiveEveryPartAName)

@@ -375,8 +375,8 @@
         <translation>Feld</translation>
     </message>
     <message>
-        <source>the grid prints no column &quot;%1&quot;</source>
-        <translation>das Gitter druckt keine Spalte „%1“</translation>
+        <source>the grid prints no column &quot;%1&quot;; there are: %2</source>
+        <translation>das Gitter druckt keine Spalte „%1“; es gibt: %2</translation>
     </message>
     <message>
         <source>this grid does not tell which of its rows are marked</source>
@@ -1331,6 +1331,14 @@
         <source>Too wide to be shrunk: printed in bands.</source>
         <translation>Zum Verkleinern zu breit: in Bändern gedruckt.</translation>
     </message>
+    <message>
+        <source>Too wide to be shrunk: its columns are narrowed.</source>
+        <translation>Zum Verkleinern zu breit: Spalten schmaler gemacht.</translation>
+    </message>
+    <message>
+        <source>Pages across: %1.</source>
+        <translation>Seiten nebeneinander: %1.</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::qt::PageFiles</name>
@@ -1641,6 +1649,10 @@
     <message>
         <source>The file holds the pages without watermark, logo and icons; save them as PDF to keep those.</source>
         <translation>Die Datei enthält die Seiten ohne Wasserzeichen, Logo und Symbole; als PDF gespeichert bleiben sie erhalten.</translation>
+    </message>
+    <message>
+        <source>Cells of %1 that show no number and that its total leaves out: %2.</source>
+        <translation>Zellen von %1, die keine Zahl zeigen und in der Summe fehlen: %2.</translation>
     </message>
 </context>
 <context>

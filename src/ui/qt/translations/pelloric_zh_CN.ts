@@ -375,8 +375,8 @@
         <translation>字段</translation>
     </message>
     <message>
-        <source>the grid prints no column &quot;%1&quot;</source>
-        <translation>表格没有打印列“%1”</translation>
+        <source>the grid prints no column &quot;%1&quot;; there are: %2</source>
+        <translation>表格没有打印列“%1”；现有的列：%2</translation>
     </message>
     <message>
         <source>this grid does not tell which of its rows are marked</source>
@@ -1331,6 +1331,14 @@
         <source>Too wide to be shrunk: printed in bands.</source>
         <translation>表格太宽，无法缩小：分栏打印。</translation>
     </message>
+    <message>
+        <source>Too wide to be shrunk: its columns are narrowed.</source>
+        <translation>表格太宽，无法缩小：列已变窄。</translation>
+    </message>
+    <message>
+        <source>Pages across: %1.</source>
+        <translation>横向页数：%1。</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::qt::PageFiles</name>
@@ -1641,6 +1649,10 @@
     <message>
         <source>The file holds the pages without watermark, logo and icons; save them as PDF to keep those.</source>
         <translation>文件中的页面不含水印、徽标和图标；另存为 PDF 可保留它们。</translation>
+    </message>
+    <message>
+        <source>Cells of %1 that show no number and that its total leaves out: %2.</source>
+        <translation>%1 中不是数字、未计入合计的单元格：%2。</translation>
     </message>
 </context>
 <context>
