@@ -210,7 +210,7 @@ private:
     std::vector<Text> texts_;
     std::string nested_;
     bool followsKey_ = false;
-    TextView refusal_;
+    Text refusal_;
     std::optional<std::size_t> errorPosition_;
     std::string error_;
 };
