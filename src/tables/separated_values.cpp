@@ -176,4 +176,19 @@ char findDelimiter(std::string_view start)
     return found;
 }
 
+DelimiterLine delimiterLineOf(std::string_view text)
+{
+    constexpr std::string_view Key = "sep=";
+    const std::string_view line = text.substr(0, text.find_first_of("\r\n"));
+    const bool isQuoted = line.size() > 2 && line.front() == '"' && line.back() == '"';
+    const std::string_view named = isQuoted ? line.substr(1, line.size() - 2) : line;
+    const auto isSame = [](char letter, char key) { return (letter | 0x20) == (key | 0x20); };
+    if (named.size() != Key.size() + 1
+        || !std::equal(Key.begin(), Key.end(), named.begin(), isSame))
+        return {};
+    const char delimiter = named.back();
+    const bool isUsable = static_cast<unsigned char>(delimiter) < 0x80 && delimiter != '"';
+    return isUsable ? DelimiterLine { delimiter, line.size() } : DelimiterLine {};
+}
+
 } // namespace pelloric

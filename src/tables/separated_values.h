@@ -97,4 +97,14 @@ private:
 /// @return       a comma where nothing tells
 char findDelimiter(std::string_view start);
 
+/// The line with which spreadsheets say at the top of a file what separates its values: "sep=;".
+/// It is no row.
+struct DelimiterLine {
+    char delimiter = ',';
+    std::size_t length = 0; ///< bytes, without the line end; 0: the text begins with no such line
+};
+
+/// @param text  in UTF-8, without a byte-order mark
+DelimiterLine delimiterLineOf(std::string_view text);
+
 } // namespace pelloric

@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+
 namespace pelloric {
 
 namespace {
@@ -113,6 +115,32 @@ TEST(SeparatedValues, FindTheirDelimiterByTheRowsThatHaveAsManyValuesAsTheTitles
     };
     for (const auto& [text, delimiter] : cases)
         EXPECT_EQ(findDelimiter(text), delimiter) << text;
+}
+
+TEST(SeparatedValues, TakesALineThatNamesTheDelimiterForNoRow)
+{
+    struct Row {
+        std::string_view text;
+        char delimiter;
+        std::size_t length;
+    };
+    for (const auto& [text, delimiter, length] : std::to_array<Row>({
+             { "sep=;\r\na;b", ';', 5 },
+             { "SEP=|\na|b", '|', 5 },
+             { "sep=\t\na\tb", '\t', 5 },
+             { "\"sep=;\"\na;b", ';', 7 },
+             { "sep=;", ';', 5 },
+             { "sep=\na", ',', 0 },
+             { "sep=;;\na;b", ',', 0 },
+             { "sep=;a\n", ',', 0 },
+             { "step;b\n", ',', 0 },
+             { "sep=\"\n", ',', 0 },
+             { "", ',', 0 },
+         })) {
+        const DelimiterLine line = delimiterLineOf(text);
+        EXPECT_EQ(line.length, length) << text;
+        EXPECT_EQ(line.delimiter, delimiter) << text;
+    }
 }
 
 } // namespace pelloric

@@ -199,11 +199,15 @@ TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
         };
     const TextFile file = readTextFile(path, reading);
     refuseZeroBytes(file.text);
-    const ValuesDialect dialect {
-        options.delimiter ? *options.delimiter : delimiterOf(path, file.text), options.hasQuotes
-    };
+    const DelimiterLine named = delimiterLineOf(file.text);
+    // Its line end stays, so that lines are counted as the file has them.
+    const std::string_view rows = std::string_view(file.text).substr(named.length);
+    const ValuesDialect dialect { options.delimiter ? *options.delimiter
+            : named.length > 0                      ? named.delimiter
+                                                    : delimiterOf(path, rows),
+        options.hasQuotes };
     OddRows odd;
-    TableGrid grid = makeGrid(file.text, dialect, options, odd);
+    TableGrid grid = makeGrid(rows, dialect, options, odd);
     if (options.notes != nullptr && file.isGuessed)
         options.notes->push_back(
             phrase(u"the encoding was guessed to be %1; name another one if letters look wrong",

@@ -162,6 +162,19 @@ TEST(CsvTable, ReadsAsItIsToldToRead)
         u"\"a|b\"|/\"1|2\"|");
 }
 
+TEST(CsvTable, ReadsByTheDelimiterThatTheFirstLineNames)
+{
+    const TempFolder folder;
+    std::vector<Text> notes;
+    const auto path = folder.write("a.csv", "\xEF\xBB\xBFsep=;\r\nName;a,b\r\nx;1,5\r\ny\r\n");
+    EXPECT_EQ(dump(readCsv(path, { .notes = &notes })), u"Name|a,b|/x|1,5|/y||");
+    ASSERT_EQ(notes.size(), 1U);
+    EXPECT_NE(notes[0].find(u"the first at line 4;"), Text::npos);
+    EXPECT_EQ(dump(readCsv(path, { .delimiter = ',' })), u"Name;a|b|/x;1|5|/y||");
+    EXPECT_EQ(read("b.tsv", "sep=,\na,b\n1,2\n"), "a|b|/1|2|");
+    EXPECT_EQ(read("c.csv", "sep=;\n"), "Type mismatch: the file is empty");
+}
+
 TEST(CsvTable, SaysWhichEncodingWasGuessedAndWhichRowsLookGlued)
 {
     const TempFolder folder;
