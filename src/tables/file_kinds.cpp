@@ -43,6 +43,8 @@ constexpr auto Kinds = std::to_array<FileKind>({
     { "\x7F"
       "ELF",
         false, phraseText(u"this is a program, not a table") },
+    { std::string_view("ARROW1\0", 7), false,
+        phraseText(u"this is an Arrow file; save its table as CSV") },
     { "PAR1\x15", false, phraseText(u"this is a Parquet file; save its table as CSV") },
     { "{\\rtf", false, phraseText(u"this is a text document, not a table; save its table as CSV") },
     { "<?xml", true, Document },

@@ -151,6 +151,8 @@ void PreviewWindow::connectStrip()
         session_->restoreDefaults();
     });
     connect(strip_, &NoticeStrip::dismissed, this, [this] {
+        if (!session_->notice())
+            fontsTold_ = services_.fonts().notes().size();
         session_->showNotice(std::nullopt);
         canvas_->setFocus();
     });
@@ -339,12 +341,28 @@ void PreviewWindow::beforeBuild(AutomationObject& grid)
         prompts_.beforeBuild(grid);
 }
 
+/// Which faces were taken for fonts that are not installed, until the person hides it.
+std::optional<PreviewNotice> PreviewWindow::fontNotice() const
+{
+    const std::vector<FontNote>& notes = services_.fonts().notes();
+    QStringList sentences;
+    for (std::size_t at = fontsTold_; at < notes.size(); ++at) {
+        if (!notes[at].taken.empty())
+            sentences.append(tr("The font %1 is not installed; %2 is taken instead.")
+                                 .arg(toQString(notes[at].asked), toQString(notes[at].taken)));
+    }
+    if (sentences.isEmpty())
+        return std::nullopt;
+    return PreviewNotice { .text = toText(sentences.join(QLatin1Char(' '))),
+        .offersGridStyle = true };
+}
+
 void PreviewWindow::navigationChanged()
 {
     if (!session_)
         return;
     toolbar_->showNavigation(session_->state(), canvas_->canvas().document().currentPage);
-    strip_->showNotice(session_->notice());
+    strip_->showNotice(session_->notice() ? session_->notice() : fontNotice());
     if (tools_)
         tools_->viewChanged();
     if (reports_)

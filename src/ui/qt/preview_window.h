@@ -9,6 +9,7 @@
 
 #include <QMainWindow>
 
+#include <cstddef>
 #include <memory>
 #include <optional>
 
@@ -112,6 +113,7 @@ private:
     bool printPages(const PrintArguments& arguments);
     PrintPages pagesToPrint() const;
     QString printFrom(PrintOptionsDialog& dialog, const PrintArguments& arguments);
+    std::optional<PreviewNotice> fontNotice() const;
     QWidget* makeCentre();
     void connectTools();
     void connectStrip();
@@ -133,6 +135,7 @@ private:
     std::unique_ptr<AutomationObject> grid_;
     PreviewToolbar* toolbar_;
     NoticeStrip* strip_;
+    std::size_t fontsTold_ = 0; ///< notes on fonts that the person has hidden
     Sorvane* canvas_;
     QMenu* contextMenu_;
     std::optional<PreviewSession> session_;

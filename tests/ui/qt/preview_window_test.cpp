@@ -4,6 +4,7 @@
 #include "ui/qt/preview_window.h"
 
 #include "controls/canvas.h"
+#include "platform/qt/qt_fonts.h"
 #include "platform/run_time_error.h"
 #include "settings/settings_file.h"
 #include "support/test_paths.h"
@@ -107,6 +108,23 @@ TEST_F(PreviewWindowTest, SaysInAStripWhyThereAreNoPagesAndMendsIt)
     EXPECT_EQ(canvas().page.intTop, 907);
     EXPECT_FALSE(canvas().document().texts(0).empty());
     EXPECT_EQ(folder_.read("OstlConfig.ini.bak"), "Top= 4000\r\n");
+}
+
+TEST_F(PreviewWindowTest, SaysOnceWhichFaceWasTakenForAFontThatIsNotInstalled)
+{
+    PreviewWindow& window = preview(3);
+    QWidget& strip = *window.findChild<QWidget*>("Notice");
+    EXPECT_FALSE(strip.isVisible());
+    writeSetting(platform_.record(), u"FontName", u"No Such Face");
+    click(2);
+    EXPECT_TRUE(strip.isVisible());
+    EXPECT_EQ(window.findChild<QLabel*>("labNotice")->text(),
+        QStringLiteral("The font No Such Face is not installed; %1 is taken instead.")
+            .arg(QtFonts::resolve(QStringLiteral("No Such Face"))));
+    window.findChild<QAbstractButton*>("cmdNoticeClose")->click();
+    EXPECT_FALSE(strip.isVisible());
+    click(2);
+    EXPECT_FALSE(strip.isVisible());
 }
 
 TEST_F(PreviewWindowTest, OpensPageSetupFromItsStrip)

@@ -806,6 +806,10 @@
         <source>a scale of %1 is too small</source>
         <translation>ein Maßstab von %1 ist zu klein</translation>
     </message>
+    <message>
+        <source>this is an Arrow file; save its table as CSV</source>
+        <translation>das ist eine Arrow-Datei; speichern Sie ihre Tabelle als CSV</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
@@ -1482,6 +1486,10 @@
     <message>
         <source>Cancel</source>
         <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>The font %1 is not installed; %2 is taken instead.</source>
+        <translation>Die Schrift %1 ist nicht installiert; stattdessen wird %2 genommen.</translation>
     </message>
 </context>
 <context>

@@ -806,6 +806,10 @@
         <source>a scale of %1 is too small</source>
         <translation>a scale of %1 is too small</translation>
     </message>
+    <message>
+        <source>this is an Arrow file; save its table as CSV</source>
+        <translation>this is an Arrow file; save its table as CSV</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
@@ -1482,6 +1486,10 @@
     <message>
         <source>Cancel</source>
         <translation>Cancel</translation>
+    </message>
+    <message>
+        <source>The font %1 is not installed; %2 is taken instead.</source>
+        <translation>The font %1 is not installed; %2 is taken instead.</translation>
     </message>
 </context>
 <context>

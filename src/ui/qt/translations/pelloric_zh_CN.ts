@@ -806,6 +806,10 @@
         <source>a scale of %1 is too small</source>
         <translation>比例 %1 太小</translation>
     </message>
+    <message>
+        <source>this is an Arrow file; save its table as CSV</source>
+        <translation>这是 Arrow 文件；请把其中的表格另存为 CSV</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
@@ -1482,6 +1486,10 @@
     <message>
         <source>Cancel</source>
         <translation>取消</translation>
+    </message>
+    <message>
+        <source>The font %1 is not installed; %2 is taken instead.</source>
+        <translation>未安装字体 %1；改用 %2。</translation>
     </message>
 </context>
 <context>
