@@ -157,16 +157,23 @@ endif()
 if(TARGET pelloric_app AND UNIX AND NOT APPLE)
     # Manual page and completions are what the program itself says.
     set(manual "${PROJECT_BINARY_DIR}/manual")
+    set(english "${CMAKE_COMMAND}" -E env LC_ALL=C.UTF-8 LANGUAGE= "$<TARGET_FILE:pelloric_app>")
     file(MAKE_DIRECTORY "${manual}")
     add_custom_command(OUTPUT "${manual}/pelloric.1" "${manual}/pelloric.bash" "${manual}/_pelloric"
             "${manual}/pelloric.fish"
-        COMMAND pelloric_app help --man > "${manual}/pelloric.1"
-        COMMAND pelloric_app completion bash > "${manual}/pelloric.bash"
-        COMMAND pelloric_app completion zsh > "${manual}/_pelloric"
-        COMMAND pelloric_app completion fish > "${manual}/pelloric.fish"
+        COMMAND ${english} help --man > "${manual}/pelloric.1"
+        COMMAND ${english} completion bash > "${manual}/pelloric.bash"
+        COMMAND ${english} completion zsh > "${manual}/_pelloric"
+        COMMAND ${english} completion fish > "${manual}/pelloric.fish"
         DEPENDS pelloric_app VERBATIM)
-    add_custom_target(pelloric_manual ALL DEPENDS "${manual}/pelloric.1")
-    install(FILES "${manual}/pelloric.1" DESTINATION "${CMAKE_INSTALL_MANDIR}/man1" COMPONENT tools)
+    set(page "${manual}/pelloric.1")
+    find_program(GZIP gzip)
+    if(GZIP)
+        add_custom_command(OUTPUT "${page}.gz" COMMAND "${GZIP}" -9nkf "${page}" DEPENDS "${page}" VERBATIM)
+        string(APPEND page ".gz")
+    endif()
+    add_custom_target(pelloric_manual ALL DEPENDS "${page}")
+    install(FILES "${page}" DESTINATION "${CMAKE_INSTALL_MANDIR}/man1" COMPONENT tools)
     install(FILES "${manual}/pelloric.bash" RENAME pelloric COMPONENT tools
         DESTINATION "${CMAKE_INSTALL_DATADIR}/bash-completion/completions")
     install(FILES "${manual}/_pelloric" COMPONENT tools

@@ -3,6 +3,7 @@
 
 #include "command_line.h"
 
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 
@@ -25,17 +26,37 @@ QString dashed(const char* name)
     return (text.size() == 1 ? QStringLiteral("-") : QStringLiteral("--")) + text;
 }
 
-/// What can be done about an error; stands behind its text.
+/// What the parser says of an option, in the language in force.
+QString wrongOption(const QCommandLineParser& parser)
+{
+    constexpr auto Sentences = std::to_array<TextView>({
+        phraseText(u"Unknown option '%1'."),
+        phraseText(u"Missing value after '%1'."),
+        phraseText(u"Unexpected value after '%1'."),
+    });
+    const QString text = parser.errorText();
+    const auto quote = text.indexOf(QLatin1Char('\''));
+    const auto last = text.lastIndexOf(QLatin1Char('\''));
+    const QString option = last > quote ? text.mid(quote + 1, last - quote - 1) : QString();
+    for (const TextView sentence : Sentences) {
+        if (text == qt::toQString(sentence).arg(option))
+            return qt::phrased(sentence, { option });
+    }
+    return text;
+}
+
+/// What can be done about an error, a phrase around its text.
 struct Advice {
     ErrorNumber number;
-    const char* text;
+    TextView text;
 };
 
 constexpr auto Advices = std::to_array<Advice>({
-    { ErrorNumber::WriteFailed, "; check that the folder exists and takes files" },
-    { ErrorNumber::DiskFull, "; make room on the disk, or choose another one" },
-    { ErrorNumber::PermissionDenied, "; check your rights to the file and its folder" },
-    { ErrorNumber::FileNotFound, "; check the name and that you may read it" },
+    { ErrorNumber::WriteFailed, phraseText(u"%1; check that the folder exists and takes files") },
+    { ErrorNumber::DiskFull, phraseText(u"%1; make room on the disk, or choose another one") },
+    { ErrorNumber::PermissionDenied,
+        phraseText(u"%1; check your rights to the file and its folder") },
+    { ErrorNumber::FileNotFound, phraseText(u"%1; check the name and that you may read it") },
 });
 
 } // namespace
@@ -51,14 +72,13 @@ CommandLine::CommandLine(
     }
     // The parser takes the first argument for the program's name.
     if (!parser_.parse(QStringList(QString()) + arguments))
-        throw CommandError(parser_.errorText(), WrongUsage);
+        throw UsageError(wrongOption(parser_));
     const auto given = parser_.positionalArguments().size();
     if (files != OneOrMore && given > files)
-        throw CommandError(QStringLiteral("one argument too many: %1; quote names with blanks")
-                               .arg(parser_.positionalArguments().at(files)),
-            WrongUsage);
+        throw UsageError(qt::phrased(u"one argument too many: %1; quote names with blanks",
+            { parser_.positionalArguments().at(files) }));
     if (given < std::max(files, files == OneOrMore ? 1 : 0))
-        throw CommandError(QStringLiteral("the file is missing"), WrongUsage);
+        throw UsageError(qt::phrased(u"the file is missing"));
 }
 
 bool CommandLine::has(const char* option) const
@@ -78,12 +98,16 @@ double numberOf(const char* option, const QString& text, double least, double mo
     const bool isInside = isNumber && number >= least && number <= most;
     if (!isInside || (isWhole && number != std::floor(number)))
         throw CommandError(
-            QStringLiteral("%1 takes a %2 from %3 to %4, not \"%5\"")
-                .arg(dashed(option),
-                    isWhole ? QStringLiteral("whole number") : QStringLiteral("number"),
-                    QString::number(least), QString::number(most), text),
+            qt::phrased(isWhole ? phraseText(u"%1 takes a whole number from %2 to %3, not \"%4\"")
+                                : phraseText(u"%1 takes a number from %2 to %3, not \"%4\""),
+                { dashed(option), QString::number(least), QString::number(most), text }),
             WrongUsage);
     return number;
+}
+
+QString helpOf(const Option& option)
+{
+    return option.help.empty() ? QString() : qt::phrased(option.help);
 }
 
 QString optionHelp(OptionTable options)
@@ -93,17 +117,16 @@ QString optionHelp(OptionTable options)
         QString left = QStringLiteral("  ") + dashed(option.name);
         if (option.value)
             left += QLatin1Char(' ') + QString::fromLatin1(option.value);
-        help += left.leftJustified(HelpColumn - 1) + QLatin1Char(' ')
-            + QString::fromUtf8(option.help) + QLatin1Char('\n');
+        help += left.leftJustified(HelpColumn - 1) + QLatin1Char(' ') + helpOf(option)
+            + QLatin1Char('\n');
     }
     return help;
 }
 
 QString detailOf(const RunTimeError& error)
 {
-    const QString text = qt::toQString(error.text());
-    const QString plain = qt::toQString(errorText(error.number())) + QStringLiteral(": ");
-    return text.startsWith(plain) ? text.mid(plain.size()) : text;
+    const TextView detail = error.detail();
+    return qt::toQString(detail.empty() ? TextView(error.text()) : detail);
 }
 
 QString describe(const RunTimeError& error)
@@ -111,26 +134,28 @@ QString describe(const RunTimeError& error)
     QString text = qt::toQString(error.text());
     for (const Advice& advice : Advices) {
         if (advice.number == error.number())
-            text += QString::fromLatin1(advice.text);
+            text = qt::phrased(advice.text, { text });
     }
     return text;
 }
 
-void tell(const QString& text)
+void tell(const QString& text) { tellMore(QStringLiteral("pelloric: ") + text); }
+
+void tellMore(const QString& text)
 {
     QString line = text;
     for (QChar& character : line) {
         if (character.category() == QChar::Other_Control)
             character = QLatin1Char(' ');
     }
-    std::fputs(("pelloric: " + line.toUtf8() + '\n').constData(), stderr);
+    std::fputs((line.toUtf8() + '\n').constData(), stderr);
 }
 
 void print(const QString& text)
 {
     std::fputs(text.toUtf8().constData(), stdout);
     if (std::fflush(stdout) != 0)
-        throw CommandError(QStringLiteral("standard output cannot be written"));
+        throw CommandError(qt::phrased(u"standard output cannot be written"));
 }
 
 } // namespace pelloric::app

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "platform/phrase.h"
+
 #include <QCommandLineParser>
 #include <QString>
 #include <QStringList>
@@ -36,11 +38,20 @@ private:
     int status_;
 };
 
+/// The arguments do not fit the command; how it is called is told behind the text.
+class UsageError : public CommandError {
+public:
+    explicit UsageError(const QString& text)
+        : CommandError(text, WrongUsage)
+    {
+    }
+};
+
 /// An option of a command.
 struct Option {
     const char* name; ///< without the dashes; one letter or a word
     const char* value; ///< what stands for its value in the help; null: it takes none
-    const char* help;
+    TextView help; ///< a phrase
 };
 
 using OptionTable = std::span<const Option>;
@@ -52,7 +63,7 @@ inline constexpr int OneOrMore = -1;
 class CommandLine {
 public:
     /// @param files  how many arguments that are no options are needed; or `OneOrMore`
-    /// @throws CommandError WrongUsage: unknown options, missing values, another number of files
+    /// @throws UsageError unknown options, missing values, another number of files
     CommandLine(const QStringList& arguments, const std::vector<OptionTable>& tables, int files);
 
     bool has(const char* option) const;
@@ -74,6 +85,9 @@ private:
 /// @throws CommandError WrongUsage: it is none, or outside the bounds
 double numberOf(const char* option, const QString& text, double least, double most, bool isWhole);
 
+/// What an option does; empty where the line above goes on.
+QString helpOf(const Option& option);
+
 /// One line of help for each option, in columns.
 QString optionHelp(OptionTable options);
 
@@ -85,6 +99,9 @@ QString describe(const RunTimeError& error);
 
 /// Writes "pelloric: " and the text as one line to standard error.
 void tell(const QString& text);
+
+/// Writes the text as a further line to standard error, without the program's name.
+void tellMore(const QString& text);
 
 /// Writes a text to standard output.
 void print(const QString& text);

@@ -26,7 +26,8 @@ using OptionTables = std::vector<OptionTable>;
 struct Command {
     const char* name = nullptr;
     const char* synopsis = nullptr; ///< what stands behind the name
-    const char* summary = nullptr; ///< one line
+    TextView summary; ///< one line, a phrase
+    const char* example = nullptr; ///< how it is called, whole
     int (*run)(const Invocation& invocation) = nullptr; ///< answers the exit status; may throw
     OptionTables (*options)() = nullptr; ///< may be missing
     QString (*details)() = nullptr; ///< prose of the command's help, ends a line; may be missing

@@ -8,6 +8,7 @@
 #include "demo_window.h"
 #include "headless.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "settings/default_settings.h"
 #include "state_log.h"
@@ -26,9 +27,11 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "samples", "FOLDER", "where the sample tables are" },
-    { "walk", "OUT", "walk through by itself, without a display, and leave what it shows in OUT" },
-    { "log", "FILE", "write what the preview window shows to a file, a line for each change" },
+    { "samples", "FOLDER", phraseText(u"where the sample tables are") },
+    { "walk", "OUT",
+        phraseText(u"walk through by itself, without a display, and leave what it shows in OUT") },
+    { "log", "FILE",
+        phraseText(u"write what the preview window shows to a file, a line for each change") },
 });
 
 /// The samples that were installed, those of the sources, or those of the present folder.
@@ -43,8 +46,8 @@ QString samplesFolder(const CommandLine& line)
         if (QFileInfo(folder + QStringLiteral("/samples.sqlite")).isFile())
             return folder;
     }
-    throw CommandError(QStringLiteral("the sample tables are not found; name their folder with "
-                                      "--samples"));
+    throw CommandError(qt::phrased(u"the sample tables are not found; name their folder with "
+                                   u"--samples"));
 }
 
 /// Settings that go with the demonstration: it changes neither the person's own nor where their
@@ -55,8 +58,8 @@ public:
     explicit DemoSettings(qt::QtPlatform& platform)
     {
         if (!folder_.isValid())
-            throw CommandError(QStringLiteral("%1; check the folder of temporary files")
-                                   .arg(folder_.errorString()));
+            throw CommandError(
+                qt::phrased(u"%1; check the folder of temporary files").arg(folder_.errorString()));
         QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, folder_.path());
         platform.folders().setSystemDirectory(qt::toText(folder_.path()));
         deployDefaultSettings(platform.record());
@@ -100,10 +103,10 @@ int runDemo(const Invocation& invocation)
 
 QString demoDetails()
 {
-    return QStringLiteral(
-        "Shows one form with a flex grid, a list view and a data grid on sample\n"
-        "tables, each with its host code and a button that previews it; tables of\n"
-        "your own can be opened beside them. What its dialogs change is forgotten.\n");
+    return qt::phrased(
+        u"Shows one form with a flex grid, a list view and a data grid on sample\n"
+        u"tables, each with its host code and a button that previews it; tables of\n"
+        u"your own can be opened beside them. What its dialogs change is forgotten.\n");
 }
 
 OptionTables demoOptions() { return { Options, windowOptions() }; }

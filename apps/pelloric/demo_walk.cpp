@@ -7,6 +7,7 @@
 #include "controls/canvas.h"
 #include "demo_window.h"
 #include "export/qt/page_export.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "table_source.h"
@@ -77,7 +78,7 @@ public:
     void run()
     {
         if (!QDir().mkpath(out_))
-            throw CommandError(QStringLiteral("%1: the folder cannot be made").arg(out_));
+            throw CommandError(qt::phrased(u"%1: the folder cannot be made").arg(out_));
         qt::PreviewPrompts prompts;
         prompts.chooseFile = [this](QWidget&, const qt::FileQuestion&) { return document(); };
         opener_.setPrompts(prompts);
@@ -88,7 +89,7 @@ public:
         click(ToolAction::Exit);
         settle();
         if (opener_.window() != nullptr)
-            throw CommandError(QStringLiteral("the preview window did not close"));
+            throw CommandError(qt::phrased(u"the preview window did not close"));
     }
 
 private:
@@ -103,7 +104,7 @@ private:
     void said(const QString& file)
     {
         if (!QFileInfo::exists(file))
-            throw CommandError(QStringLiteral("%1 was not written").arg(file));
+            throw CommandError(qt::phrased(u"%1 was not written").arg(file));
         print(file + QLatin1Char('\n'));
     }
 
@@ -112,14 +113,14 @@ private:
         settle();
         const QString file = QStringLiteral("%1/%2.png").arg(out_, name);
         if (!widget.grab().save(file))
-            throw CommandError(QStringLiteral("%1 cannot be written").arg(file));
+            throw CommandError(qt::phrased(u"%1 cannot be written").arg(file));
         said(file);
     }
 
     qt::PreviewWindow& window()
     {
         if (opener_.window() == nullptr)
-            throw CommandError(QStringLiteral("the preview window is not open"));
+            throw CommandError(qt::phrased(u"the preview window is not open"));
         return *opener_.window();
     }
 
@@ -131,7 +132,7 @@ private:
             action->trigger();
             return settle();
         }
-        throw CommandError(QStringLiteral("there is no tool %1").arg(toolOf(tool).id));
+        throw CommandError(qt::phrased(u"there is no tool %1").arg(toolOf(tool).id));
     }
 
     void showPage(int index, const DemoPage& page)
@@ -169,7 +170,7 @@ private:
         click(ToolAction::ClearPages);
         click(ToolAction::OpenFile);
         if (window().canvas().canvas().Totalpages() != pages)
-            throw CommandError(QStringLiteral("the saved document has other pages"));
+            throw CommandError(qt::phrased(u"the saved document has other pages"));
         shoot(window(), QStringLiteral("reopened"));
     }
 

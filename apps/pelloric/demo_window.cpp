@@ -7,6 +7,7 @@
 #include "demo_code/demo_code.h"
 #include "demo_grids.h"
 #include "own_table.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -71,8 +72,7 @@ const QString Connection = QStringLiteral("samples");
 [[noreturn]] void refuseSample(const QString& file)
 {
     throw CommandError(
-        QStringLiteral("%1 cannot be read; name the folder of the samples with --samples")
-            .arg(file));
+        qt::phrased(u"%1 cannot be read; name the folder of the samples with --samples").arg(file));
 }
 
 TableGrid readSample(const QString& file)

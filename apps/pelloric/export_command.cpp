@@ -14,6 +14,7 @@
 #include "interruption.h"
 #include "outcome.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -38,15 +39,17 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "o", "OUT", "where to: a name that ends in .pdf, .png, .svg or .ostl; a folder; or -" },
-    { "join", nullptr, "several inputs into one file, one behind the other" },
-    { "format", "NAME", "pdf, png, svg or ostl, for a folder or - (pdf)" },
-    { "pages", "LIST", "only these pages: 1,3,5-12" },
-    { "dpi", "N", "pixels an inch of .png images (150)" },
-    { "jobs", "N", "pages of .png images made at a time (one for each processor)" },
-    { "tagged", nullptr, "a .pdf file that says its tables, for readers who do not see it" },
-    { "pdfa", nullptr, "a .pdf file for archives (PDF/A-2b)" },
-    { "language", "TAG", "of the texts of a .pdf file: zh-CN (the locale's)" },
+    { "o", "OUT",
+        phraseText(u"where to: a name that ends in .pdf, .png, .svg or .ostl; a folder; or -") },
+    { "join", nullptr, phraseText(u"several inputs into one file, one behind the other") },
+    { "format", "NAME", phraseText(u"pdf, png, svg or ostl, for a folder or - (pdf)") },
+    { "pages", "LIST", phraseText(u"only these pages: 1,3,5-12") },
+    { "dpi", "N", phraseText(u"pixels an inch of .png images (150)") },
+    { "jobs", "N", phraseText(u"pages of .png images made at a time (one for each processor)") },
+    { "tagged", nullptr,
+        phraseText(u"a .pdf file that says its tables, for readers who do not see it") },
+    { "pdfa", nullptr, phraseText(u"a .pdf file for archives (PDF/A-2b)") },
+    { "language", "TAG", phraseText(u"of the texts of a .pdf file: zh-CN (the locale's)") },
 });
 
 /// The name that stands for the standard output.
@@ -70,7 +73,7 @@ void writePdf(const Export& job)
     const qt::PdfExport made
         = qt::exportPdf(job.document, job.setup, job.platform.fonts(), job.options, job.path);
     if (!made.byToolkitBecause.empty())
-        tell(QStringLiteral("%1; its characters are drawn as shapes")
+        tell(qt::phrased(u"%1; its characters are drawn as shapes")
                  .arg(qt::toQString(made.byToolkitBecause)));
 }
 
@@ -91,16 +94,16 @@ void writeDocument(const Export& job)
         job.options, job.path);
     const OstlLosses losses = ostlLosses(job.document, platform.codec);
     if (losses.pages > 0)
-        note(QStringLiteral("a document file holds %1 pages; the last %2 were left out")
+        note(qt::phrased(u"a document file holds %1 pages; the last %2 were left out")
                  .arg(ostl::LastPageIndex + 1)
                  .arg(losses.pages));
     if (losses.pictures)
-        note(QStringLiteral("a document file holds no pictures; watermark and logo were left out"));
+        note(qt::phrased(u"a document file holds no pictures; watermark and logo were left out"));
     if (losses.icons)
-        note(QStringLiteral("a document file holds no icons of cells; they were left out"));
+        note(qt::phrased(u"a document file holds no icons of cells; they were left out"));
     if (losses.texts > 0)
-        note(QStringLiteral("a document file has no code for some characters; %1 of its texts "
-                            "show \"?\" for them")
+        note(qt::phrased(u"a document file has no code for some characters; %1 of its texts "
+                         u"show \"?\" for them")
                  .arg(losses.texts));
 }
 
@@ -135,8 +138,7 @@ const Format& formatNamed(const QString& name)
     const Format* const format = name.isEmpty() ? &Formats.front() : findFormat(name);
     if (!format)
         throw CommandError(
-            QStringLiteral("--format takes pdf, png, svg or ostl, not \"%1\"").arg(name),
-            WrongUsage);
+            qt::phrased(u"--format takes pdf, png, svg or ostl, not \"%1\"").arg(name), WrongUsage);
     return *format;
 }
 
@@ -151,7 +153,7 @@ const Format& formatOf(const QString& out)
     const Format* const format = findFormat(QFileInfo(out).suffix());
     if (!format)
         throw CommandError(
-            QStringLiteral("%1: the name must end in .pdf, .png, .svg or .ostl").arg(out),
+            qt::phrased(u"%1: the name must end in .pdf, .png, .svg or .ostl").arg(out),
             WrongUsage);
     return *format;
 }
@@ -165,14 +167,14 @@ struct Order {
     {
         if (out.isEmpty())
             throw CommandError(
-                QStringLiteral("say where to export to: -o OUT.pdf, .png, .svg or .ostl"),
+                qt::phrased(u"say where to export to: -o OUT.pdf, .png, .svg or .ostl"),
                 WrongUsage);
         if (files.size() > 1 && !isJoined && out != StandardOutput && !isFolderName(out)
             && findFormat(QFileInfo(out).suffix()))
             throw CommandError(
-                QStringLiteral(
-                    "%1 is one input more; several go into a folder, or with --join into one "
-                    "file, and %2 is no folder; quote names with blanks")
+                qt::phrased(
+                    u"%1 is one input more; several go into a folder, or with --join into one "
+                    u"file, and %2 is no folder; quote names with blanks")
                     .arg(files.at(1), out),
                 WrongUsage);
         if (line.has("format") || isFolder() || out == StandardOutput)
@@ -181,25 +183,24 @@ struct Order {
             format = &formatOf(out);
         if (line.has("pages") && !format->takesPages)
             throw CommandError(
-                QStringLiteral("--pages is for .pdf, .png and .svg; a document file holds all"),
+                qt::phrased(u"--pages is for .pdf, .png and .svg; a document file holds all"),
                 WrongUsage);
         if (line.has("dpi") && !format->takesDpi)
-            throw CommandError(QStringLiteral("--dpi is for .png images"), WrongUsage);
+            throw CommandError(qt::phrased(u"--dpi is for .png images"), WrongUsage);
         if (line.has("jobs") && !format->takesDpi)
-            throw CommandError(QStringLiteral("--jobs is for .png images"), WrongUsage);
+            throw CommandError(qt::phrased(u"--jobs is for .png images"), WrongUsage);
         if (line.has("jobs"))
             jobs = static_cast<int>(numberOf("jobs", line.value("jobs"), 1, MostJobs, true));
         for (const char* const option : { "tagged", "pdfa", "language" }) {
             if (line.has(option) && !format->isPdf)
                 throw CommandError(
-                    QStringLiteral("--%1 is for .pdf files").arg(QLatin1String(option)),
-                    WrongUsage);
+                    qt::phrased(u"--%1 is for .pdf files").arg(QLatin1String(option)), WrongUsage);
         }
         if (line.has("dpi"))
             dpi = static_cast<int>(numberOf("dpi", line.value("dpi"), LeastDpi, MostDpi, true));
         if (out == StandardOutput && line.has("json"))
             throw CommandError(
-                QStringLiteral("-o - and --json both want the standard output"), WrongUsage);
+                qt::phrased(u"-o - and --json both want the standard output"), WrongUsage);
     }
 
     /// Whether every input gets a file of its own in the folder `out`.
@@ -256,7 +257,7 @@ void write(const Order& order, const CommandLine& line, const Laid& laid, const 
     options.isArchive = line.has("pdfa");
     options.language = qt::toText(line.value("language"));
     options.title = qt::toText(line.has("title") ? line.value("title") : title);
-    options.progress = progress.of("Writing");
+    options.progress = progress.of(phraseText(u"Writing"));
     order.format->write({ laid.document, laid.setup, platform, options, pathOf(out) });
 }
 
@@ -264,7 +265,7 @@ void refuseOverwriting(const QString& file, const QString& out)
 {
     if (isSameFile(file, out))
         throw CommandError(
-            QStringLiteral("%1 is the file that is read; export to another one").arg(out));
+            qt::phrased(u"%1 is the file that is read; export to another one").arg(out));
 }
 
 void tellMade(const Outcome& outcome, const Order& order, const QString& input, const QString& out,
@@ -295,7 +296,7 @@ void exportEach(const Order& order, const CommandLine& line, qt::QtPlatform& pla
 {
     std::error_code error;
     if (order.isFolder() && !std::filesystem::create_directories(pathOf(order.out), error) && error)
-        throw CommandError(QStringLiteral("%1: the folder cannot be made").arg(order.out));
+        throw CommandError(qt::phrased(u"%1: the folder cannot be made").arg(order.out));
     QStringList taken;
     for (const QString& file : order.files) {
         const QString name = plainName(file);
@@ -320,7 +321,7 @@ void exportJoined(const Order& order, const CommandLine& line, qt::QtPlatform& p
             && (laid.setup.myWidth != joined.setup.myWidth
                 || laid.setup.myHeight != joined.setup.myHeight))
             throw CommandError(
-                QStringLiteral("%1 has pages of another size; --join wants one size").arg(file));
+                qt::phrased(u"%1 has pages of another size; --join wants one size").arg(file));
         joined.setup = laid.setup;
         appendPages(joined.document, laid.document, isFirst);
         isFirst = false;
@@ -341,15 +342,15 @@ void exportToOutput(Order order, const CommandLine& line, qt::QtPlatform& platfo
         exportEach(order, line, platform, progress, outcome);
     QFile file(order.out);
     if (!file.open(QIODevice::ReadOnly))
-        throw CommandError(QStringLiteral("several pages as .%1 do not go into one output; name a "
-                                          "file, or a page with --pages")
+        throw CommandError(qt::phrased(u"several pages as .%1 do not go into one output; name a "
+                                       u"file, or a page with --pages")
                                .arg(QLatin1String(order.format->extension)),
             WrongUsage);
     QFile output;
     const QByteArray bytes = file.readAll();
     if (!output.open(stdout, QIODevice::WriteOnly) || output.write(bytes) != bytes.size()
         || !output.flush())
-        throw CommandError(QStringLiteral("standard output cannot be written"));
+        throw CommandError(qt::phrased(u"standard output cannot be written"));
 }
 
 } // namespace
@@ -376,14 +377,14 @@ int runExport(const Invocation& invocation)
 
 QString exportDetails()
 {
-    return QStringLiteral(
-        "FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
-        ".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
-        "--query), or a saved document (.ostl).\n"
-        "Pages look as the default settings and the options say; --settings takes others.\n"
-        "Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
-        "FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
-        "file each in the folder OUT, or with --join one file.\n");
+    return qt::phrased(
+        u"FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
+        u".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
+        u"--query), or a saved document (.ostl).\n"
+        u"Pages look as the default settings and the options say; --settings takes others.\n"
+        u"Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
+        u"FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
+        u"file each in the folder OUT, or with --join one file.\n");
 }
 
 OptionTables exportOptions()

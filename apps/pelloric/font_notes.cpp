@@ -6,6 +6,7 @@
 #include "command_line.h"
 #include "outcome.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "view/missing_glyphs.h"
@@ -16,8 +17,8 @@ void requireFonts()
 {
     if (!qt::QtFonts::hasAny())
         throw CommandError(
-            QStringLiteral("no font is installed, so no text can be drawn; install "
-                           "fonts-dejavu-core, and fonts-arphic-uming for Chinese texts"));
+            qt::phrased(u"no font is installed, so no text can be drawn; install "
+                        u"fonts-dejavu-core, and fonts-arphic-uming for Chinese texts"));
 }
 
 void tellFonts(const PageDocument& document, qt::QtPlatform& platform)
@@ -26,7 +27,7 @@ void tellFonts(const PageDocument& document, qt::QtPlatform& platform)
     const Text missing = missingGlyphsText(
         missingGlyphs(document, platform.record().metrics, &platform.record().loop));
     for (const qt::FontNote& font : platform.fonts().notes())
-        note(QStringLiteral("the font %1 is not installed; %2 is taken instead")
+        note(qt::phrased(u"the font %1 is not installed; %2 is taken instead")
                  .arg(qt::toQString(font.asked), qt::toQString(font.taken)));
     if (!missing.empty())
         note(qt::toQString(missing));

@@ -4,6 +4,7 @@
 #include "command_line.h"
 #include "commands.h"
 #include "manual.h"
+#include "platform/qt/qt_phrase.h"
 
 #include <array>
 
@@ -14,7 +15,7 @@ namespace {
 constexpr int SynopsisWidth = 24;
 
 constexpr auto Options = std::to_array<Option>({
-    { "man", nullptr, "write the manual page of the program" },
+    { "man", nullptr, phraseText(u"write the manual page of the program") },
 });
 
 QString heading(const Command& command)
@@ -26,16 +27,16 @@ QString heading(const Command& command)
 
 QString overview()
 {
-    QString text = QStringLiteral("Previews, exports and prints tables.\n\n");
+    QString text = qt::phrased(u"Previews, exports and prints tables.\n\n");
     for (const Command& command : commands()) {
         const QString synopsis = QStringLiteral("%1 %2").arg(
             QString::fromUtf8(command.name), QString::fromUtf8(command.synopsis));
         text += QStringLiteral("  pelloric ") + synopsis.leftJustified(SynopsisWidth)
-            + QStringLiteral("  ") + QString::fromUtf8(command.summary) + QLatin1Char('\n');
+            + QStringLiteral("  ") + qt::phrased(command.summary) + QLatin1Char('\n');
     }
     return text
-        + QStringLiteral(
-            "\n\"pelloric help COMMAND\" says more, \"pelloric --version\" the version.\n");
+        + qt::phrased(
+            u"\n\"pelloric help COMMAND\" says more, \"pelloric --version\" the version.\n");
 }
 
 /// What stands behind a command's summary.
@@ -56,13 +57,12 @@ QString detailsOf(const QString& name)
 {
     for (const Command& command : commands()) {
         if (name == QLatin1String(command.name)) {
-            const QString text = heading(command) + QLatin1Char('\n')
-                + QString::fromUtf8(command.summary) + QStringLiteral(".\n");
+            const QString text = heading(command) + QLatin1Char('\n') + qt::phrased(command.summary)
+                + QStringLiteral(".\n");
             return text + restOf(command);
         }
     }
-    throw CommandError(
-        QStringLiteral("no command %1; see \"pelloric help\"").arg(name), WrongUsage);
+    throw CommandError(qt::phrased(u"no command %1; see \"pelloric help\"").arg(name), WrongUsage);
 }
 
 } // namespace

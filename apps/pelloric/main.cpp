@@ -4,7 +4,9 @@
 #include "command_line.h"
 #include "commands.h"
 #include "interruption.h"
+#include "language.h"
 #include "platform/qt/file_names.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/run_time_error.h"
 
 #include <QCoreApplication>
@@ -19,26 +21,41 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Commands = std::to_array<Command>({
-    { "demo", "", "Shows all kinds of grids on sample tables", runDemo, demoOptions, demoDetails },
-    { "preview", "FILE", "Shows a table in the preview window", runPreview, previewOptions,
-        previewDetails },
-    { "open", "FILE.ostl", "Shows a saved document in the preview window", runOpen, openOptions,
-        openDetails },
-    { "export", "FILE... -o OUT", "Writes tables as PDF, PNG, SVG or a document file", runExport,
-        exportOptions, exportDetails },
-    { "run", "SCRIPT.js [ARGUMENT...]", "Runs a script that drives the controls by name", runScript,
-        nullptr, scriptDetails },
-    { "print", "FILE", "Prints a table or a document file", runPrint, printOptions, printDetails },
-    { "printers", "", "Lists the printers", runPrinters, printersOptions, printersDetails },
-    { "settings", "", "Shows or restores the settings file", runSettings, settingsOptions },
-    { "completion", "SHELL", "Writes the completion of a shell: bash, zsh or fish", runCompletion,
-        nullptr, completionDetails },
-    { "help", "[COMMAND]", "Explains the commands", runHelp, helpOptions },
+    { "demo", "", phraseText(u"Shows all kinds of grids on sample tables"), "pelloric demo",
+        runDemo, demoOptions, demoDetails },
+    { "preview", "FILE", phraseText(u"Shows a table in the preview window"),
+        "pelloric preview stock.csv", runPreview, previewOptions, previewDetails },
+    { "open", "FILE.ostl", phraseText(u"Shows a saved document in the preview window"),
+        "pelloric open stock.ostl", runOpen, openOptions, openDetails },
+    { "export", "FILE... -o OUT", phraseText(u"Writes tables as PDF, PNG, SVG or a document file"),
+        "pelloric export stock.csv -o stock.pdf", runExport, exportOptions, exportDetails },
+    { "run", "SCRIPT.js [ARGUMENT...]",
+        phraseText(u"Runs a script that drives the controls by name"), "pelloric run report.js",
+        runScript, nullptr, scriptDetails },
+    { "print", "FILE", phraseText(u"Prints a table or a document file"), "pelloric print stock.csv",
+        runPrint, printOptions, printDetails },
+    { "printers", "", phraseText(u"Lists the printers"), "pelloric printers", runPrinters,
+        printersOptions, printersDetails },
+    { "settings", "", phraseText(u"Shows or restores the settings file"),
+        "pelloric settings --path", runSettings, settingsOptions },
+    { "completion", "SHELL", phraseText(u"Writes the completion of a shell: bash, zsh or fish"),
+        "pelloric completion bash", runCompletion, nullptr, completionDetails },
+    { "help", "[COMMAND]", phraseText(u"Explains the commands"), "pelloric help export", runHelp,
+        helpOptions },
 });
 
 bool asksForHelp(const QString& argument)
 {
     return argument == QLatin1String("--help") || argument == QLatin1String("-h");
+}
+
+/// "usage: pelloric open FILE.ostl" and an example.
+QString usageOf(const Command& command)
+{
+    const QString call
+        = QStringLiteral("%1 %2").arg(QLatin1String(command.name), QLatin1String(command.synopsis));
+    return qt::phrased(u"usage: pelloric %1; for example: %2; \"pelloric help %3\" says more",
+        { call.trimmed(), QLatin1String(command.example), QLatin1String(command.name) });
 }
 
 int runCommand(const Command& command, Invocation invocation)
@@ -51,15 +68,21 @@ int runCommand(const Command& command, Invocation invocation)
             return runHelp(invocation);
         }
     }
-    return command.run(invocation);
+    try {
+        return command.run(invocation);
+    } catch (const UsageError& error) {
+        tell(QString::fromUtf8(error.what()));
+        tellMore(usageOf(command));
+        return error.status();
+    }
 }
 
 int run(Invocation invocation)
 {
     if (invocation.arguments.isEmpty())
         throw CommandError(
-            QStringLiteral("say what to do, for example \"pelloric export table.csv -o "
-                           "table.pdf\"; see \"pelloric help\""),
+            qt::phrased(u"say what to do, for example \"pelloric export table.csv -o "
+                        u"table.pdf\"; see \"pelloric help\""),
             WrongUsage);
     const QString name = invocation.arguments.takeFirst();
     if (name == QLatin1String("--version")) {
@@ -72,8 +95,7 @@ int run(Invocation invocation)
     }
     if (asksForHelp(name))
         return runHelp({ invocation.argc, invocation.argv, {} });
-    throw CommandError(
-        QStringLiteral("no command %1; see \"pelloric help\"").arg(name), WrongUsage);
+    throw CommandError(qt::phrased(u"no command %1; see \"pelloric help\"").arg(name), WrongUsage);
 }
 
 QStringList argumentsOf(int argc, char** argv)
@@ -101,6 +123,7 @@ int guardedRun(int argc, char** argv)
 #endif
     // The toolkit would take options such as "--title" for its own.
     int applicationArgc = std::min(argc, 1);
+    speakAs(QLocale::system());
     try {
         return run({ applicationArgc, argv, argumentsOf(argc, argv) });
     } catch (const CommandError& error) {
@@ -109,7 +132,7 @@ int guardedRun(int argc, char** argv)
     } catch (const RunTimeError& error) {
         return statusOf(error);
     } catch (const std::bad_alloc&) {
-        tell(QStringLiteral("there is not enough memory for this table"));
+        tell(qt::phrased(u"there is not enough memory for this table"));
     } catch (const std::exception& error) {
         tell(QString::fromUtf8(error.what()));
     }

@@ -5,6 +5,7 @@
 
 #include "command_line.h"
 #include "commands.h"
+#include "platform/qt/qt_phrase.h"
 
 #include <QStringList>
 
@@ -72,14 +73,14 @@ QString manCommand(const Command& command)
                        .arg(manText((QString::fromLatin1(command.name) + QLatin1Char(' ')
                            + QString::fromLatin1(command.synopsis))
                                         .trimmed()));
-    text += manText(QString::fromUtf8(command.summary)) + QStringLiteral(".\n");
+    text += manText(qt::phrased(command.summary)) + QStringLiteral(".\n");
     if (command.details)
         text += QStringLiteral(".PP\n") + manParagraph(command.details());
     withOptions(command, [&text](const Option& option) {
         text += QStringLiteral(".TP\n\\fB%1\\fR").arg(manText(dashed(option)));
         if (option.value)
             text += QStringLiteral(" \\fI%1\\fR").arg(manText(QString::fromUtf8(option.value)));
-        text += QLatin1Char('\n') + manText(QString::fromUtf8(option.help)) + QLatin1Char('\n');
+        text += QLatin1Char('\n') + manText(helpOf(option)) + QLatin1Char('\n');
     });
     return text;
 }
@@ -159,11 +160,11 @@ QString zshCompletion()
     for (const Command& command : commands()) {
         const QString name = QString::fromLatin1(command.name);
         names += QStringLiteral("        %1\n")
-                     .arg(quoted(name + QLatin1Char(':') + QString::fromUtf8(command.summary)));
+                     .arg(quoted(name + QLatin1Char(':') + qt::phrased(command.summary)));
         cases += QStringLiteral("        %1)\n            _arguments \\\n").arg(name);
         withOptions(command, [&cases](const Option& option) {
-            QString spec = dashed(option) + QLatin1Char('[')
-                + zshText(QString::fromUtf8(option.help)) + QLatin1Char(']');
+            QString spec
+                = dashed(option) + QLatin1Char('[') + zshText(helpOf(option)) + QLatin1Char(']');
             if (option.value)
                 spec += QLatin1Char(':') + zshText(QString::fromUtf8(option.value))
                     + QLatin1Char(':') + QLatin1String(isFile(option.value) ? "_files" : " ");
@@ -201,7 +202,7 @@ QString fishCompletion()
         const QString name = QString::fromLatin1(command.name);
         text += QStringLiteral(
             "complete -c pelloric -n 'not __fish_seen_subcommand_from %1' -a %2 -d %3\n")
-                    .arg(all, name, quoted(QString::fromUtf8(command.summary)));
+                    .arg(all, name, quoted(qt::phrased(command.summary)));
         const QString here
             = QStringLiteral("complete -c pelloric -n '__fish_seen_subcommand_from %1'").arg(name);
         if (takesFile(command))
@@ -211,8 +212,7 @@ QString fishCompletion()
                 ? QStringLiteral("-l")
                 : QStringLiteral("-s");
             text += QStringLiteral("%1 %2 %3 -d %4%5\n")
-                        .arg(here, dashes, QString::fromLatin1(option.name),
-                            quoted(QString::fromUtf8(option.help)),
+                        .arg(here, dashes, QString::fromLatin1(option.name), quoted(helpOf(option)),
                             QLatin1String(!option.value    ? ""
                                     : isFile(option.value) ? " -r -F"
                                                            : " -x"));

@@ -4,6 +4,7 @@
 #include "command_line.h"
 #include "commands.h"
 #include "controls/qt/default_platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "table_source.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
@@ -17,7 +18,7 @@ int runOpen(const Invocation& invocation)
     const QString file = line.file(0);
     std::error_code ignored;
     if (!std::filesystem::is_regular_file(pathOf(file), ignored))
-        throw CommandError(QStringLiteral("%1: there is no such file").arg(file));
+        throw CommandError(qt::phrased(u"%1: there is no such file").arg(file));
     WindowedApplication application(invocation);
     chooseLanguage(line);
     qt::QtPreviewOpener& opener = qt::installPreviewWindow();
@@ -28,8 +29,8 @@ int runOpen(const Invocation& invocation)
 
 QString openDetails()
 {
-    return QStringLiteral("FILE is a document file (.ostl) that the preview window or\n"
-                          "\"pelloric export\" has saved.\n");
+    return qt::phrased(u"FILE is a document file (.ostl) that the preview window or\n"
+                       u"\"pelloric export\" has saved.\n");
 }
 
 OptionTables openOptions() { return { windowOptions() }; }

@@ -3,6 +3,8 @@
 
 #include "outcome.h"
 
+#include "language.h"
+#include "platform/qt/qt_phrase.h"
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QStringList>
@@ -15,8 +17,8 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "quiet", nullptr, "tell nothing but errors" },
-    { "json", nullptr, "tell what was made in JSON, one object a line" },
+    { "quiet", nullptr, phraseText(u"tell nothing but errors") },
+    { "json", nullptr, phraseText(u"tell what was made in JSON, one object a line") },
 });
 
 /// How notes are told in this run of the program.
@@ -49,6 +51,8 @@ Outcome::Outcome(const CommandLine& line)
     : isJson_(line.has("json"))
 {
     telling() = { line.has("quiet"), isJson_, {} };
+    if (isJson_)
+        speakEnglish(); // other programs read it
 }
 
 void Outcome::tellMade(QJsonObject facts, const QString& sentence) const

@@ -7,6 +7,7 @@
 #include "controls/qt/default_platform.h"
 #include "controls/qt/sorvane.h"
 #include "interruption.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/run_time_error.h"
 #include "progress_line.h"
 #include "report_builder.h"
@@ -43,7 +44,7 @@ int runPreview(const Invocation& invocation)
 {
     const CommandLine line(invocation.arguments, previewOptions(), 1);
     if (isDocumentName(line.file(0)))
-        throw CommandError(QStringLiteral("%1 is a saved document; show it with \"pelloric open\"")
+        throw CommandError(qt::phrased(u"%1 is a saved document; show it with \"pelloric open\"")
                                .arg(line.file(0)),
             WrongUsage);
     WindowedApplication application(invocation);
@@ -83,13 +84,13 @@ int runPreview(const Invocation& invocation)
 
 QString previewDetails()
 {
-    return QStringLiteral("FILE is a CSV or TSV file, whose first row holds the titles, a JSON "
-                          "file, an .xlsx or\n"
-                          ".ods file (file.xlsx:Sheet), or an SQLite database (db.sqlite:table, or "
-                          "db.sqlite with\n"
-                          "--query). Pages look as your settings say, which the window's dialogs\n"
-                          "change; --defaults does without them. With one of the options for\n"
-                          "headers, paper and so on, what the dialogs change is not kept.\n");
+    return qt::phrased(u"FILE is a CSV or TSV file, whose first row holds the titles, a JSON "
+                       u"file, an .xlsx or\n"
+                       u".ods file (file.xlsx:Sheet), or an SQLite database (db.sqlite:table, or "
+                       u"db.sqlite with\n"
+                       u"--query). Pages look as your settings say, which the window's dialogs\n"
+                       u"change; --defaults does without them. With one of the options for\n"
+                       u"headers, paper and so on, what the dialogs change is not kept.\n");
 }
 
 OptionTables previewOptions()

@@ -9,6 +9,7 @@
 #include "interruption.h"
 #include "outcome.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "print/page_list.h"
@@ -32,9 +33,10 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "printer", "NAME", "where to: a name of \"pelloric printers\" (the current one)" },
-    { "pages", "LIST", "only these pages: 1,3,5-12" },
-    { "copies", "N", "whole copies, one after the other (1)" },
+    { "printer", "NAME",
+        phraseText(u"where to: a name of \"pelloric printers\" (the current one)") },
+    { "pages", "LIST", phraseText(u"only these pages: 1,3,5-12") },
+    { "copies", "N", phraseText(u"whole copies, one after the other (1)") },
 });
 
 constexpr double MostCopies = std::numeric_limits<std::int16_t>::max();
@@ -65,7 +67,7 @@ void choosePrinter(const CommandLine& line, qt::QtPrinting& printing)
     if (line.has("printer")) {
         const std::vector<Text> names = system.printerNames();
         if (std::find(names.begin(), names.end(), name) == names.end())
-            throw CommandError(QStringLiteral("no printer \"%1\"; see \"pelloric printers\"")
+            throw CommandError(qt::phrased(u"no printer \"%1\"; see \"pelloric printers\"")
                                    .arg(line.value("printer")));
         system.makeCurrent(name);
     }
@@ -119,7 +121,7 @@ void printPages(const Order& order, const PageDocument& document, PrintJob job,
     job.documentName = qt::toText(order.title);
     const std::int64_t total = pagesToSend(document, job);
     job.progress = [&](std::int64_t sent, std::int64_t wanted) {
-        progress.show("Printing", sent, wanted);
+        progress.show(phraseText(u"Printing"), sent, wanted);
         return Interruption::mayGoOn() || sent == wanted;
     };
     try {
@@ -134,10 +136,9 @@ void printPages(const Order& order, const PageDocument& document, PrintJob job,
     outcome.tellMade(
         { { QStringLiteral("input"), order.file }, { QStringLiteral("printer"), printer },
             { QStringLiteral("pages"), static_cast<qint64>(total) } },
-        QStringLiteral("%1: %2 %3 sent\n")
-            .arg(printer)
-            .arg(total)
-            .arg(QLatin1String(total == 1 ? "page" : "pages")));
+        qt::phrased(
+            total == 1 ? phraseText(u"%1: %2 page sent\n") : phraseText(u"%1: %2 pages sent\n"),
+            { printer, QString::number(total) }));
 }
 
 void printDocument(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
@@ -193,12 +194,12 @@ int runPrint(const Invocation& invocation)
 
 QString printDetails()
 {
-    return QStringLiteral(
-        "FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
-        ".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
-        "--query), or a saved document (.ostl).\n"
-        "Pages look as the default settings and the options say; --settings takes others.\n"
-        "Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
+    return qt::phrased(
+        u"FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
+        u".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
+        u"--query), or a saved document (.ostl).\n"
+        u"Pages look as the default settings and the options say; --settings takes others.\n"
+        u"Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
 }
 
 OptionTables printOptions()

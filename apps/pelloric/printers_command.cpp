@@ -4,6 +4,7 @@
 #include "command_line.h"
 #include "commands.h"
 #include "headless.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "print/qt/qt_printer_system.h"
 
@@ -14,7 +15,7 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "papers", nullptr, "also list the papers, each with its code and size" },
+    { "papers", nullptr, phraseText(u"also list the papers, each with its code and size") },
 });
 
 QString millimetres(const PaperForm& form)
@@ -46,7 +47,7 @@ int runPrinters(const Invocation& invocation)
         const QString refusal = system.refusal(name);
         print(QStringLiteral("%1 %2: %3\n")
                   .arg(QLatin1String(name == current ? "*" : " "), qt::toQString(name),
-                      refusal.isEmpty() ? QStringLiteral("ready") : refusal));
+                      refusal.isEmpty() ? qt::phrased(u"ready") : refusal));
         if (!line.has("papers"))
             continue;
         system.makeCurrent(name);
@@ -57,7 +58,7 @@ int runPrinters(const Invocation& invocation)
 
 QString printersDetails()
 {
-    return QStringLiteral("The printer with the star is used when none is named.\n");
+    return qt::phrased(u"The printer with the star is used when none is named.\n");
 }
 
 OptionTables printersOptions() { return { Options }; }

@@ -5,6 +5,7 @@
 
 #include "interruption.h"
 #include "outcome.h"
+#include "platform/qt/qt_phrase.h"
 
 #include <algorithm>
 #include <cstdio>
@@ -41,18 +42,18 @@ ProgressLine::ProgressLine()
 
 ProgressLine::~ProgressLine() { clear(); }
 
-void ProgressLine::show(const char* work, std::int64_t done, std::int64_t total)
+void ProgressLine::show(TextView work, std::int64_t done, std::int64_t total)
 {
     if (!isTerminal_ || sinceShown_.elapsed() < MillisecondsBetween)
         return;
     sinceShown_.restart();
     const double part = total > 0 ? static_cast<double>(done) / static_cast<double>(total) : 0;
     const int percent = static_cast<int>(std::clamp(part, 0.0, 1.0) * 100);
-    std::fprintf(stderr, "%s%s %d %%", BackToStart, work, percent);
+    std::fprintf(stderr, "%s%s %d %%", BackToStart, toUtf8(phrase(work)).c_str(), percent);
     isShown_ = true;
 }
 
-Progress ProgressLine::of(const char* work)
+Progress ProgressLine::of(TextView work)
 {
     return [this, work](std::int64_t done, std::int64_t total) {
         show(work, done, total);
@@ -80,7 +81,7 @@ void LayoutProgress::progressChanged()
 {
     const ProgressBar& bar = canvas_.progress();
     if (bar.visible)
-        line_.show("Laying out", bar.value, bar.maximum);
+        line_.show(phraseText(u"Laying out"), bar.value, bar.maximum);
 }
 
 } // namespace pelloric::app

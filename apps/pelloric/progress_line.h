@@ -21,11 +21,12 @@ public:
     ProgressLine(const ProgressLine&) = delete;
     ProgressLine& operator=(const ProgressLine&) = delete;
 
+    /// @param work   a phrase
     /// @param total  steps of the whole work; 0: nobody knows
-    void show(const char* work, std::int64_t done, std::int64_t total);
+    void show(TextView work, std::int64_t done, std::int64_t total);
 
     /// Shows a work that can be interrupted at each of its steps; borrows this line.
-    Progress of(const char* work);
+    Progress of(TextView work);
 
     /// Takes the line away until something is shown again.
     void clear();

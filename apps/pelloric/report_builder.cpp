@@ -11,6 +11,7 @@
 #include "platform/automation_object.h"
 #include "platform/numbers.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/text_metrics.h"
@@ -37,7 +38,7 @@ constexpr double WidestColumn = 100000; ///< twips
 
 QString cellsOf(std::int64_t count)
 {
-    return count == 1 ? QStringLiteral("1 cell") : QStringLiteral("%1 cells").arg(count);
+    return count == 1 ? qt::phrased(u"1 cell") : qt::phrased(u"%1 cells").arg(count);
 }
 
 int columnOf(const TableGrid& grid, TextView title)
@@ -93,7 +94,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
     const QStringList given
         = line.has("widths") ? line.value("widths").split(QLatin1Char(',')) : QStringList();
     if (given.size() > grid.columnCount())
-        throw CommandError(QStringLiteral("--widths names %1 columns; the table has %2")
+        throw CommandError(qt::phrased(u"--widths names %1 columns; the table has %2")
                                .arg(given.size())
                                .arg(grid.columnCount()),
             WrongUsage);
@@ -116,16 +117,15 @@ void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, Progr
     const LayoutProgress watched(canvas, progress);
     canvas.options = shapeOf(line);
     if (canvas.options.asShown && !grid.hasLooks())
-        note(QStringLiteral("--as-shown does nothing here: only cells of office files have looks"));
+        note(qt::phrased(u"--as-shown does nothing here: only cells of office files have looks"));
     canvas.doPreview(grid);
     if (canvas.table() == nullptr)
-        throw CommandError(QStringLiteral("no column is wide enough to be printed; give other "
-                                          "--widths"));
+        throw CommandError(qt::phrased(u"no column is wide enough to be printed; give other "
+                                       u"--widths"));
     if (canvas.printedRows() == 0 && grid.rowCount() > 0)
-        note(QStringLiteral("no row is printed: --where %1 holds for none")
-                 .arg(line.value("where")));
+        note(qt::phrased(u"no row is printed: --where %1 holds for none").arg(line.value("where")));
     for (const LeftOut& column : canvas.leftOut())
-        note(QStringLiteral("the total of %1 leaves out %2, being no numbers")
+        note(qt::phrased(u"the total of %1 leaves out %2, being no numbers")
                  .arg(qt::toQString(column.column), cellsOf(column.cells)));
 }
 
@@ -149,7 +149,7 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
     const char* const option = shape != nullptr ? shape : firstReportOption(line);
     if (option != nullptr && QLatin1String(option) != QLatin1String("title"))
         throw CommandError(
-            QStringLiteral("--%1 does not apply to a saved document, whose pages are laid out")
+            qt::phrased(u"--%1 does not apply to a saved document, whose pages are laid out")
                 .arg(QString::fromLatin1(option)),
             WrongUsage);
     requireFonts();
@@ -157,7 +157,7 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
     try {
         if (readOstl(platform.codec, pathOf(file), saved.document, saved.setup)
             == OstlResult::BadHeader)
-            throw CommandError(QStringLiteral("%1 is no document file").arg(file));
+            throw CommandError(qt::phrased(u"%1 is no document file").arg(file));
     } catch (const RunTimeError& error) {
         if (error.number() != ErrorNumber::Overflow)
             throw;
@@ -178,7 +178,7 @@ std::vector<int> pagesOf(const QString& list, int pageCount)
     }
     if (pages.empty())
         throw CommandError(
-            QStringLiteral("--pages %1 names no page; the document has %2 (write 1,3,5-12)")
+            qt::phrased(u"--pages %1 names no page; the document has %2 (write 1,3,5-12)")
                 .arg(list)
                 .arg(pageCount));
     return pages;

@@ -7,6 +7,7 @@
 #include "platform/file_bytes.h"
 #include "platform/platform.h"
 #include "platform/qt/file_names.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/text_codec.h"
@@ -26,24 +27,29 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "defaults", nullptr, "the default settings, whatever the user's are" },
-    { "settings", "FILE", "the settings of this file; the default ones for those it lacks" },
-    { "title", "TEXT", "title of the file, and centred above every page" },
-    { "header-left", "TEXT", "header texts; they may hold one of the fields" },
-    { "header-center", "TEXT", "[Date Printed], [Time Printed], [Date & Time Printed]," },
-    { "header-right", "TEXT", "[Page # of Pages #], [Total Pages] and [Page #]" },
-    { "footer-left", "TEXT", "footer texts, likewise" },
-    { "footer-center", "TEXT", "" },
-    { "footer-right", "TEXT", "" },
-    { "paper", "NAME", "A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in" },
-    { "margins", "LENGTHS", "top,right,bottom,left, or one for all: 10mm, 1.5cm or 0.5in" },
-    { "landscape", nullptr, "the paper's long side lies below" },
-    { "portrait", nullptr, "the paper stands upright" },
-    { "merge", nullptr, "print equal neighbouring cells once" },
-    { "no-headers", nullptr, "leave out the row of column titles" },
-    { "font", "NAME", "the face of all texts" },
-    { "font-size", "N", "the size of the cells' texts: points" },
-    { "widths", "N,N,...", "widths of the columns: twips (1440 an inch); 0 leaves one out" },
+    { "defaults", nullptr, phraseText(u"the default settings, whatever the user's are") },
+    { "settings", "FILE",
+        phraseText(u"the settings of this file; the default ones for those it lacks") },
+    { "title", "TEXT", phraseText(u"title of the file, and centred above every page") },
+    { "header-left", "TEXT", phraseText(u"header texts; they may hold one of the fields") },
+    { "header-center", "TEXT",
+        phraseText(u"[Date Printed], [Time Printed], [Date & Time Printed],") },
+    { "header-right", "TEXT", phraseText(u"[Page # of Pages #], [Total Pages] and [Page #]") },
+    { "footer-left", "TEXT", phraseText(u"footer texts, likewise") },
+    { "footer-center", "TEXT", {} },
+    { "footer-right", "TEXT", {} },
+    { "paper", "NAME",
+        phraseText(u"A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in") },
+    { "margins", "LENGTHS",
+        phraseText(u"top,right,bottom,left, or one for all: 10mm, 1.5cm or 0.5in") },
+    { "landscape", nullptr, phraseText(u"the paper's long side lies below") },
+    { "portrait", nullptr, phraseText(u"the paper stands upright") },
+    { "merge", nullptr, phraseText(u"print equal neighbouring cells once") },
+    { "no-headers", nullptr, phraseText(u"leave out the row of column titles") },
+    { "font", "NAME", phraseText(u"the face of all texts") },
+    { "font-size", "N", phraseText(u"the size of the cells' texts: points") },
+    { "widths", "N,N,...",
+        phraseText(u"widths of the columns: twips (1440 an inch); 0 leaves one out") },
 });
 
 /// An option whose value is a text of the report.
@@ -85,13 +91,13 @@ PaperForm paperOf(const QString& text)
     }
     const std::optional<SizeMm> size = sizeOf(text);
     if (!size)
-        throw CommandError(QStringLiteral("unknown paper \"%1\"; take one of %2, or a size such as "
-                                          "100x150mm or 4x6in")
+        throw CommandError(qt::phrased(u"unknown paper \"%1\"; take one of %2, or a size such as "
+                                       u"100x150mm or 4x6in")
                                .arg(text, paperNames()),
             WrongUsage);
     const auto held = [&text](double mm) {
         if (mm < LeastPaperMm || mm > MostPaperMm)
-            throw CommandError(QStringLiteral("--paper takes lengths from %1 to %2 mm, not \"%3\"")
+            throw CommandError(qt::phrased(u"--paper takes lengths from %1 to %2 mm, not \"%3\"")
                                    .arg(LeastPaperMm)
                                    .arg(MostPaperMm)
                                    .arg(text),
@@ -125,7 +131,7 @@ void changePaper(const CommandLine& line, ReportSettings& settings)
         return;
     if (line.has("landscape") && line.has("portrait"))
         throw CommandError(
-            QStringLiteral("take either --landscape or --portrait, not both"), WrongUsage);
+            qt::phrased(u"take either --landscape or --portrait, not both"), WrongUsage);
     double& width = settings.paperWidthMm;
     double& height = settings.paperHeightMm;
     bool isLandscape = line.has("landscape");
@@ -159,11 +165,10 @@ void changeMargins(const CommandLine& line, ReportSettings& settings)
         const auto at = isOne ? 0 : static_cast<qsizetype>(margin);
         const std::optional<double> mm = millimetresOf(parts.value(at));
         if ((!isOne && parts.size() != 4) || !mm || *mm < LeastMarginMm || *mm > MostPaperMm)
-            throw CommandError(
-                QStringLiteral("--margins takes one length of %1 mm or more, or four "
-                               "(top,right,bottom,left), not \"%2\"")
-                    .arg(LeastMarginMm)
-                    .arg(line.value("margins")),
+            throw CommandError(qt::phrased(u"--margins takes one length of %1 mm or more, or four "
+                                           u"(top,right,bottom,left), not \"%2\"")
+                                   .arg(LeastMarginMm)
+                                   .arg(line.value("margins")),
                 WrongUsage);
         settings.*Margins[margin] = *mm;
     }
@@ -174,7 +179,7 @@ void changeFonts(const CommandLine& line, ReportSettings& settings)
     if (line.has("font")) {
         const QString name = line.value("font");
         if (name.trimmed().isEmpty())
-            throw CommandError(QStringLiteral("--font needs the name of a face"), WrongUsage);
+            throw CommandError(qt::phrased(u"--font needs the name of a face"), WrongUsage);
         for (FontSettings* const font : { &settings.body, &settings.header, &settings.footer })
             font->name = textOf(line, "font");
     }
@@ -205,8 +210,8 @@ void check(const ReportSettings& settings, const SettingsSource& source)
 {
     for (const SettingProblem& problem : settingProblems(settings, &source)) {
         if (problem.isRefused)
-            throw CommandError(qt::toQString(problem.text)
-                + QStringLiteral(" Correct it in the file, or do without: --defaults"));
+            throw CommandError(qt::phrased(u"%1 Correct it in the file, or do without: --defaults",
+                { qt::toQString(problem.text) }));
         if (problem.key)
             tell(qt::toQString(problem.text));
     }
@@ -225,7 +230,7 @@ ReportSettings settingsOfFile(const QString& file, const Platform& platform)
     const std::vector<SettingChange> values = settingsIn(text);
     if (values.empty())
         throw CommandError(
-            QStringLiteral("%1 holds no setting; \"pelloric settings --path\" names yours")
+            qt::phrased(u"%1 holds no setting; \"pelloric settings --path\" names yours")
                 .arg(file));
     const SettingsSnapshot snapshot(settingsTextWith(values));
     const ReportSettings settings = readReportSettings(snapshot);
@@ -252,7 +257,7 @@ ReportSettings presentSettings(const CommandLine& line, const Platform& platform
 {
     if (line.has("defaults") && line.has("settings"))
         throw CommandError(
-            QStringLiteral("take either --defaults or --settings, not both"), WrongUsage);
+            qt::phrased(u"take either --defaults or --settings, not both"), WrongUsage);
     if (line.has("settings"))
         return settingsOfFile(line.value("settings"), platform);
     if (line.has("defaults") || base == SettingsBase::Defaults)

@@ -6,6 +6,7 @@
 #include "grids/qt/held_grid.h"
 #include "headless.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/text_metrics.h"
 #include "print/qt/qt_printing.h"
@@ -16,6 +17,7 @@
 #include "tables/qt/sqlite_table.h"
 #include "windows.h"
 
+#include "language.h"
 #include <algorithm>
 #include <memory>
 #include <optional>
@@ -85,16 +87,15 @@ void raiseStackLimit()
 int runScript(const Invocation& invocation)
 {
     if (invocation.arguments.isEmpty())
-        throw CommandError(
-            QStringLiteral("say which script to run, for example \"pelloric run report.js\""),
-            WrongUsage);
+        throw UsageError(qt::phrased(u"say which script to run"));
+    speakEnglish(); // a script may read what errors say
     raiseStackLimit();
     QStringList arguments = invocation.arguments;
     const bool isWindowed = arguments.front() == QLatin1String("--window");
     if (isWindowed)
         arguments.removeFirst();
     if (arguments.isEmpty())
-        throw CommandError(QStringLiteral("say which script to run"), WrongUsage);
+        throw UsageError(qt::phrased(u"say which script to run"));
     std::optional<WindowedApplication> windowed;
     std::optional<HeadlessWidgets> headless;
     if (isWindowed)
@@ -114,17 +115,17 @@ int runScript(const Invocation& invocation)
 
 QString scriptDetails()
 {
-    return QStringLiteral(
-        "The script finds Sorvane and Kestrane, the records and enumerations of their interface,\n"
-        "args, messages, print(...), exit(status), csv(path), sqlite(path, tableOrQuery),\n"
-        "lines(canvas, page), texts(canvas, page), placePicture(canvas, page, picture) and\n"
-        "wait(milliseconds). A control also has grab(path) and resize(width, height).\n"
-        "Kestrane.doPreview builds in the preview window, whose canvas previewCanvas() is. "
-        "Nothing\n"
-        "is shown, unless --window stands before SCRIPT: then the program goes on until the "
-        "window\n"
-        "is closed.\n"
-        "An exception that it does not catch ends the program with status 1.\n");
+    return qt::phrased(
+        u"The script finds Sorvane and Kestrane, the records and enumerations of their interface,\n"
+        u"args, messages, print(...), exit(status), csv(path), sqlite(path, tableOrQuery),\n"
+        u"lines(canvas, page), texts(canvas, page), placePicture(canvas, page, picture) and\n"
+        u"wait(milliseconds). A control also has grab(path) and resize(width, height).\n"
+        u"Kestrane.doPreview builds in the preview window, whose canvas previewCanvas() is. "
+        u"Nothing\n"
+        u"is shown, unless --window stands before SCRIPT: then the program goes on until the "
+        u"window\n"
+        u"is closed.\n"
+        u"An exception that it does not catch ends the program with status 1.\n");
 }
 
 } // namespace pelloric::app

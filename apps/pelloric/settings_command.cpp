@@ -6,6 +6,7 @@
 #include "headless.h"
 #include "platform/file_bytes.h"
 #include "platform/platform.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
 #include "settings/default_settings.h"
@@ -18,8 +19,8 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "path", nullptr, "only say where the file is" },
-    { "reset", nullptr, "put the default settings back" },
+    { "path", nullptr, phraseText(u"only say where the file is") },
+    { "reset", nullptr, phraseText(u"put the default settings back") },
 });
 
 QString settingsText(const Platform& platform)

@@ -3,6 +3,7 @@
 
 #include "shape_options.h"
 
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 
 #include <algorithm>
@@ -14,20 +15,23 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "where", "NAME=TEXT", "only rows whose column NAME holds TEXT" },
-    { "as-shown", nullptr, "cells have the fonts, colours and alignment of the office file" },
-    { "fit", nullptr, "turn the paper, then shrink, until the table is as wide as one page" },
-    { "pages-across", "N", "shrink until the table is at most N pages wide" },
-    { "key-columns", "N|NAME,...", "columns to repeat at the left of every page" },
-    { "down-first", nullptr, "all rows of the first columns come before the next columns" },
-    { "group", "NAME,...", "rows with equal texts in these columns stay on one page" },
-    { "total", "F:NAME,...", "totals of columns; F is sum, count, mean, min or max" },
-    { "watermark", "TEXT", "a faint text across every page" },
-    { "watermark-image", "FILE", "a faint picture in the middle of every page" },
-    { "opacity", "PERCENT", "of the watermark, 1 to 100 (15)" },
-    { "above", nullptr, "the watermark lies above the table, not behind it" },
-    { "logo", "FILE", "a picture at the top of every page" },
-    { "logo-at", "SLOT", "where the logo stands: left, center or right (left)" },
+    { "where", "NAME=TEXT", phraseText(u"only rows whose column NAME holds TEXT") },
+    { "as-shown", nullptr,
+        phraseText(u"cells have the fonts, colours and alignment of the office file") },
+    { "fit", nullptr,
+        phraseText(u"turn the paper, then shrink, until the table is as wide as one page") },
+    { "pages-across", "N", phraseText(u"shrink until the table is at most N pages wide") },
+    { "key-columns", "N|NAME,...", phraseText(u"columns to repeat at the left of every page") },
+    { "down-first", nullptr,
+        phraseText(u"all rows of the first columns come before the next columns") },
+    { "group", "NAME,...", phraseText(u"rows with equal texts in these columns stay on one page") },
+    { "total", "F:NAME,...", phraseText(u"totals of columns; F is sum, count, mean, min or max") },
+    { "watermark", "TEXT", phraseText(u"a faint text across every page") },
+    { "watermark-image", "FILE", phraseText(u"a faint picture in the middle of every page") },
+    { "opacity", "PERCENT", phraseText(u"of the watermark, 1 to 100 (15)") },
+    { "above", nullptr, phraseText(u"the watermark lies above the table, not behind it") },
+    { "logo", "FILE", phraseText(u"a picture at the top of every page") },
+    { "logo-at", "SLOT", phraseText(u"where the logo stands: left, center or right (left)") },
 });
 
 constexpr double MostPages = 1000;
@@ -67,8 +71,8 @@ Aggregation totalOf(const QString& text)
             return { qt::toText(text.mid(colon + 1).trimmed()), row.function };
     }
     throw CommandError(
-        QStringLiteral("--total takes sum, count, mean, min or max, a colon and a column, such as "
-                       "sum:Price, not \"%1\"")
+        qt::phrased(u"--total takes sum, count, mean, min or max, a colon and a column, such as "
+                    u"sum:Price, not \"%1\"")
             .arg(text),
         WrongUsage);
 }
@@ -90,7 +94,7 @@ int slotOf(const QString& name)
             return static_cast<int>(slot);
     }
     throw CommandError(
-        QStringLiteral("--logo-at takes left, center or right, not \"%1\"").arg(name), WrongUsage);
+        qt::phrased(u"--logo-at takes left, center or right, not \"%1\"").arg(name), WrongUsage);
 }
 
 /// @param needs  one of them must be given, too
@@ -98,7 +102,7 @@ void require(const CommandLine& line, const char* option, std::initializer_list<
 {
     const auto isGiven = [&](const char* name) { return line.has(name); };
     if (line.has(option) && std::none_of(needs.begin(), needs.end(), isGiven))
-        throw CommandError(QStringLiteral("--%1 says something about --%2, which is not given")
+        throw CommandError(qt::phrased(u"--%1 says something about --%2, which is not given")
                                .arg(QLatin1String(option), QLatin1String(*needs.begin())),
             WrongUsage);
 }
@@ -110,7 +114,7 @@ void takePictures(const CommandLine& line, ReportOptions& options)
     require(line, "logo-at", { "logo" });
     if (line.has("watermark") && line.has("watermark-image"))
         throw CommandError(
-            QStringLiteral("--watermark and --watermark-image exclude each other"), WrongUsage);
+            qt::phrased(u"--watermark and --watermark-image exclude each other"), WrongUsage);
     options.watermark.text = qt::toText(line.value("watermark"));
     options.watermark.imageFile = qt::toText(line.value("watermark-image"));
     options.watermark.isAbove = line.has("above");
@@ -144,8 +148,7 @@ ReportOptions shapeOf(const CommandLine& line)
         const auto sign = condition.indexOf(QLatin1Char('='));
         if (sign <= 0)
             throw CommandError(
-                QStringLiteral("--where takes a column, \"=\" and a text, not \"%1\"")
-                    .arg(condition),
+                qt::phrased(u"--where takes a column, \"=\" and a text, not \"%1\"").arg(condition),
                 WrongUsage);
         options.whereColumn = qt::toText(condition.left(sign).trimmed());
         options.whereText = qt::toText(condition.mid(sign + 1));

@@ -3,6 +3,7 @@
 
 #include "table_selection.h"
 
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "report/shown_number.h"
 
@@ -22,9 +23,10 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "columns", "NAME,...", "only these columns, in this order; #3 is the third" },
-    { "sort", "NAME,...", "sort the rows by these columns; NAME:desc downwards" },
-    { "rows", "A-B", "only these rows, from 1, after sorting; 100- and -100 work, too" },
+    { "columns", "NAME,...", phraseText(u"only these columns, in this order; #3 is the third") },
+    { "sort", "NAME,...", phraseText(u"sort the rows by these columns; NAME:desc downwards") },
+    { "rows", "A-B",
+        phraseText(u"only these rows, from 1, after sorting; 100- and -100 work, too") },
 });
 
 /// The parts of a list with commas; a part in double quotes may hold commas itself.
@@ -71,7 +73,7 @@ int columnNamed(const QString& name, const QStringList& titles, const char* opti
     QString known = titles.mid(0, MostTold).join(QStringLiteral(", "));
     if (titles.size() > MostTold)
         known += QStringLiteral(", …");
-    throw CommandError(QStringLiteral("--%1: there is no column \"%2\"; the table has %3")
+    throw CommandError(qt::phrased(u"--%1: there is no column \"%2\"; the table has %3")
                            .arg(QLatin1String(option), name, known),
         WrongUsage);
 }
@@ -157,7 +159,7 @@ void cutRows(const QString& range, std::vector<std::int64_t>& rows)
             return missing;
         if (!isNumber || number < 1)
             throw CommandError(
-                QStringLiteral("--rows takes a range such as 1-100, not \"%1\"").arg(range),
+                qt::phrased(u"--rows takes a range such as 1-100, not \"%1\"").arg(range),
                 WrongUsage);
         return static_cast<std::int64_t>(number);
     };
@@ -166,7 +168,7 @@ void cutRows(const QString& range, std::vector<std::int64_t>& rows)
     const std::int64_t last = dash < 0 ? first : end(range.mid(dash + 1), count);
     if (first > last || first > count)
         throw CommandError(
-            QStringLiteral("--rows %1 names no row; the table has %2").arg(range).arg(count));
+            qt::phrased(u"--rows %1 names no row; the table has %2").arg(range).arg(count));
     rows.resize(static_cast<std::size_t>(std::min(last, count)));
     rows.erase(rows.begin(), rows.begin() + (first - 1));
 }

@@ -6,6 +6,7 @@
 #include "interruption.h"
 #include "outcome.h"
 #include "platform/file_bytes.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "progress_line.h"
@@ -29,15 +30,16 @@ namespace pelloric::app {
 namespace {
 
 constexpr auto Options = std::to_array<Option>({
-    { "query", "SQL", "what to take of a database: a SELECT statement" },
-    { "encoding", "NAME", "of a text file; else found out" },
-    { "delimiter", "CHAR", "between the values of a CSV file, or tab; else found out" },
-    { "no-quote", nullptr, "a quote in a CSV file is a character like any other" },
+    { "query", "SQL", phraseText(u"what to take of a database: a SELECT statement") },
+    { "encoding", "NAME", phraseText(u"of a text file; else found out") },
+    { "delimiter", "CHAR",
+        phraseText(u"between the values of a CSV file, or tab; else found out") },
+    { "no-quote", nullptr, phraseText(u"a quote in a CSV file is a character like any other") },
 });
 
-/// The name that stands for the standard input, and what that is called.
+/// The name that stands for the standard input.
 const QString StandardInput = QStringLiteral("-");
-const QString StandardInputName = QStringLiteral("standard input");
+QString standardInputName() { return qt::phrased(u"standard input"); }
 
 constexpr char DatabaseMark[] = "SQLite format 3";
 
@@ -67,13 +69,13 @@ void checkReadable(const QString& name)
     std::error_code ignored;
     const auto type = std::filesystem::status(pathOf(name), ignored).type();
     if (type == std::filesystem::file_type::not_found || type == std::filesystem::file_type::none)
-        throw CommandError(QStringLiteral("%1: there is no such file").arg(name));
+        throw CommandError(qt::phrased(u"%1: there is no such file").arg(name));
     if (type == std::filesystem::file_type::directory)
-        throw CommandError(QStringLiteral("%1 is a folder; name a file in it").arg(name));
+        throw CommandError(qt::phrased(u"%1 is a folder; name a file in it").arg(name));
     if (type == std::filesystem::file_type::character || type == std::filesystem::file_type::block)
-        throw CommandError(QStringLiteral("%1 is a device; name a file").arg(name));
+        throw CommandError(qt::phrased(u"%1 is a device; name a file").arg(name));
     if (type == std::filesystem::file_type::regular && !std::ifstream(pathOf(name)))
-        throw CommandError(QStringLiteral("%1: you may not read this file").arg(name));
+        throw CommandError(qt::phrased(u"%1: you may not read this file").arg(name));
 }
 /// What a pipe hands over, in a file that can be read twice.
 class PipedInput {
@@ -83,12 +85,12 @@ public:
         QFile in;
         if (!file_.open() || !in.open(stdin, QIODevice::ReadOnly))
             throw CommandError(
-                QStringLiteral("the standard input cannot be kept: %1").arg(file_.errorString()));
+                qt::phrased(u"the standard input cannot be kept: %1").arg(file_.errorString()));
         constexpr qint64 Piece = 1 << 20;
         for (QByteArray bytes = in.read(Piece); !bytes.isEmpty(); bytes = in.read(Piece)) {
             if (file_.write(bytes) != bytes.size())
-                throw CommandError(QStringLiteral("the standard input cannot be kept: %1")
-                                       .arg(file_.errorString()));
+                throw CommandError(
+                    qt::phrased(u"the standard input cannot be kept: %1").arg(file_.errorString()));
         }
         file_.close();
     }
@@ -103,14 +105,14 @@ TableGrid readDatabase(const DatabaseName& name, const CommandLine& line, Progre
 {
     if (line.has("encoding"))
         throw CommandError(
-            QStringLiteral("--encoding is for CSV and TSV files, not databases"), WrongUsage);
+            qt::phrased(u"--encoding is for CSV and TSV files, not databases"), WrongUsage);
     if (line.has("query") && !name.table.isEmpty())
-        throw CommandError(QStringLiteral("take either a table or --query, not both"), WrongUsage);
+        throw CommandError(qt::phrased(u"take either a table or --query, not both"), WrongUsage);
     qt::SqliteSource source;
     source.path = pathOf(name.file);
     source.table = name.table;
     source.query = line.value("query");
-    source.progress = progress.of("Reading");
+    source.progress = progress.of(phraseText(u"Reading"));
     return qt::readSqlite(source);
 }
 
@@ -126,8 +128,7 @@ std::optional<char> delimiterOf(const CommandLine& line)
     constexpr char16_t FirstPastAscii = 0x80;
     if (text.size() != 1 || text.front() >= QChar(FirstPastAscii) || text.front() == u'"')
         throw CommandError(
-            QStringLiteral("--delimiter takes one ASCII character, or \"tab\", not \"%1\"")
-                .arg(text),
+            qt::phrased(u"--delimiter takes one ASCII character, or \"tab\", not \"%1\"").arg(text),
             WrongUsage);
     return text.front().toLatin1();
 }
@@ -150,8 +151,8 @@ TableGrid readValues(
     const QString& name, const QString& shown, const CommandLine& line, ProgressLine& progress)
 {
     if (line.has("query"))
-        throw CommandError(QStringLiteral("--query is for databases; %1 is none").arg(name));
-    const Progress step = progress.of("Reading");
+        throw CommandError(qt::phrased(u"--query is for databases; %1 is none").arg(name));
+    const Progress step = progress.of(phraseText(u"Reading"));
     const std::optional<char> delimiter = delimiterOf(line);
     if (isJson(name))
         return qt::readJson(pathOf(name), { .encoding = line.value("encoding"), .progress = step });
@@ -201,13 +202,12 @@ TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& 
     if (file == StandardInput)
         piped.emplace();
     const DatabaseName name = splitName(piped ? piped->name() : file);
-    const QString shown = piped ? StandardInputName : name.file;
+    const QString shown = piped ? standardInputName() : name.file;
     checkReadable(name.file);
     const bool isFromDatabase = isDatabase(name.file);
     const bool isOffice = qt::isOfficeFile(pathOf(name.file));
     if (!isFromDatabase && !isOffice && !name.table.isEmpty())
-        throw CommandError(
-            QStringLiteral("%1 is no SQLite database and no office file").arg(shown));
+        throw CommandError(qt::phrased(u"%1 is no SQLite database and no office file").arg(shown));
     try {
         if (isOffice)
             return selected(

@@ -3,6 +3,8 @@
 
 #include "windows.h"
 
+#include "language.h"
+#include "platform/qt/qt_phrase.h"
 #include "platform/run_time_error.h"
 #include "settings/default_settings.h"
 #include "ui/qt/translation.h"
@@ -23,7 +25,8 @@ namespace {
 
 constexpr auto Options = std::to_array<Option>({
     { "language", "LANG",
-        "of hints, tips and further menus: de, en, zh_CN, or system; the rest has one wording" },
+        phraseText(u"of hints, tips and errors (the locale's): de, en, zh_CN, or system; the rest "
+                   u"has one wording") },
 });
 
 /// The toolkit's own texts, such as those of its file dialogs, where its catalogues are installed.
@@ -41,18 +44,17 @@ OptionTable windowOptions() { return Options; }
 
 void chooseLanguage(const CommandLine& line)
 {
-    if (!line.has("language"))
-        return;
-    const QString name = line.value("language");
+    const QString name = line.has("language") ? line.value("language") : QStringLiteral("system");
     const bool isSystem = name == QLatin1String("system");
     const QLocale locale = isSystem ? QLocale::system() : QLocale(name);
     const bool isKnown = qt::installTranslation(locale);
     qt::installTranslation(locale, QStringLiteral("pelloric_program"));
+    speakAs(locale);
     if (isKnown)
         translateToolkit(locale);
     else if (!isSystem)
         throw CommandError(
-            QStringLiteral("--language %1: there are de, en, zh_CN, and system").arg(name),
+            qt::phrased(u"--language %1: there are de, en, zh_CN, and system").arg(name),
             WrongUsage);
 }
 
@@ -69,9 +71,9 @@ bool hasDisplay()
 WindowedApplication::WindowedApplication(const Invocation& invocation)
 {
     if (!hasDisplay())
-        throw CommandError(QStringLiteral(
-            "there is no display to show windows on; \"pelloric export\" and \"pelloric demo "
-            "--walk OUT\" need none"));
+        throw CommandError(qt::phrased(
+            u"there is no display to show windows on; \"pelloric export\" and \"pelloric demo "
+            u"--walk OUT\" need none"));
     application_ = std::make_unique<QApplication>(invocation.argc, invocation.argv);
 }
 

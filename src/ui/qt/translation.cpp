@@ -27,9 +27,18 @@ Text translatedPhrase(TextView english)
 
 } // namespace
 
-bool installTranslation(const QLocale& locale)
+std::unique_ptr<QTranslator> catalogueOf(const QLocale& locale, const QString& name)
 {
     initCatalogues();
+    auto catalogue = std::make_unique<QTranslator>();
+    if (!catalogue->load(
+            locale, name, QStringLiteral("_"), QStringLiteral(":/pelloric/translations")))
+        return nullptr;
+    return catalogue;
+}
+
+bool installTranslation(const QLocale& locale)
+{
     usePhraseTranslator(translatedPhrase);
     return installTranslation(locale, QStringLiteral("pelloric"));
 }
@@ -41,9 +50,8 @@ bool installTranslation(const QLocale& locale, const QString& name)
         return false;
     const QString object = QStringLiteral("translation of ") + name;
     delete application->findChild<QTranslator*>(object, Qt::FindDirectChildrenOnly);
-    auto catalogue = std::make_unique<QTranslator>();
-    if (!catalogue->load(
-            locale, name, QStringLiteral("_"), QStringLiteral(":/pelloric/translations")))
+    std::unique_ptr<QTranslator> catalogue = catalogueOf(locale, name);
+    if (!catalogue)
         return false;
     catalogue->setObjectName(object);
     catalogue->setParent(application);

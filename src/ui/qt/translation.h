@@ -7,11 +7,19 @@
 
 #include <QLocale>
 #include <QString>
+#include <QTranslator>
+
+#include <memory>
 
 namespace pelloric::qt {
 
 /// The context of the phrases of the core in the catalogues.
 inline constexpr char PhraseContext[] = "Phrase";
+
+/// A catalogue that is compiled in; null where there is none for the locale. Needs no application
+/// object.
+/// @param name  see `installTranslation`
+std::unique_ptr<QTranslator> catalogueOf(const QLocale& locale, const QString& name);
 
 /// The same as `installTranslation` of one argument from another catalogue that is compiled in, for
 /// programs that add texts of their own.

@@ -334,12 +334,97 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
         EXPECT_EQ(ended.status, row.status) << row.arguments;
         EXPECT_TRUE(ended.errors.starts_with("pelloric: ")) << row.arguments;
         EXPECT_TRUE(has(ended.errors, row.message)) << row.arguments << '\n' << ended.errors;
-        EXPECT_EQ(std::count(ended.errors.begin(), ended.errors.end(), '\n'), 1) << row.arguments;
+        const bool tellsUsage = has(ended.errors, "\nusage: pelloric ");
+        EXPECT_EQ(std::count(ended.errors.begin(), ended.errors.end(), '\n'), tellsUsage ? 2 : 1)
+            << row.arguments;
         EXPECT_EQ(ended.output, "") << row.arguments;
     }
     EXPECT_EQ(folder_.read("kept.pdf"), "old");
     EXPECT_EQ(folder_.read("table.svg"), "a\n1\n");
     EXPECT_EQ(folder_.names().size(), 8U); // the files above
+}
+
+TEST_F(Program, SaysHowACommandIsCalledWhereItsArgumentsDoNotFit)
+{
+    struct Row {
+        const char* arguments;
+        const char* errors; ///< behind the program's name, up to the advice to ask for help
+    };
+    const Row rows[] = {
+        { "demo t.csv",
+            "one argument too many: t.csv; quote names with blanks\n"
+            "usage: pelloric demo; for example: pelloric demo" },
+        { "preview",
+            "the file is missing\n"
+            "usage: pelloric preview FILE; for example: pelloric preview stock.csv" },
+        { "open --bogus",
+            "Unknown option 'bogus'.\n"
+            "usage: pelloric open FILE.ostl; for example: pelloric open stock.ostl" },
+        { "export",
+            "the file is missing\nusage: pelloric export FILE... -o OUT; for example: pelloric "
+            "export "
+            "stock.csv -o stock.pdf" },
+        { "export t.csv -o",
+            "Missing value after '-o'.\nusage: pelloric export FILE... -o OUT; for example: "
+            "pelloric "
+            "export stock.csv -o stock.pdf" },
+        { "run",
+            "say which script to run\nusage: pelloric run SCRIPT.js [ARGUMENT...]; for example: "
+            "pelloric run report.js" },
+        { "print",
+            "the file is missing\nusage: pelloric print FILE; for example: pelloric print "
+            "stock.csv" },
+        { "printers x",
+            "one argument too many: x; quote names with blanks\n"
+            "usage: pelloric printers; for example: pelloric printers" },
+        { "settings x",
+            "one argument too many: x; quote names with blanks\n"
+            "usage: pelloric settings; for example: pelloric settings --path" },
+        { "completion",
+            "the file is missing\n"
+            "usage: pelloric completion SHELL; for example: pelloric completion bash" },
+    };
+    for (const Row& row : rows) {
+        const QStringList arguments = words(row.arguments);
+        const Ended ended = run(arguments);
+        EXPECT_EQ(ended.status, 2) << row.arguments;
+        EXPECT_EQ(ended.errors,
+            std::string("pelloric: ") + row.errors + "; \"pelloric help "
+                + arguments.front().toStdString() + "\" says more\n");
+    }
+}
+
+TEST_F(Program, SpeaksTheLanguageOfTheLocaleExceptToPrograms)
+{
+    const auto in = [this](const char* locale) {
+        surround = [locale](QProcess&, QProcessEnvironment& environment) {
+            environment.remove(QStringLiteral("LANGUAGE"));
+            environment.insert(QStringLiteral("LC_ALL"), QString::fromLatin1(locale));
+        };
+    };
+    folder_.write("t.csv", "a;b\n1;2\n3\n4;5\n");
+    in("de_DE.UTF-8");
+    EXPECT_EQ(run(words("export no.csv -o t.pdf")).errors,
+        "pelloric: no.csv: diese Datei gibt es nicht\n");
+    EXPECT_EQ(run(words("export t.csv -o t.pdf")).errors,
+        "pelloric: t.csv: 1 von 3 Zeilen haben nicht so viele Werte wie die Titelzeile, die erste "
+        "bei "
+        "Dateizeile 3; ist das eine Tabelle mit \";\" zwischen den Werten?\n");
+    EXPECT_TRUE(
+        has(run(words("help export")).output, "--merge                 gleiche Nachbarzellen"));
+    EXPECT_TRUE(
+        has(run(words("export t.csv -o t.pdf --json")).output, "1 of 3 rows have not as many"));
+    folder_.write(
+        "t.js", "try { new Sorvane().Currentpage = 'x'; } catch (e) { print(e.message); }");
+    EXPECT_TRUE(has(run(words("run t.js")).output, "Type mismatch"));
+    in("zh_CN.UTF-8");
+    EXPECT_EQ(run(words("export no.csv -o t.pdf")).errors, "pelloric: no.csv：没有这个文件\n");
+    for (const char* const other : { "C.UTF-8", "fi_FI.UTF-8", "en_GB.UTF-8" }) {
+        in(other);
+        EXPECT_EQ(run(words("export no.csv -o t.pdf")).errors,
+            "pelloric: no.csv: there is no such file\n")
+            << other;
+    }
 }
 
 TEST_F(Program, SaysOfADamagedDocumentThatItOpensWhatItSaysWhenItExportsIt)
