@@ -9,6 +9,7 @@ set(CPACK_PACKAGE_NAME pelloric)
 set(CPACK_PACKAGE_VENDOR "The Pelloric authors")
 set(CPACK_PACKAGE_CONTACT "The Pelloric authors <authors@pelloric.invalid>")
 set(CPACK_PACKAGE_VERSION "${PROJECT_VERSION}")
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "") # the first line of each description below is its summary
 set(CPACK_PACKAGING_INSTALL_PREFIX /usr)
 set(CPACK_STRIP_FILES ON)
 set(CPACK_COMPONENTS_ALL runtime development tools designer)
@@ -26,6 +27,7 @@ set(same "${runtime} (= ${PROJECT_VERSION})")
 
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_NAME "${runtime}")
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_SECTION libs)
+set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA "${PROJECT_SOURCE_DIR}/packaging/triggers")
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_RECOMMENDS "libqt6sql6-sqlite, fonts-arphic-uming, fonts-dejavu-core")
 set(CPACK_COMPONENT_RUNTIME_DESCRIPTION "print preview and printing of grids (libraries)
  Pelloric gives programs with a grid on their form a print preview, real
@@ -48,8 +50,9 @@ set(CPACK_DEBIAN_TOOLS_PACKAGE_SECTION utils)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS libqt6sql6-sqlite)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_RECOMMENDS "fonts-arphic-uming")
 set(CPACK_COMPONENT_TOOLS_DESCRIPTION "previews, exports and prints tables
- The program pelloric lays out CSV and TSV files and tables of SQLite
- databases into pages, and shows, prints or saves them as PDF, PNG or SVG.")
+ The program pelloric lays out CSV, TSV and JSON files, office sheets and
+ tables of SQLite databases into pages, and shows, prints or saves them as
+ PDF, PNG or SVG.")
 
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_NAME pelloric-designer)
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_SECTION libdevel)
