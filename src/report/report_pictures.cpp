@@ -4,6 +4,7 @@
 #include "report/report_pictures.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 #include <pelloric/options.h>
@@ -22,7 +23,7 @@ Tpoint fitted(TextView file, Tpoint room, PictureService& pictures)
 {
     const auto size = pictures.pixelSize(file);
     if (!size || size->x <= 0 || size->y <= 0)
-        throw RunTimeError(ErrorNumber::FileNotFound, Text(file) + u" is no picture");
+        throw RunTimeError(ErrorNumber::FileNotFound, phrase(u"%1 is no picture", { file }));
     const double scale
         = std::min(static_cast<double>(room.x) / size->x, static_cast<double>(room.y) / size->y);
     return { std::max(1, roundToInt32(size->x * scale)),

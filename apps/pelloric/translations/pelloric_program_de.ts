@@ -773,6 +773,30 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
         <source>there is no display to show windows on; &quot;pelloric export&quot; and &quot;pelloric demo --walk OUT&quot; need none</source>
         <translation>es gibt keine Anzeige für Fenster; „pelloric export“ und „pelloric demo --walk OUT“ brauchen keine</translation>
     </message>
+    <message>
+        <source>a document file holds no icons of cells; they were left out</source>
+        <translation>eine Dokumentdatei fasst keine Symbole von Zellen; sie wurden weggelassen</translation>
+    </message>
+    <message>
+        <source>a document file has no code for some characters; %1 of its texts show &quot;?&quot; for them</source>
+        <translation>eine Dokumentdatei hat für manche Zeichen keinen Code; %1 ihrer Texte zeigen „?“ dafür</translation>
+    </message>
+    <message>
+        <source>1 cell</source>
+        <translation>1 Zelle</translation>
+    </message>
+    <message>
+        <source>%1 cells</source>
+        <translation>%1 Zellen</translation>
+    </message>
+    <message>
+        <source>no row is printed: --where %1 holds for none</source>
+        <translation>keine Zeile wird gedruckt: --where %1 gilt für keine</translation>
+    </message>
+    <message>
+        <source>the total of %1 leaves out %2, being no numbers</source>
+        <translation>die Summe von %1 lässt %2 aus, die keine Zahlen sind</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

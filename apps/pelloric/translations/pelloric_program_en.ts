@@ -772,6 +772,30 @@ An exception that it does not catch ends the program with status 1.
         <source>there is no display to show windows on; &quot;pelloric export&quot; and &quot;pelloric demo --walk OUT&quot; need none</source>
         <translation>there is no display to show windows on; &quot;pelloric export&quot; and &quot;pelloric demo --walk OUT&quot; need none</translation>
     </message>
+    <message>
+        <source>a document file holds no icons of cells; they were left out</source>
+        <translation>a document file holds no icons of cells; they were left out</translation>
+    </message>
+    <message>
+        <source>a document file has no code for some characters; %1 of its texts show &quot;?&quot; for them</source>
+        <translation>a document file has no code for some characters; %1 of its texts show &quot;?&quot; for them</translation>
+    </message>
+    <message>
+        <source>1 cell</source>
+        <translation>1 cell</translation>
+    </message>
+    <message>
+        <source>%1 cells</source>
+        <translation>%1 cells</translation>
+    </message>
+    <message>
+        <source>no row is printed: --where %1 holds for none</source>
+        <translation>no row is printed: --where %1 holds for none</translation>
+    </message>
+    <message>
+        <source>the total of %1 leaves out %2, being no numbers</source>
+        <translation>the total of %1 leaves out %2, being no numbers</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

@@ -766,6 +766,30 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
         <source>there is no display to show windows on; &quot;pelloric export&quot; and &quot;pelloric demo --walk OUT&quot; need none</source>
         <translation>没有可显示窗口的显示器；“pelloric export”和“pelloric demo --walk OUT”不需要显示器</translation>
     </message>
+    <message>
+        <source>a document file holds no icons of cells; they were left out</source>
+        <translation>文档文件不含单元格的图标；图标已略去</translation>
+    </message>
+    <message>
+        <source>a document file has no code for some characters; %1 of its texts show &quot;?&quot; for them</source>
+        <translation>文档文件无法表示某些字符；其中 %1 处文字以“?”代替</translation>
+    </message>
+    <message>
+        <source>1 cell</source>
+        <translation>1 个单元格</translation>
+    </message>
+    <message>
+        <source>%1 cells</source>
+        <translation>%1 个单元格</translation>
+    </message>
+    <message>
+        <source>no row is printed: --where %1 holds for none</source>
+        <translation>没有打印任何行：--where %1 对任何行都不成立</translation>
+    </message>
+    <message>
+        <source>the total of %1 leaves out %2, being no numbers</source>
+        <translation>%1 的合计略去了 %2，因为不是数字</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

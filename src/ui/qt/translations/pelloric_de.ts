@@ -810,6 +810,10 @@
         <source>this is an Arrow file; save its table as CSV</source>
         <translation>das ist eine Arrow-Datei; speichern Sie ihre Tabelle als CSV</translation>
     </message>
+    <message>
+        <source>%1 is no picture</source>
+        <translation>%1 ist kein Bild</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

@@ -810,6 +810,10 @@
         <source>this is an Arrow file; save its table as CSV</source>
         <translation>this is an Arrow file; save its table as CSV</translation>
     </message>
+    <message>
+        <source>%1 is no picture</source>
+        <translation>%1 is no picture</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

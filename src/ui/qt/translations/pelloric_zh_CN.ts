@@ -810,6 +810,10 @@
         <source>this is an Arrow file; save its table as CSV</source>
         <translation>这是 Arrow 文件；请把其中的表格另存为 CSV</translation>
     </message>
+    <message>
+        <source>%1 is no picture</source>
+        <translation>%1 不是图片</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
