@@ -30,37 +30,37 @@ set(CPACK_DEBIAN_RUNTIME_PACKAGE_SECTION libs)
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA "${PROJECT_SOURCE_DIR}/packaging/triggers")
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_RECOMMENDS "libqt6sql6-sqlite, fonts-arphic-uming, fonts-dejavu-core")
 set(CPACK_COMPONENT_RUNTIME_DESCRIPTION "print preview and printing of grids (libraries)
- Pelloric gives programs with a grid on their form a print preview, real
- printing, and PDF, PNG and SVG files of the same pages.
- .
- This package holds the libraries that such programs run with.")
+Pelloric gives programs with a grid on their form a print preview, real
+printing, and PDF, PNG and SVG files of the same pages.
+
+This package holds the libraries that such programs run with.")
 
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_NAME libpelloric-dev)
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_DEPENDS
     "${same}, qt6-base-dev, qt6-declarative-dev, qt6-svg-dev, libcups2-dev, libpng-dev, libuchardet-dev, libzip-dev")
 set(CPACK_COMPONENT_DEVELOPMENT_DESCRIPTION "print preview and printing of grids (development files)
- Pelloric gives programs with a grid on their form a print preview, real
- printing, and PDF, PNG and SVG files of the same pages.
- .
- This package holds the headers, and the package that CMake finds.")
+Pelloric gives programs with a grid on their form a print preview, real
+printing, and PDF, PNG and SVG files of the same pages.
+
+This package holds the headers, and the package that CMake finds.")
 
 set(CPACK_DEBIAN_TOOLS_PACKAGE_NAME pelloric)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_SECTION utils)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_DEPENDS libqt6sql6-sqlite)
 set(CPACK_DEBIAN_TOOLS_PACKAGE_RECOMMENDS "fonts-arphic-uming")
 set(CPACK_COMPONENT_TOOLS_DESCRIPTION "previews, exports and prints tables
- The program pelloric lays out CSV, TSV and JSON files, office sheets and
- tables of SQLite databases into pages, and shows, prints or saves them as
- PDF, PNG or SVG.")
+The program pelloric lays out CSV, TSV and JSON files, office sheets and
+tables of SQLite databases into pages, and shows, prints or saves them as
+PDF, PNG or SVG.")
 
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_NAME pelloric-designer)
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_DEPENDS "${same}")
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_ENHANCES designer-qt6)
 set(CPACK_COMPONENT_DESIGNER_DESCRIPTION "Qt Designer plugin of the Pelloric controls
- With this plugin the two controls of Pelloric, the preview facade and the
- page canvas, stand in the widget box of Qt Designer.")
+With this plugin the two controls of Pelloric, the preview facade and the
+page canvas, stand in the widget box of Qt Designer.")
 
 # Each package tells its licence and what has changed, as Debian asks.
 find_program(GZIP gzip)
