@@ -406,10 +406,8 @@ TEST_F(Program, SpeaksTheLanguageOfTheLocaleExceptToPrograms)
     in("de_DE.UTF-8");
     EXPECT_EQ(run(words("export no.csv -o t.pdf")).errors,
         "pelloric: no.csv: diese Datei gibt es nicht\n");
-    EXPECT_EQ(run(words("export t.csv -o t.pdf")).errors,
-        "pelloric: t.csv: 1 von 3 Zeilen haben nicht so viele Werte wie die Titelzeile, die erste "
-        "bei "
-        "Dateizeile 3; ist das eine Tabelle mit \";\" zwischen den Werten?\n");
+    EXPECT_TRUE(has(run(words("export t.csv -o t.pdf")).errors,
+        "pelloric: t.csv: 1 von 3 Zeilen haben nicht so viele Werte wie die Titelzeile"));
     EXPECT_TRUE(
         has(run(words("help export")).output, "--merge                 gleiche Nachbarzellen"));
     EXPECT_TRUE(
