@@ -488,15 +488,15 @@
     </message>
     <message>
         <source>%1; restore the defaults</source>
-        <translation>%1; stellen Sie die Vorgaben wieder her</translation>
+        <translation>%1; stellen Sie die Standardwerte wieder her</translation>
     </message>
     <message>
         <source>%1; correct it in %2 or restore the defaults</source>
-        <translation>%1; berichtigen Sie dies in „%2“, oder stellen Sie die Vorgaben wieder her</translation>
+        <translation>%1; berichtigen Sie dies in „%2“, oder stellen Sie die Standardwerte wieder her</translation>
     </message>
     <message>
         <source>%1, which holds paper, margins and style; restore the defaults</source>
-        <translation>%1 mit Papier, Rändern und Stil; stellen Sie die Vorgaben wieder her</translation>
+        <translation>%1 mit Papier, Rändern und Stil; stellen Sie die Standardwerte wieder her</translation>
     </message>
     <message>
         <source>a cell holds an object</source>

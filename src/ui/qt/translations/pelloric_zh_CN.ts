@@ -488,15 +488,15 @@
     </message>
     <message>
         <source>%1; restore the defaults</source>
-        <translation>%1；请恢复默认设置</translation>
+        <translation>%1；请恢复默认值</translation>
     </message>
     <message>
         <source>%1; correct it in %2 or restore the defaults</source>
-        <translation>%1；请在“%2”中更正，或恢复默认设置</translation>
+        <translation>%1；请在“%2”中更正，或恢复默认值</translation>
     </message>
     <message>
         <source>%1, which holds paper, margins and style; restore the defaults</source>
-        <translation>%1（保存纸张、边距和样式）；请恢复默认设置</translation>
+        <translation>%1（保存纸张、边距和样式）；请恢复默认值</translation>
     </message>
     <message>
         <source>a cell holds an object</source>
