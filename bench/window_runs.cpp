@@ -72,9 +72,9 @@ public:
         printers_.current = u"bin";
         platform_.usePrinter(printer_, printers_);
         deployDefaultSettings(platform_.record());
-        PreviewPrompts prompts = standardPrompts();
+        qt::PreviewPrompts prompts = qt::standardPrompts();
         prompts.chooseFile
-            = [this](QWidget&, const FileQuestion&) { return folder_.filePath("report.pdf"); };
+            = [this](QWidget&, const qt::FileQuestion&) { return folder_.filePath("report.pdf"); };
         opener_.setPrompts(std::move(prompts));
     }
 
