@@ -29,18 +29,6 @@ void readByMembers(const FlexRows& rows, TableRowSet& table, Pulse& pulse)
     }
 }
 
-/// Windows live between rows only, for they may change the grid.
-void readWhole(RowCells& cells, const FlexRows& rows, TableRowSet& table, Pulse& pulse)
-{
-    for (std::int32_t row = rows.first; row < rows.end; ++row) {
-        table.addRecord();
-        int field = 0;
-        cells.readRow(
-            row, rows.columns, [&](TextView text) { table.setLast(field++, Value::ofText(text)); });
-        pulse.beat(rows.columns.size());
-    }
-}
-
 void readKept(const KeptCells& cells, const FlexRows& rows, TableRowSet& table, Pulse& pulse)
 {
     std::vector<TextView> texts(static_cast<std::size_t>(rows.gridColumns));
@@ -66,6 +54,17 @@ void Pulse::beat(std::size_t cells)
     loop_->keepAlive();
 }
 
+void readWholeRows(RowCells& cells, const WholeRows& rows, TableRowSet& table, Pulse& pulse)
+{
+    for (std::int32_t row = rows.first; row < rows.end; ++row) {
+        table.addRecord();
+        int field = 0;
+        cells.readRow(
+            row, rows.columns, [&](TextView text) { table.setLast(field++, Value::ofText(text)); });
+        pulse.beat(rows.columns.size());
+    }
+}
+
 std::shared_ptr<const TextStore> readFlexRows(
     const FlexRows& rows, TableRowSet& table, Pulse& pulse)
 {
@@ -81,7 +80,7 @@ std::shared_ptr<const TextStore> readFlexRows(
     FlexRows below = rows;
     below.first = std::max(1, rows.first);
     if (kept == nullptr) {
-        readWhole(*whole, below, table, pulse);
+        readWholeRows(*whole, { below.first, below.end, below.columns }, table, pulse);
         return nullptr;
     }
     std::shared_ptr<const TextStore> texts = kept->keptTexts();

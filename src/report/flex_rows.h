@@ -11,6 +11,7 @@
 namespace pelloric {
 
 class MessageLoop;
+class RowCells;
 class TableRowSet;
 class TextStore;
 
@@ -43,6 +44,17 @@ struct FlexRows {
     std::int32_t first = 1; ///< 0: the titles
     std::int32_t end = 1; ///< behind the last
 };
+
+/// Rows that are read as a whole.
+struct WholeRows {
+    std::int32_t first = 1;
+    std::int32_t end = 1; ///< behind the last
+    std::span<const int> columns; ///< of the grid, from 0
+};
+
+/// Reads rows into a table. Windows live between rows only, for they may change the grid.
+/// @throws RunTimeError as `readFlexRows`
+void readWholeRows(RowCells& cells, const WholeRows& rows, TableRowSet& table, Pulse& pulse);
 
 /// Reads rows of a flex grid into a table: one by one through its members, or the faster way that
 /// the grid offers, see `KeptCells` and `RowCells`.

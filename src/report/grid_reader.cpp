@@ -8,6 +8,7 @@
 #include "platform/cell_look.h"
 #include "platform/numbers.h"
 #include "platform/phrase.h"
+#include "platform/row_cells.h"
 #include "platform/run_time_error.h"
 #include "report/flex_rows.h"
 #include "report/late_bound_rows.h"
@@ -248,6 +249,25 @@ std::vector<PrintedColumn> readHeaders(
     return columns;
 }
 
+void readItems(
+    const Collection& items, std::span<const int> columns, TableRowSet& table, Pulse& pulse)
+{
+    MemberOfItems textMember(u"Text");
+    MemberOfItems subItemsMember(u"SubItems");
+    for (int number = 1; number <= items.count(); ++number) {
+        AutomationObject& item = items.item(number);
+        table.addRecord();
+        int field = 0;
+        for (const int column : columns) {
+            pulse.beat();
+            const Value position = Value::ofNumber(column);
+            table.setLast(field++,
+                column == 0 ? item.get(textMember.of(item), {})
+                            : item.get(subItemsMember.of(item), { &position, 1 }));
+        }
+    }
+}
+
 GridTable readListView(AutomationObject& object, const GridRequest& request)
 {
     GridTable result;
@@ -256,24 +276,15 @@ GridTable readListView(AutomationObject& object, const GridRequest& request)
     if (columns.empty())
         return {};
     const Collection items(getMember(object, u"ListItems").toObject());
-    MemberOfItems textMember(u"Text");
-    MemberOfItems subItemsMember(u"SubItems");
     Pulse pulse(request.loop);
     table.reserveRecords(items.count());
-    for (int number = 1; number <= items.count(); ++number) {
-        AutomationObject& item = items.item(number);
-        table.addRecord();
-        int field = 0;
-        for (const PrintedColumn& column : columns) {
-            pulse.beat();
-            const Value position = Value::ofNumber(column.position);
-            table.setLast(field++,
-                column.position == 0 ? item.get(textMember.of(item), {})
-                                     : item.get(subItemsMember.of(item), { &position, 1 }));
-        }
-    }
+    const std::vector<int> positions = positionsOf(columns);
+    if (auto* const whole = dynamic_cast<RowCells*>(&object))
+        readWholeRows(*whole, { 1, items.count() + 1, positions }, table, pulse);
+    else
+        readItems(items, positions, table, pulse);
     setWidths(result, widthsOf(columns), request);
-    result.gridColumns = positionsOf(columns);
+    result.gridColumns = positions;
     GridTableParts::finishTable(result);
     return result;
 }

@@ -8,7 +8,6 @@
 #include <QAbstractItemView>
 #include <QItemDelegate>
 
-#include <array>
 #include <limits>
 #include <typeinfo>
 
@@ -77,13 +76,11 @@ CellText::DelegateKind CellText::kindOf(const QAbstractItemDelegate* delegate)
     return lastKind_;
 }
 
-/// What a delegate does that changes nothing, without its fonts, colours and icons.
+/// What a delegate does that changes nothing, without its fonts, colours and icons. Most models
+/// answer several roles one after the other, too, and then copy every answer.
 void CellText::readPlain(const QModelIndex& index, DelegateKind kind)
 {
-    std::array<QModelRoleData, 2> roles { QModelRoleData(Qt::DisplayRole),
-        QModelRoleData(Qt::CheckStateRole) };
-    index.multiData(roles);
-    setText(shown(roles[0].data(), kind), roles[1].data());
+    setText(shown(index.data(Qt::DisplayRole), kind), index.data(Qt::CheckStateRole));
 }
 
 void CellText::readStyled(const QStyledItemDelegate& delegate, const QModelIndex& index)
@@ -98,10 +95,10 @@ void CellText::readStyled(const QStyledItemDelegate& delegate, const QModelIndex
 
 QString CellText::shown(const QVariant& value, DelegateKind kind) const
 {
+    if (value.typeId() == QMetaType::QString)
+        return *static_cast<const QString*>(value.constData());
     if (value.isNull())
         return {};
-    if (value.typeId() == QMetaType::QString)
-        return value.toString();
     if (kind == DelegateKind::Numbers && value.typeId() == QMetaType::Double)
         return option_.locale.toString(
             value.toDouble(), 'g', std::numeric_limits<double>::digits10);

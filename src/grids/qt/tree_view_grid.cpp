@@ -209,6 +209,17 @@ struct TreeViewGrid::Source {
         look.indent = twipsOfPixels(steps * tree->indentation(), tree->logicalDpiX());
     }
 
+    /// The text of a row in a column.
+    TextView cell(int row, int column)
+    {
+        const QAbstractItemView& shown = view();
+        const QModelIndex& first = this->row(row);
+        const int section = logical(column);
+        if (section > 0 && isSpanned(first))
+            return {};
+        return text.of(shown, first.siblingAtColumn(section));
+    }
+
     const QModelIndex& row(int place) const
     {
         const auto at = static_cast<std::size_t>(place);
@@ -301,10 +312,11 @@ public:
     Value get(MemberId member, std::span<const Value> arguments) override
     {
         if (member == ItemText)
-            return Value::ofText(cell(0));
+            return Value::ofText(source_.cell(place_, 0));
         if (member != SubItems)
             refuseMember(ItemNames, member);
-        return Value::ofText(cell(indexArgument(arguments, 0, 1, source_.columns.count() - 1)));
+        const int column = indexArgument(arguments, 0, 1, source_.columns.count() - 1);
+        return Value::ofText(source_.cell(place_, column));
     }
 
     void put(MemberId member, std::span<const Value>, const Value&) override
@@ -313,16 +325,6 @@ public:
     }
 
 private:
-    TextView cell(int column)
-    {
-        const QAbstractItemView& view = source_.view();
-        const QModelIndex& row = source_.row(place_);
-        const int logical = source_.logical(column);
-        if (logical > 0 && source_.isSpanned(row))
-            return {};
-        return source_.text.of(view, row.siblingAtColumn(logical));
-    }
-
     Source& source_;
     int place_ = 0;
 };
@@ -404,6 +406,16 @@ Value TreeViewGrid::get(MemberId member, std::span<const Value> arguments)
 void TreeViewGrid::put(MemberId member, std::span<const Value>, const Value&)
 {
     refuseMember(GridNames, member);
+}
+
+void TreeViewGrid::readRow(
+    std::int32_t row, std::span<const int> columns, const std::function<void(TextView text)>& take)
+{
+    for (const int column : columns) {
+        if (column < 0 || column >= source_->columns.count())
+            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the list has changed");
+        take(source_->cell(row - 1, column));
+    }
 }
 
 /// Trees and lists draw no lines between cells.

@@ -5,6 +5,7 @@
 
 #include "platform/automation_object.h"
 #include "platform/cell_look.h"
+#include "platform/row_cells.h"
 
 #include <memory>
 
@@ -22,7 +23,7 @@ namespace pelloric::qt {
 /// or not: those of branches that are open, without hidden rows; what the first column of a row
 /// spans is empty. Both count from 1. Reading `ColumnHeaders` takes the columns anew, reading
 /// `ListItems` the rows.
-class TreeViewGrid final : public AutomationObject, public CellLooks {
+class TreeViewGrid final : public AutomationObject, public CellLooks, public RowCells {
 public:
     /// @param view  borrowed; once it is gone, its members are the object-missing error
     explicit TreeViewGrid(QTreeView& view);
@@ -36,6 +37,9 @@ public:
     Value get(MemberId member, std::span<const Value> arguments) override;
     void put(MemberId member, std::span<const Value> arguments, const Value& value) override;
     CellLooks* cellLooks() override { return this; }
+
+    void readRow(std::int32_t row, std::span<const int> columns,
+        const std::function<void(TextView text)>& take) override;
 
     GridLook gridLook() override;
     void readLook(std::int32_t row, std::int32_t column, CellLook& look) override;
