@@ -62,7 +62,7 @@ SeparatedValues::SeparatedValues(std::string_view text, ValuesDialect dialect)
 
 bool SeparatedValues::nextRow()
 {
-    values_.clear();
+    valueCount_ = 0;
     scratch_.clear();
     hasLineBreak_ = false;
     hasStrayQuote_ = false;
@@ -127,7 +127,7 @@ bool SeparatedValues::readQuoted(std::size_t quote)
     if (hasDoubled)
         addUnquoted(inner);
     else
-        values_.push_back({ begin, inner.size(), false });
+        add({ begin, inner.size(), false });
     position_ = end + 1;
     return true;
 }
@@ -147,7 +147,7 @@ void SeparatedValues::readPlain()
     const std::string_view value = withoutBlanks(text_.substr(begin, end - begin));
     const std::size_t offset
         = value.empty() ? begin : static_cast<std::size_t>(value.data() - text_.data());
-    values_.push_back({ offset, value.size(), false });
+    add({ offset, value.size(), false });
     hasStrayQuote_ = hasStrayQuote_ || (seen & IsQuote) != 0;
 }
 
@@ -159,7 +159,7 @@ void SeparatedValues::addUnquoted(std::string_view inner)
         scratch_ += inner[at];
         at += inner[at] == '"' ? 1 : 0;
     }
-    values_.push_back({ begin, scratch_.size() - begin, true });
+    add({ begin, scratch_.size() - begin, true });
 }
 
 char findDelimiter(std::string_view start)

@@ -34,7 +34,7 @@ public:
     /// Goes to the next row. @return  false: there is none
     bool nextRow();
 
-    std::size_t valueCount() const { return values_.size(); }
+    std::size_t valueCount() const { return valueCount_; }
     /// A value of the row, from 0; borrowed until the next row.
     std::string_view value(std::size_t index) const
     {
@@ -76,6 +76,12 @@ private:
     bool readQuoted(std::size_t quote);
     void readPlain();
     void addUnquoted(std::string_view inner);
+    void add(const Piece& piece)
+    {
+        if (valueCount_ == values_.size())
+            values_.resize(2 * valueCount_ + 16);
+        values_[valueCount_++] = piece;
+    }
 
     std::string_view text_;
     ValuesDialect dialect_;
@@ -85,7 +91,8 @@ private:
     std::int64_t rowLine_ = 1;
     bool hasLineBreak_ = false;
     bool hasStrayQuote_ = false;
-    std::vector<Piece> values_;
+    std::vector<Piece> values_; ///< of the row, and room
+    std::size_t valueCount_ = 0;
     std::string scratch_;
 };
 
