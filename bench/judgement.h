@@ -3,22 +3,19 @@
 
 #pragma once
 
-#include <chrono>
 #include <cstdint>
 #include <cstdio>
+#include <ctime>
 
 namespace pelloric::bench {
 
-/// Seconds since it was made.
+/// Seconds of the processor since it was made, so that other work on the machine counts little.
 class StopWatch {
 public:
-    double seconds() const
-    {
-        return std::chrono::duration<double>(std::chrono::steady_clock::now() - start_).count();
-    }
+    double seconds() const { return static_cast<double>(std::clock() - start_) / CLOCKS_PER_SEC; }
 
 private:
-    std::chrono::steady_clock::time_point start_ = std::chrono::steady_clock::now();
+    std::clock_t start_ = std::clock();
 };
 
 /// Prints how long something took for so many rows.
