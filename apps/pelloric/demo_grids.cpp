@@ -184,6 +184,7 @@ QTreeWidget* makeZoneTree(const TableGrid& zones)
     constexpr int Zone = 2;
     constexpr int Coordinates = 3;
     auto* const view = new QTreeWidget;
+    view->setUniformRowHeights(true); // rows that are laid out before have no height then
     view->setHeaderLabels({ QCoreApplication::translate("DemoGrids", "Zone"),
         QCoreApplication::translate("DemoGrids", "Country"),
         QCoreApplication::translate("DemoGrids", "Coordinates") });

@@ -170,7 +170,6 @@ void DemoWindow::addShownPages(const TableGrid& wines, const QString& samples)
                 } },
         classes);
     QTreeWidget* const tree = makeZoneTree(readSample(samples + QStringLiteral("/time-zones.tsv")));
-    tree->setUniformRowHeights(true);
     fitColumns(*tree->header());
     addPage({ QStringLiteral("Tree"), tr("&Tree"),
                 tr("A tree widget with branches, icons and ticks, printed as it is shown."),

@@ -13,6 +13,7 @@
 #include <QAbstractButton>
 #include <QAbstractItemView>
 #include <QApplication>
+#include <QHeaderView>
 #include <QInputDialog>
 #include <QLabel>
 #include <QTabWidget>
@@ -98,6 +99,23 @@ TEST_F(DemoWindowTest, LetsTheTabKeyWalkFromTheGridToItsButton)
         ASSERT_NE(grid + 1, stops.end());
         EXPECT_EQ((*(grid + 1))->objectName(), QStringLiteral("preview") + view->objectName());
     });
+}
+
+TEST_F(DemoWindowTest, ShowsTheRowsOfEveryGrid)
+{
+    show();
+    int grids = 0;
+    onEachPage([&] {
+        for (const QAbstractItemView* const view : demo_->findChildren<QAbstractItemView*>()) {
+            if (!view->isVisible() || qobject_cast<const QHeaderView*>(view))
+                continue;
+            ++grids;
+            const QModelIndex middle = view->indexAt(
+                QPoint(view->viewport()->width() / 2, view->viewport()->height() / 2));
+            EXPECT_TRUE(middle.isValid()) << demo_->pages().currentIndex();
+        }
+    });
+    EXPECT_EQ(grids, demo_->pages().count());
 }
 
 TEST_F(DemoWindowTest, HasNoAltKeyTwice)
