@@ -10,7 +10,11 @@
 #include <pelloric/grids.h>
 #include <pelloric/printing.h>
 
+#include <QHeaderView>
 #include <QProcess>
+#include <QRegularExpression>
+#include <QSortFilterProxyModel>
+#include <QStandardItemModel>
 #include <QTableWidget>
 
 #include <gtest/gtest.h>
@@ -138,6 +142,63 @@ TEST(LiveView, IsExportedInOneCallWithOptions)
     request.options.columns = { u"Nothing" };
     EXPECT_EQ(errorOf([&] { exportPdf(view, request); }), ErrorNumber::InvalidCall);
     EXPECT_EQ(folder.names().size(), 4U);
+}
+
+TEST(LiveView, AddsUpTheRowsThatItShowsInTheirOrder)
+{
+    struct Part {
+        const char* kind;
+        double price;
+    };
+    constexpr Part Parts[] = { { "bolt", 0.25 }, { "nut", 1.5 }, { "bolt", 10 }, { "left out", 99 },
+        { "nut", 0.125 }, { "bolt", 2 } };
+    QStandardItemModel model(0, 2);
+    model.setHorizontalHeaderLabels({ "Kind", "Price" });
+    for (const Part& part : Parts) {
+        auto* const price = new QStandardItem;
+        price->setData(part.price, Qt::DisplayRole);
+        model.appendRow({ new QStandardItem(QString::fromLatin1(part.kind)), price });
+    }
+    QSortFilterProxyModel proxy;
+    proxy.setSourceModel(&model);
+    proxy.setFilterKeyColumn(0);
+    proxy.setFilterRegularExpression(QStringLiteral("bolt|nut"));
+    proxy.sort(1, Qt::DescendingOrder); // 10, 2, 1.5, 0.25, 0.125
+    proxy.sort(0, Qt::DescendingOrder); // the nuts first
+    QTableView view;
+    view.setModel(&proxy);
+    view.horizontalHeader()->moveSection(1, 0);
+    view.setRowHidden(3, true); // of the bolts
+    view.setColumnWidth(1, 300);
+    ReportOptions options;
+    options.groupColumns = { u"Kind" };
+    options.totals = { { u"Price" }, { u"Price", AggregateFunction::Minimum } };
+    Report report;
+    report.useSettings(ReportSettings());
+    report.setReportOptions(options);
+    report.build(view);
+    double bolts = 0;
+    double least = 1000;
+    for (const int row : { 2, 4 }) {
+        EXPECT_EQ(proxy.index(row, 0).data().toString(), "bolt");
+        bolts += proxy.index(row, 1).data().toDouble();
+        least = std::min(least, proxy.index(row, 1).data().toDouble());
+    }
+    const QStringList lines = report.pageText(1).split(u'\n');
+    const auto follows = [&](const char* name, double number) {
+        const auto at = lines.indexOf(
+            QRegularExpression(u'^' + QString::fromLatin1(name) + QStringLiteral(".*")));
+        EXPECT_GE(at, 0) << name;
+        EXPECT_EQ(lines.value(at).section(u' ', -1).toDouble(), number) << name;
+    };
+    follows("nut: Sum", 1.625);
+    follows("nut: Minimum", 0.125);
+    follows("bolt: Sum", bolts);
+    follows("bolt: Minimum", least);
+    follows("Total: Sum", bolts + 1.625);
+    EXPECT_LT(lines.indexOf(QRegularExpression("^nut: Sum.*")),
+        lines.indexOf(QRegularExpression("^bolt: Sum.*")));
+    EXPECT_EQ(lines.count(QStringLiteral("bolt")), 2);
 }
 
 TEST(LiveView, HasTicksThatKeepTheirShareOfTheBoxAtEveryResolution)
