@@ -17,6 +17,8 @@
 #include <QStyle>
 #include <QStyleOptionComboBox>
 
+#include <cstdlib>
+
 namespace pelloric::qt {
 
 namespace {
@@ -55,6 +57,20 @@ protected:
         return bar && bar->isVisible() ? bar->currentMessage() : QString();
     }
 };
+
+/// Keeps the panel, in light and in dark, where the environment says, to be looked at.
+void keepPictures(OptionsPanel& panel, const QString& name)
+{
+    const char* const folder = std::getenv("PELLORIC_PICTURES");
+    if (!folder)
+        return;
+    const QString file = QString::fromUtf8(folder) + QStringLiteral("/panel-") + name;
+    EXPECT_TRUE(panel.grab().save(file + QStringLiteral(".png")));
+    const QPalette light = panel.palette();
+    panel.setPalette(QPalette(QColor(0x35, 0x35, 0x35)));
+    EXPECT_TRUE(panel.grab().save(file + QStringLiteral("-dark.png")));
+    panel.setPalette(light);
+}
 
 } // namespace
 
@@ -161,6 +177,7 @@ TEST_F(ReportToolsTest, ClipNoEntryOfTheirLists)
         own.show();
         own.resize(own.minimumSizeHint().width(), 600);
         QCoreApplication::processEvents();
+        keepPictures(own, QString::fromLatin1(language));
         for (const QComboBox* const box : own.findChildren<QComboBox*>()) {
             int longest = 0;
             for (int entry = 0; entry < box->count(); ++entry)
