@@ -29,8 +29,9 @@ function(pelloric_component name component)
     add_library(${name} STATIC ${arg_SOURCES})
     target_include_directories(${name} PRIVATE "${PROJECT_SOURCE_DIR}/src")
     target_link_libraries(${name} PUBLIC ${below} PRIVATE $<BUILD_INTERFACE:pelloric_warnings>)
-    # Nothing is hidden from those who debug.
-    if(NOT CMAKE_BUILD_TYPE STREQUAL "Debug")
+    pelloric_precompile(${name} ${arg_PUBLIC} ${arg_PRIVATE})
+    # Nothing is hidden from those who debug, nor where libraries and tests share compiled headers.
+    if(NOT CMAKE_BUILD_TYPE STREQUAL "Debug" AND NOT PELLORIC_PRECOMPILED_HEADERS)
         set_target_properties(${name} PROPERTIES CXX_VISIBILITY_PRESET hidden
             VISIBILITY_INLINES_HIDDEN ON)
     endif()
@@ -76,4 +77,5 @@ function(pelloric_program name)
     add_executable(${name} ${arg_SOURCES})
     target_include_directories(${name} PRIVATE "${PROJECT_SOURCE_DIR}/src")
     target_link_libraries(${name} PRIVATE ${arg_LIBRARIES} pelloric_warnings)
+    pelloric_precompile(${name} ${arg_LIBRARIES})
 endfunction()

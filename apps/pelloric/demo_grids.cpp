@@ -132,7 +132,8 @@ QTreeWidgetItem* addRegion(QTreeWidget& view, const QString& name)
     font.setBold(true);
     region->setFont(0, font);
     region->setBackground(0, QColor(0xFFE8EEF7));
-    region->setIcon(0, discOf(ClassInks[view.topLevelItemCount() % ClassInks.size()]));
+    region->setIcon(0,
+        discOf(ClassInks[static_cast<std::size_t>(view.topLevelItemCount()) % ClassInks.size()]));
     region->setFirstColumnSpanned(true);
     return region;
 }

@@ -116,7 +116,8 @@ TEST(TextList, FindsTextsOnBothSidesOfWhatARunReaches)
     const Text units(200'000, u'y');
     const TextView all = units;
     std::vector<TextRecord> texts;
-    for (const std::size_t start : { 0, 65'535, 65'536, 131'000, 0, 199'999 })
+    for (const std::size_t start :
+        std::initializer_list<std::size_t> { 0, 65'535, 65'536, 131'000, 0, 199'999 })
         texts.push_back(textAt({ 0, 0 }, all.substr(start, 1)));
     texts.push_back(textAt({ 0, 0 }, all.substr(0, 65'535)));
     texts.push_back(textAt({ 0, 0 }, all.substr(0, 65'536)));

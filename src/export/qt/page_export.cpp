@@ -153,11 +153,13 @@ std::vector<std::filesystem::path> exportEach(const PageDocument& document,
     const std::vector<int> pages = differentPagesOf(document, options);
     const std::vector<std::filesystem::path> paths = pageFilePaths(document, options, path);
     PendingFiles files;
-    for (std::size_t done = 0; done < pages.size(); ++done) {
-        tell(options.progress, done, pages.size());
-        files.write(paths[done], [&](QFile& file) { return write(pages[done], file); });
+    const std::int64_t total = std::ssize(pages);
+    std::int64_t done = 0;
+    for (std::size_t i = 0; i < pages.size(); ++i) {
+        tell(options.progress, done++, total);
+        files.write(paths[i], [&](QFile& file) { return write(pages[i], file); });
     }
-    tell(options.progress, pages.size(), pages.size());
+    tell(options.progress, total, total);
     files.putInPlace();
     return paths;
 }
@@ -201,14 +203,17 @@ void exportPdfByToolkit(const PageDocument& document, const PageSetup& setup, Qt
         QPdfWriter writer(&file);
         setUpPdf(writer, setup, options.title);
         QPainter painter;
-        for (std::size_t done = 0; done < pages.size(); ++done) {
-            tell(options.progress, done, pages.size());
+        const std::int64_t total = std::ssize(pages);
+        std::int64_t done = 0;
+        for (const int page : pages) {
+            tell(options.progress, done, total);
             const bool isReady = done == 0 ? painter.begin(&writer) : writer.newPage();
             if (!isReady || file.error() != QFileDevice::NoError)
                 return false;
-            pagePainter.paint(pages[done], painter, PdfResolution, false);
+            pagePainter.paint(page, painter, PdfResolution, false);
+            ++done;
         }
-        tell(options.progress, pages.size(), pages.size());
+        tell(options.progress, total, total);
         return painter.end();
     });
     files.putInPlace();

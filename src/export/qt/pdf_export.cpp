@@ -35,15 +35,17 @@ void drawPages(const PageDocument& document, const PageSetup& setup, const Expor
 {
     const std::vector<int> pages = pagesOf(document, options);
     const PageRenderer renderer(document);
-    for (std::size_t done = 0; done < pages.size(); ++done) {
-        tell(options.progress, done, pages.size());
+    const std::int64_t total = std::ssize(pages);
+    std::int64_t done = 0;
+    for (const int page : pages) {
+        tell(options.progress, done++, total);
         const pdf::Paper paper { .width = setup.myWidth, .height = setup.myHeight };
-        JoinedLines joined(writer.beginPage(paper, document.structure, pages[done]));
-        renderer.replay(pages[done], {}, joined);
+        JoinedLines joined(writer.beginPage(paper, document.structure, page));
+        renderer.replay(page, {}, joined);
         joined.finish();
         writer.endPage();
     }
-    tell(options.progress, pages.size(), pages.size());
+    tell(options.progress, total, total);
 }
 
 } // namespace
