@@ -5,7 +5,6 @@
 #include "commands.h"
 #include "controls/canvas.h"
 #include "controls/qt/default_platform.h"
-#include "controls/qt/sorvane.h"
 #include "interruption.h"
 #include "platform/qt/qt_phrase.h"
 #include "platform/run_time_error.h"
@@ -19,6 +18,8 @@
 #include "ui/qt/preview_prompts.h"
 #include "ui/qt/preview_window.h"
 #include "windows.h"
+
+#include <pelloric/sorvane.h>
 
 #include <optional>
 

@@ -4,7 +4,8 @@
 #include "controls/qt/page_accessible.h"
 
 #include "controls/qt/page_surface.h"
-#include "controls/qt/sorvane.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QWidget>
 

@@ -3,9 +3,11 @@
 
 #include "ui/qt/page_marks.h"
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QMouseEvent>
 #include <QPainter>

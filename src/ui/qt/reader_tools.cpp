@@ -3,7 +3,7 @@
 
 #include "ui/qt/reader_tools.h"
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "ui/page_reading.h"
 #include "ui/preview_navigation.h"
 #include "ui/qt/find_bar.h"
@@ -11,6 +11,8 @@
 #include "ui/qt/page_marks.h"
 #include "ui/qt/page_strip.h"
 #include "ui/tool_table.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QApplication>
 #include <QClipboard>

@@ -3,8 +3,10 @@
 
 #include "ui/qt/reading_input.h"
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "ui/preview_navigation.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QKeyEvent>
 #include <QWheelEvent>

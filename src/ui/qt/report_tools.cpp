@@ -3,14 +3,16 @@
 
 #include "ui/qt/report_tools.h"
 
+#include "controls/canvas.h"
 #include "controls/messages.h"
-#include "controls/qt/sorvane.h"
 #include "document/ostl_losses.h"
 #include "platform/platform.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 #include "ui/qt/options_panel.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QApplication>
 #include <QMainWindow>

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 
 #include "controls/canvas.h"
-#include "controls/qt/sorvane.h"
 #include "fakes/temp_folder.h"
 #include "platform/qt/qt_platform.h"
 #include "settings/default_settings.h"
@@ -10,6 +9,8 @@
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
 #include "ui_host_form.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QDesignerCustomWidgetCollectionInterface>
 #include <QFile>

@@ -1,12 +1,13 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/sorvane.h"
 #include "controls/qt/sorvane_world.h"
 #include "document/page_document.h"
 #include "document/recorder.h"
 #include "export/qt/page_export.h"
 #include "print/qt/print_test.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QImage>
 #include <QImageReader>

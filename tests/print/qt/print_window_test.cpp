@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
 #include "grids/table_grid.h"
@@ -11,6 +11,8 @@
 #include "support/qt/beside.h"
 #include "ui/qt/preview_window.h"
 #include "ui/qt/print_options_dialog.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QAction>
 #include <QApplication>

@@ -1,7 +1,7 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "fakes/fake_platform.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/qt/qt_text.h"
@@ -14,6 +14,8 @@
 #include "ui/qt/preview_prompts.h"
 #include "ui/qt/preview_window.h"
 #include "ui/qt/print_options_dialog.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QAccessible>
 #include <QApplication>

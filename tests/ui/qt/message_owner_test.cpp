@@ -1,11 +1,12 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
-#include "controls/qt/kestrane.h"
 #include "fakes/temp_folder.h"
 #include "platform/qt/qt_platform.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
+
+#include <pelloric/kestrane.h>
 
 #include <QApplication>
 #include <QDialog>

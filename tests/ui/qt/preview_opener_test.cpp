@@ -4,12 +4,13 @@
 #include "ui/qt/preview_opener.h"
 
 #include "controls/qt/default_platform.h"
-#include "controls/qt/kestrane.h"
 #include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
 #include "platform/qt/qt_platform.h"
 #include "settings/default_settings.h"
 #include "settings/settings_file.h"
+
+#include <pelloric/kestrane.h>
 
 #include <gtest/gtest.h>
 

@@ -3,7 +3,7 @@
 
 #pragma once
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "fakes/fake_printer.h"
 #include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
@@ -13,6 +13,8 @@
 #include "ui/qt/choice_box.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QApplication>
 #include <QLineEdit>

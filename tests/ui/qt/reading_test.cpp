@@ -3,8 +3,10 @@
 
 #include "ui/qt/reading_input.h"
 
-#include "controls/qt/sorvane.h"
+#include "controls/canvas.h"
 #include "ui/qt/preview_world.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QImage>
 #include <QScrollBar>

@@ -1,6 +1,0 @@
-// SPDX-FileCopyrightText: The Pelloric authors
-// SPDX-License-Identifier: MIT
-
-#pragma once
-
-#include <pelloric/kestrane.h>
