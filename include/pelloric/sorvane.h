@@ -47,6 +47,15 @@ class PELLORIC_EXPORT SorvaneCalls : public QWidget {
 public:
     using QWidget::QWidget;
 
+    /// The members of these names of `Sorvane`, as callers by name get them.
+    Q_INVOKABLE QVariant WindowMinPage() const;
+    /// The same.
+    Q_INVOKABLE QVariant WindowMaxPage() const;
+    /// The same.
+    Q_INVOKABLE QVariant WindowPages() const;
+    /// The same: the number of an `OrderStyle`.
+    Q_INVOKABLE QVariant WindowOrderStyle() const;
+
 private:
     Q_INVOKABLE void showMuliPage(short nPages);
     Q_INVOKABLE void showMuliPage(int nPages);
@@ -207,6 +216,15 @@ public:
     /// Sets the window of pages that several-page modes show.
     void SetShowStyle(std::int16_t nPages, std::int16_t nStartPage, std::int16_t nEndPage);
 
+    /// The first page of the window of pages, from 0; 0 at first.
+    std::int16_t WindowMinPage() const;
+    /// Its last page, from 0; 0 at first.
+    std::int16_t WindowMaxPage() const;
+    /// How many pages it shows, as `SetShowStyle` was told; 0, as at first: there is none.
+    std::int16_t WindowPages() const;
+    /// The display mode in force, `One` at first.
+    OrderStyle WindowOrderStyle() const;
+
     /// Prints on the current printer; before a build the one empty page.
     /// @param bAllPrint      false: the pages of the list
     /// @param strPrintRange  page numbers from 1, separated by ","; what is no page is passed over
@@ -277,14 +295,6 @@ public:
     /// The same for an object that publishes a grid's members.
     Q_INVOKABLE void SetShowStyle(
         const QVariant& nPages, const QVariant& nStartPage, const QVariant& nEndPage);
-    /// The first page of the window of pages, from 1.
-    Q_INVOKABLE QVariant WindowMinPage() const;
-    /// Its last page.
-    Q_INVOKABLE QVariant WindowMaxPage() const;
-    /// How many pages it shows; 0: there is none.
-    Q_INVOKABLE QVariant WindowPages() const;
-    /// The display mode in force, an `OrderStyle`.
-    Q_INVOKABLE QVariant WindowOrderStyle() const;
     /// Lays the pages out again at the present scale and paints them.
     Q_INVOKABLE void OnDraw();
     /// The same for callers by name: the variants are checked.

@@ -24,6 +24,26 @@ template <typename Record> void registerRecord(const char* name)
 
 } // namespace
 
+QVariant SorvaneCalls::WindowMinPage() const
+{
+    return QVariant::fromValue(static_cast<const Sorvane&>(*this).WindowMinPage());
+}
+
+QVariant SorvaneCalls::WindowMaxPage() const
+{
+    return QVariant::fromValue(static_cast<const Sorvane&>(*this).WindowMaxPage());
+}
+
+QVariant SorvaneCalls::WindowPages() const
+{
+    return QVariant::fromValue(static_cast<const Sorvane&>(*this).WindowPages());
+}
+
+QVariant SorvaneCalls::WindowOrderStyle() const
+{
+    return static_cast<int>(static_cast<const Sorvane&>(*this).WindowOrderStyle());
+}
+
 void SorvaneCalls::showMuliPage(short nPages)
 {
     static_cast<Sorvane&>(*this).showMuliPage(QVariant::fromValue(nPages));

@@ -283,13 +283,16 @@ void Sorvane::SetShowStyle(
     run([&] { canvas().SetShowStyle(toInt16(nPages), toInt16(nStartPage), toInt16(nEndPage)); });
 }
 
-QVariant Sorvane::WindowMinPage() const { return QVariant::fromValue(canvas().WindowMinPage()); }
+std::int16_t Sorvane::WindowMinPage() const { return canvas().WindowMinPage(); }
 
-QVariant Sorvane::WindowMaxPage() const { return QVariant::fromValue(canvas().WindowMaxPage()); }
+std::int16_t Sorvane::WindowMaxPage() const { return canvas().WindowMaxPage(); }
 
-QVariant Sorvane::WindowPages() const { return QVariant::fromValue(canvas().WindowPages()); }
+std::int16_t Sorvane::WindowPages() const { return canvas().WindowPages(); }
 
-QVariant Sorvane::WindowOrderStyle() const { return static_cast<int>(canvas().WindowOrderStyle()); }
+Sorvane::OrderStyle Sorvane::WindowOrderStyle() const
+{
+    return static_cast<OrderStyle>(canvas().WindowOrderStyle());
+}
 
 void Sorvane::OnDraw()
 {

@@ -138,21 +138,32 @@ std::vector<std::string> ownProperties(const QMetaObject& meta)
     return names;
 }
 
+/// What every caller by name finds besides the members of every widget.
+std::vector<QMetaMethod> publishedMethods(const QMetaObject& meta)
+{
+    std::vector<QMetaMethod> methods;
+    for (int at = QWidget::staticMetaObject.methodCount(); at < meta.methodCount(); ++at) {
+        if (meta.method(at).access() == QMetaMethod::Public)
+            methods.push_back(meta.method(at));
+    }
+    return methods;
+}
+
 std::vector<std::string> ownMethods(const QMetaObject& meta, QMetaMethod::MethodType type)
 {
     std::vector<std::string> names;
-    for (int at = meta.methodOffset(); at < meta.methodCount(); ++at) {
-        if (meta.method(at).methodType() == type)
-            names.push_back(meta.method(at).name().toStdString());
+    for (const QMetaMethod& method : publishedMethods(meta)) {
+        if (method.methodType() == type)
+            names.push_back(method.name().toStdString());
     }
     return names;
 }
 
 QMetaMethod methodOf(const QMetaObject& meta, const std::string& name)
 {
-    for (int at = meta.methodOffset(); at < meta.methodCount(); ++at) {
-        if (meta.method(at).name() == QByteArray::fromStdString(name))
-            return meta.method(at);
+    for (const QMetaMethod& method : publishedMethods(meta)) {
+        if (method.name() == QByteArray::fromStdString(name))
+            return method;
     }
     return {};
 }
@@ -297,6 +308,30 @@ TEST(PublishedMembers, ReadTheScaleAsTheDivisor)
     world.sorvane.setProperty("DispScale", 0);
     expectOneBox(world.platform.messages, u"Division by zero", "DispScale");
     EXPECT_EQ(world.sorvane.property("DispScale").toFloat(), 0.5F);
+}
+
+TEST(PublishedMembers, AnswerTheWindowOfPagesWithTypesToHostsAndByName)
+{
+    SorvaneWorld world;
+    const Sorvane& canvas = world.sorvane;
+    world.sorvane.SetShowStyle(4, 8, 11);
+    world.makePages(12);
+    world.sorvane.showMuliPage(std::int16_t { 4 });
+    const std::int16_t first = canvas.WindowMinPage();
+    const std::int16_t last = canvas.WindowMaxPage();
+    const std::int16_t pages = canvas.WindowPages();
+    const Sorvane::OrderStyle style = canvas.WindowOrderStyle();
+    EXPECT_EQ(first, 8);
+    EXPECT_EQ(last, 11);
+    EXPECT_EQ(pages, 4);
+    EXPECT_EQ(style, Sorvane::Four);
+    QVariant byName;
+    EXPECT_TRUE(
+        QMetaObject::invokeMethod(&world.sorvane, "WindowMinPage", Q_RETURN_ARG(QVariant, byName)));
+    EXPECT_EQ(byName, QVariant::fromValue(std::int16_t { 8 }));
+    EXPECT_TRUE(QMetaObject::invokeMethod(
+        &world.sorvane, "WindowOrderStyle", Q_RETURN_ARG(QVariant, byName)));
+    EXPECT_EQ(byName, QVariant(static_cast<int>(Sorvane::Four)));
 }
 
 TEST(PublishedMembers, AreErrorsOfAScriptThatUsesThem)
@@ -460,13 +495,13 @@ TEST(PlainCalls, MembersTakePlainTypesByName)
     Sorvane& canvas = world.sorvane;
     EXPECT_TRUE(QMetaObject::invokeMethod(
         &canvas, "SetShowStyle", Q_ARG(short, 6), Q_ARG(short, 0), Q_ARG(short, 5)));
-    EXPECT_EQ(canvas.WindowPages().toInt(), 6);
+    EXPECT_EQ(canvas.WindowPages(), 6);
     EXPECT_TRUE(QMetaObject::invokeMethod(
         &canvas, "SetShowStyle", Q_ARG(int, 4), Q_ARG(int, 0), Q_ARG(int, 3)));
-    EXPECT_EQ(canvas.WindowPages().toInt(), 4);
+    EXPECT_EQ(canvas.WindowPages(), 4);
     world.makePages(4);
     EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "showMuliPage", Q_ARG(short, 4)));
-    EXPECT_EQ(canvas.WindowOrderStyle().toInt(), Sorvane::Four);
+    EXPECT_EQ(canvas.WindowOrderStyle(), Sorvane::Four);
     const QString file = QString::fromStdString(world.platform.folder.file("a.ostl").string());
     EXPECT_TRUE(QMetaObject::invokeMethod(&canvas, "SaveFile", Q_ARG(QString, file)));
     canvas.clear();
