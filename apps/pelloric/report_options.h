@@ -4,7 +4,7 @@
 #pragma once
 
 #include "command_line.h"
-#include <pelloric/settings.h>
+#include <pelloric/options.h>
 
 namespace pelloric {
 struct Platform;

@@ -21,13 +21,12 @@
 /// @endcode
 
 #include <pelloric/options.h>
-#include <pelloric/settings.h>
 #include <pelloric/version.h>
 
 #include <QString>
 #include <QStringList>
 
-#include <functional>
+#include <cstdint>
 #include <optional>
 #include <vector>
 
@@ -51,7 +50,7 @@ struct ExportRequest {
     bool isTagged = false;
     bool isArchive = false; ///< a PDF file is PDF/A-2b, which can be read for good
     /// Told before each page how many are done; answers whether to go on. May be empty.
-    std::function<bool(int done, int total)> progress {};
+    Progress progress {};
 
     /// What a live view's pages do beyond the plain ones. Pages that are laid out already stay as
     /// they are.

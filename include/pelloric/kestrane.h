@@ -12,7 +12,7 @@
 /// connect(button, &QPushButton::clicked, preview, [=] { preview->doPreview(tableView); });
 /// @endcode
 
-#include <pelloric/settings.h>
+#include <pelloric/options.h>
 #include <pelloric/version.h>
 
 #include <QVariant>

@@ -23,6 +23,5 @@
 #include <pelloric/printing.h>
 #include <pelloric/records.h>
 #include <pelloric/report.h>
-#include <pelloric/settings.h>
 #include <pelloric/sorvane.h>
 #include <pelloric/version.h>

@@ -14,7 +14,7 @@
 /// pelloric::qt::usePreviewWindow();
 /// @endcode
 
-#include <pelloric/settings.h>
+#include <pelloric/options.h>
 #include <pelloric/version.h>
 
 #include <QLocale>

@@ -15,7 +15,6 @@
 
 #include <pelloric/errors.h>
 #include <pelloric/options.h>
-#include <pelloric/settings.h>
 #include <pelloric/version.h>
 
 #include <QString>

@@ -14,7 +14,6 @@
 
 #include <pelloric/options.h>
 #include <pelloric/records.h>
-#include <pelloric/settings.h>
 #include <pelloric/version.h>
 
 #include <QVariant>

@@ -12,7 +12,6 @@
 #include "view/view_state.h"
 
 #include <pelloric/options.h>
-#include <pelloric/settings.h>
 
 #include <filesystem>
 #include <functional>

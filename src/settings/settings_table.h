@@ -5,7 +5,7 @@
 
 #include "platform/text.h"
 
-#include <pelloric/settings.h>
+#include <pelloric/options.h>
 
 #include <span>
 #include <variant>

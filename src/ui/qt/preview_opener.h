@@ -6,7 +6,6 @@
 #include "controls/facade.h"
 #include "ui/qt/preview_prompts.h"
 #include <pelloric/options.h>
-#include <pelloric/settings.h>
 
 #include <QPointer>
 

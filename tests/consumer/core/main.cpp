@@ -4,7 +4,7 @@
 // The parts of the library that need the standard library alone.
 
 #include <pelloric/errors.h>
-#include <pelloric/settings.h>
+#include <pelloric/options.h>
 #include <pelloric/version.h>
 
 #include <cstdio>
