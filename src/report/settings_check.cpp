@@ -21,15 +21,14 @@ namespace pelloric {
 
 namespace {
 
-constexpr double MostPoints = 16000; ///< of a text that is no higher than the highest sheet
-
 /// Settings with the place where they came from.
 struct Judged {
     const ReportSettings& settings;
     const SettingsSource* source;
 };
 
-/// What the value of one key must be; other keys go by their unit.
+/// What the value of one key must be, for a person: the range of its row; other keys go by their
+/// unit.
 struct LimitRow {
     SettingKey key;
     TextView limit;
@@ -173,13 +172,14 @@ bool isUsable(const Judged& judged, SettingKey key)
         = std::holds_alternative<double*>(field) ? std::get<double*>(field) : nullptr;
     if (number == nullptr)
         return true;
-    switch (settingOf(key).unit) {
+    const Setting& row = settingOf(key);
+    switch (row.unit) {
     case SettingUnit::Points:
-        return *number > 0 && *number <= MostPoints;
+        return row.range.holds(*number);
     case SettingUnit::Color:
         return std::abs(*number) <= std::numeric_limits<Color>::max();
     default:
-        return *number > 0 || (key != SettingKey::PagerWidth && key != SettingKey::PagerHeight);
+        return !row.range.isAbove || *number > row.range.least;
     }
 }
 

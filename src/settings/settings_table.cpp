@@ -14,6 +14,17 @@ namespace pelloric {
 
 namespace {
 
+constexpr SettingRange Colors { .least = 0, .most = 0xFFFFFF };
+
+/// No text is higher than the highest sheet.
+constexpr SettingRange Points { .least = 0, .most = 16000, .isAbove = true };
+
+/// A tenth of the longest sheet's twips fits 16 bits.
+constexpr SettingRange SheetMm { .least = 0, .most = 5779, .isAbove = true };
+
+/// The twips of a margin fit 16 bits when it is as much larger as it is printed.
+constexpr SettingRange atMost(double mm) { return { .least = 0, .most = mm }; }
+
 constexpr auto Settings = std::to_array<Setting>({
     { SettingKey::ShowHeaders, u"ShowHeaders", u"1", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.showHeaders; } },
@@ -24,13 +35,13 @@ constexpr auto Settings = std::to_array<Setting>({
     { SettingKey::GridMerge, u"GridMerge", u"0", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.mergeCells; } },
     { SettingKey::HeaderColor, u"HeaderColor", u"14737632", SettingUnit::Color,
-        [](ReportSettings& s) -> SettingField { return &s.headerColor; } },
+        [](ReportSettings& s) -> SettingField { return &s.headerColor; }, Colors },
     { SettingKey::GridLineColor, u"GridLineColor", u"0", SettingUnit::Color,
-        [](ReportSettings& s) -> SettingField { return &s.gridLineColor; } },
+        [](ReportSettings& s) -> SettingField { return &s.gridLineColor; }, Colors },
     { SettingKey::FontName, u"FontName", u"宋体", SettingUnit::Text,
         [](ReportSettings& s) -> SettingField { return &s.body.name; } },
     { SettingKey::FontSize, u"FontSize", u"9", SettingUnit::Points,
-        [](ReportSettings& s) -> SettingField { return &s.body.size; } },
+        [](ReportSettings& s) -> SettingField { return &s.body.size; }, Points },
     { SettingKey::FontBold, u"FontBold", u"0", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.body.bold; } },
     { SettingKey::FontItalic, u"FontItalic", u"0", SettingUnit::Switch,
@@ -40,11 +51,11 @@ constexpr auto Settings = std::to_array<Setting>({
     { SettingKey::FontUnderline, u"FontUnderline", u"0", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.body.underline; } },
     { SettingKey::FontColor, u"FontColor", u"0", SettingUnit::Color,
-        [](ReportSettings& s) -> SettingField { return &s.body.color; } },
+        [](ReportSettings& s) -> SettingField { return &s.body.color; }, Colors },
     { SettingKey::HeaderFontName, u"HeaderFontName", u"宋体", SettingUnit::Text,
         [](ReportSettings& s) -> SettingField { return &s.header.name; } },
     { SettingKey::HeaderFontSize, u"HeaderFontSize", u"9", SettingUnit::Points,
-        [](ReportSettings& s) -> SettingField { return &s.header.size; } },
+        [](ReportSettings& s) -> SettingField { return &s.header.size; }, Points },
     { SettingKey::HeaderFontBold, u"HeaderFontBold", u"0", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.header.bold; } },
     { SettingKey::HeaderFontItalic, u"HeaderFontItalic", u"0", SettingUnit::Switch,
@@ -54,11 +65,11 @@ constexpr auto Settings = std::to_array<Setting>({
     { SettingKey::HeaderFontUnderline, u"HeaderFontUnderline", u"0", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.header.underline; } },
     { SettingKey::HeaderFontColor, u"HeaderFontColor", u"0", SettingUnit::Color,
-        [](ReportSettings& s) -> SettingField { return &s.header.color; } },
+        [](ReportSettings& s) -> SettingField { return &s.header.color; }, Colors },
     { SettingKey::FooterFontName, u"FooterFontName", u"宋体", SettingUnit::Text,
         [](ReportSettings& s) -> SettingField { return &s.footer.name; } },
     { SettingKey::FooterFontSize, u"FooterFontSize", u"9", SettingUnit::Points,
-        [](ReportSettings& s) -> SettingField { return &s.footer.size; } },
+        [](ReportSettings& s) -> SettingField { return &s.footer.size; }, Points },
     { SettingKey::FooterFontBold, u"FooterFontBold", u"0", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.footer.bold; } },
     { SettingKey::FooterFontItalic, u"FooterFontItalic", u"0", SettingUnit::Switch,
@@ -68,25 +79,26 @@ constexpr auto Settings = std::to_array<Setting>({
     { SettingKey::FooterFontUnderline, u"FooterFontUnderline", u"0", SettingUnit::Switch,
         [](ReportSettings& s) -> SettingField { return &s.footer.underline; } },
     { SettingKey::FooterFontColor, u"FooterFontColor", u"0", SettingUnit::Color,
-        [](ReportSettings& s) -> SettingField { return &s.footer.color; } },
+        [](ReportSettings& s) -> SettingField { return &s.footer.color; }, Colors },
     { SettingKey::PagerSize, u"PagerSize", u"A4", SettingUnit::Text,
         [](ReportSettings& s) -> SettingField { return &s.paperName; } },
     { SettingKey::PagerOrientation, u"PagerOrientation", u"1", SettingUnit::Code,
-        [](ReportSettings& s) -> SettingField { return &s.orientation; } },
+        [](ReportSettings& s) -> SettingField { return &s.orientation; },
+        { .least = 1, .most = 2 } },
     { SettingKey::PagerSizeValue, u"PagerSizeValue", u"9", SettingUnit::Code,
         [](ReportSettings& s) -> SettingField { return &s.paperCode; } },
     { SettingKey::Top, u"Top", u"10", SettingUnit::Millimetres,
-        [](ReportSettings& s) -> SettingField { return &s.topMm; } },
+        [](ReportSettings& s) -> SettingField { return &s.topMm; }, atMost(361) },
     { SettingKey::Buttom, u"Buttom", u"10", SettingUnit::Millimetres,
-        [](ReportSettings& s) -> SettingField { return &s.bottomMm; } },
+        [](ReportSettings& s) -> SettingField { return &s.bottomMm; }, atMost(321) },
     { SettingKey::Left, u"Left", u"10", SettingUnit::Millimetres,
-        [](ReportSettings& s) -> SettingField { return &s.leftMm; } },
+        [](ReportSettings& s) -> SettingField { return &s.leftMm; }, atMost(481) },
     { SettingKey::Right, u"Right", u"10", SettingUnit::Millimetres,
-        [](ReportSettings& s) -> SettingField { return &s.rightMm; } },
+        [](ReportSettings& s) -> SettingField { return &s.rightMm; }, atMost(481) },
     { SettingKey::PagerWidth, u"PagerWidth", u"210", SettingUnit::Millimetres,
-        [](ReportSettings& s) -> SettingField { return &s.paperWidthMm; } },
+        [](ReportSettings& s) -> SettingField { return &s.paperWidthMm; }, SheetMm },
     { SettingKey::PagerHeight, u"PagerHeight", u"297", SettingUnit::Millimetres,
-        [](ReportSettings& s) -> SettingField { return &s.paperHeightMm; } },
+        [](ReportSettings& s) -> SettingField { return &s.paperHeightMm; }, SheetMm },
     { SettingKey::HeaderLeft, u"HeaderLeft", u"", SettingUnit::Text,
         [](ReportSettings& s) -> SettingField { return &s.headerTexts[0]; } },
     { SettingKey::HeaderCenter, u"HeaderCenter", u"", SettingUnit::Text,
@@ -141,8 +153,7 @@ struct DescribeField {
     Text operator()(const bool* field) const { return *field ? u"1" : u"0"; }
     Text operator()(const double* field) const
     {
-        const bool isSingle = std::abs(*field) <= std::numeric_limits<float>::max();
-        return unit == SettingUnit::Points && isSingle
+        return unit == SettingUnit::Points && isHeld(unit, *field)
             ? formatSingle(static_cast<float>(*field), decimalSeparator)
             : formatNumber(*field, decimalSeparator);
     }
@@ -160,6 +171,12 @@ std::span<const Setting> settingsTable() { return Settings; }
 const Setting& settingOf(SettingKey key) { return Settings[static_cast<std::size_t>(key)]; }
 
 TextView settingName(SettingKey key) { return settingOf(key).name; }
+
+bool isHeld(SettingUnit unit, double value)
+{
+    return unit == SettingUnit::Points ? std::abs(value) <= std::numeric_limits<float>::max()
+                                       : std::isfinite(value);
+}
 
 void setSetting(ReportSettings& settings, SettingKey key, TextView text)
 {

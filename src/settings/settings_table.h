@@ -62,6 +62,19 @@ enum class SettingKey {
 /// What a setting's value counts or names.
 enum class SettingUnit { Switch, Color, Points, Millimetres, Code, Text };
 
+/// The numbers that a setting is meant to be, in its unit. Pages are built by many others, too, as
+/// far as those fit the numbers of a page; what cannot be used is told by this range.
+struct SettingRange {
+    double least = 0;
+    double most = 0; ///< as `least`: the setting has no range
+    bool isAbove = false; ///< `least` itself lies outside
+
+    bool holds(double value) const
+    {
+        return (isAbove ? value > least : value >= least) && value <= most;
+    }
+};
+
 /// The member of the settings that a key fills.
 using SettingField = std::variant<bool*, double*, std::optional<std::int16_t>*, Text*>;
 
@@ -72,6 +85,7 @@ struct Setting {
     TextView start; ///< its value in the default file
     SettingUnit unit;
     SettingField (*field)(ReportSettings& settings);
+    SettingRange range {};
 };
 
 /// All settings, in the order of `SettingKey`.
@@ -85,6 +99,9 @@ const Setting& settingOf(SettingKey key);
 
 /// The key as the file spells it.
 TextView settingName(SettingKey key);
+
+/// Whether the numbers of a unit can be so large: a font size is a single, all others are finite.
+bool isHeld(SettingUnit unit, double value);
 
 /// Fills a setting with a text as the file holds it.
 ///

@@ -17,7 +17,7 @@ namespace pelloric {
 
 namespace {
 
-constexpr double LongestSheetMm = 5779; ///< whose tenth of twips still fits 16 bits
+double longestSheetMm() { return settingOf(SettingKey::PagerWidth).range.most; }
 
 /// A margin and what stands for it in texts.
 struct MarginName {
@@ -55,7 +55,7 @@ Text millimetres(double length)
 std::optional<double> lengthOf(TextView box)
 {
     const double length = leadingNumber(box);
-    if (box.find(u"mm") == TextView::npos || !(length > 0) || length > LongestSheetMm)
+    if (box.find(u"mm") == TextView::npos || !(length > 0) || length > longestSheetMm())
         return std::nullopt;
     return length;
 }
@@ -73,10 +73,10 @@ Text sizeHint(TextView name, TextView box)
     if (!(length > 0))
         return phrase(
             u"%1 must be above 0: OK will store it, and no page can be laid out.", { name });
-    if (length > LongestSheetMm)
+    if (length > longestSheetMm())
         return phrase(u"%1 is at most %2: OK will store it, and no page can be built until it is "
                       u"smaller.",
-            { name, millimetres(LongestSheetMm) });
+            { name, millimetres(longestSheetMm()) });
     return {};
 }
 

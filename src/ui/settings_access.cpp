@@ -9,8 +9,6 @@
 #include "ui/font_description.h"
 
 #include <array>
-#include <cmath>
-#include <limits>
 
 namespace pelloric {
 
@@ -28,8 +26,6 @@ constexpr auto StyleKeys = std::to_array<StyleKey>({
     { SettingKey::FontStrikethru, &Font::strikethrough },
     { SettingKey::FontUnderline, &Font::underline },
 });
-
-bool fitsSingle(double value) { return std::fabs(value) <= std::numeric_limits<float>::max(); }
 
 } // namespace
 
@@ -60,7 +56,7 @@ std::optional<double> LenientSettings::number(SettingKey key) const
     if (!found)
         return std::nullopt;
     const double value = leadingNumber(*found);
-    return std::isfinite(value) ? std::optional(value) : std::nullopt;
+    return isHeld(settingOf(key).unit, value) ? std::optional(value) : std::nullopt;
 }
 
 ColoredFont LenientSettings::font(ReportFont which) const
@@ -68,7 +64,7 @@ ColoredFont LenientSettings::font(ReportFont which) const
     ColoredFont result;
     if (const auto name = text(fontKey(which, SettingKey::FontName)))
         result.font.name = *name;
-    if (const auto size = number(fontKey(which, SettingKey::FontSize)); size && fitsSingle(*size))
+    if (const auto size = number(fontKey(which, SettingKey::FontSize)); size)
         result.font.size = static_cast<float>(*size);
     for (const StyleKey& row : StyleKeys)
         result.font.*row.style = number(fontKey(which, row.key)).value_or(0) != 0;

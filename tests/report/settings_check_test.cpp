@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "fakes/fake_platform.h"
+#include "platform/numbers.h"
 #include "report/report_style.h"
 #include "settings/default_settings.h"
 #include "settings/settings_file.h"
@@ -112,6 +113,28 @@ TEST(SettingProblems, StandBesideTheLargestValuesThatTheLoadTakes)
         EXPECT_TRUE(world.problems().empty()) << world.problem();
         EXPECT_EQ(world.error(), "(no error)");
     }
+}
+
+TEST(SettingProblems, BeginBehindTheRangeThatTheTableGivesAKey)
+{
+    int judged = 0;
+    for (const Setting& row : settingsTable()) {
+        const bool isMargin = row.key >= SettingKey::Top && row.key <= SettingKey::Right;
+        if (!isMargin && row.unit != SettingUnit::Points)
+            continue;
+        ++judged;
+        ReportSettings settings;
+        settings.paperWidthMm = settings.paperHeightMm
+            = settingOf(SettingKey::PagerWidth).range.most;
+        setSetting(settings, row.key, formatNumber(row.range.most));
+        EXPECT_TRUE(settingProblems(settings).empty()) << toUtf8(row.name);
+        setSetting(settings, row.key, formatNumber(row.range.most + 1));
+        const auto problems = settingProblems(settings);
+        ASSERT_EQ(problems.size(), 1U) << toUtf8(row.name);
+        EXPECT_EQ(problems[0].key, row.key);
+        EXPECT_NE(problems[0].text.find(u"at most " + formatNumber(row.range.most)), Text::npos);
+    }
+    EXPECT_EQ(judged, 7);
 }
 
 TEST(SettingProblems, NameEachOfSeveralBadValues)
