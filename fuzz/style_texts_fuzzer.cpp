@@ -73,7 +73,6 @@ void typeMargin(fuzz::Bytes& bytes, PageSetupState& state)
         break;
     default:
         state.chooseOrientation(bytes.chance());
-        state.setFrame(bytes.number(), bytes.number());
     }
     const Text& box = state.marginBox(margin);
     fuzz::require(box.empty() || box.ends_with(u"mm") || !contains(box, u"\n"));

@@ -162,6 +162,8 @@ public:
     void keepDocument(const std::function<void()>& work);
 
     /// Gives the page the size of a named paper; an unknown name shows a message.
+    ///
+    /// For hosts that record pages of their own: a build takes the size that the settings hold.
     void setPaper(TextView name);
 
     void showWholePage();
@@ -206,7 +208,7 @@ public:
     const ReportStyle& style() const { return style_; }
     const ViewState& view() const { return view_; }
     const ProgressBar& progress() const { return progress_; }
-    /// The progress bar as the last build left it.
+    /// The progress bar as the last build left it, for hosts that judge how a build ended.
     const ProgressBar& buildProgress() const { return buildProgress_; }
     /// Another number tells that the pages are others: built, opened, cleared or more of them.
     std::uint32_t documentNumber() const { return documentNumber_; }

@@ -43,7 +43,8 @@ struct PictureRecord {
     TextView file; ///< lives in a text store of the document
 };
 
-/// A margin given in whole centimetres, as twips.
+/// A margin given in whole centimetres, as twips, for hosts that set margins so; settings and
+/// dialogs hold millimetres.
 /// @throws RunTimeError Overflow: above 57 or below -57
 std::int16_t marginOfCentimetres(std::int16_t centimetres);
 
@@ -100,7 +101,8 @@ public:
     const MapLocation* picture(int page) const;
     /// Gives a page its picture. @throws RunTimeError SubscriptOutOfRange
     void placePicture(int page, const MapLocation& picture);
-    /// Takes the page's picture away. @throws RunTimeError SubscriptOutOfRange
+    /// Takes the page's picture away, for the host that placed it. @throws RunTimeError
+    /// SubscriptOutOfRange
     void removePicture(int page);
 
     /// The number of a pen in this document.

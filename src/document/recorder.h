@@ -91,6 +91,8 @@ public:
     /// Prints a text that is too wide for its cell in pieces under each other, all beginning at
     /// the current x.
     ///
+    /// For hosts that record pages of their own: a build wraps by `cellText`, which also takes
+    /// texts that fit.
     /// @param cellWidth  twips, 144 of them stay free
     void wrappingPrint(TextView text, double cellWidth);
 

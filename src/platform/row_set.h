@@ -67,6 +67,8 @@ public:
     bool isBeforeFirst() const { return position() <= 0; }
     bool isAfterLast() const { return position() > recordCount(); }
 
+    // The moves of hosts that walk a set of their own; a build goes to positions.
+
     /// Stands on the first record, or behind the last of an empty set.
     void moveFirst() { setPosition(1); }
     /// One further; behind the last record it stays.

@@ -43,6 +43,8 @@ void replaceSettings(const Platform& platform, TextView content);
 /// Which line a key finds is decided by the order of the lines, so "Left" finds a "HeaderLeft"
 /// that stands above it; that is kept. A line without "=" is the value as a whole. When no line
 /// holds the key, the last line of the file is the result, and of an empty file the empty text.
+///
+/// For hosts that ask for one key; a report and the dialogs ask a `SettingsSnapshot` for all.
 /// @throws RunTimeError FileNotFound: the file is missing or cannot be read
 Text readSetting(const Platform& platform, TextView key);
 

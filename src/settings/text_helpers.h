@@ -13,13 +13,13 @@ namespace pelloric {
 /// @param keep        true: those that occur in it; false: those that do not
 Text filterChars(TextView text, TextView characters, bool keep);
 
-/// How often a character occurs in a text.
+/// How often a character occurs in a text, for hosts that keep a list in a text of their own.
 ///
 /// @param character  one character; anything else occurs nowhere
 /// @throws RunTimeError Overflow: more than 32767 times
 std::int16_t countChar(TextView text, TextView character);
 
-/// One field of a text in which every field is followed by a separator.
+/// One field of a text in which every field is followed by a separator; for the same hosts.
 ///
 /// @param index       0 is the first field
 /// @param separator   one character or more

@@ -33,9 +33,6 @@ inline constexpr auto FontRows
     = std::to_array<TextView>({ u"Font", u"Header Font", u"Footer Font" });
 static_assert(FontRows.size() == GridFontCount);
 
-/// What the font dialog offers here: screen and printer fonts, with effects.
-inline constexpr int FontDialogFlags = 259;
-
 /// The grid style dialog without its widgets.
 class GridStyleState {
 public:
@@ -67,7 +64,6 @@ public:
 
     /// A row was clicked. @param name  one of `FontRows`
     void selectRow(TextView name) { selectedRow_ = name; }
-    const Text& selectedRow() const { return selectedRow_; }
 
     /// "Change Font...": the message to show when no row is selected, or else the font with which
     /// the font dialog is preset.

@@ -90,7 +90,6 @@ public:
 
     SketchPointer pointer() const { return pointer_; }
     bool isDragging() const { return dragging_; }
-    bool isOverLine() const { return overLine_; }
 
     /// The ruled table inside the margins, rows first; what lies off the sketch is left out.
     std::vector<SketchLine> ruledLines() const;

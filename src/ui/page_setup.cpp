@@ -167,16 +167,9 @@ void PageSetupState::chooseOrientation(bool portrait)
     sizeSketch();
 }
 
-void PageSetupState::setFrame(double width, double height)
-{
-    frameWidth_ = width;
-    frameHeight_ = height;
-    sizeSketch();
-}
-
 void PageSetupState::sizeSketch()
 {
-    picture_ = sketchRect(frameWidth_, frameHeight_, paper.isPortrait());
+    picture_ = sketchRect(SketchFrameWidth, SketchFrameHeight, paper.isPortrait());
     sketch_.setSize(picture_.width, picture_.height);
 }
 

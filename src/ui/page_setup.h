@@ -83,9 +83,6 @@ public:
     /// Chooses the orientation and sizes the sketch in its frame.
     void chooseOrientation(bool portrait);
 
-    /// Tells the frame around the sketch; sizes the sketch.
-    void setFrame(double width, double height);
-
     /// Where the sketch stands in its frame.
     const SketchRect& picture() const { return picture_; }
 
@@ -125,8 +122,6 @@ private:
     std::vector<PaperRow> rows_;
     MarginSketch sketch_;
     std::array<Text, 4> boxes_;
-    double frameWidth_ = SketchFrameWidth;
-    double frameHeight_ = SketchFrameHeight;
     SketchRect picture_;
     int lastFormatBox_ = 0;
 };

@@ -153,12 +153,10 @@ const PreviewTool* clickedTool(int id);
 /// The window's title, which ends with a blank.
 inline constexpr TextView PreviewTitle = u"Print Preview ";
 
-/// Titles, folder and filter of the two file dialogs.
+/// Titles, filter and folder of the two file dialogs.
 inline constexpr TextView OpenFileTitle = u"Open File";
 inline constexpr TextView SaveFileTitle = u"Save File";
-inline constexpr TextView FileFilter = u"Ostrel (*.ostl)|*.ostl|";
 inline constexpr TextView FileFilterName = u"Ostrel (*.ostl)";
-inline constexpr TextView FileFilterPattern = u"*.ostl";
 #ifdef _WIN32
 inline constexpr TextView InitialFileFolder = u"C:\\";
 #else

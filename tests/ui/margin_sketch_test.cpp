@@ -41,7 +41,6 @@ TEST(MarginSketch, ShowsWhichWayALineMoves)
     EXPECT_EQ(sketch.pointer(), SketchPointer::NorthSouth);
     sketch.mouseMove(Margin::Left, 284.2, 10);
     EXPECT_EQ(sketch.pointer(), SketchPointer::Default);
-    EXPECT_FALSE(sketch.isOverLine());
     sketch.mouseMove(Margin::Right, 10, 500);
     EXPECT_EQ(sketch.pointer(), SketchPointer::WestEast);
 }

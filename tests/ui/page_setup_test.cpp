@@ -120,12 +120,13 @@ TEST(PageSetup, SizesTheSketchInItsFrame)
 {
     Fixture fixture;
     PageSetupState state(fixture.platform.services());
-    state.setFrame(3300, 6600);
     state.chooseOrientation(true);
-    EXPECT_EQ(state.picture(), (SketchRect { 150, 300, 3000, 6000 }));
-    EXPECT_EQ(state.sketch().height(), 6000);
+    EXPECT_EQ(state.picture(), sketchRect(SketchFrameWidth, SketchFrameHeight, true));
+    EXPECT_EQ(state.sketch().height(), state.picture().height);
     state.chooseOrientation(false);
-    EXPECT_EQ(state.picture(), (SketchRect { 150, 2550, 3000, 1500 }));
+    EXPECT_EQ(state.picture(), sketchRect(SketchFrameWidth, SketchFrameHeight, false));
+    EXPECT_EQ(sketchRect(3300, 6600, true), (SketchRect { 150, 300, 3000, 6000 }));
+    EXPECT_EQ(sketchRect(3300, 6600, false), (SketchRect { 150, 2550, 3000, 1500 }));
 }
 
 TEST(PageSetup, SavesEveryKeyOfItsOwn)

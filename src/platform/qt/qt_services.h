@@ -24,7 +24,8 @@ QString timeWithSeconds(QTime time, const QLocale& locale);
 /// The system's clock, or a fixed moment.
 class QtClock final : public Clock {
 public:
-    /// Stops the clock at a moment; nothing: the clock runs.
+    /// Stops the clock at a moment, for hosts whose reports have to come out alike on any day;
+    /// nothing: the clock runs.
     void setNow(std::optional<QDateTime> now);
 
     Text date() const override;

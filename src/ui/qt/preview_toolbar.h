@@ -41,7 +41,6 @@ public:
     std::vector<QAction*> contextActions() const;
 
     /// Every tool that is clicked; those that are no buttons are here, too.
-    const std::map<int, QAction*>& toolActions() const { return actions_; }
 
     /// Closes the row of the tools that do not fit. @return false: it was not open
     bool closeFurtherRow();
