@@ -49,6 +49,11 @@ function(pelloric_component name component)
         endif()
         set_target_properties(${shared} PROPERTIES OUTPUT_NAME ${name} VERSION ${PROJECT_VERSION}
             SOVERSION ${PROJECT_VERSION_MAJOR} LINKER_LANGUAGE CXX)
+        if(UNIX AND NOT APPLE)
+            set(names "${PROJECT_SOURCE_DIR}/cmake/exports.map")
+            target_link_options(${shared} PRIVATE "LINKER:--version-script=${names}")
+            set_target_properties(${shared} PROPERTIES LINK_DEPENDS "${names}")
+        endif()
         # Where the system looks by itself, a path of one's own is out of place.
         if(NOT CMAKE_INSTALL_PREFIX STREQUAL "/usr")
             set_target_properties(${shared} PROPERTIES INSTALL_RPATH "$ORIGIN")

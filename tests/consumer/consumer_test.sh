@@ -39,8 +39,8 @@ install() {
     done
 }
 
-# onlyPublicNames LIBRARY...: fails for a function of the library that public headers do not export.
-# Weak names, as those of templates, are not looked at.
+# onlyPublicNames LIBRARY...: fails for a function of the library that public headers do not export, and
+# for every name that is not the library's.
 onlyPublicNames() {
     local public='pelloric::(version\(\)|RunTimeError|qt::('
     public+='Kestrane|Sorvane|MemoryGrid|Report::|export(Pdf|Png|Svg|Ostl)\(|print(ers|Pages)\(|'
@@ -48,6 +48,9 @@ onlyPublicNames() {
     public+='installTranslation\(|dataGrid|csvGrid|sqliteGrid|letScriptsCall|gridFor|useScriptCaller))'
     if nm -DC --defined-only "$@" | grep -E '^[0-9a-f]+ T pelloric::' | grep -vE "^[0-9a-f]+ T $public"; then
         fail "these names are exported, and no host is to use them"
+    fi
+    if nm -DC --defined-only "$@" | grep -E '^[0-9a-f]+ [A-Za-z] ' | grep -v 'pelloric::'; then
+        fail "these names are exported, and are not of this library"
     fi
 }
 
