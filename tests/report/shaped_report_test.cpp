@@ -110,7 +110,7 @@ TEST_F(ShapedReportTest, IsThePlainReportWhereItIsAskedForNothingThatShows)
 {
     struct Case {
         TableGrid grid;
-        Settings settings;
+        std::vector<Change> settings;
     };
     std::vector<Case> cases;
     cases.push_back({ gridOf(columnsOf(3, 2000), numberedRows(7, 3)), {} });

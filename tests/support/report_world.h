@@ -9,6 +9,8 @@
 #include "settings/settings_table.h"
 
 #include <initializer_list>
+#include <span>
+#include <utility>
 #include <utility>
 #include <vector>
 
@@ -39,7 +41,8 @@ inline std::vector<std::vector<Text>> numberedRows(int rows, int columns)
 /// A canvas on a platform whose settings file holds the default settings, with the footer empty.
 class ReportWorld : public FakePlatform {
 public:
-    using Settings = std::initializer_list<std::pair<Text, Text>>;
+    using Change = std::pair<Text, Text>; ///< key and value
+    using Settings = std::initializer_list<Change>; ///< lives as long as its statement
 
     ReportWorld(Settings changes = {})
         : canvas(services())
@@ -48,7 +51,10 @@ public:
     }
 
     /// Writes the settings file anew: the default settings with these values changed.
-    void set(Settings changes)
+    void set(Settings changes) { set(std::span(changes.begin(), changes.size())); }
+
+    /// The same.
+    void set(std::span<const Change> changes)
     {
         Text text;
         for (const Setting& setting : settingsTable()) {
