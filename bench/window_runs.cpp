@@ -9,13 +9,14 @@
 #include "sample_table.h"
 
 #include "controls/canvas.h"
-#include "controls/qt/sorvane.h"
 #include "fakes/fake_printer.h"
 #include "platform/qt/qt_platform.h"
 #include "settings/default_settings.h"
 #include "support/qt/beside.h"
 #include "ui/qt/preview_opener.h"
 #include "ui/qt/preview_window.h"
+
+#include <pelloric/sorvane.h>
 
 #include <QApplication>
 #include <QDockWidget>

@@ -170,7 +170,7 @@ private:
     void draw(PageDocument& document, const Paper& paper, int page, int row, int column) const
     {
         const QRgb rgb = FirstColor + static_cast<QRgb>(indexOf(page, row, column));
-        const Color color = (rgb & 0xFF) << 16 | (rgb & 0xFF00) | (rgb >> 16 & 0xFF);
+        const QRgb color = (rgb & 0xFF) << 16 | (rgb & 0xFF00) | (rgb >> 16 & 0xFF);
         const LinePen pen { .FillStyle = 0, .FillColor = static_cast<Color>(color) };
         document.append(LineRecord { { edge(column, paper.width), edge(row, paper.height) },
             { edge(column + 1, paper.width), edge(row + 1, paper.height) },
