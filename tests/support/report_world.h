@@ -11,7 +11,6 @@
 #include <initializer_list>
 #include <span>
 #include <utility>
-#include <utility>
 #include <vector>
 
 namespace pelloric {
