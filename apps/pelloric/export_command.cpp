@@ -185,6 +185,7 @@ struct Order {
             throw CommandError(
                 qt::phrased(u"--pages is for .pdf, .png and .svg; a document file holds all"),
                 WrongUsage);
+        refuseNoPages(line);
         if (line.has("dpi") && !format->takesDpi)
             throw CommandError(qt::phrased(u"--dpi is for .png images"), WrongUsage);
         if (line.has("jobs") && !format->takesDpi)

@@ -16,6 +16,11 @@
 #include <csignal>
 #include <new>
 
+#ifdef Q_OS_UNIX
+#include <fcntl.h>
+#include <unistd.h>
+#endif
+
 namespace pelloric::app {
 
 namespace {
@@ -114,6 +119,21 @@ int statusOf(const RunTimeError& error)
     return Failed;
 }
 
+/// Keeps files that are opened from taking the place of a standard stream that was closed, which
+/// would be written into them; reading and writing there fails, as it does without a stream.
+void fillStandardStreams()
+{
+#ifdef Q_OS_UNIX
+    for (const int stream : { STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO }) {
+        if (fcntl(stream, F_GETFD) >= 0)
+            continue;
+        const int held = open("/dev/null", stream == STDIN_FILENO ? O_WRONLY : O_RDONLY);
+        if (held >= 0 && held != stream)
+            close(held);
+    }
+#endif
+}
+
 /// Runs the program; every error becomes one line and an exit status.
 int guardedRun(int argc, char** argv)
 {
@@ -121,6 +141,7 @@ int guardedRun(int argc, char** argv)
     // A file past the largest size that is allowed is an error like any other.
     std::signal(SIGXFSZ, SIG_IGN);
 #endif
+    fillStandardStreams();
     // The toolkit would take options such as "--title" for its own.
     int applicationArgc = std::min(argc, 1);
     speakAs(QLocale::system());

@@ -7,6 +7,7 @@
 #include "document/ostl_reader.h"
 #include "font_notes.h"
 #include "grids/table_grid.h"
+#include "interruption.h"
 #include "outcome.h"
 #include "platform/automation_object.h"
 #include "platform/numbers.h"
@@ -152,7 +153,14 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
             qt::phrased(u"--%1 does not apply to a saved document, whose pages are laid out")
                 .arg(QString::fromLatin1(option)),
             WrongUsage);
+    checkReadable(file);
+    if (isPipe(file))
+        throw CommandError(
+            qt::phrased(u"%1 is a pipe; a saved document is read from a file, so save it "
+                        u"to one and name that")
+                .arg(file));
     requireFonts();
+    const Interruption::AtOnce atOnce;
     SavedDocument saved;
     try {
         if (readOstl(platform.codec, pathOf(file), saved.document, saved.setup)
@@ -164,6 +172,13 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
         throw CommandError(detailOf(error));
     }
     return saved;
+}
+
+void refuseNoPages(const CommandLine& line)
+{
+    if (line.has("pages") && line.value("pages").trimmed().isEmpty())
+        throw CommandError(
+            qt::phrased(u"--pages takes pages such as 1,3,5-12, not \"\""), WrongUsage);
 }
 
 std::vector<int> pagesOf(const QString& list, int pageCount)

@@ -165,10 +165,12 @@ void changeMargins(const CommandLine& line, ReportSettings& settings)
         const auto at = isOne ? 0 : static_cast<qsizetype>(margin);
         const std::optional<double> mm = millimetresOf(parts.value(at));
         if ((!isOne && parts.size() != 4) || !mm || *mm < LeastMarginMm || *mm > MostPaperMm)
-            throw CommandError(qt::phrased(u"--margins takes one length of %1 mm or more, or four "
-                                           u"(top,right,bottom,left), not \"%2\"")
-                                   .arg(LeastMarginMm)
-                                   .arg(line.value("margins")),
+            throw CommandError(
+                qt::phrased(u"--margins takes one length of %1 mm or more and at most %2 mm, or "
+                            u"four (top,right,bottom,left), not \"%3\"")
+                    .arg(LeastMarginMm)
+                    .arg(MostPaperMm)
+                    .arg(line.value("margins")),
                 WrongUsage);
         settings.*Margins[margin] = *mm;
     }

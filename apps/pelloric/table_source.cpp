@@ -15,7 +15,9 @@
 #include "tables/qt/json_table.h"
 #include "tables/qt/office_table.h"
 #include "tables/qt/sqlite_table.h"
+#include "tables/qt/text_file.h"
 
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QTemporaryFile>
@@ -64,40 +66,67 @@ DatabaseName splitName(const QString& name)
     return { name, {} };
 }
 
-void checkReadable(const QString& name)
-{
-    std::error_code ignored;
-    const auto type = std::filesystem::status(pathOf(name), ignored).type();
-    if (type == std::filesystem::file_type::not_found || type == std::filesystem::file_type::none)
-        throw CommandError(qt::phrased(u"%1: there is no such file").arg(name));
-    if (type == std::filesystem::file_type::directory)
-        throw CommandError(qt::phrased(u"%1 is a folder; name a file in it").arg(name));
-    if (type == std::filesystem::file_type::character || type == std::filesystem::file_type::block)
-        throw CommandError(qt::phrased(u"%1 is a device; name a file").arg(name));
-    if (type == std::filesystem::file_type::regular && !std::ifstream(pathOf(name)))
-        throw CommandError(qt::phrased(u"%1: you may not read this file").arg(name));
-}
-/// What a pipe hands over, in a file that can be read twice.
+/// What a pipe hands over, in a file of the same kind that can be read twice; removed with the
+/// object.
 class PipedInput {
 public:
-    PipedInput()
+    /// @param name   of the pipe; "-" is the standard input
+    /// @param shown  what it is called in errors
+    PipedInput(const QString& name, QString shown)
+        : shown_(std::move(shown))
+        , file_(QDir::tempPath() + QStringLiteral("/pelloric-XXXXXX.") + QFileInfo(name).suffix())
     {
-        QFile in;
-        if (!file_.open() || !in.open(stdin, QIODevice::ReadOnly))
-            throw CommandError(
-                qt::phrased(u"the standard input cannot be kept: %1").arg(file_.errorString()));
-        constexpr qint64 Piece = 1 << 20;
-        for (QByteArray bytes = in.read(Piece); !bytes.isEmpty(); bytes = in.read(Piece)) {
-            if (file_.write(bytes) != bytes.size())
-                throw CommandError(
-                    qt::phrased(u"the standard input cannot be kept: %1").arg(file_.errorString()));
-        }
+        QFile in(pathOf(name));
+        const QIODevice::OpenMode mode = QIODevice::ReadOnly | QIODevice::Unbuffered;
+        if (!(name == StandardInput ? in.open(stdin, mode) : in.open(mode)))
+            refuseReading(in);
+        if (!file_.open())
+            throw CommandError(qt::phrased(u"%1 cannot be kept in %2: %3; name another folder in "
+                                           u"TMPDIR, or save it to a file and name that")
+                                   .arg(shown_, QDir::tempPath(), file_.errorString()));
+        QByteArray bytes(1 << 20, Qt::Uninitialized);
+        qint64 size = 0;
+        while ((size = in.read(bytes.data(), bytes.size())) > 0)
+            keep({ bytes.constData(), size });
+        if (in.error() != QFileDevice::NoError)
+            refuseReading(in);
         file_.close();
     }
 
     QString name() const { return file_.fileName(); }
 
 private:
+    [[noreturn]] void refuseReading(const QFile& in) const
+    {
+        throw CommandError(qt::phrased(u"%1 cannot be read: %2").arg(shown_, in.errorString()));
+    }
+
+    void keep(QByteArrayView bytes)
+    {
+        if (file_.size() > qt::MostPipeBytes - bytes.size())
+            throw CommandError(qt::phrased(u"%1 goes on after %2 GB, which is the most that is "
+                                           u"taken of a pipe; save it to a file and name that, or "
+                                           u"hand over fewer rows")
+                                   .arg(shown_)
+                                   .arg(qt::MostPipeBytes >> 30));
+        if (hasNoRoom() || file_.write(bytes.data(), bytes.size()) != bytes.size()
+            || !file_.flush())
+            throw CommandError(qt::phrased(u"%1 does not fit into %2, where it is kept while it is "
+                                           u"read; make room there, or name another folder in "
+                                           u"TMPDIR")
+                                   .arg(shown_, QDir::tempPath()));
+    }
+
+    /// Whether no more than what other programs need is left.
+    static bool hasNoRoom()
+    {
+        constexpr std::uintmax_t LeastLeft = 64U << 20U;
+        std::error_code none;
+        const auto space = std::filesystem::space(pathOf(QDir::tempPath()), none);
+        return !none && space.available < LeastLeft;
+    }
+
+    QString shown_;
     QTemporaryFile file_;
 };
 
@@ -170,7 +199,29 @@ TableGrid readValues(
 
 } // namespace
 
+void checkReadable(const QString& name)
+{
+    std::error_code ignored;
+    const auto type = std::filesystem::status(pathOf(name), ignored).type();
+    if (type == std::filesystem::file_type::not_found || type == std::filesystem::file_type::none)
+        throw CommandError(qt::phrased(u"%1: there is no such file").arg(name));
+    if (type == std::filesystem::file_type::directory)
+        throw CommandError(qt::phrased(u"%1 is a folder; name a file in it").arg(name));
+    if (type == std::filesystem::file_type::character || type == std::filesystem::file_type::block)
+        throw CommandError(qt::phrased(u"%1 is a device; name a file").arg(name));
+    if (type == std::filesystem::file_type::socket)
+        throw CommandError(qt::phrased(u"%1 is a socket; name a file").arg(name));
+    if (type == std::filesystem::file_type::regular && !std::ifstream(pathOf(name)))
+        throw CommandError(qt::phrased(u"%1: you may not read this file").arg(name));
+}
+
 OptionTable sourceOptions() { return Options; }
+
+bool isPipe(const QString& name)
+{
+    std::error_code ignored;
+    return name == StandardInput || std::filesystem::is_fifo(pathOf(name), ignored);
+}
 
 bool isDatabase(const QString& name)
 {
@@ -199,10 +250,11 @@ TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& 
 {
     const Interruption::AtOnce atOnce;
     std::optional<PipedInput> piped;
-    if (file == StandardInput)
-        piped.emplace();
+    const QString shownPipe = file == StandardInput ? standardInputName() : file;
+    if (isPipe(file))
+        piped.emplace(file, shownPipe);
     const DatabaseName name = splitName(piped ? piped->name() : file);
-    const QString shown = piped ? standardInputName() : name.file;
+    const QString shown = piped ? shownPipe : name.file;
     checkReadable(name.file);
     const bool isFromDatabase = isDatabase(name.file);
     const bool isOffice = qt::isOfficeFile(pathOf(name.file));

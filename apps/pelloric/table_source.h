@@ -16,6 +16,14 @@ OptionTable sourceOptions();
 
 using qt::pathOf;
 
+/// Refuses in words what no file is that can be read: a name without one, a folder, a device, a
+/// socket, or a file without the rights. A pipe is none of these.
+/// @throws CommandError naming it
+void checkReadable(const QString& name);
+
+/// Whether a name is the standard input's, or a pipe's, which can be read only once.
+bool isPipe(const QString& name);
+
 /// Whether a file is an SQLite database.
 bool isDatabase(const QString& name);
 

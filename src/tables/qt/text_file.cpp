@@ -57,6 +57,9 @@ std::string readAll(const std::filesystem::path& path, const TextFileOptions& op
         bytes.resize(size + Chunk);
         file.read(bytes.data() + size, ChunkBytes);
         size += static_cast<std::size_t>(file.gcount());
+        if (whole == 0 && static_cast<std::int64_t>(size) > MostPipeBytes)
+            throw RunTimeError(ErrorNumber::Overflow,
+                pathText(path) + u" goes on after 4 GB; save it to a file and name that");
         // A pipe has no size, and a file may grow while it is read.
         tell(options.progress, static_cast<std::int64_t>(size),
             static_cast<std::int64_t>(whole > 0 ? std::max(size, whole) : 0));

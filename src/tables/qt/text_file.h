@@ -8,10 +8,14 @@
 
 #include <QString>
 
+#include <cstdint>
 #include <filesystem>
 #include <string>
 
 namespace pelloric::qt {
+
+/// The most that is taken of a pipe, which may have no end.
+inline constexpr std::int64_t MostPipeBytes = std::int64_t(4) << 30;
 
 /// A text file that was read.
 struct TextFile {
@@ -31,7 +35,7 @@ struct TextFileOptions {
 /// @throws RunTimeError FileNotFound: it is missing or cannot be read, with the path; TypeMismatch,
 ///         naming the line where there is one: an unknown encoding, bytes that are no text, or a
 ///         file that begins as no table does, see `notATable`;
-///         Cancelled: the progress said so
+///         Overflow: a pipe goes on after `MostPipeBytes`; Cancelled: the progress said so
 TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options);
 
 /// "line 3: what": how errors of text files begin.

@@ -309,6 +309,9 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
         { "export t.csv -o t.pdf --paper Q7", 2, "Q7" },
         { "export t.csv -o t.png --dpi x", 2, "from 10 to 2400" },
         { "export t.csv -o t.ostl --pages 1", 2, "--pages" },
+        { "export t.csv -o t.pdf --pages=", 2, "--pages takes pages such as 1,3,5-12" },
+        { "print t.csv --pages=", 2, "--pages takes pages such as 1,3,5-12" },
+        { "export t.csv -o t.pdf --margins 9999mm", 2, "of 1 mm or more and at most " },
         { "export t.csv -o t.pdf --landscape --portrait", 2, "not both" },
         { "export missing.csv -o t.pdf", 1, "missing.csv: there is no such file" },
         { "export one_object.json -o kept.pdf", 1, "one_object.json: the file is one object" },
@@ -438,6 +441,7 @@ TEST_F(Program, SaysOfADamagedDocumentThatItOpensWhatItSaysWhenItExportsIt)
         EXPECT_EQ(ended.status, 1) << arguments;
         EXPECT_TRUE(has(ended.errors, "large.ostl is damaged: 1000000000000 is not between "))
             << ended.errors;
+        EXPECT_FALSE(has(ended.errors, "shown")) << ended.errors; // for nothing stands before it
     }
 }
 

@@ -10,7 +10,11 @@
 
 #if defined(__unix__)
 
+#include <signal.h>
 #include <sys/resource.h>
+#include <sys/socket.h>
+#include <sys/stat.h>
+#include <sys/un.h>
 #include <unistd.h>
 
 #include <algorithm>
@@ -306,6 +310,148 @@ TEST_F(ProgramFaults, ReadAndWriteFilesWhoseNamesAreNoText)
     }
     EXPECT_EQ(command("export o\xFE.ostl -o again.pdf").status, 0);
     EXPECT_EQ(folder_.names().size(), 7U); // and the script
+}
+
+/// A place for the temporary files of the program, which must be empty behind it.
+class Pipes : public ProgramFaults {
+protected:
+    Pipes()
+    {
+        namespace fs = std::filesystem;
+        fs::create_directory(folder_.file("tmp"));
+        // Without one, the toolkit makes itself a folder beside the temporary files.
+        fs::create_directory(folder_.file("runtime"));
+        fs::permissions(folder_.file("runtime"), fs::perms::owner_all);
+        surround = [this](QProcess& process, QProcessEnvironment& environment) {
+            environment.insert(
+                QStringLiteral("TMPDIR"), QString::fromStdString(folder_.file("tmp").string()));
+            if (most > 0)
+                limit(process, RLIMIT_FSIZE, most);
+        };
+    }
+
+    ~Pipes() override
+    {
+        std::error_code none;
+        EXPECT_TRUE(std::filesystem::is_empty(folder_.file("tmp"), none));
+    }
+
+    /// Runs a line of the shell in which $P is the program.
+    Ended shell(const std::string& line)
+    {
+        QProcess process;
+        QProcessEnvironment environment = surroundings();
+        environment.insert(QStringLiteral("P"), QStringLiteral(PELLORIC_PROGRAM));
+        surround(process, environment);
+        process.setProcessEnvironment(environment);
+        process.setWorkingDirectory(QString::fromStdString(folder_.path().string()));
+        process.start(QStringLiteral("bash"), { QStringLiteral("-c"), line.c_str() });
+        return finish(process);
+    }
+
+    /// Starts the program, which will wait or work for ever, and has it ended by Ctrl+C.
+    /// @return  milliseconds from the signal to the program's end
+    qint64 interrupted(const QStringList& arguments, const QString& input = {})
+    {
+        QProcess process;
+        if (!input.isEmpty())
+            process.setStandardInputFile(input);
+        start(process, arguments);
+        EXPECT_FALSE(process.waitForFinished(1500)) << process.readAllStandardError().toStdString();
+        QElapsedTimer clock;
+        clock.start();
+        kill(static_cast<pid_t>(process.processId()), SIGINT);
+        const Ended ended = finish(process);
+        EXPECT_EQ(ended.status, 130) << ended.errors;
+        EXPECT_EQ(ended.errors, "");
+        return clock.elapsed();
+    }
+
+    rlim_t most = 0; ///< bytes that a file may hold; 0: no limit
+};
+
+TEST_F(Pipes, ThatHaveNoEndAreRefusedWhereNothingMoreFits)
+{
+    most = 8U << 20U;
+    for (const char* line : { "yes | $P export - -o t.pdf", "$P export - -o t.pdf < /dev/zero",
+             "$P export <(yes) -o t.pdf", "yes | $P export - -o - > /dev/null" }) {
+        const Ended ended = shell(line);
+        EXPECT_EQ(ended.status, 1) << line;
+        EXPECT_TRUE(has(ended.errors, "does not fit into ")) << line << ended.errors;
+        EXPECT_TRUE(has(ended.errors, "TMPDIR")) << ended.errors;
+    }
+    EXPECT_FALSE(std::filesystem::exists(folder_.file("t.pdf")));
+}
+
+TEST_F(Pipes, EndAtOnceWhenInterrupted)
+{
+    ASSERT_EQ(mkfifo(folder_.file("silent.csv").c_str(), 0600), 0);
+    ASSERT_EQ(mkfifo(folder_.file("silent.ostl").c_str(), 0600), 0);
+    constexpr qint64 Longest = 5000; // of a machine that does much else
+    constexpr qint64 Grace = 3000; // for what is asked to end
+    EXPECT_LT(interrupted(words("export silent.csv -o t.pdf")), Longest);
+    EXPECT_LT(interrupted(words("export - -o -")), Longest);
+    folder_.write("t.csv", "a\n1\n");
+    EXPECT_LT(interrupted(words("export t.csv -o t.pdf --logo silent.csv")), Longest + Grace);
+    std::filesystem::remove(folder_.file("t.csv"));
+    const Ended document = run(words("export silent.ostl -o t.pdf"));
+    EXPECT_EQ(document.status, 1);
+    EXPECT_TRUE(has(document.errors, "silent.ostl is a pipe; ")) << document.errors;
+    EXPECT_THAT(sortedNames(), testing::ElementsAre("runtime", "silent.csv", "silent.ostl", "tmp"));
+}
+
+TEST_F(Pipes, AreReadAsFilesOfTheirKindAre)
+{
+    const Ended json = shell("$P export <(echo '[{\"a\": 1}]') -o t.svg");
+    EXPECT_EQ(json.status, 0) << json.errors;
+    EXPECT_TRUE(has(folder_.read("t.svg"), ">a<")) << folder_.read("t.svg");
+    ASSERT_EQ(mkfifo(folder_.file("x.tsv").c_str(), 0600), 0);
+    const Ended tabs = shell("printf 'a,b\tc\n1\t2\n' > x.tsv & $P export x.tsv -o t.svg");
+    EXPECT_EQ(tabs.status, 0) << tabs.errors;
+    EXPECT_TRUE(has(folder_.read("t.svg"), ">a,b<")) << folder_.read("t.svg");
+}
+
+TEST_F(Pipes, AndOtherThingsThatCannotBeReadAreNamed)
+{
+    struct Case {
+        const char* line;
+        const char* message;
+    };
+    folder_.write("t.csv", "a\n1\n");
+    constexpr Case Cases[] = {
+        { "$P export - -o t.pdf < .", "standard input cannot be read: Is a directory" },
+        { "$P export - -o t.pdf <&-", "standard input cannot be read: " },
+        { "$P export tmp -o t.pdf", "tmp is a folder" },
+        { "$P export /dev/zero -o t.pdf", "/dev/zero is a device" },
+        { "ln -s /dev/zero z.ostl; $P export z.ostl -o t.pdf", "z.ostl is a device" },
+        { "$P export t.csv -o - >&-", "standard output cannot be written" },
+        { "$P export t.csv -o u.pdf --json >&-", "standard output cannot be written" },
+        { "$P help >&-", "standard output cannot be written" },
+    };
+    for (const Case& row : Cases) {
+        const Ended ended = shell(row.line);
+        EXPECT_EQ(ended.status, 1) << row.line;
+        EXPECT_TRUE(has(ended.errors, row.message)) << row.line << ": " << ended.errors;
+    }
+    EXPECT_FALSE(std::filesystem::exists(folder_.file("t.pdf")));
+    EXPECT_TRUE(folder_.read("u.pdf").ends_with("%%EOF\n")); // what was made is whole
+    EXPECT_EQ(shell("$P export t.csv -o v.pdf 2>&-").status, 0);
+    EXPECT_TRUE(folder_.read("v.pdf").ends_with("%%EOF\n"));
+}
+
+TEST_F(Pipes, ThatASocketIsNamedAsOne)
+{
+    const int end = socket(AF_UNIX, SOCK_STREAM, 0);
+    sockaddr_un address {};
+    address.sun_family = AF_UNIX;
+    const std::string name = folder_.file("s").string();
+    ASSERT_LT(name.size(), sizeof address.sun_path);
+    std::ranges::copy(name, address.sun_path);
+    ASSERT_EQ(bind(end, reinterpret_cast<const sockaddr*>(&address), sizeof address), 0);
+    const Ended ended = run(words("export s -o t.pdf"));
+    close(end);
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_TRUE(has(ended.errors, "s is a socket; name a file")) << ended.errors;
 }
 
 #if !defined(__SANITIZE_ADDRESS__) // which takes more addresses than there are bytes of memory

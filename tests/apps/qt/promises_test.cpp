@@ -54,12 +54,17 @@ protected:
 
 TEST_F(Promises, HoldThatNothingGoesOverANetwork)
 {
+    copySample();
     folder_.write("t.csv", "a\nhttp://example.org/picture.png\n");
-    for (const char* out : { "t.pdf", "t.svg", "t.png", "t.ostl" }) {
-        for (const QString& call :
-            callsOf("socket,connect", { "export", "t.csv", "-o", QString::fromLatin1(out) }))
-            EXPECT_FALSE(call.contains("AF_INET")) << call.toStdString();
+    folder_.write("t.json", "[{\"$ref\": \"http://example.org/rows.json\"}]\n");
+    folder_.write("s.js", "print(typeof XMLHttpRequest, typeof fetch, typeof require)\n");
+    for (const char* line : { "export t.csv -o t.pdf", "export t.csv -o t.svg",
+             "export t.csv -o t.png", "export t.csv -o t.ostl", "export t.ostl -o u.pdf",
+             "export t.json -o t.pdf", "export s.sqlite:wine -o t.pdf", "run s.js", "settings" }) {
+        for (const QString& call : callsOf("socket,connect", words(line)))
+            EXPECT_FALSE(call.contains("AF_INET")) << line << ": " << call.toStdString();
     }
+    EXPECT_EQ(run(words("run s.js")).output, "undefined undefined undefined\n");
 }
 
 TEST_F(Promises, HoldThatNoProgramIsStarted)
