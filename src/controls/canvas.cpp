@@ -319,9 +319,13 @@ void Canvas::OpenFile(const std::filesystem::path& path)
             return;
         }
     } catch (const RunTimeError& error) {
-        if (error.number() != ErrorNumber::FileNotFound)
-            showFirstPage(); // what was read before stays
-        throw;
+        if (error.number() == ErrorNumber::FileNotFound)
+            throw;
+        showFirstPage(); // what was read before stays
+        if (!document_.hasRecords())
+            throw;
+        throw RunTimeError(error.number(),
+            phrase(u"%1; what stands before it is shown", { error.detail() }));
     }
     showFirstPage();
 }

@@ -219,8 +219,7 @@ OstlResult readNamed(const TextCodec& codec, std::istream& stream, PageDocument&
         return readOstl(codec, stream, document, setup);
     } catch (const RunTimeError& error) {
         throw RunTimeError(error.number(),
-            phrase(u"%1 is damaged: %2; what stands before it was read",
-                { pathText(path), error.detail() }));
+            phrase(u"%1 is damaged: %2", { pathText(path), error.detail() }));
     }
 }
 

@@ -62,6 +62,12 @@ PageDocument::PageDocument()
 {
 }
 
+bool PageDocument::hasRecords() const
+{
+    return std::ranges::any_of(
+        pages_, [](const Page& page) { return page.lines.size() > 0 || page.texts.size() > 0; });
+}
+
 void PageDocument::newPage()
 {
     if (Totalpages == std::numeric_limits<std::int16_t>::max())

@@ -80,6 +80,9 @@ public:
     PageDocument cleared() const;
 
     /// Whether there is such a page.
+    /// Whether anything is drawn on any page.
+    bool hasRecords() const;
+
     bool hasPage(int page) const { return page >= 0 && page < pageCount(); }
 
     /// @throws RunTimeError SubscriptOutOfRange: no such page

@@ -32,14 +32,25 @@ TableGrid::TableGrid(std::vector<TableColumn> columns)
 void TableGrid::reserve(std::size_t rows)
 {
     rowStarts_.reserve(rows);
-    cellEnds_.reserve(rows * columns_.size());
+    cellEnds_.reserve(std::min<std::size_t>(rows * columns_.size(), MostCells));
+}
+
+void TableGrid::requireRoom(std::size_t rows, std::size_t columns) const
+{
+    if (columns > 0 && rows > MostCells / columns)
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"row %1 of a table of %2 columns makes more than %3 cells; take fewer rows or "
+                   u"columns",
+                { decimal(rowCount()), decimal(static_cast<std::int64_t>(columns)),
+                    decimal(static_cast<std::int64_t>(MostCells)) }));
 }
 
 void TableGrid::widen(std::size_t count, const TableColumn& column)
 {
+    requireRoom(rowStarts_.size(), count);
     const std::size_t before = columns_.size();
     std::vector<std::uint32_t> ends;
-    ends.reserve(rowStarts_.capacity() * count);
+    ends.reserve(std::min<std::size_t>(rowStarts_.capacity() * count, MostCells));
     for (std::size_t row = 0; row < rowStarts_.size(); ++row) {
         const auto first = cellEnds_.begin() + static_cast<std::ptrdiff_t>(row * before);
         ends.insert(ends.end(), first, first + static_cast<std::ptrdiff_t>(before));
@@ -69,6 +80,7 @@ void TableGrid::addRow(std::span<const TextView> cells, std::span<const std::uin
         throw RunTimeError(ErrorNumber::Overflow,
             phrase(u"row %1 holds more than 4294967295 characters", { decimal(rowCount() + 1) }));
 
+    requireRoom(rowStarts_.size() + 1, columns_.size());
     char16_t* const texts = store_->room(length);
     rowStarts_.push_back(texts);
     std::uint32_t end = 0;

@@ -30,6 +30,9 @@ struct TableColumn {
 /// costs little more than its texts.
 class TableGrid final : public AutomationObject, public KeptCells, public CellLooks {
 public:
+    /// Empty ones count: a wide table of few values takes its room all the same.
+    static constexpr std::uint64_t MostCells = 1ULL << 29U;
+
     /// A table without rows.
     explicit TableGrid(std::vector<TableColumn> columns);
 
@@ -39,13 +42,14 @@ public:
     /// Adds columns at the right, empty in the rows that are there.
     /// @param count   how many columns there are then; not fewer than now
     /// @param column  what each of the new ones is
+    /// @throws RunTimeError Overflow: more than `MostCells`; the table is as before
     void widen(std::size_t count, const TableColumn& column);
 
     /// Adds a row at the end.
     ///
     /// @param cells  left to right; cells that are missing at the end are empty
     /// @throws RunTimeError SubscriptOutOfRange: more cells than columns; Overflow: a row of 2^32
-    ///         code units or more; the table is as before
+    ///         code units or more, or more than `MostCells`; the table is as before
     /// @param looks  numbers of the looks of these cells; others have look 0; may be empty
     void addRow(std::span<const TextView> cells, std::span<const std::uint16_t> looks = {});
 
@@ -85,6 +89,8 @@ public:
     std::optional<double> number(std::int32_t, std::int32_t) override { return std::nullopt; }
 
 private:
+    void requireRoom(std::size_t rows, std::size_t columns) const;
+
     std::vector<TableColumn> columns_;
     std::shared_ptr<TextStore> store_; ///< lives on where pages show its texts
     std::vector<const char16_t*> rowStarts_; ///< a row's cells, one behind the other

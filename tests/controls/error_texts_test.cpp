@@ -4,6 +4,7 @@
 #include "controls/canvas.h"
 #include "document/text_search.h"
 #include "document/text_store.h"
+#include "fakes/fake_object.h"
 #include "fakes/fake_platform.h"
 #include "grids/table_grid.h"
 #include "platform/automation_object.h"
@@ -13,11 +14,15 @@
 #include "platform/safe_file.h"
 #include "platform/value.h"
 #include "print/page_list.h"
+#include "report/chosen_rows.h"
+#include "report/late_bound_rows.h"
 #include "report/table_row_set.h"
 #include "settings/default_settings.h"
 #include "settings/settings_file.h"
 #include "support/test_paths.h"
+#include "view/page_arrangement.h"
 #include "view/page_texts.h"
+#include "view/view_state.h"
 
 #include <gmock/gmock.h>
 
@@ -130,6 +135,16 @@ TEST(ErrorTexts, NameTheObjectTheLimitAndTheWayOut)
                 world.grid.addRow(std::vector<TextView> { u"1", u"2", u"3" });
             },
             ErrorNumber::SubscriptOutOfRange, { "a row of 3 cells; there are 2 columns" } },
+        { "too many cells of a table",
+            [&] {
+                TableGrid tall({ { u"a", 1000 } });
+                for (int row = 0; row < 20000; ++row)
+                    tall.addRow({});
+                tall.widen(32767, {});
+            },
+            ErrorNumber::Overflow,
+            { "row 20000 of a table of 32767 columns makes more than 536870912 cells; take fewer "
+              "rows or columns" } },
         { "a page", [&] { static_cast<void>(document.lines(4)); }, ErrorNumber::SubscriptOutOfRange,
             { "page 5; there is 1" } },
         { "a line of a page", [&] { static_cast<void>(document.line(0, 2)); },
@@ -165,6 +180,16 @@ TEST(ErrorTexts, NameTheObjectTheLimitAndTheWayOut)
             },
             ErrorNumber::Overflow,
             { world.path("bad.ostl"), "is damaged", "99999999999 is not between" } },
+        { "a document that is damaged behind its first line",
+            [&] {
+                world.open("cut.ostl",
+                    "##Release2004-10-23\r\n##Release2004-10-23PageWidth=100\r\n"
+                    "##Release2004-10-23PageHeight=100\r\n##Release2004-10-23[0]\r\n"
+                    "##Release2004-10-23 PLine Begin\r\n1\r\n0\r\n0\r\n1\r\n0\r\n1\r\n1\r\n"
+                    "9\r\n9\r\n99999\r\n");
+            },
+            ErrorNumber::Overflow,
+            { world.path("cut.ostl"), "99999 is not between", "what stands before it is shown" } },
         { "a file that cannot be written",
             [&] {
                 SafeFile(
@@ -214,6 +239,110 @@ TEST(ErrorTexts, NameTheObjectTheLimitAndTheWayOut)
                 world.canvas.doPreview(world.grid);
             },
             ErrorNumber::FileNotFound, { world.path("OstlConfig.ini"), "restore the defaults" } },
+    };
+    for (const ErrorRow& row : rows)
+        expectError(row);
+}
+
+TEST(ErrorTexts, OfGridsNameWhatIsWrongWithThem)
+{
+    World world;
+    world.grid.addRow(std::vector<TextView> { u"3", u"4" });
+    FakeObject wide;
+    wide.number(u"Cols", 1e9);
+    wide.number(u"Rows", 2);
+    wide.number(u"ColWidth", 1000);
+    wide.text(u"TextMatrix", u"x");
+    FakeRecords lost({ u"A" }, { { u"1" } }, FakeRecords::Cursor::Steps);
+    lost.rows.resize(9, { u"1" });
+    lost.position = 7;
+    TableRowSet oneField(std::make_shared<TextStore>());
+    oneField.appendField(u"a");
+    FakeDataGrid data(Value::ofRows(oneField), { 1000, 1000 });
+    const std::vector<Text> titles { u"a", u"b" };
+    const std::vector<Text> wanted { u"Sum" };
+    const Value object = Value::ofObject(world.grid);
+    const ErrorRow rows[] = {
+        { "an object as rows", [&] { static_cast<void>(object.toRows()); },
+            ErrorNumber::TypeMismatch, { "a row set was expected" } },
+        { "an object as a text",
+            [&] {
+                Text buffer;
+                displayText(object, u'.', buffer);
+            },
+            ErrorNumber::TypeMismatch, { "an object has no text" } },
+        { "an object in a cell",
+            [&] {
+                TableRowSet cells(std::make_shared<TextStore>());
+                cells.appendField(u"a");
+                cells.addRecord();
+                cells.setLast(0, object);
+            },
+            ErrorNumber::TypeMismatch, { "a cell holds an object" } },
+        { "a column that is not printed", [&] { fieldsNamed(titles, wanted); },
+            ErrorNumber::InvalidCall, { "the grid prints no column \"Sum\"" } },
+        { "marked rows of a grid without marks",
+            [&] { chosenRecords(oneField, { .rows = RowChoice::Marked }, nullptr, 1, u'.'); },
+            ErrorNumber::InvalidCall, { "this grid does not tell which of its rows are marked" } },
+        { "columns without end", [&] { world.canvas.doPreview(wide); }, ErrorNumber::Overflow,
+            { "the grid has 1000000000 columns, at most 1000000 can be read" } },
+        { "other columns than were built",
+            [&] {
+                TableGrid three { { { u"a", 1000 }, { u"b", 1000 }, { u"c", 1000 } } };
+                world.canvas.doPreview(world.grid);
+                world.canvas.ReDrawZoom(three);
+            },
+            ErrorNumber::SubscriptOutOfRange,
+            { "the grid prints 3 columns now, the report was built with 2; preview it anew" } },
+        { "more columns than fields",
+            [&] {
+                world.canvas.m_PrintObj = PrintObjKind::datagrid;
+                world.canvas.doPreview(data);
+            },
+            ErrorNumber::SubscriptOutOfRange, { "the data grid has more columns than fields" } },
+        { "a cursor that is lost", [&] { const LateBoundRows read(lost); },
+            ErrorNumber::InvalidCall, { "the data source never comes to its first record" } },
+        { "a logo",
+            [&] {
+                Canvas canvas(world.platform.services());
+                canvas.options.logo.imageFile = u"missing";
+                canvas.doPreview(world.grid);
+            },
+            ErrorNumber::FileNotFound, { "missing is no picture" } },
+        { "a row without end",
+            [&] {
+                const Text text(1U << 24U, u'x');
+                const std::vector<TextView> cells(256, text);
+                TableGrid(std::vector<TableColumn>(256)).addRow(cells);
+            },
+            ErrorNumber::Overflow, { "row 1 holds more than 4294967295 characters" } },
+    };
+    for (const ErrorRow& row : rows)
+        expectError(row);
+}
+
+TEST(ErrorTexts, OfViewsNameWhatHasNoSize)
+{
+    const ErrorRow rows[] = {
+        { "paper without a width", [] { gridOf(OrderStyle::Multiple, 100, {}); },
+            ErrorNumber::DivisionByZero, { "the paper has no width" } },
+        { "paper without a height",
+            [] {
+                fittingDivisor(100, 100, { 1, 1 }, { .myWidth = 9 });
+            },
+            ErrorNumber::DivisionByZero, { "the paper has no width or no height" } },
+        { "a window without room",
+            [] {
+                fittingDivisor(FittingEdge, FittingEdge, { 1, 1 }, { .myWidth = 9, .myHeight = 9 });
+            },
+            ErrorNumber::DivisionByZero, { "the window has no room for a page" } },
+        { "a divisor",
+            [] {
+                ViewState view;
+                view.divisor = 3e38F;
+                zoomIn(view, {});
+            },
+            ErrorNumber::Overflow, { "the pages cannot be shown any smaller" } },
     };
     for (const ErrorRow& row : rows)
         expectError(row);

@@ -112,6 +112,17 @@ TEST(TableGrid, HasEmptyCellsWhereItIsWidened)
     EXPECT_EQ(grid.cell(3, 4), u"5");
 }
 
+TEST(TableGrid, RefusesMoreCellsThanItHoldsAndKeepsThoseItHas)
+{
+    TableGrid grid({ { u"a", 1000 } });
+    for (int row = 0; row < 20000; ++row)
+        grid.addRow(std::vector<TextView> { u"1" });
+    const auto widen = [&] { grid.widen(32767, { u"b", 1000 }); };
+    EXPECT_EQ(errorOf(widen), ErrorNumber::Overflow);
+    EXPECT_EQ(grid.columnCount(), 1);
+    EXPECT_EQ(grid.cell(19999, 0), u"1");
+}
+
 TEST(TableGrid, TakesWidthsAsTheyArePut)
 {
     TableGrid grid = fruits();

@@ -342,7 +342,13 @@ TEST(PreviewNavigation, BuildsRefreshesAndZoomsAGrid)
     fixture.click({ 2 });
     EXPECT_DOUBLE_EQ(fixture.canvas.table()->ColumnWidths[0], 1000);
     fixture.session().forgetGrid();
-    EXPECT_EQ(errorOf([&] { fixture.session().refresh(true); }), ErrorNumber::ObjectMissing);
+    try {
+        fixture.session().refresh(true);
+        ADD_FAILURE() << "no error";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(error.number(), ErrorNumber::ObjectMissing);
+        EXPECT_EQ(error.detail(), u"no grid is previewed");
+    }
     EXPECT_EQ(errorOf([&] { fixture.session().reZoom(); }), ErrorNumber::ObjectMissing);
     fixture.click({ 2, 23, 24 });
 }

@@ -154,7 +154,9 @@ void refuseZeroBytes(std::string_view text)
     if (zero == std::string_view::npos)
         return;
     const auto line = std::ranges::count(text.substr(0, zero), '\n') + 1;
-    refuse(atLine(line, phrase(u"a zero byte; this is no text file")));
+    refuse(atLine(line,
+        phrase(u"a zero byte; this is no text file, unless in UTF-16: then name UTF-16LE or "
+               u"UTF-16BE as its encoding")));
 }
 
 Text gluedNote(const OddRows& odd)

@@ -224,8 +224,12 @@ std::int64_t lineAt(std::string_view text, std::size_t position)
 Text explained(const std::string& error)
 {
     const std::size_t colon = error.rfind(": ");
-    return phrase(u"this is no JSON: %1",
-        { fromUtf8(colon == std::string::npos ? error : error.substr(colon + 2)) });
+    if (colon != std::string::npos)
+        return phrase(u"this is no JSON: %1", { fromUtf8(error.substr(colon + 2)) });
+    // Of a number that no program could hold, the parser gives its own name and the number.
+    const std::size_t number = error.rfind('\'', error.size() - 2);
+    return phrase(u"the number %1 is too large; write it in quotation marks",
+        { fromUtf8(error.substr(std::min(number, error.size()))) });
 }
 
 /// @param firstLine  of the text in its file

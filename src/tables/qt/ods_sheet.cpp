@@ -18,14 +18,14 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr std::int64_t MostRepeated = 1048576;
+constexpr int MostBlanks = 1 << 24; ///< that one element stands for
 
 /// How often a row or cell stands there.
 std::int64_t repeated(const QXmlStreamReader& xml, const char* name)
 {
     for (const QXmlStreamAttribute& one : xml.attributes()) {
         if (one.name() == QLatin1String(name))
-            return std::clamp<std::int64_t>(one.value().toLongLong(), 1, MostRepeated);
+            return std::clamp<std::int64_t>(one.value().toLongLong(), 1, SheetCells::MostRows);
     }
     return 1;
 }
@@ -98,7 +98,8 @@ private:
         const QString style = attribute(xml_, "default-cell-style-name");
         columns_.emplace_back(count, style);
         if (!style.isEmpty())
-            cells_.fillBlanks({ 0, columnCount_, MostRepeated, count }, looks_.value(style));
+            cells_.fillBlanks(
+                { 0, columnCount_, SheetCells::MostRows, count }, looks_.value(style));
         const auto width = widths_.constFind(attribute(xml_, "style-name"));
         const QString visibility = attribute(xml_, "visibility");
         if (!visibility.isEmpty() && visibility != QLatin1String("visible"))
@@ -121,6 +122,8 @@ private:
     {
         const std::int64_t rows = repeated(xml_, "number-rows-repeated");
         std::int64_t column = 0;
+        std::int64_t end = 0; ///< of what is filled
+        std::int64_t characters = 0;
         std::vector<Filled> filled;
         while (!atEndOf("table-row")) {
             if (!xml_.isStartElement() || !isCell(xml_.name()))
@@ -135,10 +138,19 @@ private:
                 cells_.merge(box);
             if (text.empty() && !style.isEmpty())
                 cells_.fillBlanks({ row, column, rows, columns }, looks_.value(style));
-            for (std::int64_t at = 0; at < columns && !text.empty(); ++at)
-                filled.push_back({ column + at, text, value, lookAt(style, column + at) });
+            if (!text.empty()) {
+                if (column >= SheetCells::MostColumns)
+                    cells_.put(row, column, text, {}, value); // which refuses it
+                end = std::min(column + columns, SheetCells::MostColumns + 1);
+                characters += (end - column) * std::ssize(text);
+                cells_.requireRoom(0, characters);
+            }
+            for (std::int64_t at = column; at < end && !text.empty(); ++at)
+                filled.push_back({ at, text, value, lookAt(style, at) });
             column += columns;
         }
+        cells_.requireRoom(end * rows, 0);
+        cells_.requireRoom(0, characters * rows);
         for (std::int64_t at = 0; at < rows && !filled.empty(); ++at) {
             for (const Filled& cell : filled)
                 cells_.put(row + at, cell.column, cell.text, cell.look, cell.value);
@@ -174,7 +186,7 @@ private:
             if (!xml_.isStartElement())
                 continue;
             if (xml_.name() == QLatin1String("s"))
-                text += QString(std::max(1, attribute(xml_, "c").toInt()), u' ');
+                text += QString(std::clamp(attribute(xml_, "c").toInt(), 1, MostBlanks), u' ');
             else if (xml_.name() == QLatin1String("tab"))
                 text += u'\t';
             else if (xml_.name() == QLatin1String("line-break"))

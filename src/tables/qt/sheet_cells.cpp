@@ -3,6 +3,7 @@
 
 #include "tables/qt/sheet_cells.h"
 
+#include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -18,8 +19,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr std::int64_t MostRows = 1048576;
-constexpr std::int64_t MostSheetColumns = 16384;
 constexpr std::size_t MostLooks = 4000;
 
 constexpr CellAlignment UsualAlignments[]
@@ -126,18 +125,36 @@ SheetArea SheetArea::within(const SheetArea& other) const
     return common;
 }
 
+void SheetCells::requireRoom(std::int64_t cells, std::int64_t characters) const
+{
+    if (cells > MostCells - cells_)
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"the sheet holds more than %1 cells; save the part that is wanted as CSV",
+                { decimal(MostCells) }));
+    if (characters > MostCharacters - characters_)
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"the sheet holds more than %1 characters; save the part that is wanted as CSV",
+                { decimal(MostCharacters) }));
+}
+
 void SheetCells::put(
     std::int64_t row, std::int64_t column, Text text, const SheetLook& look, SheetValue value)
 {
-    if (row < 0 || row >= MostRows || column < 0 || column >= MostSheetColumns)
+    if (row < 0 || row >= MostRows || column < 0 || column >= MostColumns)
         throw RunTimeError(ErrorNumber::Overflow, phrase(u"a cell past the end of its sheet"));
     if (text.empty())
         return fillBlanks({ row, column }, look);
+    const auto characters = static_cast<std::int64_t>(text.size());
+    requireRoom(0, characters);
     if (rows_.size() <= static_cast<std::size_t>(row))
         rows_.resize(static_cast<std::size_t>(row) + 1);
     std::vector<Cell>& cells = rows_[static_cast<std::size_t>(row)];
-    if (cells.size() <= static_cast<std::size_t>(column))
+    if (const std::int64_t more = column + 1 - std::ssize(cells); more > 0) {
+        requireRoom(more, 0);
         cells.resize(static_cast<std::size_t>(column) + 1);
+        cells_ += more;
+    }
+    characters_ += characters;
     CellLook seen = look.cell;
     if (!look.isAligned)
         seen.alignment = UsualAlignments[static_cast<std::size_t>(value)];
@@ -168,7 +185,7 @@ void SheetCells::setWidth(std::int64_t column, std::int64_t columns, Twips width
 SheetArea SheetCells::filledArea() const
 {
     const auto isFilled = [](const Cell& cell) { return !cell.text.empty(); };
-    std::int64_t first = MostSheetColumns;
+    std::int64_t first = MostColumns;
     std::int64_t end = 0;
     std::int64_t titles = -1;
     for (std::size_t row = 0; row < rows_.size(); ++row) {
@@ -209,6 +226,9 @@ TableGrid SheetCells::toTable() const
 {
     const SheetArea all = filledArea();
     const SheetArea body { all.row + 1, all.column, all.rows - 1, all.columns };
+    // The corners of an area may be all that it holds.
+    if (static_cast<std::uint64_t>(all.rows * all.columns) > TableGrid::MostCells)
+        requireRoom(MostCells + 1, 0);
     TableGrid grid(columnsOf(all));
     ShownCells shown(body, looks_);
     for (const Blanks& blanks : blanks_)

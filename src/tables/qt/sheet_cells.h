@@ -43,9 +43,18 @@ struct SheetArea {
 /// The cells of a sheet of an office file, as they look.
 class SheetCells {
 public:
+    static constexpr std::int64_t MostRows = 1048576;
+    static constexpr std::int64_t MostColumns = 16384;
+    static constexpr std::int64_t MostCells = 1 << 26; ///< with the empty ones in front of others
+    static constexpr std::int64_t MostCharacters = 1 << 30;
+
+    /// Refuses more than fits, before it is made: a small file can name any number.
+    /// @throws RunTimeError Overflow
+    void requireRoom(std::int64_t cells, std::int64_t characters) const;
+
     /// Puts a text into a cell; rows and columns count from 0. Of a cell without a text only the
     /// background is kept.
-    /// @throws RunTimeError Overflow: past the last row or column that a sheet has
+    /// @throws RunTimeError Overflow: past the last row or column that a sheet has; no room
     void put(
         std::int64_t row, std::int64_t column, Text text, const SheetLook& look, SheetValue value);
 
@@ -89,6 +98,8 @@ private:
     std::vector<Blanks> blanks_; ///< later ones lie above earlier ones
     std::vector<SheetArea> boxes_;
     std::vector<Width> widths_;
+    std::int64_t cells_ = 0;
+    std::int64_t characters_ = 0;
 };
 
 /// Reads a sheet of an .xlsx file.

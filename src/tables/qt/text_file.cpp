@@ -59,7 +59,8 @@ std::string readAll(const std::filesystem::path& path, const TextFileOptions& op
         size += static_cast<std::size_t>(file.gcount());
         if (whole == 0 && static_cast<std::int64_t>(size) > MostPipeBytes)
             throw RunTimeError(ErrorNumber::Overflow,
-                pathText(path) + u" goes on after 4 GB; save it to a file and name that");
+                phrase(
+                    u"%1 goes on after 4 GB; save it to a file and name that", { pathText(path) }));
         // A pipe has no size, and a file may grow while it is read.
         tell(options.progress, static_cast<std::int64_t>(size),
             static_cast<std::int64_t>(whole > 0 ? std::max(size, whole) : 0));

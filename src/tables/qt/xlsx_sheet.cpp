@@ -12,6 +12,7 @@
 #include <QDateTime>
 #include <QXmlStreamReader>
 
+#include <algorithm>
 #include <cmath>
 #include <vector>
 
@@ -19,8 +20,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr std::int64_t MostRows = 1048576;
-constexpr std::int64_t MostSheetColumns = 16384;
 constexpr double WidestColumn = 255; ///< digits
 
 /// The text of an element with all its runs, but without the readings of Chinese characters.
@@ -174,8 +173,10 @@ public:
         forEachElement(bytes, [&](QXmlStreamReader& xml) {
             if (xml.name() == QLatin1String("row")) {
                 const QString number = attribute(xml, "r");
-                next_ = { number.isEmpty() ? next_.row + 1 : number.toLongLong() - 1, 0 };
-                fillFrom(xml, "s", { next_.row, 0, 1, MostSheetColumns });
+                const std::int64_t row
+                    = number.isEmpty() ? next_.row + 1 : std::max(number.toLongLong(), 0LL) - 1;
+                next_ = { std::min(row, SheetCells::MostRows), 0 };
+                fillFrom(xml, "s", { next_.row, 0, 1, SheetCells::MostColumns });
             } else if (xml.name() == QLatin1String("c")) {
                 readCell(xml);
             } else if (xml.name() == QLatin1String("col")) {
@@ -215,9 +216,9 @@ private:
     {
         const std::int64_t first = attribute(xml, "min").toLongLong() - 1;
         const std::int64_t last = attribute(xml, "max").toLongLong() - 1;
-        if (first < 0 || last < first || last >= MostSheetColumns)
+        if (first < 0 || last < first || last >= SheetCells::MostColumns)
             return;
-        fillFrom(xml, "style", { 0, first, MostRows, last - first + 1 });
+        fillFrom(xml, "style", { 0, first, SheetCells::MostRows, last - first + 1 });
         bool isNumber = false;
         const double width = attribute(xml, "width").toDouble(&isNumber);
         if (isOn(xml, "hidden"))

@@ -1,20 +1,38 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
+#include "controls/canvas.h"
+#include "controls/qt/kestrane.h"
+#include "controls/qt/published_values.h"
+#include "controls/qt/sorvane.h"
 #include "document/page_document.h"
 #include "export/qt/page_export.h"
+#include "fakes/fake_services.h"
 #include "fakes/temp_folder.h"
+#include "grids/qt/grid_for.h"
+#include "grids/qt/held_value.h"
+#include "grids/qt/late_bound.h"
+#include "grids/qt/model_row_set.h"
+#include "grids/qt/table_view_grid.h"
+#include "grids/qt/tree_view_grid.h"
+#include "grids/table_grid.h"
 #include "platform/member_names.h"
+#include "platform/platform.h"
 #include "platform/qt/qt_platform.h"
 #include "platform/run_time_error.h"
 #include "print/qt/qt_printing.h"
+#include "support/test_paths.h"
 #include "tables/qt/csv_table.h"
 #include "tables/qt/json_table.h"
 #include "tables/qt/office_table.h"
 #include "tables/qt/sqlite_table.h"
+#include "ui/qt/page_files.h"
 
 #include <QSqlDatabase>
 #include <QSqlQuery>
+#include <QStandardItemModel>
+#include <QTableWidget>
+#include <QTreeWidget>
 
 #include <gmock/gmock.h>
 
@@ -23,6 +41,8 @@
 namespace pelloric::qt {
 
 namespace {
+
+namespace fs = std::filesystem;
 
 /// What an error is called for, and what its text must name: the object, and the limit or the way
 /// out.
@@ -58,6 +78,19 @@ protected:
                 EXPECT_TRUE(QSqlQuery(database).exec(QString::fromLatin1(statement)));
         }
         QSqlDatabase::removeDatabase("errors");
+    }
+
+    static std::filesystem::path office(const char* name)
+    {
+        return fs::path(PELLORIC_TESTS_DIR) / "data" / "office" / name;
+    }
+
+    static std::string wideJson()
+    {
+        std::string json = "[{";
+        for (int name = 0; name < 32768; ++name)
+            json += (name > 0 ? ",\"" : "\"") + std::to_string(name) + "\":0";
+        return json + "}]";
     }
 
     std::string path(const char* name) const { return folder.file(name).string(); }
@@ -103,13 +136,24 @@ TEST_F(LibraryErrorTexts, OfTablesNameFileLineAndWayOut)
         { "an empty table", [&] { csv("empty.csv", ""); }, ErrorNumber::TypeMismatch,
             { "the file is empty" } },
         { "a zero byte", [&] { csv("zero.csv", std::string_view("a\nb\0c\n", 6)); },
-            ErrorNumber::TypeMismatch, { "line 2", "zero byte" } },
+            ErrorNumber::TypeMismatch, { "line 2: a zero byte; ", "unless in UTF-16" } },
         { "too many columns", [&] { csv("wide.csv", std::string(32768, ',')); },
-            ErrorNumber::Overflow, { "line 1", "32767" } },
+            ErrorNumber::Overflow, { "line 1: more than 32767 values in a row" } },
         { "no JSON", [&] { readJson(folder.write("bad.json", "[{]\n"), {}); },
             ErrorNumber::TypeMismatch, { "line 1" } },
+        { "a number of JSON that is too large",
+            [&] { readJson(folder.write("n.json", "[{\"a\": 1},\n{\"a\": 1e99999}]"), {}); },
+            ErrorNumber::TypeMismatch,
+            { "line 2: the number '1e99999' is too large; write it in quotation marks" } },
         { "JSON that is no table", [&] { readJson(folder.write("no.json", "[1,2]\n"), {}); },
             ErrorNumber::TypeMismatch, { "line 1" } },
+        { "JSON of too many columns", [&] { readJson(folder.write("w.json", wideJson()), {}); },
+            ErrorNumber::TypeMismatch, { "line 1: more than 32767 different names" } },
+        { "an empty sheet", [&] { readOffice({ office("empty_sheet.xlsx") }); },
+            ErrorNumber::TypeMismatch, { "the sheet is empty" } },
+        { "an office file that unpacks without end",
+            [&] { readOffice({ office("part_of_3_gb.xlsx") }); }, ErrorNumber::Overflow,
+            { "the office file holds more than 2 GB" } },
         { "a damaged office file", [&] { readOffice({ folder.write("b.xlsx", "PK\x03\x04") }); },
             ErrorNumber::TypeMismatch, { "the office file is damaged", "save it" } },
         { "a missing database", [&] { sqlite("none.sqlite", {}); }, ErrorNumber::FileNotFound,
@@ -120,6 +164,12 @@ TEST_F(LibraryErrorTexts, OfTablesNameFileLineAndWayOut)
                 sqlite("text.sqlite", {});
             },
             ErrorNumber::InvalidCall, { "this is no SQLite database" } },
+        { "a database without tables",
+            [&] {
+                folder.write("empty.sqlite", "");
+                sqlite("empty.sqlite", {});
+            },
+            ErrorNumber::InvalidCall, { "the database has no table" } },
         { "a table that is not there", [&] { sqlite("good.sqlite", "three"); },
             ErrorNumber::InvalidCall, { "three", "one", "two" } },
         { "a statement that writes", [&] { sqlite("good.sqlite", {}, "DROP TABLE one"); },
@@ -141,6 +191,21 @@ TEST_F(LibraryErrorTexts, OfExportsNamePagePaperAndFile)
         { "paper", [&] { pdf({}, "t.pdf", { .myHeight = 300000, .myWidth = 0 }); },
             ErrorNumber::Overflow,
             { "paper of 0 by 300000 twips", "1 to 288000 twips (200 inches)" } },
+        { "no page",
+            [&] {
+                PageDocument none;
+                none.Totalpages = 0;
+                exportPdf(none, {}, platform.fonts(), {}, folder.file("t.pdf"));
+            },
+            ErrorNumber::SubscriptOutOfRange, { "the document has no page to write" } },
+        { "a kind of file that pages cannot be saved as",
+            [&] {
+                Platform services = platform.record();
+                Canvas canvas(services);
+                savePages(canvas, platform.fonts(), folder.file("t.doc"), {});
+            },
+            ErrorNumber::InvalidCall,
+            { path("t.doc") + ": the name must end in .pdf, .png or .svg" } },
         { "a folder that is missing", [&] { pdf({}, "none/t.pdf"); }, ErrorNumber::WriteFailed,
             { path("none/t.pdf") } },
         { "an image", [&] { exportPngs(document, {}, { .dpi = 100000 }, folder.file("t.png")); },
@@ -149,6 +214,99 @@ TEST_F(LibraryErrorTexts, OfExportsNamePagePaperAndFile)
     };
     for (const ErrorRow& row : rows)
         expectError(row);
+}
+
+TEST_F(LibraryErrorTexts, OfArgumentsSayWhatWasGivenAndWhatIsWanted)
+{
+    QObject control;
+    const QVariant list = QStringList { "a", "b" };
+    Value number = Value::ofNumber(70000);
+    TableGrid grid({ { u"a", 1000 } });
+    const ErrorRow rows[] = {
+        { "a word as a number", [] { toInt16(QStringLiteral("wide")); }, ErrorNumber::TypeMismatch,
+            { "\"wide\" was given where a number is wanted" } },
+        { "a list as a text", [&] { toPlainText(list); }, ErrorNumber::TypeMismatch,
+            { "QStringList was given where a plain value is wanted" } },
+        { "a number as a grid", [&] { toGrid(7, control); }, ErrorNumber::TypeMismatch,
+            { "int was given where a grid is wanted" } },
+        { "no grid", [&] { toGrid(QVariant::fromValue<QObject*>(nullptr), control); },
+            ErrorNumber::ObjectMissing, { "no grid was given" } },
+        { "null as a grid", [&] { toGrid(QVariant::fromValue(nullptr), control); },
+            ErrorNumber::ObjectMissing, { "no grid was given" } },
+        { "a number past its member's type",
+            [&] { toVariant(number, QMetaType::fromType<short>()); }, ErrorNumber::Overflow,
+            { "70000 is past what the member holds" } },
+        { "an object as a plain value",
+            [&] { toVariant(Value::ofObject(grid), QMetaType::fromType<QVariant>()); },
+            ErrorNumber::TypeMismatch, { "an object is no plain value" } },
+    };
+    for (const ErrorRow& row : rows)
+        expectError(row);
+}
+
+TEST_F(LibraryErrorTexts, OfGridsThatChangeOrGoSayWhatToDo)
+{
+    auto model = std::make_unique<QStandardItemModel>(3, 1);
+    ModelRowSet shrunk;
+    shrunk.take(*model);
+    shrunk.setPosition(3);
+    model->removeRow(0);
+    auto table = std::make_unique<QTableWidget>(3, 1);
+    TableViewGrid shorter(*table);
+    LateBound(shorter).get(u"Rows");
+    table->setRowCount(1);
+    QTreeWidget tree;
+    tree.addTopLevelItem(new QTreeWidgetItem(QStringList("a")));
+    TreeViewGrid list(tree);
+    LateBound item = LateBound(list).child(u"ListItems").item(1);
+    tree.clear();
+    auto object = std::make_unique<QObject>();
+    const auto gone = gridFor(*object);
+    object.reset();
+    auto goneTable = std::make_unique<QTableWidget>(1, 1);
+    const auto goneView = gridFor(*goneTable);
+    goneTable.reset();
+    const ErrorRow rows[] = {
+        { "a model that shrank", [&] { shrunk.value(0); }, ErrorNumber::SubscriptOutOfRange,
+            { "the grid has lost rows" } },
+        { "a model that is gone",
+            [&] {
+                model.reset();
+                shrunk.value(0);
+            },
+            ErrorNumber::ObjectMissing, { "the grid's model is gone" } },
+        { "a view that shrank", [&] { LateBound(shorter).get(u"TextMatrix", 3, 0); },
+            ErrorNumber::SubscriptOutOfRange, { "the grid has lost rows" } },
+        { "a list that changed", [&] { item.get(u"Text"); }, ErrorNumber::SubscriptOutOfRange,
+            { "the list has changed" } },
+        { "an object that is gone", [&] { LateBound(*gone).get(u"objectName"); },
+            ErrorNumber::ObjectMissing, { "the object is gone" } },
+        { "a view that is gone", [&] { LateBound(*goneView).get(u"Cols"); },
+            ErrorNumber::ObjectMissing, { "the grid is gone" } },
+    };
+    for (const ErrorRow& row : rows)
+        expectError(row);
+}
+
+TEST_F(LibraryErrorTexts, OfControlsAreToldInAMessageBox)
+{
+    FakeMessages messages;
+    platform.useMessages(messages);
+    Kestrane facade(platform);
+    facade.doPreview(std::unique_ptr<AutomationObject>());
+    facade.doPreview(static_cast<QObject*>(nullptr));
+    Sorvane canvas(platform);
+    canvas.doPreview(nullptr);
+    const std::vector<Message> shown = messages.take();
+    ASSERT_EQ(shown.size(), 3U);
+    EXPECT_THAT(toUtf8(shown[0].text), testing::HasSubstr("doPreview was given no grid"));
+    EXPECT_THAT(toUtf8(shown[1].text), testing::HasSubstr("doPreview was given no grid"));
+    EXPECT_THAT(toUtf8(shown[2].text), testing::HasSubstr("no grid was given"));
+    Kestrane::setDefaultPreviewOpener(nullptr);
+    QTableWidget table(1, 1);
+    facade.doPreview(&table);
+    EXPECT_THAT(
+        toUtf8(messages.take().at(0).text), testing::HasSubstr("nobody opens the preview window"));
 }
 
 TEST_F(LibraryErrorTexts, OfIndexesNameTheLimits)

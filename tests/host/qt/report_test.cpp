@@ -4,6 +4,7 @@
 #include <pelloric/report.h>
 
 #include "fakes/temp_folder.h"
+#include "platform/run_time_error.h"
 #include "support/errors.h"
 
 #include <pelloric/export.h>
@@ -76,7 +77,13 @@ TEST(Report, RefusesAGridWithoutAColumnToPrint)
     grid.addRow({ "x" });
     Report report;
     report.useSettings(ReportSettings());
-    EXPECT_EQ(errorOf([&] { report.build(grid); }), ErrorNumber::ObjectMissing);
+    try {
+        report.build(grid);
+        ADD_FAILURE() << "no error";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(error.number(), ErrorNumber::ObjectMissing);
+        EXPECT_EQ(error.detail(), u"no column of the grid is wide enough to be printed");
+    }
 }
 
 TEST(Report, IsExportedPageByPageAndOpenedAgain)

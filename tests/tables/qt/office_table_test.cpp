@@ -268,6 +268,21 @@ TEST(OfficeTable, TakesColoursOfEmptyCellsMergedCellsAndWidthsOfOpenDocumentShee
     EXPECT_EQ(boxesOf(grid), "1-2,0-1 ");
 }
 
+TEST(OfficeTable, RefusesAtOnceMoreThanFitsHoweverFewBytesSayIt)
+{
+    const auto repeated = sample("repeated_without_end.ods");
+    EXPECT_EQ(read(repeated, QStringLiteral("cells")),
+        "Overflow: the sheet holds more than 67108864 cells; save the part that is wanted as CSV");
+    EXPECT_EQ(read(repeated, QStringLiteral("blanks")),
+        "Overflow: the sheet holds more than 1073741824 characters; save the part that is wanted "
+        "as CSV");
+    const std::string past = "Overflow: a cell past the end of its sheet";
+    EXPECT_EQ(read(repeated, QStringLiteral("columns")), past);
+    EXPECT_EQ(read(repeated, QStringLiteral("far")), past);
+    for (const char* const sheet : { "below", "past", "far" })
+        EXPECT_EQ(read(sample("rows_past_the_end.xlsx"), QString::fromLatin1(sheet)), past);
+}
+
 TEST(OfficeTable, IsKnownByItsContentWhereTheNameDoesNotTell)
 {
     const TempFolder folder;
