@@ -24,6 +24,7 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
+#include <cmath>
 #include <cstdio>
 #include <cstring>
 #include <fstream>
@@ -284,9 +285,14 @@ void ScriptHost::print(const QString& line)
     engine_->throwError(QStringLiteral("print: cannot write: ") + reason);
 }
 
-void ScriptHost::exit(int status)
+void ScriptHost::exit(double status)
 {
-    exitStatus_ = status;
+    constexpr double MostStatus = 255;
+    if (!(status >= 0 && status <= MostStatus) || status != std::floor(status)) {
+        engine_->throwError(QStringLiteral("exit: a status is a whole number from 0 to 255"));
+        return;
+    }
+    exitStatus_ = static_cast<int>(status);
     engine_->setInterrupted(true);
     engine_->throwError(QString::fromLatin1(ExitMark));
 }

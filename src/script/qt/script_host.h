@@ -71,7 +71,7 @@ public:
     /// Prints a line on standard output.
     Q_INVOKABLE void print(const QString& line);
     /// Ends the script with an exit status.
-    Q_INVOKABLE void exit(int status);
+    Q_INVOKABLE void exit(double status);
     Q_INVOKABLE QJSValue csv(const QString& path);
     Q_INVOKABLE QJSValue sqlite(const QString& path, const QString& tableOrQuery);
     /// @param kind  "Sorvane" or "Kestrane"

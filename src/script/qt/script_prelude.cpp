@@ -55,14 +55,18 @@ const char ScriptPrelude[] = R"js(
 
     // A control is reached through a stand-in that knows its published members: in any letter case,
     // and no others.
-    const controls = new WeakMap();
-    const kinds = new WeakMap();
-    const bare = (value) => Object(value) === value && controls.get(value) || value;
+    // The control is a hidden property of its stand-in: weak maps of the engine break when it has
+    // collected some of their keys.
+    const hidden = Symbol("control");
+    const hide = (object, value) =>
+        Object.defineProperty(object, hidden, { value, configurable: true });
+    const shown = (value) => Object(value) === value ? value[hidden] : undefined;
+    const bare = (value) => (shown(value) || { object: value }).object;
     const unasked = ["toJSON", "then"]; // what the language itself looks for
     const standIn = (object, members, prototype) => {
         const known = (name) => typeof name === "string" && members[name.toLowerCase()];
         const inherited = (target, name) => typeof name === "symbol" || name in target;
-        const value = new Proxy(Object.create(prototype), {
+        return new Proxy(hide(Object.create(prototype), { object, prototype }), {
             get(target, name) {
                 const member = known(name);
                 if (member)
@@ -94,9 +98,6 @@ const char ScriptPrelude[] = R"js(
                 return Object.defineProperty(target, name, descriptor) && descriptor;
             },
         });
-        controls.set(value, object);
-        kinds.set(value, prototype);
-        return value;
     };
     const membersOf = (kind) => {
         const members = Object.create(null);
@@ -110,7 +111,7 @@ const char ScriptPrelude[] = R"js(
             return standIn(host.newControl(kind), members, constructor.prototype);
         };
         Object.defineProperty(constructor, Symbol.hasInstance, { value: (value) =>
-            Object(value) === value && kinds.get(value) === constructor.prototype });
+            (shown(value) || {}).prototype === constructor.prototype });
         return Object.assign(constructor, constants);
     };
     for (const name in enumerations)
@@ -126,7 +127,7 @@ const char ScriptPrelude[] = R"js(
     });
     define("args", Object.freeze(argumentList));
     define("print", (...values) => host.print(values.map(String).join(" ")));
-    define("exit", (status = 0) => host.exit(status));
+    define("exit", (status = 0) => host.exit(typeof status === "number" ? status : NaN));
     define("csv", (path) => host.csv(path));
     define("sqlite", (path, source) => host.sqlite(path, source));
     define("wait", (milliseconds) => host.wait(milliseconds));
@@ -142,7 +143,7 @@ const char ScriptPrelude[] = R"js(
     // Promises whose rejection nobody looks after are told when the script has ended.
     const NativePromise = Promise;
     const then = NativePromise.prototype.then;
-    const lookedAfter = new WeakSet();
+    const lookedAfter = Symbol("looked after");
     const rejected = [];
     let settled = 0;
     const track = (promise) => {
@@ -151,7 +152,7 @@ const char ScriptPrelude[] = R"js(
         return promise;
     };
     NativePromise.prototype.then = function (...reactions) {
-        lookedAfter.add(this);
+        Object.defineProperty(this, lookedAfter, { value: true, configurable: true });
         return track(then.apply(this, reactions));
     };
     const TrackedPromise = function Promise(executor) {
@@ -161,7 +162,7 @@ const char ScriptPrelude[] = R"js(
     for (const name of ["resolve", "reject", "all", "race"])
         TrackedPromise[name] = (given) => track(NativePromise[name](given));
     global.Promise = TrackedPromise;
-    return () => ({ settled, reasons: rejected.filter((entry) => !lookedAfter.has(entry.promise))
+    return () => ({ settled, reasons: rejected.filter((entry) => !entry.promise[lookedAfter])
         .map((entry) => entry.reason) });
 })
 )js";

@@ -251,6 +251,48 @@ TEST_F(ScriptHostTest, WhateverACellFunctionThrowsIsAnError)
     }
 }
 
+TEST_F(ScriptHostTest, MakesAnyNumberOfControlsAndPromises)
+{
+    EXPECT_EQ(run(QStringLiteral("let last; for (let i = 0; i < 1500; ++i) {"
+                                 "    last = new Sorvane(); new Sorvane().intTop = i % 100;"
+                                 "    Promise.resolve(last).then(() => 1); }"
+                                 "print(last instanceof Sorvane, last instanceof Kestrane)")),
+        0)
+        << errors;
+    EXPECT_EQ(output, "true false\n");
+}
+
+TEST_F(ScriptHostTest, RefusesAStatusThatNoProgramEndsWith)
+{
+    for (const char* status : { "256", "-1", "1e308", "'x'", "NaN", "1.5", "null" }) {
+        EXPECT_EQ(run(QStringLiteral("exit(%1)").arg(QLatin1String(status))), 1) << status;
+        EXPECT_NE(errors.find("exit: a status is a whole number from 0 to 255"), std::string::npos)
+            << errors;
+    }
+    EXPECT_EQ(run(QStringLiteral("exit(255)")), 255);
+}
+
+TEST_F(ScriptHostTest, SaysWhatIsWrongWithObjectsThatAreHandedOver)
+{
+    struct Case {
+        const char* script;
+        const char* message;
+    };
+    constexpr Case Cases[] = {
+        { "lines(new Kestrane(), 0)", "a Sorvane was expected" },
+        { "const c = new Sorvane(); c.m_PrintObj = PrintObjKind.MSFlexGrid;"
+          "c.doPreview({ Cols: 1, Rows: 2, ColWidth: () => 900, TextMatrix: () => Symbol('s') });",
+            "a symbol is no value" },
+        { "const c = new Sorvane(); c.m_PrintObj = PrintObjKind.MSFlexGrid;"
+          "c.doPreview({ Cols: 1, Rows: 2, ColWidth: 900, TextMatrix: () => '' });",
+            "only an array takes an index" },
+    };
+    for (const Case& row : Cases) {
+        EXPECT_EQ(run(QString::fromLatin1(row.script)), 1) << row.script;
+        EXPECT_NE(errors.find(row.message), std::string::npos) << row.script << ": " << errors;
+    }
+}
+
 TEST_F(ScriptHostTest, ReportsPromisesThatWereRejectedAndThatNobodyLooksAfter)
 {
     EXPECT_EQ(run(QStringLiteral("Promise.reject(new Error('lost'));")), 1);
