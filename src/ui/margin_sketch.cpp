@@ -17,6 +17,9 @@ constexpr double FrameEdge = 150;
 /// Further off than any window reaches.
 constexpr double FarOff = 30000;
 
+/// Larger than any screen: twips.
+constexpr double MostExtent = 1e6;
+
 /// Where the ruled lines of one direction stand, from one margin to the other.
 ///
 /// @param margin  the first line stands one step behind it
@@ -28,7 +31,7 @@ std::vector<double> ruledPositions(double margin, double step, double limit, dou
     double at = margin + step;
     if (at < 0)
         at = std::fmod(at, step);
-    const double end = std::min(limit, extent + step);
+    const double end = std::min({ limit, extent + step, MostExtent });
     for (; at < end; at += step)
         positions.push_back(at);
     return positions;

@@ -134,4 +134,10 @@ TEST(MarginSketch, EndsItsTableWhateverTheMarginsAre)
     }
 }
 
+TEST(MarginSketch, RulesAFrameOfAnySizeWithAnEnd)
+{
+    for (const double size : { 1e9, 1e18, 1e300 })
+        EXPECT_LT(sketchOf(size, size).ruledLines().size(), 20000U) << size;
+}
+
 } // namespace pelloric
