@@ -324,8 +324,8 @@ void Canvas::OpenFile(const std::filesystem::path& path)
         showFirstPage(); // what was read before stays
         if (!document_.hasRecords())
             throw;
-        throw RunTimeError(error.number(),
-            phrase(u"%1; what stands before it is shown", { error.detail() }));
+        throw RunTimeError(
+            error.number(), phrase(u"%1; what stands before it is shown", { error.detail() }));
     }
     showFirstPage();
 }

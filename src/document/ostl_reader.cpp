@@ -218,8 +218,8 @@ OstlResult readNamed(const TextCodec& codec, std::istream& stream, PageDocument&
     try {
         return readOstl(codec, stream, document, setup);
     } catch (const RunTimeError& error) {
-        throw RunTimeError(error.number(),
-            phrase(u"%1 is damaged: %2", { pathText(path), error.detail() }));
+        throw RunTimeError(
+            error.number(), phrase(u"%1 is damaged: %2", { pathText(path), error.detail() }));
     }
 }
 

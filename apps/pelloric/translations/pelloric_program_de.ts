@@ -550,10 +550,6 @@ Jede Seite ist ein eigener Auftrag, einseitig, auf dem Papier, für das sie aufg
         <translation>nehmen Sie entweder --landscape oder --portrait, nicht beides</translation>
     </message>
     <message>
-        <source>--margins takes one length of %1 mm or more, or four (top,right,bottom,left), not &quot;%2&quot;</source>
-        <translation>--margins verlangt eine Länge von %1 mm oder mehr, oder vier (oben,rechts,unten,links), nicht „%2“</translation>
-    </message>
-    <message>
         <source>--font needs the name of a face</source>
         <translation>--font verlangt den Namen einer Schrift</translation>
     </message>
@@ -734,10 +730,6 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
         <translation>%1: Sie dürfen diese Datei nicht lesen</translation>
     </message>
     <message>
-        <source>the standard input cannot be kept: %1</source>
-        <translation>die Standardeingabe kann nicht aufbewahrt werden: %1</translation>
-    </message>
-    <message>
         <source>--encoding is for CSV and TSV files, not databases</source>
         <translation>--encoding ist für CSV- und TSV-Dateien, nicht für Datenbanken</translation>
     </message>
@@ -796,6 +788,38 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
     <message>
         <source>the total of %1 leaves out %2, being no numbers</source>
         <translation>die Summe von %1 lässt %2 aus, die keine Zahlen sind</translation>
+    </message>
+    <message>
+        <source>%1 is a pipe; a saved document is read from a file, so save it to one and name that</source>
+        <translation>%1 ist eine Pipe; ein gespeichertes Dokument wird aus einer Datei gelesen, speichern Sie es also in eine und nennen Sie diese</translation>
+    </message>
+    <message>
+        <source>--pages takes pages such as 1,3,5-12, not &quot;&quot;</source>
+        <translation>--pages nimmt Seiten wie 1,3,5-12, nicht &quot;&quot;</translation>
+    </message>
+    <message>
+        <source>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</source>
+        <translation>--margins nimmt eine Länge von mindestens %1 mm und höchstens %2 mm, oder vier (oben,rechts,unten,links), nicht &quot;%3&quot;</translation>
+    </message>
+    <message>
+        <source>%1 cannot be kept in %2: %3; name another folder in TMPDIR, or save it to a file and name that</source>
+        <translation>%1 kann nicht in %2 aufbewahrt werden: %3; nennen Sie einen anderen Ordner in TMPDIR, oder speichern Sie es in eine Datei und nennen Sie diese</translation>
+    </message>
+    <message>
+        <source>%1 cannot be read: %2</source>
+        <translation>%1 kann nicht gelesen werden: %2</translation>
+    </message>
+    <message>
+        <source>%1 goes on after %2 GB, which is the most that is taken of a pipe; save it to a file and name that, or hand over fewer rows</source>
+        <translation>%1 geht nach %2 GB noch weiter, und mehr wird aus einer Pipe nicht genommen; speichern Sie es in eine Datei und nennen Sie diese, oder übergeben Sie weniger Zeilen</translation>
+    </message>
+    <message>
+        <source>%1 does not fit into %2, where it is kept while it is read; make room there, or name another folder in TMPDIR</source>
+        <translation>%1 passt nicht in %2, wo es beim Lesen aufbewahrt wird; schaffen Sie dort Platz, oder nennen Sie einen anderen Ordner in TMPDIR</translation>
+    </message>
+    <message>
+        <source>%1 is a socket; name a file</source>
+        <translation>%1 ist ein Socket; nennen Sie eine Datei</translation>
     </message>
 </context>
 <context>

@@ -549,10 +549,6 @@ Every page is a job of its own, one-sided, on the paper it was laid out for.
         <translation>take either --landscape or --portrait, not both</translation>
     </message>
     <message>
-        <source>--margins takes one length of %1 mm or more, or four (top,right,bottom,left), not &quot;%2&quot;</source>
-        <translation>--margins takes one length of %1 mm or more, or four (top,right,bottom,left), not &quot;%2&quot;</translation>
-    </message>
-    <message>
         <source>--font needs the name of a face</source>
         <translation>--font needs the name of a face</translation>
     </message>
@@ -733,10 +729,6 @@ An exception that it does not catch ends the program with status 1.
         <translation>%1: you may not read this file</translation>
     </message>
     <message>
-        <source>the standard input cannot be kept: %1</source>
-        <translation>the standard input cannot be kept: %1</translation>
-    </message>
-    <message>
         <source>--encoding is for CSV and TSV files, not databases</source>
         <translation>--encoding is for CSV and TSV files, not databases</translation>
     </message>
@@ -795,6 +787,38 @@ An exception that it does not catch ends the program with status 1.
     <message>
         <source>the total of %1 leaves out %2, being no numbers</source>
         <translation>the total of %1 leaves out %2, being no numbers</translation>
+    </message>
+    <message>
+        <source>%1 is a pipe; a saved document is read from a file, so save it to one and name that</source>
+        <translation>%1 is a pipe; a saved document is read from a file, so save it to one and name that</translation>
+    </message>
+    <message>
+        <source>--pages takes pages such as 1,3,5-12, not &quot;&quot;</source>
+        <translation>--pages takes pages such as 1,3,5-12, not &quot;&quot;</translation>
+    </message>
+    <message>
+        <source>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</source>
+        <translation>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</translation>
+    </message>
+    <message>
+        <source>%1 cannot be kept in %2: %3; name another folder in TMPDIR, or save it to a file and name that</source>
+        <translation>%1 cannot be kept in %2: %3; name another folder in TMPDIR, or save it to a file and name that</translation>
+    </message>
+    <message>
+        <source>%1 cannot be read: %2</source>
+        <translation>%1 cannot be read: %2</translation>
+    </message>
+    <message>
+        <source>%1 goes on after %2 GB, which is the most that is taken of a pipe; save it to a file and name that, or hand over fewer rows</source>
+        <translation>%1 goes on after %2 GB, which is the most that is taken of a pipe; save it to a file and name that, or hand over fewer rows</translation>
+    </message>
+    <message>
+        <source>%1 does not fit into %2, where it is kept while it is read; make room there, or name another folder in TMPDIR</source>
+        <translation>%1 does not fit into %2, where it is kept while it is read; make room there, or name another folder in TMPDIR</translation>
+    </message>
+    <message>
+        <source>%1 is a socket; name a file</source>
+        <translation>%1 is a socket; name a file</translation>
     </message>
 </context>
 <context>

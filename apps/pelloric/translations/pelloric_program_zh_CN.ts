@@ -544,10 +544,6 @@ Every page is a job of its own, one-sided, on the paper it was laid out for.
         <translation>--landscape 和 --portrait 只能用一个</translation>
     </message>
     <message>
-        <source>--margins takes one length of %1 mm or more, or four (top,right,bottom,left), not &quot;%2&quot;</source>
-        <translation>--margins 需要一个不小于 %1 mm 的长度，或四个（上,右,下,左），而不是“%2”</translation>
-    </message>
-    <message>
         <source>--font needs the name of a face</source>
         <translation>--font 需要字体名称</translation>
     </message>
@@ -727,10 +723,6 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
         <translation>%1：您无权读取此文件</translation>
     </message>
     <message>
-        <source>the standard input cannot be kept: %1</source>
-        <translation>无法保存标准输入：%1</translation>
-    </message>
-    <message>
         <source>--encoding is for CSV and TSV files, not databases</source>
         <translation>--encoding 用于 CSV 和 TSV 文件，而不是数据库</translation>
     </message>
@@ -789,6 +781,38 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
     <message>
         <source>the total of %1 leaves out %2, being no numbers</source>
         <translation>%1 的合计略去了 %2，因为不是数字</translation>
+    </message>
+    <message>
+        <source>%1 is a pipe; a saved document is read from a file, so save it to one and name that</source>
+        <translation>%1 是管道；已保存的文档须从文件读取，请先保存为文件并指定该文件</translation>
+    </message>
+    <message>
+        <source>--pages takes pages such as 1,3,5-12, not &quot;&quot;</source>
+        <translation>--pages 需要页码，如 1,3,5-12，而不是 &quot;&quot;</translation>
+    </message>
+    <message>
+        <source>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</source>
+        <translation>--margins 需要一个不小于 %1 毫米且不大于 %2 毫米的长度，或四个（上,右,下,左），而不是 &quot;%3&quot;</translation>
+    </message>
+    <message>
+        <source>%1 cannot be kept in %2: %3; name another folder in TMPDIR, or save it to a file and name that</source>
+        <translation>无法将 %1 暂存到 %2：%3；请在 TMPDIR 中指定其他文件夹，或保存为文件并指定该文件</translation>
+    </message>
+    <message>
+        <source>%1 cannot be read: %2</source>
+        <translation>无法读取 %1：%2</translation>
+    </message>
+    <message>
+        <source>%1 goes on after %2 GB, which is the most that is taken of a pipe; save it to a file and name that, or hand over fewer rows</source>
+        <translation>%1 超过 %2 GB 仍未结束，这是从管道读取的上限；请保存为文件并指定该文件，或减少行数</translation>
+    </message>
+    <message>
+        <source>%1 does not fit into %2, where it is kept while it is read; make room there, or name another folder in TMPDIR</source>
+        <translation>读取 %1 时要暂存到 %2，但空间不足；请在那里腾出空间，或在 TMPDIR 中指定其他文件夹</translation>
+    </message>
+    <message>
+        <source>%1 is a socket; name a file</source>
+        <translation>%1 是套接字；请指定文件</translation>
     </message>
 </context>
 <context>

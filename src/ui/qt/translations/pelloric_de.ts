@@ -79,10 +79,6 @@
         <translation>%1 wurde übergeben, verlangt ist ein Gitter</translation>
     </message>
     <message>
-        <source>%1 is damaged: %2; what stands before it was read</source>
-        <translation>%1 ist beschädigt: %2; was davor steht, wurde gelesen</translation>
-    </message>
-    <message>
         <source>page</source>
         <translation>Seite</translation>
     </message>
@@ -571,10 +567,6 @@
         <translation>die Datei ist leer</translation>
     </message>
     <message>
-        <source>a zero byte; this is no text file</source>
-        <translation>ein Nullbyte; das ist keine Textdatei</translation>
-    </message>
-    <message>
         <source>%1 and others</source>
         <translation>%1 und andere</translation>
     </message>
@@ -813,6 +805,38 @@
     <message>
         <source>%1 is no picture</source>
         <translation>%1 ist kein Bild</translation>
+    </message>
+    <message>
+        <source>%1; what stands before it is shown</source>
+        <translation>%1; was davor steht, wird gezeigt</translation>
+    </message>
+    <message>
+        <source>%1 is damaged: %2</source>
+        <translation>%1 ist beschädigt: %2</translation>
+    </message>
+    <message>
+        <source>row %1 of a table of %2 columns makes more than %3 cells; take fewer rows or columns</source>
+        <translation>Zeile %1 einer Tabelle mit %2 Spalten ergibt mehr als %3 Zellen; nehmen Sie weniger Zeilen oder Spalten</translation>
+    </message>
+    <message>
+        <source>a zero byte; this is no text file, unless in UTF-16: then name UTF-16LE or UTF-16BE as its encoding</source>
+        <translation>ein Nullbyte; dies ist keine Textdatei, es sei denn in UTF-16: nennen Sie dann UTF-16LE oder UTF-16BE als Kodierung</translation>
+    </message>
+    <message>
+        <source>the number %1 is too large; write it in quotation marks</source>
+        <translation>die Zahl %1 ist zu groß; schreiben Sie sie in Anführungszeichen</translation>
+    </message>
+    <message>
+        <source>the sheet holds more than %1 cells; save the part that is wanted as CSV</source>
+        <translation>das Blatt enthält mehr als %1 Zellen; speichern Sie den gewünschten Teil als CSV</translation>
+    </message>
+    <message>
+        <source>the sheet holds more than %1 characters; save the part that is wanted as CSV</source>
+        <translation>das Blatt enthält mehr als %1 Zeichen; speichern Sie den gewünschten Teil als CSV</translation>
+    </message>
+    <message>
+        <source>%1 goes on after 4 GB; save it to a file and name that</source>
+        <translation>%1 geht nach 4 GB noch weiter; speichern Sie es in eine Datei und nennen Sie diese</translation>
     </message>
 </context>
 <context>

@@ -79,10 +79,6 @@
         <translation>%1 was given where a grid is wanted</translation>
     </message>
     <message>
-        <source>%1 is damaged: %2; what stands before it was read</source>
-        <translation>%1 is damaged: %2; what stands before it was read</translation>
-    </message>
-    <message>
         <source>page</source>
         <translation>page</translation>
     </message>
@@ -571,10 +567,6 @@
         <translation>the file is empty</translation>
     </message>
     <message>
-        <source>a zero byte; this is no text file</source>
-        <translation>a zero byte; this is no text file</translation>
-    </message>
-    <message>
         <source>%1 and others</source>
         <translation>%1 and others</translation>
     </message>
@@ -813,6 +805,38 @@
     <message>
         <source>%1 is no picture</source>
         <translation>%1 is no picture</translation>
+    </message>
+    <message>
+        <source>%1; what stands before it is shown</source>
+        <translation>%1; what stands before it is shown</translation>
+    </message>
+    <message>
+        <source>%1 is damaged: %2</source>
+        <translation>%1 is damaged: %2</translation>
+    </message>
+    <message>
+        <source>row %1 of a table of %2 columns makes more than %3 cells; take fewer rows or columns</source>
+        <translation>row %1 of a table of %2 columns makes more than %3 cells; take fewer rows or columns</translation>
+    </message>
+    <message>
+        <source>a zero byte; this is no text file, unless in UTF-16: then name UTF-16LE or UTF-16BE as its encoding</source>
+        <translation>a zero byte; this is no text file, unless in UTF-16: then name UTF-16LE or UTF-16BE as its encoding</translation>
+    </message>
+    <message>
+        <source>the number %1 is too large; write it in quotation marks</source>
+        <translation>the number %1 is too large; write it in quotation marks</translation>
+    </message>
+    <message>
+        <source>the sheet holds more than %1 cells; save the part that is wanted as CSV</source>
+        <translation>the sheet holds more than %1 cells; save the part that is wanted as CSV</translation>
+    </message>
+    <message>
+        <source>the sheet holds more than %1 characters; save the part that is wanted as CSV</source>
+        <translation>the sheet holds more than %1 characters; save the part that is wanted as CSV</translation>
+    </message>
+    <message>
+        <source>%1 goes on after 4 GB; save it to a file and name that</source>
+        <translation>%1 goes on after 4 GB; save it to a file and name that</translation>
     </message>
 </context>
 <context>

@@ -79,10 +79,6 @@
         <translation>给出的是 %1，需要的是表格</translation>
     </message>
     <message>
-        <source>%1 is damaged: %2; what stands before it was read</source>
-        <translation>%1 已损坏：%2；之前的内容已读取</translation>
-    </message>
-    <message>
         <source>page</source>
         <translation>页</translation>
     </message>
@@ -571,10 +567,6 @@
         <translation>文件是空的</translation>
     </message>
     <message>
-        <source>a zero byte; this is no text file</source>
-        <translation>含有零字节；这不是文本文件</translation>
-    </message>
-    <message>
         <source>%1 and others</source>
         <translation>%1 等</translation>
     </message>
@@ -813,6 +805,38 @@
     <message>
         <source>%1 is no picture</source>
         <translation>%1 不是图片</translation>
+    </message>
+    <message>
+        <source>%1; what stands before it is shown</source>
+        <translation>%1；其前的内容已显示</translation>
+    </message>
+    <message>
+        <source>%1 is damaged: %2</source>
+        <translation>%1 已损坏：%2</translation>
+    </message>
+    <message>
+        <source>row %1 of a table of %2 columns makes more than %3 cells; take fewer rows or columns</source>
+        <translation>%2 列的表格的第 %1 行使单元格超过 %3 个；请减少行或列</translation>
+    </message>
+    <message>
+        <source>a zero byte; this is no text file, unless in UTF-16: then name UTF-16LE or UTF-16BE as its encoding</source>
+        <translation>有一个零字节；除非采用 UTF-16 编码，否则这不是文本文件；若是，请指定编码 UTF-16LE 或 UTF-16BE</translation>
+    </message>
+    <message>
+        <source>the number %1 is too large; write it in quotation marks</source>
+        <translation>数字 %1 过大；请用引号括起来</translation>
+    </message>
+    <message>
+        <source>the sheet holds more than %1 cells; save the part that is wanted as CSV</source>
+        <translation>工作表的单元格超过 %1 个；请将所需部分另存为 CSV</translation>
+    </message>
+    <message>
+        <source>the sheet holds more than %1 characters; save the part that is wanted as CSV</source>
+        <translation>工作表的字符超过 %1 个；请将所需部分另存为 CSV</translation>
+    </message>
+    <message>
+        <source>%1 goes on after 4 GB; save it to a file and name that</source>
+        <translation>%1 超过 4 GB 仍未结束；请保存为文件并指定该文件</translation>
     </message>
 </context>
 <context>
