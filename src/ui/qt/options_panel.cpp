@@ -95,7 +95,7 @@ QFormLayout* addGroup(QVBoxLayout& all, const QString& title)
     auto* const group = new QGroupBox(title);
     auto* const form = new QFormLayout(group);
     form->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
-    form->setRowWrapPolicy(QFormLayout::WrapLongRows);
+    form->setRowWrapPolicy(QFormLayout::DontWrapRows);
     all.addWidget(group);
     return form;
 }
