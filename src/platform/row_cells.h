@@ -11,8 +11,8 @@
 
 namespace pelloric {
 
-/// A flex grid or list view that answers a whole row at one go, with the texts that `TextMatrix`, or
-/// `Text` and `SubItems` of an item, would answer one by one.
+/// A flex grid or list view that answers a whole row at one go, with the texts that `TextMatrix`,
+/// or `Text` and `SubItems` of an item, would answer one by one.
 class RowCells {
 public:
     virtual ~RowCells() = default;
