@@ -105,11 +105,13 @@ void ShapedLayout::drawRowLines(std::size_t at)
     if (!drawsHor_)
         return;
     const ShapedRow* const next = at + 1 < page_.size() ? &page_[at + 1] : nullptr;
-    if (next == nullptr || (!isMerged && row.looks.empty())) {
+    if (!isMerged && (next == nullptr || row.looks.empty())) {
         drawLine({ tableLeft_, bottom }, { tableRight_, bottom });
         return;
     }
     const auto isOpen = [&](int field) {
+        if (next == nullptr)
+            return false;
         if (isSameBox(row, field, *next, field))
             return true;
         const auto place = static_cast<std::size_t>(field);
@@ -119,7 +121,8 @@ void ShapedLayout::drawRowLines(std::size_t at)
         if (isOpen(columns_[first].field))
             continue;
         std::size_t end = first;
-        while (end + 1 < columns_.size() && !isOpen(columns_[end + 1].field))
+        // A merged row's columns each have a line of their own, as on the plain page.
+        while (!isMerged && end + 1 < columns_.size() && !isOpen(columns_[end + 1].field))
             ++end;
         const Twips right = end + 1 < columns_.size() ? columns_[end + 1].edge : tableRight_;
         drawLine({ columns_[first].edge, bottom }, { right, bottom });
