@@ -1,10 +1,11 @@
 // SPDX-FileCopyrightText: The Pelloric authors
 // SPDX-License-Identifier: MIT
 
+#include <pelloric/kestrane.h>
+#include <pelloric/sorvane.h>
+
 #include "controls/canvas.h"
-#include "controls/qt/kestrane.h"
 #include "controls/qt/published_values.h"
-#include "controls/qt/sorvane.h"
 #include "document/page_document.h"
 #include "export/qt/page_export.h"
 #include "fakes/fake_services.h"
