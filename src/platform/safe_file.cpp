@@ -209,6 +209,10 @@ void SafeFile::takePlace()
     std::error_code error;
     if (!written_.empty())
         fs::rename(written_, target_, error);
+    if (error) { // some systems rename no file that is open
+        file_.reset();
+        fs::rename(written_, target_, error);
+    }
     if (!written_.empty() && !error) {
         written_.clear();
         files_->syncFolder(folderOf(target_));
