@@ -133,6 +133,7 @@ SafeFile::SafeFile(SafeFile&& other) noexcept
 
 SafeFile::~SafeFile()
 {
+    file_.reset(); // some systems remove no file that is open
     std::error_code ignored;
     if (!written_.empty())
         fs::remove(written_, ignored);
