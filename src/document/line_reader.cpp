@@ -3,6 +3,9 @@
 
 #include "document/line_reader.h"
 
+#include "platform/phrase.h"
+#include "platform/run_time_error.h"
+
 #include <istream>
 
 namespace pelloric {
@@ -13,8 +16,9 @@ constexpr std::size_t ChunkBytes = 1U << 18U;
 
 } // namespace
 
-LineReader::LineReader(std::istream& stream)
+LineReader::LineReader(std::istream& stream, const LineLimits& limits)
     : stream_(stream)
+    , limits_(limits)
 {
 }
 
@@ -61,8 +65,25 @@ bool LineReader::refill()
     const std::size_t kept = buffer_.size();
     buffer_.resize(kept + ChunkBytes);
     stream_.read(buffer_.data() + kept, static_cast<std::streamsize>(ChunkBytes));
-    buffer_.resize(kept + static_cast<std::size_t>(stream_.gcount()));
-    return buffer_.size() > kept;
+    const auto size = static_cast<std::size_t>(stream_.gcount());
+    buffer_.resize(kept + size);
+    read_ += size;
+    requireEnd();
+    return size > 0;
+}
+
+/// @throws RunTimeError Overflow: what was read so far is behind a limit
+void LineReader::requireEnd() const
+{
+    if (scanned_ > limits_.line)
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"a line holds more than %1 bytes",
+                { decimal(static_cast<std::int64_t>(limits_.line)) }));
+    if (read_ > limits_.all)
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"it goes on after %1 bytes, which is the most that is read of what is no "
+                   u"ordinary file",
+                { decimal(static_cast<std::int64_t>(limits_.all)) }));
 }
 
 } // namespace pelloric

@@ -48,9 +48,10 @@ std::string_view trimmedBytes(std::string_view line)
 /// Reads one file, line by line.
 class Reader {
 public:
-    Reader(const TextCodec& codec, std::istream& stream, PageDocument& document)
+    Reader(const TextCodec& codec, std::istream& stream, PageDocument& document,
+        const LineLimits& limits)
         : codec_(codec)
-        , lines_(stream)
+        , lines_(stream, limits)
         , document_(document)
     {
     }
@@ -199,24 +200,33 @@ private:
 
 } // namespace
 
-OstlResult readOstl(
-    const TextCodec& codec, std::istream& stream, PageDocument& document, PageSetup& setup)
+namespace {
+
+OstlResult readLimited(const TextCodec& codec, std::istream& stream, PageDocument& document,
+    PageSetup& setup, const LineLimits& limits)
 {
-    Reader reader(codec, stream, document);
+    Reader reader(codec, stream, document, limits);
     if (!reader.readHeader(setup))
         return OstlResult::BadHeader;
     reader.readPages();
     return OstlResult::Opened;
 }
 
-namespace {
+/// A pipe or a device may go on for ever.
+LineLimits limitsOf(const std::filesystem::path& path)
+{
+    std::error_code ignored;
+    if (std::filesystem::is_regular_file(path, ignored))
+        return {};
+    return { .all = MostPipedOstlBytes };
+}
 
-/// An error of a number that the file holds names the file.
+/// An error of what the file holds names the file.
 OstlResult readNamed(const TextCodec& codec, std::istream& stream, PageDocument& document,
     PageSetup& setup, const std::filesystem::path& path)
 {
     try {
-        return readOstl(codec, stream, document, setup);
+        return readLimited(codec, stream, document, setup, limitsOf(path));
     } catch (const RunTimeError& error) {
         throw RunTimeError(
             error.number(), phrase(u"%1 is damaged: %2", { pathText(path), error.detail() }));
@@ -224,6 +234,12 @@ OstlResult readNamed(const TextCodec& codec, std::istream& stream, PageDocument&
 }
 
 } // namespace
+
+OstlResult readOstl(
+    const TextCodec& codec, std::istream& stream, PageDocument& document, PageSetup& setup)
+{
+    return readLimited(codec, stream, document, setup, {});
+}
 
 OstlResult readOstl(const TextCodec& codec, const std::filesystem::path& path,
     PageDocument& document, PageSetup& setup)

@@ -3,6 +3,7 @@
 
 #pragma once
 
+#include <cstddef>
 #include <filesystem>
 #include <iosfwd>
 
@@ -11,6 +12,9 @@ namespace pelloric {
 class PageDocument;
 class TextCodec;
 struct PageSetup;
+
+/// Of a pipe or a device, which may have no end, no more bytes are read.
+inline constexpr std::size_t MostPipedOstlBytes = 1U << 30U;
 
 /// How the reading of a document file ended.
 enum class OstlResult {
@@ -26,13 +30,14 @@ enum class OstlResult {
 /// number that its line begins with, turned back into text, so most names come back as "0"; that
 /// is kept. Texts lose the blanks at both ends.
 /// @param setup   gets width and height as soon as both have been read
-/// @throws RunTimeError Overflow: a number is too large for what it says, or there are more than
-///         32767 pages; what was read before stays
+/// @throws RunTimeError Overflow: a number is too large for what it says, a line holds more than
+///         268435456 bytes, or there are more than 32767 pages; what was read before stays
 OstlResult readOstl(
     const TextCodec& codec, std::istream& stream, PageDocument& document, PageSetup& setup);
 
 /// The same for a file.
-/// @throws RunTimeError FileNotFound, with the path: it is missing or cannot be read; or as above
+/// @throws RunTimeError FileNotFound, with the path: it is missing or cannot be read; Overflow: it
+///         is no ordinary file and holds more than `MostPipedOstlBytes`; or as above
 OstlResult readOstl(const TextCodec& codec, const std::filesystem::path& path,
     PageDocument& document, PageSetup& setup);
 

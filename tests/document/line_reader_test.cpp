@@ -3,8 +3,11 @@
 
 #include "document/line_reader.h"
 
+#include "platform/run_time_error.h"
+
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <sstream>
 #include <vector>
 
@@ -20,6 +23,16 @@ std::vector<std::string> linesOf(const std::string& bytes)
     for (std::string_view line; reader.next(line);)
         lines.emplace_back(line);
     return lines;
+}
+
+std::string errorTextOf(const std::function<void()>& action)
+{
+    try {
+        action();
+    } catch (const RunTimeError& error) {
+        return toUtf8(error.detail());
+    }
+    return {};
 }
 
 using Lines = std::vector<std::string>;
@@ -58,6 +71,38 @@ TEST(LineReader, TakesLinesOfAnyLength)
 {
     const std::string line(3U << 20U, 'x');
     EXPECT_EQ(linesOf(line + "\r\n" + line), (Lines { line, line }));
+}
+
+TEST(LineReader, RefusesALineThatGoesOnBehindItsLimit)
+{
+    constexpr std::size_t piece = 1U << 18U;
+    const LineLimits limits { .line = piece };
+    std::istringstream exact("a\n" + std::string(piece, 'x') + "\nb");
+    LineReader reader(exact, limits);
+    std::string_view line;
+    for (const std::size_t length : { std::size_t { 1 }, piece, std::size_t { 1 } }) {
+        ASSERT_TRUE(reader.next(line));
+        EXPECT_EQ(line.size(), length);
+    }
+    std::istringstream endless("a\n" + std::string(3 * piece, 'x'));
+    LineReader refusing(endless, limits);
+    ASSERT_TRUE(refusing.next(line));
+    EXPECT_EQ(errorTextOf([&] { refusing.next(line); }), "a line holds more than 262144 bytes");
+}
+
+TEST(LineReader, RefusesAStreamThatGoesOnBehindItsLimit)
+{
+    constexpr std::size_t piece = 1U << 18U;
+    std::istringstream lines(std::string(3 * piece, '\n'));
+    LineReader reader(lines, { .all = 2 * piece });
+    std::string_view line;
+    std::size_t count = 0;
+    const auto readAll = [&] {
+        while (reader.next(line))
+            ++count;
+    };
+    EXPECT_TRUE(errorTextOf(readAll).starts_with("it goes on after 524288 bytes, "));
+    EXPECT_EQ(count, 2 * piece);
 }
 
 } // namespace pelloric

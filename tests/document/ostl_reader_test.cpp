@@ -300,4 +300,22 @@ TEST(OstlReader, FailsForAFileThatIsMissingOrNoFile)
     }
 }
 
+#if defined(__linux__)
+TEST(OstlReader, RefusesADeviceThatNeverEnds)
+{
+    const Utf8Codec codec;
+    PageDocument document;
+    PageSetup setup;
+    try {
+        readOstl(codec, std::filesystem::path("/dev/zero"), document, setup);
+        FAIL() << "it has an end";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(error.number(), ErrorNumber::Overflow);
+        EXPECT_EQ(
+            toUtf8(error.detail()), "/dev/zero is damaged: a line holds more than 268435456 bytes");
+    }
+    EXPECT_EQ(setup, PageSetup());
+}
+#endif
+
 } // namespace pelloric
