@@ -27,4 +27,19 @@ FileFault faultOf(int error)
     }
 }
 
+ErrorNumber errorNumberOf(FileFault fault)
+{
+    switch (fault) {
+    case FileFault::NoRights:
+        return ErrorNumber::PermissionDenied;
+    case FileFault::DiskFull:
+        return ErrorNumber::DiskFull;
+    case FileFault::None:
+    case FileFault::Exists:
+    case FileFault::Other:
+        break;
+    }
+    return ErrorNumber::WriteFailed;
+}
+
 } // namespace pelloric

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include "platform/run_time_error.h"
+
 #include <cstddef>
 #include <filesystem>
 #include <memory>
@@ -17,6 +19,9 @@ enum class FileFault { None, Exists, NoRights, DiskFull, Other };
 
 /// The reason behind an error number of the system.
 FileFault faultOf(int error);
+
+/// What is thrown for it: PermissionDenied, DiskFull, or WriteFailed.
+ErrorNumber errorNumberOf(FileFault fault);
 
 /// A file that is open for writing; closed when it goes.
 class OpenFile {

@@ -250,17 +250,7 @@ void SafeFile::refuse() const { refuse(file_->fault()); }
 
 void SafeFile::refuse(FileFault fault) const
 {
-    switch (fault) {
-    case FileFault::NoRights:
-        throw RunTimeError(ErrorNumber::PermissionDenied, pathText(path_));
-    case FileFault::DiskFull:
-        throw RunTimeError(ErrorNumber::DiskFull, pathText(path_));
-    case FileFault::None:
-    case FileFault::Exists:
-    case FileFault::Other:
-        break;
-    }
-    throw RunTimeError(ErrorNumber::WriteFailed, pathText(path_));
+    throw RunTimeError(errorNumberOf(fault), pathText(path_));
 }
 
 } // namespace pelloric

@@ -4,6 +4,7 @@
 #include "settings/default_settings.h"
 
 #include "platform/file_bytes.h"
+#include "platform/files.h"
 #include "platform/platform.h"
 #include "platform/run_time_error.h"
 #include "platform/text_codec.h"
@@ -32,22 +33,38 @@ bool holdsSettings(TextView text)
     return false;
 }
 
-/// Copies a file to the first free name beside it; an existing file is never overwritten.
-/// @throws RunTimeError WriteFailed: the copy cannot be made
-void keepBeside(const std::filesystem::path& path)
+/// @return  None: the copy is whole; else there is none, and what was begun of it is gone
+FileFault copyTo(FileSystem& files, const std::filesystem::path& path, std::string_view bytes,
+    const std::filesystem::path& like)
 {
+    OpenedFile copy = files.create(path, like);
+    if (!copy.file)
+        return copy.fault;
+    if (copy.file->write(bytes) && copy.file->sync())
+        return FileFault::None;
+    const FileFault fault = copy.file->fault();
+    copy.file.reset(); // some systems remove no file that is open
+    std::error_code ignored;
+    std::filesystem::remove(path, ignored);
+    return fault == FileFault::None ? FileFault::Other : fault;
+}
+
+/// Copies a file to the first free name beside it; an existing file is never overwritten.
+/// @throws RunTimeError WriteFailed, PermissionDenied, DiskFull, with the path: the copy cannot be
+///         made
+void keepBeside(FileSystem& files, const std::filesystem::path& path)
+{
+    const std::string bytes = readFileBytes(path);
     std::filesystem::path copy = path;
     copy += ".bak";
-    for (int number = 1; number < MostKept; ++number) {
-        std::error_code error;
-        if (std::filesystem::copy_file(path, copy, error))
-            return;
-        if (error != std::errc::file_exists)
-            break;
+    FileFault fault = copyTo(files, copy, bytes, path);
+    for (int number = 1; number < MostKept && fault == FileFault::Exists; ++number) {
         copy = path;
         copy += ".bak" + std::to_string(number);
+        fault = copyTo(files, copy, bytes, path);
     }
-    throw RunTimeError(ErrorNumber::WriteFailed, pathText(copy));
+    if (fault != FileFault::None)
+        throw RunTimeError(errorNumberOf(fault), pathText(copy));
 }
 
 /// Whether there is a file that must be left alone: one that holds settings or cannot be read.
@@ -70,7 +87,7 @@ void replace(const Platform& platform, std::span<const SettingChange> values)
     const std::filesystem::path path = settingsPath(platform);
     std::error_code error;
     if (std::filesystem::exists(path, error))
-        keepBeside(path);
+        keepBeside(platform.files, path);
     replaceSettings(platform, settingsTextWith(values));
 }
 

@@ -8,6 +8,7 @@
 #include "settings/settings_file.h"
 #include "settings/settings_table.h"
 #include "support/errors.h"
+#include "support/file_size_limit.h"
 
 #include <gtest/gtest.h>
 
@@ -92,6 +93,22 @@ TEST(DeployDefaultSettings, KeepsAFileWithoutASettingBesideTheDefaults)
         EXPECT_EQ(platform.folder.read("OstlConfig.ini.bak"), content);
     }
 }
+
+#if defined(__unix__)
+TEST(DeployDefaultSettings, LeavesAFileThatTheDiskHasNoRoomToKeep)
+{
+    FakePlatform platform;
+    const std::string content(5000, 'x');
+    platform.folder.write("OstlConfig.ini", content);
+    {
+        const FileSizeLimit full(1000);
+        EXPECT_EQ(
+            errorOf([&] { deployDefaultSettings(platform.services()); }), ErrorNumber::DiskFull);
+    }
+    EXPECT_EQ(platform.folder.names().size(), 1U);
+    EXPECT_EQ(platform.folder.read("OstlConfig.ini"), content);
+}
+#endif
 
 TEST(DeployDefaultSettings, NeverOverwritesAFileThatWasKept)
 {
