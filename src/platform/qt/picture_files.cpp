@@ -3,12 +3,18 @@
 
 #include "platform/qt/picture_files.h"
 
+#include "platform/file_bytes.h"
+#include "platform/files.h"
+#include "platform/phrase.h"
+#include "platform/qt/file_names.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
+#include "platform/std_files.h"
 
 #include <QBuffer>
 #include <QCache>
 #include <QCryptographicHash>
+#include <QDir>
 #include <QFile>
 #include <QFont>
 #include <QFontMetricsF>
@@ -19,6 +25,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <filesystem>
 #include <mutex>
 #include <numbers>
 
@@ -41,18 +48,31 @@ QTemporaryDir& folder()
     return kept;
 }
 
+/// @throws RunTimeError WriteFailed, PermissionDenied, DiskFull, with the path; nothing is left
+void write(std::string_view bytes, const std::filesystem::path& path)
+{
+    const OpenedFile made = StdFiles().create(path, {});
+    if (made.file && made.file->write(bytes) && made.file->sync())
+        return;
+    const FileFault fault = made.file ? made.file->fault() : made.fault;
+    std::error_code ignored;
+    std::filesystem::remove(path, ignored);
+    throw RunTimeError(errorNumberOf(fault), pathText(path));
+}
+
 /// @param ending  of the file's name
+/// @throws RunTimeError the file cannot be written, or there is no folder for it
 Text keepFile(const QByteArray& bytes, const QString& ending)
 {
+    if (!folder().isValid())
+        throw RunTimeError(ErrorNumber::WriteFailed,
+            phrase(u"pictures cannot be kept in %1: %2",
+                { toText(QDir::tempPath()), toText(folder().errorString()) }));
     const QByteArray hash = QCryptographicHash::hash(bytes, QCryptographicHash::Sha1).toHex();
     const QString path = folder().filePath(QString::fromLatin1(hash) + QLatin1Char('.') + ending);
-    QFile file(path);
-    if (file.exists())
+    if (QFile::exists(path))
         return toText(path);
-    if (!file.open(QIODevice::WriteOnly) || file.write(bytes) != bytes.size() || !file.flush()) {
-        file.remove();
-        throw RunTimeError(ErrorNumber::WriteFailed, viewOf(path));
-    }
+    write({ bytes.constData(), static_cast<std::size_t>(bytes.size()) }, pathOf(path));
     return toText(path);
 }
 

@@ -269,6 +269,19 @@ TEST_F(ProgramFaults, TellRightsThatAreMissingFromAFullDisk)
     EXPECT_THAT(sortedNames(), testing::ElementsAre("kept.pdf", "t.csv"));
 }
 
+TEST_F(ProgramFaults, NameAFileThatMayNotBeRead)
+{
+    namespace fs = std::filesystem;
+    fs::permissions(folder_.path(), fs::perms::all);
+    folder_.write("secret.csv", table(4));
+    fs::permissions(folder_.file("secret.csv"), fs::perms::none);
+    surround = [](QProcess& process, QProcessEnvironment&) { becomeNobody(process); };
+    const Ended ended = run(words("export secret.csv -o t.pdf"));
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_EQ(ended.errors, "pelloric: secret.csv: you may not read this file\n");
+    EXPECT_THAT(sortedNames(), testing::ElementsAre("secret.csv"));
+}
+
 TEST_F(ProgramFaults, FollowLinksToTheFilesThatTheyName)
 {
     namespace fs = std::filesystem;
@@ -439,6 +452,22 @@ TEST_F(Pipes, AndOtherThingsThatCannotBeReadAreNamed)
     EXPECT_TRUE(folder_.read("u.pdf").ends_with("%%EOF\n")); // what was made is whole
     EXPECT_EQ(shell("$P export t.csv -o v.pdf 2>&-").status, 0);
     EXPECT_TRUE(folder_.read("v.pdf").ends_with("%%EOF\n"));
+}
+
+/// Pictures of a report are kept beside other temporary files.
+TEST_F(Pipes, AndPicturesTellOfAFullDisk)
+{
+    folder_.write("t.csv", table(30));
+    folder_.write("t.pdf", "old");
+    most = 500;
+    const Ended full = run(words("export t.csv -o t.pdf --watermark DRAFT"));
+    EXPECT_EQ(full.status, 1);
+    EXPECT_TRUE(full.errors.starts_with("pelloric: Disk full: ")) << full.errors;
+    EXPECT_TRUE(has(full.errors, folder_.file("tmp").string())) << full.errors;
+    const Ended none = shell("TMPDIR=/proc $P export t.csv -o t.pdf --watermark DRAFT");
+    EXPECT_EQ(none.status, 1);
+    EXPECT_TRUE(has(none.errors, "pictures cannot be kept in /proc: ")) << none.errors;
+    EXPECT_EQ(folder_.read("t.pdf"), "old");
 }
 
 TEST_F(Pipes, ThatASocketIsNamedAsOne)
