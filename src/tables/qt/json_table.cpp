@@ -336,6 +336,9 @@ TableGrid readJson(const std::filesystem::path& path, const TextFileOptions& opt
         refuseNestedObject(file.text);
     Names names;
     parseAll(file.text, isOne, names, nullptr);
+    if (names.all().empty())
+        refuse(phrase(u"no object of the file has a name, so there is no column; %1",
+            { phrase(WantedShape) }));
     std::vector<TableColumn> columns;
     for (const std::string& name : names.all())
         columns.push_back({ .title = fromUtf8(name), .width = -1 });

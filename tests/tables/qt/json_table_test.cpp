@@ -54,8 +54,7 @@ TEST(JsonTable, ReadsArraysOfObjectsAndLines)
         { "[{\"城市\":\"北京\\n\\u5317\"}]", "城市|/北京\n北|" },
         { "\xEF\xBB\xBF[{\"a\":1}]", "a|/1|" },
         { "{\n\"a\":1,\n\"b\":\"x\"\n}", "a|b|/1|x|" },
-        { "[]", "" },
-        { "[{}]", "/" },
+        { "[{},{\"a\":1}]", "a|/|/1|" },
     };
     for (const Case& row : cases)
         EXPECT_EQ(read(row.bytes), row.result) << row.bytes;
@@ -79,6 +78,10 @@ TEST(JsonTable, NamesTheLineOfWhatItCannotReadAndWhatATableIs)
         "Type mismatch: the file is one object; " + std::string(Shape)
             + "; take the array out of it, for example with: jq .NAME");
     EXPECT_EQ(read(" \n"), "Type mismatch: the file is empty");
+    for (const char* const nameless : { "[]", "[{}]", "{}\n{}\n" })
+        EXPECT_EQ(read(nameless),
+            "Type mismatch: no object of the file has a name, so there is no column; "
+                + std::string(Shape));
 }
 
 TEST(JsonTable, TakesOneNestedObjectForARowWhereTheNameSaysSo)
