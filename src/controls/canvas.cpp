@@ -17,6 +17,7 @@
 #include "print/page_list.h"
 #include "print/paper_names.h"
 #include "print/print_job.h"
+#include "report/page_limit.h"
 #include "report/shaped_report.h"
 
 #include <algorithm>
@@ -202,6 +203,10 @@ bool Canvas::rebuild(AutomationObject& grid, bool takeWidths, const Shape& earli
         .store = std::make_shared<TextStore>(),
         .decimalSeparator = platform_.decimalSeparator,
         .loop = &platform_.loop };
+    // Which rows are chosen is known only when they were read.
+    if (!options.choosesCells())
+        request.mostRows = mostRowsOnPages(
+            page, options.shapesPages(grid.cellLooks() != nullptr) ? 1 : CellPadding);
     if (!takeWidths)
         request.keptWidths = table_->ColumnWidths;
     GridTable table = readGrid(grid, request);

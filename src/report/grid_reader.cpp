@@ -12,6 +12,7 @@
 #include "platform/run_time_error.h"
 #include "report/flex_rows.h"
 #include "report/late_bound_rows.h"
+#include "report/page_limit.h"
 #include "report/table_row_set.h"
 
 #include <algorithm>
@@ -191,7 +192,9 @@ GridTable readFlexGrid(AutomationObject& object, const GridRequest& request)
         appendTitle(table, displayText(title, request.decimalSeparator, buffer), column.position);
     }
     const std::int32_t rows = grid.rows();
-    table.reserveRecords(std::int64_t { rows } - std::max(0, request.startRow));
+    const std::int64_t records = std::int64_t { rows } - std::max(0, request.startRow);
+    requireRowsToFit(records, request.mostRows);
+    table.reserveRecords(records);
     const std::vector<int> positions = positionsOf(columns);
     result.lentTexts
         = readFlexRows({ object, grid.columns(), positions, request.startRow, rows }, table, pulse);
@@ -276,6 +279,7 @@ GridTable readListView(AutomationObject& object, const GridRequest& request)
     if (columns.empty())
         return {};
     const Collection items(getMember(object, u"ListItems").toObject());
+    requireRowsToFit(items.count(), request.mostRows);
     Pulse pulse(request.loop);
     table.reserveRecords(items.count());
     const std::vector<int> positions = positionsOf(columns);
@@ -322,6 +326,7 @@ GridTable readDataGrid(AutomationObject& object, const GridRequest& request)
     if (static_cast<std::size_t>(result.rows->fieldCount()) < widths.size())
         throw RunTimeError(ErrorNumber::SubscriptOutOfRange,
             phrase(u"the data grid has more columns than fields"));
+    requireRowsToFit(result.rows->recordCount(), request.mostRows);
     result.gridColumns.resize(widths.size());
     std::iota(result.gridColumns.begin(), result.gridColumns.end(), 0);
     setWidths(result, std::move(widths), request);

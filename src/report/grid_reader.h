@@ -10,6 +10,7 @@
 
 #include <pelloric/records.h>
 
+#include <limits>
 #include <memory>
 #include <optional>
 #include <span>
@@ -36,6 +37,8 @@ struct GridRequest {
     std::optional<std::span<const double>> keptWidths;
     std::shared_ptr<TextStore> store; ///< where texts are kept that are copied from the grid
     char16_t decimalSeparator = u'.';
+    /// More rows cannot be printed; see `requireRowsToFit`.
+    std::int64_t mostRows = std::numeric_limits<std::int64_t>::max();
     MessageLoop* loop = nullptr; ///< kept alive while rows are read; null: nothing is
 };
 
@@ -89,7 +92,8 @@ private:
 /// the host's grid.
 /// @throws RunTimeError NoSuchMember: the object is of another kind; SubscriptOutOfRange: kept
 ///         widths for another number of columns, or a data grid with more columns than fields;
-///         Overflow: more than 32767 printed columns, or more than `MostGridColumns` in all;
+///         Overflow: more than 32767 printed columns, more than `MostGridColumns` in all, or more
+///         rows than asked for;
 ///         Cancelled: by the message loop; or the grid's own error
 GridTable readGrid(AutomationObject& grid, const GridRequest& request);
 

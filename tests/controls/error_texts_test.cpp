@@ -364,6 +364,31 @@ TEST(ErrorTexts, SayHowManyPagesAreNeededAndHowManyRowsFit)
           "or leave out columns" } });
 }
 
+/// A grid that promises more rows than any document takes is not walked.
+TEST(ErrorTexts, SayHowManyRowsADocumentTakesBeforeAnyIsRead)
+{
+    World world;
+    std::int64_t asked = 0;
+    FakeObject tall;
+    tall.number(u"Cols", 1);
+    tall.number(u"Rows", 2147483647);
+    tall.number(u"ColWidth", 1000);
+    tall.member(u"TextMatrix", [&asked](FakeObject::Arguments arguments) {
+        asked += arguments[0].number() > 0 ? 1 : 0;
+        return Value::ofNumber(1);
+    });
+    expectError({ "a grid of too many rows", [&] { world.canvas.doPreview(tall); },
+        ErrorNumber::Overflow,
+        { "the grid has 2,147,483,646 rows; the 32,767 pages that a document holds take 3,407,768 "
+          "of them at most, so print fewer rows" } });
+    world.canvas.options.fit.toSheet = true;
+    expectError({ "a grid of too many rows to be fitted", [&] { world.canvas.doPreview(tall); },
+        ErrorNumber::Overflow,
+        { "the grid has 2,147,483,646 rows; the 32,767 pages that a document holds take "
+          "488,654,271 of them at most, so print fewer rows" } });
+    EXPECT_EQ(asked, 0);
+}
+
 /// An error that is thrown with its number alone tells nobody what it is about.
 TEST(ErrorTexts, AreNeverTheTextOfTheNumberAlone)
 {
