@@ -73,12 +73,25 @@ CommandLine::CommandLine(
     // The parser takes the first argument for the program's name.
     if (!parser_.parse(QStringList(QString()) + arguments))
         throw UsageError(wrongOption(parser_));
+    for (const OptionTable table : tables)
+        std::ranges::for_each(table, [this](const Option& option) { refuseBlank(option); });
     const auto given = parser_.positionalArguments().size();
     if (files != OneOrMore && given > files)
         throw UsageError(qt::phrased(u"one argument too many: %1; quote names with blanks",
             { parser_.positionalArguments().at(files) }));
     if (given < std::max(files, files == OneOrMore ? 1 : 0))
         throw UsageError(qt::phrased(u"the file is missing"));
+}
+
+/// @throws UsageError the option's value says nothing, which nobody writes on purpose
+void CommandLine::refuseBlank(const Option& option) const
+{
+    if (option.value == nullptr || option.mayBeBlank || !has(option.name))
+        return;
+    const QString text = value(option.name);
+    if (text.trimmed().isEmpty())
+        throw UsageError(qt::phrased(u"%1 takes %2, not \"%3\": %4",
+            { dashed(option.name), QString::fromLatin1(option.value), text, helpOf(option) }));
 }
 
 bool CommandLine::has(const char* option) const

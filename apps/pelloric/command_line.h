@@ -52,6 +52,7 @@ struct Option {
     const char* name; ///< without the dashes; one letter or a word
     const char* value; ///< what stands for its value in the help; null: it takes none
     TextView help; ///< a phrase
+    bool mayBeBlank = false; ///< nothing, or blanks alone, are a value like any other
 };
 
 using OptionTable = std::span<const Option>;
@@ -63,7 +64,8 @@ inline constexpr int OneOrMore = -1;
 class CommandLine {
 public:
     /// @param files  how many arguments that are no options are needed; or `OneOrMore`
-    /// @throws UsageError unknown options, missing values, another number of files
+    /// @throws UsageError unknown options, values that are missing or blank, another number of
+    /// files
     CommandLine(const QStringList& arguments, const std::vector<OptionTable>& tables, int files);
 
     bool has(const char* option) const;
@@ -77,6 +79,8 @@ public:
     QString file(int number) const { return parser_.positionalArguments().at(number); }
 
 private:
+    void refuseBlank(const Option& option) const;
+
     QCommandLineParser parser_;
 };
 

@@ -19,13 +19,13 @@
 #include <QAbstractButton>
 #include <QAction>
 #include <QApplication>
-#include <QDir>
 #include <QFileInfo>
 #include <QPixmap>
 #include <QTabWidget>
 #include <QWidget>
 
 #include <array>
+#include <filesystem>
 
 namespace pelloric::app {
 
@@ -77,8 +77,10 @@ public:
 
     void run()
     {
-        if (!QDir().mkpath(out_))
-            throw CommandError(qt::phrased(u"%1: the folder cannot be made").arg(out_));
+        std::error_code error;
+        if (!std::filesystem::create_directories(pathOf(out_), error) && error)
+            throw CommandError(qt::phrased(u"%1: the folder cannot be made: %2",
+                { out_, QString::fromStdString(error.message()) }));
         qt::PreviewPrompts prompts;
         prompts.chooseFile = [this](QWidget&, const qt::FileQuestion&) { return document(); };
         opener_.setPrompts(prompts);

@@ -185,7 +185,6 @@ struct Order {
             throw CommandError(
                 qt::phrased(u"--pages is for .pdf, .png and .svg; a document file holds all"),
                 WrongUsage);
-        refuseNoPages(line);
         if (line.has("dpi") && !format->takesDpi)
             throw CommandError(qt::phrased(u"--dpi is for .png images"), WrongUsage);
         if (line.has("jobs") && !format->takesDpi)
@@ -297,7 +296,8 @@ void exportEach(const Order& order, const CommandLine& line, qt::QtPlatform& pla
 {
     std::error_code error;
     if (order.isFolder() && !std::filesystem::create_directories(pathOf(order.out), error) && error)
-        throw CommandError(qt::phrased(u"%1: the folder cannot be made").arg(order.out));
+        throw CommandError(qt::phrased(u"%1: the folder cannot be made: %2",
+            { order.out, QString::fromStdString(error.message()) }));
     QStringList taken;
     for (const QString& file : order.files) {
         const QString name = plainName(file);

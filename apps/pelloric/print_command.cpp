@@ -48,7 +48,6 @@ struct Order {
         , title(line.has("title") ? line.value("title") : plainName(file))
         , pages(line.value("pages").trimmed())
     {
-        refuseNoPages(line);
         if (line.has("copies"))
             copies = static_cast<std::int16_t>(
                 numberOf("copies", line.value("copies"), 1, MostCopies, true));

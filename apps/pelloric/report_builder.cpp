@@ -174,13 +174,6 @@ SavedDocument readDocument(const QString& file, const CommandLine& line, const P
     return saved;
 }
 
-void refuseNoPages(const CommandLine& line)
-{
-    if (line.has("pages") && line.value("pages").trimmed().isEmpty())
-        throw CommandError(
-            qt::phrased(u"--pages takes pages such as 1,3,5-12, not \"\""), WrongUsage);
-}
-
 std::vector<int> pagesOf(const QString& list, int pageCount)
 {
     std::vector<int> pages;

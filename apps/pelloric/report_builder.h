@@ -48,10 +48,6 @@ struct SavedDocument {
 /// @throws CommandError it is no document file, or other options are given; RunTimeError of reading
 SavedDocument readDocument(const QString& file, const CommandLine& line, const Platform& platform);
 
-/// Refuses a page list without any text: all pages are what is taken without the option.
-/// @throws CommandError WrongUsage
-void refuseNoPages(const CommandLine& line);
-
 /// The zero-based pages that a list such as 1,3,5-12 names; empty for an empty list.
 /// @throws CommandError the list names no page of the document
 std::vector<int> pagesOf(const QString& list, int pageCount);

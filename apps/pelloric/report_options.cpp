@@ -30,14 +30,15 @@ constexpr auto Options = std::to_array<Option>({
     { "defaults", nullptr, phraseText(u"the default settings, whatever the user's are") },
     { "settings", "FILE",
         phraseText(u"the settings of this file; the default ones for those it lacks") },
-    { "title", "TEXT", phraseText(u"title of the file, and centred above every page") },
-    { "header-left", "TEXT", phraseText(u"header texts; they may hold one of the fields") },
+    { "title", "TEXT", phraseText(u"title of the file, and centred above every page"), true },
+    { "header-left", "TEXT", phraseText(u"header texts; they may hold one of the fields"), true },
     { "header-center", "TEXT",
-        phraseText(u"[Date Printed], [Time Printed], [Date & Time Printed],") },
-    { "header-right", "TEXT", phraseText(u"[Page # of Pages #], [Total Pages] and [Page #]") },
-    { "footer-left", "TEXT", phraseText(u"footer texts, likewise") },
-    { "footer-center", "TEXT", {} },
-    { "footer-right", "TEXT", {} },
+        phraseText(u"[Date Printed], [Time Printed], [Date & Time Printed],"), true },
+    { "header-right", "TEXT", phraseText(u"[Page # of Pages #], [Total Pages] and [Page #]"),
+        true },
+    { "footer-left", "TEXT", phraseText(u"footer texts, likewise"), true },
+    { "footer-center", "TEXT", {}, true },
+    { "footer-right", "TEXT", {}, true },
     { "paper", "NAME",
         phraseText(u"A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in") },
     { "margins", "LENGTHS",
@@ -179,9 +180,6 @@ void changeMargins(const CommandLine& line, ReportSettings& settings)
 void changeFonts(const CommandLine& line, ReportSettings& settings)
 {
     if (line.has("font")) {
-        const QString name = line.value("font");
-        if (name.trimmed().isEmpty())
-            throw CommandError(qt::phrased(u"--font needs the name of a face"), WrongUsage);
         for (FontSettings* const font : { &settings.body, &settings.header, &settings.footer })
             font->name = textOf(line, "font");
     }

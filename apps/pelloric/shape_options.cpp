@@ -54,11 +54,25 @@ constexpr auto Functions = std::to_array<FunctionName>({
     { "max", AggregateFunction::Maximum },
 });
 
-std::vector<Text> namesOf(const QString& list)
+/// The items of an option's list, between commas; empty when it was not given.
+/// @throws CommandError WrongUsage: the list holds only commas
+QStringList itemsOf(const CommandLine& line, const char* option)
+{
+    QStringList items;
+    for (const QString& item : line.value(option).split(QLatin1Char(','), Qt::SkipEmptyParts))
+        items.append(item.trimmed());
+    if (items.isEmpty() && line.has(option))
+        throw CommandError(qt::phrased(u"--%1 names no column, only \"%2\"",
+                               { QLatin1String(option), line.value(option) }),
+            WrongUsage);
+    return items;
+}
+
+std::vector<Text> namesOf(const CommandLine& line, const char* option)
 {
     std::vector<Text> names;
-    for (const QString& name : list.split(QLatin1Char(','), Qt::SkipEmptyParts))
-        names.push_back(qt::toText(name.trimmed()));
+    for (const QString& name : itemsOf(line, option))
+        names.push_back(qt::toText(name));
     return names;
 }
 
@@ -77,14 +91,15 @@ Aggregation totalOf(const QString& text)
         WrongUsage);
 }
 
-void takeKeys(const QString& text, ReportOptions& options)
+void takeKeys(const CommandLine& line, ReportOptions& options)
 {
+    const QString text = line.value("key-columns");
     bool isCount = false;
     text.toInt(&isCount);
     if (isCount)
         options.keyColumns = static_cast<int>(numberOf("key-columns", text, 0, MostColumns, true));
     else
-        options.keyColumnNames = namesOf(text);
+        options.keyColumnNames = namesOf(line, "key-columns");
 }
 
 int slotOf(const QString& name)
@@ -158,12 +173,12 @@ ReportOptions shapeOf(const CommandLine& line)
         options.fit.pagesAcross = static_cast<int>(
             numberOf("pages-across", line.value("pages-across"), 1, MostPages, true));
     if (line.has("key-columns"))
-        takeKeys(line.value("key-columns"), options);
+        takeKeys(line, options);
     if (line.has("down-first"))
         options.pageOrder = PageOrder::DownThenAcross;
-    options.groupColumns = namesOf(line.value("group"));
+    options.groupColumns = namesOf(line, "group");
     options.keepsGroups = !options.groupColumns.empty();
-    for (const QString& total : line.value("total").split(QLatin1Char(','), Qt::SkipEmptyParts))
+    for (const QString& total : itemsOf(line, "total"))
         options.totals.push_back(totalOf(total));
     takePictures(line, options);
     return options;

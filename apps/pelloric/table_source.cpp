@@ -34,8 +34,8 @@ namespace {
 constexpr auto Options = std::to_array<Option>({
     { "query", "SQL", phraseText(u"what to take of a database: a SELECT statement") },
     { "encoding", "NAME", phraseText(u"of a text file; else found out") },
-    { "delimiter", "CHAR",
-        phraseText(u"between the values of a CSV file, or tab; else found out") },
+    { "delimiter", "CHAR", phraseText(u"between the values of a CSV file, or tab; else found out"),
+        true },
     { "no-quote", nullptr, phraseText(u"a quote in a CSV file is a character like any other") },
 });
 
@@ -259,7 +259,9 @@ TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& 
     const bool isFromDatabase = isDatabase(name.file);
     const bool isOffice = qt::isOfficeFile(pathOf(name.file));
     if (!isFromDatabase && !isOffice && !name.table.isEmpty())
-        throw CommandError(qt::phrased(u"%1 is no SQLite database and no office file").arg(shown));
+        throw CommandError(
+            qt::phrased(u"%1 is no SQLite database and no office file, so it has no table \"%2\"",
+                { shown, name.table }));
     try {
         if (isOffice)
             return selected(

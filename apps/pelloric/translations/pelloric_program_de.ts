@@ -117,10 +117,6 @@ Tabellen lassen sich daneben öffnen. Was die Dialoge ändern, wird vergessen.
 </translation>
     </message>
     <message>
-        <source>%1: the folder cannot be made</source>
-        <translation>%1: der Ordner kann nicht angelegt werden</translation>
-    </message>
-    <message>
         <source>the preview window did not close</source>
         <translation>das Vorschaufenster hat sich nicht geschlossen</translation>
     </message>
@@ -550,10 +546,6 @@ Jede Seite ist ein eigener Auftrag, einseitig, auf dem Papier, für das sie aufg
         <translation>nehmen Sie entweder --landscape oder --portrait, nicht beides</translation>
     </message>
     <message>
-        <source>--font needs the name of a face</source>
-        <translation>--font verlangt den Namen einer Schrift</translation>
-    </message>
-    <message>
         <source>%1 Correct it in the file, or do without: --defaults</source>
         <translation>%1 Berichtigen Sie dies in der Datei, oder verzichten Sie darauf: --defaults</translation>
     </message>
@@ -750,10 +742,6 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
         <translation>--query ist für Datenbanken; %1 ist keine</translation>
     </message>
     <message>
-        <source>%1 is no SQLite database and no office file</source>
-        <translation>%1 ist weder eine SQLite-Datenbank noch eine Office-Datei</translation>
-    </message>
-    <message>
         <source>of hints, tips and errors (the locale&apos;s): de, en, zh_CN, or system; the rest has one wording</source>
         <translation>von Hinweisen, Tipps und Fehlern (die der Umgebung): de, en, zh_CN oder system; der Rest hat einen Wortlaut</translation>
     </message>
@@ -794,10 +782,6 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
         <translation>%1 ist eine Pipe; ein gespeichertes Dokument wird aus einer Datei gelesen, speichern Sie es also in eine und nennen Sie diese</translation>
     </message>
     <message>
-        <source>--pages takes pages such as 1,3,5-12, not &quot;&quot;</source>
-        <translation>--pages nimmt Seiten wie 1,3,5-12, nicht &quot;&quot;</translation>
-    </message>
-    <message>
         <source>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</source>
         <translation>--margins nimmt eine Länge von mindestens %1 mm und höchstens %2 mm, oder vier (oben,rechts,unten,links), nicht &quot;%3&quot;</translation>
     </message>
@@ -820,6 +804,22 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
     <message>
         <source>%1 is a socket; name a file</source>
         <translation>%1 ist ein Socket; nennen Sie eine Datei</translation>
+    </message>
+    <message>
+        <source>%1 takes %2, not &quot;%3&quot;: %4</source>
+        <translation>%1 nimmt %2, nicht &quot;%3&quot;: %4</translation>
+    </message>
+    <message>
+        <source>%1: the folder cannot be made: %2</source>
+        <translation>%1: der Ordner kann nicht angelegt werden: %2</translation>
+    </message>
+    <message>
+        <source>--%1 names no column, only &quot;%2&quot;</source>
+        <translation>--%1 nennt keine Spalte, nur &quot;%2&quot;</translation>
+    </message>
+    <message>
+        <source>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</source>
+        <translation>%1 ist weder eine SQLite-Datenbank noch eine Office-Datei und hat daher keine Tabelle &quot;%2&quot;</translation>
     </message>
 </context>
 <context>

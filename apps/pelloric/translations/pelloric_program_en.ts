@@ -117,10 +117,6 @@ your own can be opened beside them. What its dialogs change is forgotten.
 </translation>
     </message>
     <message>
-        <source>%1: the folder cannot be made</source>
-        <translation>%1: the folder cannot be made</translation>
-    </message>
-    <message>
         <source>the preview window did not close</source>
         <translation>the preview window did not close</translation>
     </message>
@@ -549,10 +545,6 @@ Every page is a job of its own, one-sided, on the paper it was laid out for.
         <translation>take either --landscape or --portrait, not both</translation>
     </message>
     <message>
-        <source>--font needs the name of a face</source>
-        <translation>--font needs the name of a face</translation>
-    </message>
-    <message>
         <source>%1 Correct it in the file, or do without: --defaults</source>
         <translation>%1 Correct it in the file, or do without: --defaults</translation>
     </message>
@@ -749,10 +741,6 @@ An exception that it does not catch ends the program with status 1.
         <translation>--query is for databases; %1 is none</translation>
     </message>
     <message>
-        <source>%1 is no SQLite database and no office file</source>
-        <translation>%1 is no SQLite database and no office file</translation>
-    </message>
-    <message>
         <source>of hints, tips and errors (the locale&apos;s): de, en, zh_CN, or system; the rest has one wording</source>
         <translation>of hints, tips and errors (the locale&apos;s): de, en, zh_CN, or system; the rest has one wording</translation>
     </message>
@@ -793,10 +781,6 @@ An exception that it does not catch ends the program with status 1.
         <translation>%1 is a pipe; a saved document is read from a file, so save it to one and name that</translation>
     </message>
     <message>
-        <source>--pages takes pages such as 1,3,5-12, not &quot;&quot;</source>
-        <translation>--pages takes pages such as 1,3,5-12, not &quot;&quot;</translation>
-    </message>
-    <message>
         <source>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</source>
         <translation>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</translation>
     </message>
@@ -819,6 +803,22 @@ An exception that it does not catch ends the program with status 1.
     <message>
         <source>%1 is a socket; name a file</source>
         <translation>%1 is a socket; name a file</translation>
+    </message>
+    <message>
+        <source>%1 takes %2, not &quot;%3&quot;: %4</source>
+        <translation>%1 takes %2, not &quot;%3&quot;: %4</translation>
+    </message>
+    <message>
+        <source>%1: the folder cannot be made: %2</source>
+        <translation>%1: the folder cannot be made: %2</translation>
+    </message>
+    <message>
+        <source>--%1 names no column, only &quot;%2&quot;</source>
+        <translation>--%1 names no column, only &quot;%2&quot;</translation>
+    </message>
+    <message>
+        <source>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</source>
+        <translation>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</translation>
     </message>
 </context>
 <context>

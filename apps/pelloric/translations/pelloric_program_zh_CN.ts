@@ -116,10 +116,6 @@ your own can be opened beside them. What its dialogs change is forgotten.
 </translation>
     </message>
     <message>
-        <source>%1: the folder cannot be made</source>
-        <translation>%1：无法创建文件夹</translation>
-    </message>
-    <message>
         <source>the preview window did not close</source>
         <translation>预览窗口没有关闭</translation>
     </message>
@@ -544,10 +540,6 @@ Every page is a job of its own, one-sided, on the paper it was laid out for.
         <translation>--landscape 和 --portrait 只能用一个</translation>
     </message>
     <message>
-        <source>--font needs the name of a face</source>
-        <translation>--font 需要字体名称</translation>
-    </message>
-    <message>
         <source>%1 Correct it in the file, or do without: --defaults</source>
         <translation>%1 请在文件中更正，或不使用它：--defaults</translation>
     </message>
@@ -743,10 +735,6 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
         <translation>--query 用于数据库；%1 不是数据库</translation>
     </message>
     <message>
-        <source>%1 is no SQLite database and no office file</source>
-        <translation>%1 既不是 SQLite 数据库也不是办公文件</translation>
-    </message>
-    <message>
         <source>of hints, tips and errors (the locale&apos;s): de, en, zh_CN, or system; the rest has one wording</source>
         <translation>提示、说明和错误的语言（默认为区域设置）：de、en、zh_CN 或 system；其余文字只有一种</translation>
     </message>
@@ -787,10 +775,6 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
         <translation>%1 是管道；已保存的文档须从文件读取，请先保存为文件并指定该文件</translation>
     </message>
     <message>
-        <source>--pages takes pages such as 1,3,5-12, not &quot;&quot;</source>
-        <translation>--pages 需要页码，如 1,3,5-12，而不是 &quot;&quot;</translation>
-    </message>
-    <message>
         <source>--margins takes one length of %1 mm or more and at most %2 mm, or four (top,right,bottom,left), not &quot;%3&quot;</source>
         <translation>--margins 需要一个不小于 %1 毫米且不大于 %2 毫米的长度，或四个（上,右,下,左），而不是 &quot;%3&quot;</translation>
     </message>
@@ -813,6 +797,22 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
     <message>
         <source>%1 is a socket; name a file</source>
         <translation>%1 是套接字；请指定文件</translation>
+    </message>
+    <message>
+        <source>%1 takes %2, not &quot;%3&quot;: %4</source>
+        <translation>%1 需要 %2，而不是 &quot;%3&quot;：%4</translation>
+    </message>
+    <message>
+        <source>%1: the folder cannot be made: %2</source>
+        <translation>%1：无法创建文件夹：%2</translation>
+    </message>
+    <message>
+        <source>--%1 names no column, only &quot;%2&quot;</source>
+        <translation>--%1 没有指定任何列，只有 &quot;%2&quot;</translation>
+    </message>
+    <message>
+        <source>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</source>
+        <translation>%1 既不是 SQLite 数据库也不是办公文件，因此没有表 &quot;%2&quot;</translation>
     </message>
 </context>
 <context>

@@ -838,6 +838,26 @@
         <source>%1 goes on after 4 GB; save it to a file and name that</source>
         <translation>%1 geht nach 4 GB noch weiter; speichern Sie es in eine Datei und nennen Sie diese</translation>
     </message>
+    <message>
+        <source>a line holds more than %1 bytes</source>
+        <translation>eine Zeile hat mehr als %1 Bytes</translation>
+    </message>
+    <message>
+        <source>it goes on after %1 bytes, which is the most that is read of what is no ordinary file</source>
+        <translation>nach %1 Bytes geht es weiter; mehr wird nicht gelesen, wo es keine gewöhnliche Datei ist</translation>
+    </message>
+    <message>
+        <source>pictures cannot be kept in %1: %2</source>
+        <translation>in %1 können keine Bilder abgelegt werden: %2</translation>
+    </message>
+    <message>
+        <source>the grid has %1 rows; the %2 pages that a document holds take %3 of them at most, so print fewer rows</source>
+        <translation>das Gitter hat %1 Zeilen; auf die %2 Seiten, die ein Dokument hat, passen höchstens %3, also weniger Zeilen drucken</translation>
+    </message>
+    <message>
+        <source>no object of the file has a name, so there is no column; %1</source>
+        <translation>kein Objekt der Datei hat einen Namen, also gibt es keine Spalte; %1</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

@@ -838,6 +838,26 @@
         <source>%1 goes on after 4 GB; save it to a file and name that</source>
         <translation>%1 goes on after 4 GB; save it to a file and name that</translation>
     </message>
+    <message>
+        <source>a line holds more than %1 bytes</source>
+        <translation>a line holds more than %1 bytes</translation>
+    </message>
+    <message>
+        <source>it goes on after %1 bytes, which is the most that is read of what is no ordinary file</source>
+        <translation>it goes on after %1 bytes, which is the most that is read of what is no ordinary file</translation>
+    </message>
+    <message>
+        <source>pictures cannot be kept in %1: %2</source>
+        <translation>pictures cannot be kept in %1: %2</translation>
+    </message>
+    <message>
+        <source>the grid has %1 rows; the %2 pages that a document holds take %3 of them at most, so print fewer rows</source>
+        <translation>the grid has %1 rows; the %2 pages that a document holds take %3 of them at most, so print fewer rows</translation>
+    </message>
+    <message>
+        <source>no object of the file has a name, so there is no column; %1</source>
+        <translation>no object of the file has a name, so there is no column; %1</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

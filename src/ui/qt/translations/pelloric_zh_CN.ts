@@ -838,6 +838,26 @@
         <source>%1 goes on after 4 GB; save it to a file and name that</source>
         <translation>%1 超过 4 GB 仍未结束；请保存为文件并指定该文件</translation>
     </message>
+    <message>
+        <source>a line holds more than %1 bytes</source>
+        <translation>有一行超过 %1 个字节</translation>
+    </message>
+    <message>
+        <source>it goes on after %1 bytes, which is the most that is read of what is no ordinary file</source>
+        <translation>%1 个字节之后还有内容；不是普通文件时最多只读取这么多</translation>
+    </message>
+    <message>
+        <source>pictures cannot be kept in %1: %2</source>
+        <translation>无法在 %1 中存放图片：%2</translation>
+    </message>
+    <message>
+        <source>the grid has %1 rows; the %2 pages that a document holds take %3 of them at most, so print fewer rows</source>
+        <translation>表格有 %1 行；一个文档的 %2 页最多容纳 %3 行，请少打印一些行</translation>
+    </message>
+    <message>
+        <source>no object of the file has a name, so there is no column; %1</source>
+        <translation>文件中没有任何带名称的对象，因此没有列；%1</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
