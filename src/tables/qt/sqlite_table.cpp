@@ -43,7 +43,10 @@ constexpr char Misuse[] = "21"; ///< the driver's own: more than one statement
 {
     if (error.nativeErrorCode() == QLatin1String(Misuse))
         refuse(phrase(u"give one statement only"));
-    refuse(toText(error.databaseText()));
+    // The database has nothing against open values; the driver has, without a number.
+    if (error.databaseText().isEmpty() && error.nativeErrorCode().isEmpty())
+        refuse(phrase(u"the statement leaves a value open (?, :name or $name); write the value"));
+    refuse(toText(error.databaseText().isEmpty() ? error.driverText() : error.databaseText()));
 }
 
 bool isReading(const QString& statement)

@@ -323,6 +323,10 @@ TEST_F(SqliteTable, RefusesEveryStatementThatIsNoQuery)
         "Invalid procedure call or argument: the statement is no query; give a SELECT");
     EXPECT_EQ(read({}, QStringLiteral("SELECT 1; SELECT 2")),
         "Invalid procedure call or argument: give one statement only");
+    for (const char* const open : { "SELECT $5", "SELECT ?", "SELECT:x FROM (VALUES (1))" })
+        EXPECT_EQ(read({}, QString::fromLatin1(open)),
+            "Invalid procedure call or argument: the statement leaves a value open (?, :name or "
+            "$name); write the value");
     EXPECT_EQ(read({}, QStringLiteral("-- one\n/* two */ values (1)")), "column1|/1|");
 }
 

@@ -858,6 +858,10 @@
         <source>no object of the file has a name, so there is no column; %1</source>
         <translation>kein Objekt der Datei hat einen Namen, also gibt es keine Spalte; %1</translation>
     </message>
+    <message>
+        <source>the statement leaves a value open (?, :name or $name); write the value</source>
+        <translation>die Anweisung lässt einen Wert offen (?, :name oder $name); den Wert selbst schreiben</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

@@ -858,6 +858,10 @@
         <source>no object of the file has a name, so there is no column; %1</source>
         <translation>no object of the file has a name, so there is no column; %1</translation>
     </message>
+    <message>
+        <source>the statement leaves a value open (?, :name or $name); write the value</source>
+        <translation>the statement leaves a value open (?, :name or $name); write the value</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

@@ -858,6 +858,10 @@
         <source>no object of the file has a name, so there is no column; %1</source>
         <translation>文件中没有任何带名称的对象，因此没有列；%1</translation>
     </message>
+    <message>
+        <source>the statement leaves a value open (?, :name or $name); write the value</source>
+        <translation>语句中有未给出的值（?、:name 或 $name）；请直接写出该值</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
