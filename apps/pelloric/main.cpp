@@ -18,6 +18,7 @@
 
 #ifdef Q_OS_UNIX
 #include <fcntl.h>
+#include <sys/resource.h>
 #include <unistd.h>
 #endif
 
@@ -134,6 +135,37 @@ void fillStandardStreams()
 #endif
 }
 
+#ifdef Q_OS_UNIX
+/// What the toolkit needs to start at all; with less it ends the program without a word.
+struct Need {
+    int (*ask)(rlimit& held);
+    rlim_t least; ///< units of the limit
+    rlim_t unit; ///< of the numbers that are told
+    TextView text;
+};
+
+constexpr auto Needs = std::to_array<Need>({
+    { [](rlimit& held) { return getrlimit(RLIMIT_STACK, &held); }, 256U << 10U, 1024,
+        phraseText(u"the stack may hold %1 KB only; allow %2 at least: ulimit -s 8192") },
+    { [](rlimit& held) { return getrlimit(RLIMIT_NOFILE, &held); }, 16, 1,
+        phraseText(u"only %1 files may be open; allow %2 at least: ulimit -n 1024") },
+});
+#endif
+
+/// @throws CommandError a limit that somebody has set is too low
+void requireResources()
+{
+#ifdef Q_OS_UNIX
+    for (const Need& need : Needs) {
+        rlimit held {};
+        if (need.ask(held) == 0 && held.rlim_cur < need.least)
+            throw CommandError(qt::phrased(need.text,
+                { QString::number(held.rlim_cur / need.unit),
+                    QString::number(need.least / need.unit) }));
+    }
+#endif
+}
+
 /// Runs the program; every error becomes one line and an exit status.
 int guardedRun(int argc, char** argv)
 {
@@ -146,6 +178,7 @@ int guardedRun(int argc, char** argv)
     int applicationArgc = std::min(argc, 1);
     speakAs(QLocale::system());
     try {
+        requireResources();
         return run({ applicationArgc, argv, argumentsOf(argc, argv) });
     } catch (const CommandError& error) {
         tell(QString::fromUtf8(error.what()));

@@ -821,6 +821,14 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
         <source>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</source>
         <translation>%1 ist weder eine SQLite-Datenbank noch eine Office-Datei und hat daher keine Tabelle &quot;%2&quot;</translation>
     </message>
+    <message>
+        <source>the stack may hold %1 KB only; allow %2 at least: ulimit -s 8192</source>
+        <translation>der Stapel darf nur %1 KB haben; mindestens %2 erlauben: ulimit -s 8192</translation>
+    </message>
+    <message>
+        <source>only %1 files may be open; allow %2 at least: ulimit -n 1024</source>
+        <translation>nur %1 Dateien dürfen offen sein; mindestens %2 erlauben: ulimit -n 1024</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

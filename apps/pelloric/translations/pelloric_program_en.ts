@@ -820,6 +820,14 @@ An exception that it does not catch ends the program with status 1.
         <source>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</source>
         <translation>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</translation>
     </message>
+    <message>
+        <source>the stack may hold %1 KB only; allow %2 at least: ulimit -s 8192</source>
+        <translation>the stack may hold %1 KB only; allow %2 at least: ulimit -s 8192</translation>
+    </message>
+    <message>
+        <source>only %1 files may be open; allow %2 at least: ulimit -n 1024</source>
+        <translation>only %1 files may be open; allow %2 at least: ulimit -n 1024</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

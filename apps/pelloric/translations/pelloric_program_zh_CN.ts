@@ -814,6 +814,14 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
         <source>%1 is no SQLite database and no office file, so it has no table &quot;%2&quot;</source>
         <translation>%1 既不是 SQLite 数据库也不是办公文件，因此没有表 &quot;%2&quot;</translation>
     </message>
+    <message>
+        <source>the stack may hold %1 KB only; allow %2 at least: ulimit -s 8192</source>
+        <translation>栈最多只能有 %1 KB；请至少允许 %2：ulimit -s 8192</translation>
+    </message>
+    <message>
+        <source>only %1 files may be open; allow %2 at least: ulimit -n 1024</source>
+        <translation>最多只能打开 %1 个文件；请至少允许 %2 个：ulimit -n 1024</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

@@ -498,6 +498,26 @@ TEST_F(ProgramFaults, TellThatThereIsNotEnoughMemory)
     EXPECT_EQ(folder_.read("t.pdf"), "old");
     EXPECT_THAT(sortedNames(), testing::ElementsAre("t.csv", "t.pdf"));
 }
+
+TEST_F(ProgramFaults, NameALimitThatLeavesTheToolkitNoRoom)
+{
+    folder_.write("t.csv", table(4));
+    const auto limited = [this](int resource, rlim_t most) {
+        surround = [resource, most](
+                       QProcess& process, QProcessEnvironment&) { limit(process, resource, most); };
+        return run(words("export t.csv -o t.pdf"));
+    };
+    const Ended stack = limited(RLIMIT_STACK, 64U << 10U);
+    EXPECT_EQ(stack.status, 1);
+    EXPECT_EQ(stack.errors,
+        "pelloric: the stack may hold 64 KB only; allow 256 at least: ulimit -s 8192\n");
+    const Ended files = limited(RLIMIT_NOFILE, 4);
+    EXPECT_EQ(files.status, 1);
+    EXPECT_EQ(
+        files.errors, "pelloric: only 4 files may be open; allow 16 at least: ulimit -n 1024\n");
+    EXPECT_EQ(limited(RLIMIT_STACK, 256U << 10U).status, 0);
+    EXPECT_EQ(limited(RLIMIT_NOFILE, 16).status, 0);
+}
 #endif
 
 } // namespace pelloric::qt
