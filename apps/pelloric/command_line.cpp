@@ -11,8 +11,10 @@
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
 #include <cmath>
 #include <cstdio>
+#include <cstring>
 
 namespace pelloric::app {
 
@@ -168,7 +170,8 @@ void print(const QString& text)
 {
     std::fputs(text.toUtf8().constData(), stdout);
     if (std::fflush(stdout) != 0)
-        throw CommandError(qt::phrased(u"standard output cannot be written"));
+        throw CommandError(qt::phrased(u"standard output cannot be written: %1",
+            { QString::fromLocal8Bit(std::strerror(errno)) }));
 }
 
 } // namespace pelloric::app

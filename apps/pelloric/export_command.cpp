@@ -336,6 +336,9 @@ void exportToOutput(Order order, const CommandLine& line, qt::QtPlatform& platfo
     ProgressLine& progress, const Outcome& outcome)
 {
     const QTemporaryDir folder;
+    if (!folder.isValid())
+        throw CommandError(
+            qt::phrased(u"%1; check the folder of temporary files").arg(folder.errorString()));
     order.out = folder.filePath(QStringLiteral("out.") + QLatin1String(order.format->extension));
     if (order.files.size() > 1)
         exportJoined(order, line, platform, progress, outcome);
@@ -351,7 +354,8 @@ void exportToOutput(Order order, const CommandLine& line, qt::QtPlatform& platfo
     const QByteArray bytes = file.readAll();
     if (!output.open(stdout, QIODevice::WriteOnly) || output.write(bytes) != bytes.size()
         || !output.flush())
-        throw CommandError(qt::phrased(u"standard output cannot be written"));
+        throw CommandError(
+            qt::phrased(u"standard output cannot be written: %1", { output.errorString() }));
 }
 
 } // namespace

@@ -16,15 +16,18 @@ import sys
 UNTESTABLE = {
     "a text of more than 4294967295 characters cannot be recorded":
         "cells hold 16,777,216 at most; it would take 8 GB",
-    "there is no memory for an image of ": "depends on the machine's memory",
+    "there is no memory for an image of %1 by %2 pixels; choose a lower resolution":
+        "depends on the machine's memory",
     "is a variable or coloured font": "no such font is among the packages of the tests",
     "has no outlines of a kind that can be embedded": "likewise",
     " takes no jobs": "of a printer that vanishes between two questions, see `choosePrinter`",
     "Item needs an index": "the library itself always gives one",
-    "the file cannot be copied to convert it": "takes a full disk of temporary files",
+    "the file cannot be copied into %1 to be converted: %2": "takes a full disk of temporary files",
     "the database cannot be copied to read its log: ": "likewise",
     "this Qt has no converter for GB18030": "the packages' Qt has one",
-    " goes on after 4 GB; save it to a file and name that": "takes 4 GB to come to",
+    "%1 goes on after 4 GB; save it to a file and name that": "takes 4 GB to come to",
+    "the sample tables are not found; name their folder with --samples":
+        "those of the sources are always found",
     "an object of the library cannot be handed to a script's grid":
         "no member of a grid takes one",
     "the preview window did not close": "of a walk through the program's own windows",
@@ -38,7 +41,8 @@ UNTESTABLE = {
 
 LEAST = 80  # errors; fewer, and the sources were not understood
 MADE = re.compile(
-    r"(?:RunTimeError\(\s*ErrorNumber::\w+,|\brefuse\w*\(|(?:Command|Usage)Error\()([^;]*);",
+    r"(?:RunTimeError\(\s*ErrorNumber::\w+,|\brefuse\w*\(|(?:Command|Usage)Error\()"
+    r"((?:'.'|\"(?:[^\"\\]|\\.)*\"|[^;\"])*);",
     re.DOTALL)
 LITERAL = re.compile(r'"((?:[^"\\]|\\.)*)"')
 

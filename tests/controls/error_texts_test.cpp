@@ -286,6 +286,16 @@ TEST(ErrorTexts, OfGridsNameWhatIsWrongWithThem)
             ErrorNumber::InvalidCall, { "this grid does not tell which of its rows are marked" } },
         { "columns without end", [&] { world.canvas.doPreview(wide); }, ErrorNumber::Overflow,
             { "the grid has 1000000000 columns, at most 1000000 can be read" } },
+        { "more columns than a page document has",
+            [&] {
+                FakeObject broad;
+                broad.number(u"Cols", 40000);
+                broad.number(u"Rows", 1);
+                broad.number(u"ColWidth", 1000);
+                broad.text(u"TextMatrix", u"x");
+                world.canvas.doPreview(broad);
+            },
+            ErrorNumber::Overflow, { "more than 32767 columns are printed; leave some out" } },
         { "other columns than were built",
             [&] {
                 TableGrid three { { { u"a", 1000 }, { u"b", 1000 }, { u"c", 1000 } } };

@@ -323,7 +323,13 @@ TEST_F(ShapedReportTest, PrintsARangeOfRowsThoseThatAFilterTakesAndThoseThatAreM
     EXPECT_EQ(page(1), "C1|r3c1");
     canvas.options = {};
     canvas.options.rows = RowChoice::Marked;
-    EXPECT_EQ(errorOf([&] { canvas.doPreview(grid); }), ErrorNumber::InvalidCall);
+    try {
+        canvas.doPreview(grid);
+        FAIL() << "nothing is marked";
+    } catch (const RunTimeError& error) {
+        EXPECT_EQ(error.number(), ErrorNumber::InvalidCall);
+        EXPECT_EQ(toUtf8(error.detail()), "no row of the grid is marked; mark rows, or print all");
+    }
     grid.marked = { 2, 7 };
     canvas.doPreview(grid);
     EXPECT_EQ(page(1), "C1|r2c1|r7c1");

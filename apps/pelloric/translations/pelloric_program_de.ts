@@ -83,10 +83,6 @@
         <translation>%1 verlangt eine Zahl von %2 bis %3, nicht „%4“</translation>
     </message>
     <message>
-        <source>standard output cannot be written</source>
-        <translation>auf die Standardausgabe kann nicht geschrieben werden</translation>
-    </message>
-    <message>
         <source>where the sample tables are</source>
         <translation>wo die Beispieltabellen liegen</translation>
     </message>
@@ -828,6 +824,10 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
     <message>
         <source>only %1 files may be open; allow %2 at least: ulimit -n 1024</source>
         <translation>nur %1 Dateien dürfen offen sein; mindestens %2 erlauben: ulimit -n 1024</translation>
+    </message>
+    <message>
+        <source>standard output cannot be written: %1</source>
+        <translation>die Standardausgabe kann nicht geschrieben werden: %1</translation>
     </message>
 </context>
 <context>

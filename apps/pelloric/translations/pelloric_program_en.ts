@@ -83,10 +83,6 @@
         <translation>%1 takes a number from %2 to %3, not &quot;%4&quot;</translation>
     </message>
     <message>
-        <source>standard output cannot be written</source>
-        <translation>standard output cannot be written</translation>
-    </message>
-    <message>
         <source>where the sample tables are</source>
         <translation>where the sample tables are</translation>
     </message>
@@ -827,6 +823,10 @@ An exception that it does not catch ends the program with status 1.
     <message>
         <source>only %1 files may be open; allow %2 at least: ulimit -n 1024</source>
         <translation>only %1 files may be open; allow %2 at least: ulimit -n 1024</translation>
+    </message>
+    <message>
+        <source>standard output cannot be written: %1</source>
+        <translation>standard output cannot be written: %1</translation>
     </message>
 </context>
 <context>

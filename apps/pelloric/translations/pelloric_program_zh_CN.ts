@@ -83,10 +83,6 @@
         <translation>%1 需要 %2 到 %3 之间的数，而不是“%4”</translation>
     </message>
     <message>
-        <source>standard output cannot be written</source>
-        <translation>无法写入标准输出</translation>
-    </message>
-    <message>
         <source>where the sample tables are</source>
         <translation>示例表格所在的文件夹</translation>
     </message>
@@ -821,6 +817,10 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
     <message>
         <source>only %1 files may be open; allow %2 at least: ulimit -n 1024</source>
         <translation>最多只能打开 %1 个文件；请至少允许 %2 个：ulimit -n 1024</translation>
+    </message>
+    <message>
+        <source>standard output cannot be written: %1</source>
+        <translation>无法写入标准输出：%1</translation>
     </message>
 </context>
 <context>

@@ -52,7 +52,8 @@ std::filesystem::path converted(const std::filesystem::path& path, const QTempor
     const QString name = folder.filePath(QStringLiteral("table")) + extensionOf(path);
     std::error_code error;
     if (!std::filesystem::copy_file(path, pathOf(name), error))
-        refuse(phrase(u"the file cannot be copied to convert it"));
+        refuse(phrase(u"the file cannot be copied into %1 to be converted: %2",
+            { toText(folder.path()), fromUtf8(error.message()) }));
     QProcess process;
     process.start(program,
         { QStringLiteral("--headless"), QStringLiteral("--convert-to"), QStringLiteral("xlsx"),

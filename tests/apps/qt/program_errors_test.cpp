@@ -45,6 +45,22 @@ TEST_F(ProgramErrors, NameTheOptionAndWhatItTakes)
 {
     folder_.write("t.csv", "a\n1\n");
     expectRefusals({
+        { {}, 2,
+            "say what to do, for example \"pelloric export table.csv -o table.pdf\"; see "
+            "\"pelloric help\"" },
+        { words("completion tcsh"), 2, "no completion for the shell tcsh; take bash, zsh or fish" },
+        { words("export t.csv t.csv -o u.pdf"), 2,
+            "t.csv is one input more; several go into a folder, or with --join into one file, and "
+            "u.pdf is no folder; quote names with blanks" },
+        { words("export t.csv -o t.ostl --pages 1"), 2,
+            "--pages is for .pdf, .png and .svg; a document file holds all" },
+        { exported("--widths 1,2"), 2, "--widths names 2 columns; the table has 1" },
+        { exported("--widths 0"), 1,
+            "no column is wide enough to be printed; give other --widths" },
+        { exported("--paper Q7"), 2,
+            "unknown paper \"Q7\"; take one of Letter, Tabloid, Legal, A3, A4, A5, B5, A2, A6, 8k, "
+            "16k, "
+            "or a size such as 100x150mm or 4x6in" },
         { words("export t.csv"), 2, "say where to export to: -o OUT.pdf, .png, .svg or .ostl" },
         { words("export t.csv -o out/ --format doc"), 2,
             "--format takes pdf, png, svg or ostl, not \"doc\"" },
@@ -121,9 +137,16 @@ TEST_F(ProgramErrors, NameTheFileAndWhatItIsNot)
     folder_.write("t.csv", "a\n1\n");
     folder_.write("plain", "");
     folder_.write("t.sqlite", "SQLite format 3");
+    std::string rows = "a\n";
+    for (int row = 0; row < 200; ++row)
+        rows += "1\n";
+    folder_.write("two-pages.csv", rows);
+    folder_.write("no.ini", "a=1\n");
+    std::filesystem::create_directory(folder_.file("folder"));
     folder_.write("wide.ini", "\"\r\nTop= 4000\r\n\"\r\n");
-    const Ended made = run(words("export t.csv -o t.ostl"));
-    ASSERT_EQ(made.status, 0) << made.errors;
+    for (const char* const call :
+        { "export t.csv -o t.ostl", "export t.csv -o a5.ostl --paper A5" })
+        ASSERT_EQ(run(words(call)).status, 0) << call;
     expectRefusals({
         { words("export t.ostl -o u.pdf --merge"), 2,
             "--merge does not apply to a saved document, whose pages are laid out" },
@@ -134,6 +157,25 @@ TEST_F(ProgramErrors, NameTheFileAndWhatItIsNot)
         { words("export t.csv -o u.pdf --settings wide.ini"), 1,
             "Top= 4000 in wide.ini: this margin is at most 361 mm. Correct it in the file, or do "
             "without: --defaults" },
+        { words("export t.csv -o u.pdf --settings no.ini"), 1,
+            "no.ini holds no setting; \"pelloric settings --path\" names yours" },
+        { words("export folder -o u.pdf"), 1, "folder is a folder; name a file in it" },
+        { words("export /dev/null -o u.pdf"), 1, "/dev/null is a device; name a file" },
+        { words("export t.ostl t.csv --join -o u.pdf --paper A5"), 2,
+            "--paper does not apply to a saved document, whose pages are laid out" },
+        { words("export t.ostl a5.ostl --join -o u.pdf"), 1,
+            "a5.ostl has pages of another size; --join wants one size" },
+        { words("preview t.ostl"), 2,
+            "t.ostl is a saved document; show it with \"pelloric open\"" },
+        { words("preview t.csv"), 1,
+            "there is no display to show windows on; \"pelloric export\" and \"pelloric demo "
+            "--walk OUT\" need none" },
+        { words("export two-pages.csv -o - --format svg"), 2,
+            "several pages as .svg do not go into one output; name a file, or a page with "
+            "--pages" },
+        { words("demo --walk out --samples folder"), 1,
+            "folder/wine.csv cannot be read; name the folder of the samples with "
+            "--samples" },
         { words("export t.csv:a -o u.pdf"), 1,
             "t.csv is no SQLite database and no office file, so it has no table \"a\"" },
         { words("export t.csv t.csv -o plain/out/"), 1,
@@ -141,7 +183,20 @@ TEST_F(ProgramErrors, NameTheFileAndWhatItIsNot)
         { words("demo --walk plain/out"), 1,
             "plain/out: the folder cannot be made: Not a directory" },
     });
-    EXPECT_EQ(folder_.names().size(), 5U);
+    EXPECT_EQ(folder_.names().size(), 9U);
+}
+
+TEST_F(ProgramErrors, NameTheFolderOfTemporaryFiles)
+{
+    folder_.write("t.csv", "a\n1\n");
+    surround = [](QProcess&, QProcessEnvironment& environment) {
+        environment.insert(QStringLiteral("TMPDIR"), QStringLiteral("/proc"));
+    };
+    for (const char* const call : { "export t.csv -o -", "demo --walk out" }) {
+        const Ended ended = run(words(call));
+        EXPECT_EQ(ended.status, 1) << call;
+        EXPECT_TRUE(has(ended.errors, "; check the folder of temporary files\n")) << ended.errors;
+    }
 }
 
 } // namespace pelloric::qt

@@ -321,6 +321,8 @@ TEST_F(SqliteTable, RefusesEveryStatementThatIsNoQuery)
     EXPECT_FALSE(std::filesystem::exists(copy));
     EXPECT_EQ(read({}, QStringLiteral("BEGIN")),
         "Invalid procedure call or argument: the statement is no query; give a SELECT");
+    EXPECT_EQ(read({}, QStringLiteral("PRAGMA foreign_keys = 1")),
+        "Invalid procedure call or argument: the statement answers no rows; give a SELECT");
     EXPECT_EQ(read({}, QStringLiteral("SELECT 1; SELECT 2")),
         "Invalid procedure call or argument: give one statement only");
     for (const char* const open : { "SELECT $5", "SELECT ?", "SELECT:x FROM (VALUES (1))" })

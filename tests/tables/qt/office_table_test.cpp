@@ -305,8 +305,12 @@ TEST(OfficeTable, LetsLibreOfficeConvertOlderFiles)
     const QByteArray path = qgetenv("PATH");
     qputenv("PATH", QByteArray::fromStdString(folder.path().string()) + ':' + path);
     const std::string converted = read(old, QStringLiteral("城市"));
+    folder.write("soffice", "#!/bin/sh\nexit 1\n");
+    const std::string refused = read(old);
     qputenv("PATH", path);
     EXPECT_EQ(converted, "7|");
+    EXPECT_EQ(refused,
+        "Type mismatch: LibreOffice could not convert this file; save it as .xlsx, .ods or CSV");
 }
 
 } // namespace pelloric::qt

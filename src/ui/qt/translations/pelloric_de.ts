@@ -611,10 +611,6 @@
         <translation>diese Office-Datei muss von LibreOffice umgewandelt werden, das nicht installiert ist; installieren Sie libreoffice-calc, oder speichern Sie die Datei als .xlsx, .ods oder CSV</translation>
     </message>
     <message>
-        <source>the file cannot be copied to convert it</source>
-        <translation>die Datei kann nicht zum Umwandeln kopiert werden</translation>
-    </message>
-    <message>
         <source>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</source>
         <translation>LibreOffice konnte diese Datei nicht umwandeln; speichern Sie sie als .xlsx, .ods oder CSV</translation>
     </message>
@@ -861,6 +857,10 @@
     <message>
         <source>the statement leaves a value open (?, :name or $name); write the value</source>
         <translation>die Anweisung lässt einen Wert offen (?, :name oder $name); den Wert selbst schreiben</translation>
+    </message>
+    <message>
+        <source>the file cannot be copied into %1 to be converted: %2</source>
+        <translation>die Datei kann zum Umwandeln nicht nach %1 kopiert werden: %2</translation>
     </message>
 </context>
 <context>

@@ -611,10 +611,6 @@
         <translation>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</translation>
     </message>
     <message>
-        <source>the file cannot be copied to convert it</source>
-        <translation>the file cannot be copied to convert it</translation>
-    </message>
-    <message>
         <source>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</source>
         <translation>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</translation>
     </message>
@@ -861,6 +857,10 @@
     <message>
         <source>the statement leaves a value open (?, :name or $name); write the value</source>
         <translation>the statement leaves a value open (?, :name or $name); write the value</translation>
+    </message>
+    <message>
+        <source>the file cannot be copied into %1 to be converted: %2</source>
+        <translation>the file cannot be copied into %1 to be converted: %2</translation>
     </message>
 </context>
 <context>

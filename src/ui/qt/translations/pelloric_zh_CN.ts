@@ -611,10 +611,6 @@
         <translation>此办公文件需要由 LibreOffice 转换，但未安装 LibreOffice；请安装 libreoffice-calc，或把文件另存为 .xlsx、.ods 或 CSV</translation>
     </message>
     <message>
-        <source>the file cannot be copied to convert it</source>
-        <translation>无法复制文件以进行转换</translation>
-    </message>
-    <message>
         <source>LibreOffice could not convert this file; save it as .xlsx, .ods or CSV</source>
         <translation>LibreOffice 无法转换此文件；请把它另存为 .xlsx、.ods 或 CSV</translation>
     </message>
@@ -861,6 +857,10 @@
     <message>
         <source>the statement leaves a value open (?, :name or $name); write the value</source>
         <translation>语句中有未给出的值（?、:name 或 $name）；请直接写出该值</translation>
+    </message>
+    <message>
+        <source>the file cannot be copied into %1 to be converted: %2</source>
+        <translation>无法将文件复制到 %1 以便转换：%2</translation>
     </message>
 </context>
 <context>
