@@ -30,6 +30,9 @@ constexpr double WholePixel = 1e-4;
 /// Past this an em tells nothing on any paper; the toolkit's numbers would overflow.
 constexpr double LargestEm = 1e6;
 
+/// Of larger fonts the toolkit makes hollow boxes; texts are drawn in one of this size, enlarged.
+constexpr int MostPixels = 16384;
+
 /// By draw style.
 constexpr auto PenStyles = std::to_array({ Qt::SolidLine, Qt::DashLine, Qt::DotLine,
     Qt::DashDotLine, Qt::DashDotDotLine, Qt::NoPen, Qt::SolidLine });
@@ -250,7 +253,7 @@ void QtDrawingSurface::takeFont()
     isFontStale_ = false;
     face_ = &fonts_.face(fontName_, bold_, italic_);
     em_ = emOfSize();
-    const int pixels = std::max(1, static_cast<int>(std::nearbyint(em_)));
+    const int pixels = std::clamp(static_cast<int>(std::nearbyint(em_)), 1, MostPixels);
     fontScale_ = std::abs(em_ - pixels) < WholePixel ? 1 : em_ / pixels;
     font_ = isPaper_ ? face_->font(pixels) : face_->installedFont(pixels);
 }

@@ -431,4 +431,56 @@ TEST_F(QtDrawingSurfaceTest, PaperTakesABoldTextOnce)
     EXPECT_LT(static_cast<double>(bytesOf(true)), 1.5 * static_cast<double>(bytesOf(false)));
 }
 
+/// The toolkit draws boxes for fonts of more than some ten thousand pixels.
+TEST_F(QtDrawingSurfaceTest, PrintsTheLargestTextsAsItPrintsSmallOnes)
+{
+    constexpr int Side = 300; // pixels
+    const auto inkAt = [&](float size, bool bold) {
+        QImage image(Side, Side, QImage::Format_RGB32);
+        image.fill(Qt::white);
+        QPainter painter(&image);
+        const double scale = Side / (static_cast<double>(size) * 20 * 1.3);
+        painter.scale(scale, scale);
+        QtDrawingSurface surface(painter, fonts_, {});
+        setFont(surface, size, bold);
+        surface.print(u"东");
+        return image;
+    };
+    for (const bool bold : { false, true }) {
+        const QImage small = inkAt(100, bold);
+        const QRect ink = inkOf(small);
+        EXPECT_GT(ink.width(), Side / 2);
+        for (const float size : { 1000.0F, 4000.0F, 16000.0F, 50000.0F }) {
+            const QImage large = inkAt(size, bold);
+            int other = 0;
+            for (int at = 0; at < Side * Side; ++at) {
+                const auto grey = [at](const QImage& image) {
+                    return qGray(image.pixel(at % Side, at / Side));
+                };
+                other += std::abs(grey(small) - grey(large)) > 128 ? 1 : 0;
+            }
+            EXPECT_LT(other, Side) << size << (bold ? " bold" : "");
+        }
+    }
+}
+
+TEST_F(QtDrawingSurfaceTest, PrintsAnyCharacterInBoldAtAnySize)
+{
+    Text units;
+    for (char16_t unit = 0; unit < 0x180; ++unit)
+        units.push_back(unit);
+    units += u"\u0301\u200D\u202E\u2028\uFEFF\uFFFD\uFFFF宋★";
+    units += { 0xD83D, 0xDE00 };
+    for (const float size : { 0.01F, 1.0F, 9.0F, 72.0F, 1000.0F, 1e6F }) {
+        for (const char16_t unit : units) {
+            for (const Text& text : { Text(1, unit), Text { u'宋', unit } }) {
+                drawn([&](DrawingSurface& surface) {
+                    setFont(surface, size, true);
+                    surface.print(text);
+                });
+            }
+        }
+    }
+}
+
 } // namespace pelloric::qt
