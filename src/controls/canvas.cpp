@@ -258,7 +258,6 @@ void Canvas::layOut(GridTable& table)
     recorder_.moveTo({});
     recorder_.documentReplaced();
     const auto step = [this](std::int64_t done, std::int64_t total) {
-        buildProgress_ = { true, total, done };
         showProgress(done, total);
         return true;
     };

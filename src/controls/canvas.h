@@ -208,8 +208,6 @@ public:
     const ReportStyle& style() const { return style_; }
     const ViewState& view() const { return view_; }
     const ProgressBar& progress() const { return progress_; }
-    /// The progress bar as the last build left it, for hosts that judge how a build ended.
-    const ProgressBar& buildProgress() const { return buildProgress_; }
     /// Another number tells that the pages are others: built, opened, cleared or more of them.
     std::uint32_t documentNumber() const { return documentNumber_; }
     /// What the last build read of its grid, or null.
@@ -254,7 +252,6 @@ private:
     ViewState view_;
     std::optional<GridTable> table_;
     ProgressBar progress_;
-    ProgressBar buildProgress_;
     std::vector<CanvasObserver*> observers_;
     Text openedName_; ///< of the file that the document was opened from
     double titleTop_ = 0;

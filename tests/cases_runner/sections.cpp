@@ -74,7 +74,7 @@ Json tableSection(World& world)
 
 Json progressSection(World& world)
 {
-    const ProgressBar& progress = world.canvas.buildProgress();
+    const ProgressBar& progress = world.buildBar.bar();
     return { { "maximum", progress.maximum }, { "value", progress.value } };
 }
 

@@ -13,6 +13,7 @@
 #include "platform/services.h"
 #include "platform/std_files.h"
 #include "platform/text_codec.h"
+#include "support/build_bar.h"
 
 #include <filesystem>
 #include <memory>
@@ -181,6 +182,7 @@ public:
     NoWindow window;
     Facade facade;
     Canvas canvas;
+    BuildBar buildBar { canvas };
     std::unique_ptr<CaseGrid> grid;
 
 private:

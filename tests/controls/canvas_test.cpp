@@ -210,9 +210,9 @@ TEST_F(CanvasTest, BuildsWithTheSettingsOfTheMomentAndShowsPageOne)
     EXPECT_EQ(canvas.WindowOrderStyle(), OrderStyle::One);
     EXPECT_TRUE(canvas.view().baseVisible);
     EXPECT_FALSE(canvas.progress().visible);
-    EXPECT_EQ(canvas.buildProgress(), (ProgressBar { true, 200, 200 }));
-    EXPECT_EQ(observer.bars.size(), 202U);
+    ASSERT_EQ(observer.bars.size(), 202U);
     EXPECT_EQ(observer.bars.front(), (ProgressBar { true, 200, 0 }));
+    EXPECT_EQ(observer.bars[200], (ProgressBar { true, 200, 200 }));
     EXPECT_FALSE(observer.bars.back().visible);
     EXPECT_FALSE(observer.paper.front());
     EXPECT_TRUE(observer.paper.back());

@@ -24,7 +24,7 @@ TEST(EarlyEnd, AHeaderThatCannotBeDrawnLeavesTheProgressBarAlone)
     ReportWorld world(ReportWorld::Settings { { u"HeaderFontColor", u"1e10" } });
     TableGrid grid = gridOf({ { u"A", 1000 } }, numberedRows(3, 1));
     EXPECT_EQ(errorOf([&] { world.canvas.doPreview(grid); }), ErrorNumber::Overflow);
-    EXPECT_EQ(world.canvas.buildProgress(), ProgressBar {});
+    EXPECT_EQ(world.buildBar.bar(), ProgressBar {});
     EXPECT_EQ(world.canvas.document().pageCount(), 1);
 }
 

@@ -121,7 +121,7 @@ TEST(LayoutEngine, PrintsEveryPageOfRowsOncePerBand)
     for (int page = 0; page < document.pageCount(); ++page)
         shown += textsOf(document, page) + "\n";
     EXPECT_EQ(shown, golden("report/three_bands_of_25_rows.txt", shown));
-    EXPECT_EQ(world.canvas.buildProgress(), (ProgressBar { true, 75, 75 }));
+    EXPECT_EQ(world.buildBar.bar(), (ProgressBar { true, 75, 75 }));
 }
 
 TEST(LayoutEngine, PutsTheFooterUnderTheTableOfAFullPageAndElseAtTheBottomMargin)
@@ -164,7 +164,7 @@ TEST(LayoutEngine, MakesOnePageOfTitlesWhenThereAreNoRows)
     const PageDocument& document = world.build(columnsOf({ 9000, 9000 }), {});
     ASSERT_EQ(document.pageCount(), 1);
     EXPECT_EQ(textsOf(document, 0), "h|T1|f");
-    EXPECT_EQ(world.canvas.buildProgress(), (ProgressBar { true, 1, 0 }));
+    EXPECT_EQ(world.buildBar.bar(), (ProgressBar { true, 1, 0 }));
 }
 
 TEST(LayoutEngine, GoesOnWithAnEmptyPageWhenTheLastRowFillsTheLastBand)

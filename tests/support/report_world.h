@@ -7,6 +7,7 @@
 #include "fakes/fake_platform.h"
 #include "grids/table_grid.h"
 #include "settings/settings_table.h"
+#include "support/build_bar.h"
 
 #include <initializer_list>
 #include <span>
@@ -68,6 +69,7 @@ public:
     }
 
     Canvas canvas;
+    BuildBar buildBar { canvas };
 };
 
 } // namespace pelloric
