@@ -13,17 +13,8 @@ namespace pelloric {
 
 namespace {
 
-constexpr Twips ScrollStep = 100; ///< of a bar: page twips
-
 /// How much of the viewport stays free around a part that was scrolled to: a fifth.
 constexpr double SightEdge = 0.2;
-
-/// A large step, but never more than is seen at once; the bar's own is rounded.
-int stepOf(const ScrollBar& bar, double inner)
-{
-    const int seen = static_cast<int>(std::clamp(inner / ScrollStep, 1.0, 32767.0));
-    return std::min<int>(bar.largeChange, seen);
-}
 
 bool isAtEnd(const ScrollBar& bar, ReadingWay way)
 {
@@ -32,7 +23,7 @@ bool isAtEnd(const ScrollBar& bar, ReadingWay way)
 
 int nextValue(const ScrollBar& bar, double inner, ReadingWay way)
 {
-    const int step = stepOf(bar, inner);
+    const int step = seenStep(bar, inner);
     return std::clamp<int>(bar.value + (way == ReadingWay::On ? step : -step), 0, bar.maximum);
 }
 

@@ -19,9 +19,6 @@ namespace {
 constexpr Twips GapPerRow = 400;
 constexpr Twips GapPerColumn = 200;
 
-/// What one step of a scroll bar moves: page twips.
-constexpr Twips ScrollStep = 100;
-
 /// The pages along one direction.
 struct Extent {
     double inner = 0; ///< of the viewport: page twips
@@ -158,6 +155,18 @@ OrderStyle styleOf(std::int16_t pages, OrderStyle present)
 } // namespace
 
 bool showsPageWindow(const ViewState& view) { return view.multiPage && view.window.nPages != 0; }
+
+bool hasScale(const ViewState& view)
+{
+    const double divisor = view.divisor;
+    return divisor > 0 && std::isfinite(1 / divisor);
+}
+
+std::int16_t seenStep(const ScrollBar& bar, double inner)
+{
+    const double seen = std::max(1.0, inner / ScrollStep);
+    return seen < bar.largeChange ? static_cast<std::int16_t>(seen) : bar.largeChange;
+}
 
 std::optional<int> pageOnSurface(const ViewState& view, const PageFacts& facts, int surface)
 {

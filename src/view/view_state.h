@@ -13,7 +13,10 @@ namespace pelloric {
 
 struct ReportStyle;
 
-/// A scroll bar; its minimum is always 0 and one step is 100 page twips.
+/// What one step of a scroll bar moves: page twips.
+inline constexpr Twips ScrollStep = 100;
+
+/// A scroll bar; its minimum is always 0 and one step is a `ScrollStep`.
 struct ScrollBar {
     bool enabled = false;
     std::int16_t maximum = 0;
@@ -54,6 +57,14 @@ struct ViewState {
     bool portrait = true; ///< orientation flag
     int shownPage = 0; ///< zero-based; the page that was shown alone last
 };
+
+/// Whether pages have a size at all: a host may set a divisor without a meaning.
+bool hasScale(const ViewState& view);
+
+/// A large step of a bar, but never more than is seen at once; the bar's own is rounded.
+/// @param inner  of the viewport along the bar: page twips
+/// @return       steps, at least 1
+std::int16_t seenStep(const ScrollBar& bar, double inner);
 
 /// The page that a paint of a surface shows.
 ///
@@ -138,12 +149,12 @@ void zoomOut(ViewState& view, const PageFacts& facts);
 ///                      nothing has changed. Or as `layOutAgain`
 void setDispScale(ViewState& view, const PageFacts& facts, float scale);
 
-/// The horizontal bar was moved: the pages follow by 100 twips a step.
+/// The horizontal bar was moved: the pages follow by a `ScrollStep` for each step.
 /// @param value  not clamped to the bar's range
 /// @throws RunTimeError Overflow: value past 16 bits or position past 32; nothing has changed
 void setHbar(ViewState& view, const PageFacts& facts, std::int32_t value);
 
-/// The vertical bar was moved: the pages follow by 100 twips a step.
+/// The vertical bar was moved: the pages follow by a `ScrollStep` for each step.
 /// @param value  not clamped to the bar's range
 /// @throws RunTimeError Overflow: value past 16 bits or position past 32; nothing has changed
 void setVbar(ViewState& view, const PageFacts& facts, std::int32_t value);

@@ -21,13 +21,8 @@
 #include <QCursor>
 #include <QLabel>
 #include <QPainter>
-#include <QScrollBar>
-#include <QSignalBlocker>
-#include <QStyle>
-#include <QWheelEvent>
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <limits>
 
@@ -35,15 +30,8 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr double ScrollStep = 100; ///< what one step of a bar moves: page twips
-
 /// So many page surfaces are widgets; the toolkit takes long to move thousands of them.
 constexpr std::size_t MostSurfaces = 64;
-
-constexpr double ZoomStep = 1.25; ///< of a wheel click
-
-constexpr double SmallestScale = 0.01; ///< wheel and pinch zoom no further out
-constexpr double LargestScale = 64; ///< wheel and pinch zoom no further in
 
 /// Reaches the pages of no document: a coordinate beyond all 32-bit twips has no meaning.
 Twips wholeTwips(double twips)
@@ -59,24 +47,6 @@ int wholePixel(double position)
     return static_cast<int>(std::nearbyint(std::clamp(position, -Reach, Reach)));
 }
 
-/// What a key does to a scroll bar.
-struct KeyRow {
-    int key;
-    Qt::Orientation bar;
-    QAbstractSlider::SliderAction action;
-};
-
-constexpr auto Keys = std::to_array<KeyRow>({
-    { Qt::Key_Left, Qt::Horizontal, QAbstractSlider::SliderSingleStepSub },
-    { Qt::Key_Right, Qt::Horizontal, QAbstractSlider::SliderSingleStepAdd },
-    { Qt::Key_Up, Qt::Vertical, QAbstractSlider::SliderSingleStepSub },
-    { Qt::Key_Down, Qt::Vertical, QAbstractSlider::SliderSingleStepAdd },
-    { Qt::Key_PageUp, Qt::Vertical, QAbstractSlider::SliderPageStepSub },
-    { Qt::Key_PageDown, Qt::Vertical, QAbstractSlider::SliderPageStepAdd },
-    { Qt::Key_Home, Qt::Vertical, QAbstractSlider::SliderToMinimum },
-    { Qt::Key_End, Qt::Vertical, QAbstractSlider::SliderToMaximum },
-});
-
 QLabel* makeHolder(QWidget& control, const char* name, const QString& accessibleName)
 {
     auto* const holder = new QLabel(&control);
@@ -84,17 +54,6 @@ QLabel* makeHolder(QWidget& control, const char* name, const QString& accessible
     holder->setAccessibleName(accessibleName);
     holder->hide();
     return holder;
-}
-
-/// Shows a bar of the canvas without running its change handler.
-void showBar(QScrollBar& bar, const ScrollBar& state)
-{
-    const QSignalBlocker blocker(bar);
-    bar.setEnabled(state.enabled);
-    bar.setRange(0, state.enabled ? state.maximum : 0);
-    bar.setPageStep(state.largeChange);
-    bar.setSingleStep(state.smallChange);
-    bar.setValue(state.value);
 }
 
 } // namespace
@@ -109,50 +68,30 @@ CanvasAreas::CanvasAreas(QWidget& control, Canvas& canvas, QtFonts& fonts, Right
     , progress_(new ProgressArea(&control))
     , hand_(makeHolder(control, "imgPan",
           QCoreApplication::translate("pelloric::qt::CanvasAreas", "Hand cursor")))
-    , Hbar_(makeBar(Qt::Horizontal, "Hbar"))
-    , Vbar_(makeBar(Qt::Vertical, "Vbar"))
+    , scrolling_(control, *backScreen_, canvas)
 {
     makeHolder(
         control, "PicHouse", QCoreApplication::translate("pelloric::qt::CanvasAreas", "Picture"));
     makeHolder(
         control, "PicIcon", QCoreApplication::translate("pelloric::qt::CanvasAreas", "Picture"));
     hand_->setPixmap(handPicture(control.devicePixelRatioF()));
-    Hbar_->setAccessibleName(
-        QCoreApplication::translate("pelloric::qt::CanvasAreas", "Horizontal scroll bar"));
-    Vbar_->setAccessibleName(
-        QCoreApplication::translate("pelloric::qt::CanvasAreas", "Vertical scroll bar"));
     auto* const base = new PageSurface(*this, backScreen_);
     base->hide();
     surfaces_[0] = base;
-    QObject::connect(Hbar_, &QScrollBar::valueChanged, &control_,
-        [this](int value) { MemberCalls::endQuietly([&] { canvas_.setHbar(value); }); });
-    QObject::connect(Vbar_, &QScrollBar::valueChanged, &control_,
-        [this](int value) { MemberCalls::endQuietly([&] { canvas_.setVbar(value); }); });
     canvas_.observe(*this);
 }
 
 CanvasAreas::~CanvasAreas() { canvas_.forget(*this); }
 
-QScrollBar* CanvasAreas::makeBar(Qt::Orientation orientation, const char* name)
-{
-    auto* const bar = new QScrollBar(orientation, &control_);
-    bar->setObjectName(QString::fromLatin1(name));
-    bar->setLayoutDirection(Qt::LeftToRight);
-    bar->setRange(0, 0);
-    bar->setEnabled(false);
-    return bar;
-}
-
 void CanvasAreas::fill(int edge)
 {
-    const int bar = control_.style()->pixelMetric(QStyle::PM_ScrollBarExtent, nullptr, Hbar_);
+    const int bar = scrolling_.extent();
     const QRect all = control_.rect().adjusted(edge, edge, -edge, -edge);
     const QSize view(std::max(0, all.width() - bar), std::max(0, all.height() - bar));
     const QRect viewport(all.topLeft(), view);
     backScreen_->setGeometry(viewport);
     startIcon_->setGeometry(viewport);
-    Hbar_->setGeometry(all.left(), all.top() + view.height(), view.width(), bar);
-    Vbar_->setGeometry(all.left() + view.width(), all.top(), bar, view.height());
+    scrolling_.placeAround(viewport);
     const int progressHeight = std::max(bar, progress_->sizeHint().height());
     progress_->setGeometry(
         all.left(), all.bottom() + 1 - progressHeight, all.width(), progressHeight);
@@ -203,8 +142,10 @@ bool CanvasAreas::isAtStart() const { return !canvas_.view().baseVisible && !can
 /// There is nothing to scroll at the start.
 void CanvasAreas::showBars()
 {
-    showBar(*Hbar_, isAtStart() ? ScrollBar() : canvas_.view().Hbar);
-    showBar(*Vbar_, isAtStart() ? ScrollBar() : canvas_.view().Vbar);
+    if (isAtStart())
+        scrolling_.showNothing();
+    else
+        scrolling_.show(canvas_.view());
 }
 
 void CanvasAreas::showCursor()
@@ -213,12 +154,6 @@ void CanvasAreas::showCursor()
         return;
     showsHand_ = canvas_.view().pan;
     backScreen_->setCursor(showsHand_ ? QCursor(hand_->pixmap()) : QCursor(Qt::ArrowCursor));
-}
-
-bool CanvasAreas::hasScale() const
-{
-    const double divisor = canvas_.view().divisor;
-    return divisor > 0 && std::isfinite(1 / divisor);
 }
 
 QSizeF CanvasAreas::pixelsPerTwip() const
@@ -231,7 +166,7 @@ QSizeF CanvasAreas::pixelsPerTwip() const
 /// of them move by the same pixels.
 QPoint CanvasAreas::firstCorner() const
 {
-    if (!hasScale())
+    if (!hasScale(canvas_.view()))
         return {};
     const QSizeF scale = pixelsPerTwip();
     const Tpoint first = canvas_.view().surfaces.front();
@@ -252,7 +187,7 @@ QRectF CanvasAreas::pageArea(int surface) const
 
 std::vector<int> CanvasAreas::shownSurfaces() const
 {
-    if (!canvas_.view().baseVisible || !hasScale())
+    if (!canvas_.view().baseVisible || !hasScale(canvas_.view()))
         return {};
     std::vector<int> shown = surfacesInView(canvas_.view(), canvas_.facts());
     if (shown.empty() || shown.front() != 0)
@@ -349,7 +284,7 @@ PageSurface& CanvasAreas::surfaceFor(int index, std::vector<PageSurface*>& spare
 
 void CanvasAreas::paintSurface(int surface, QPainter& painter, QPointF origin, const QRect& exposed)
 {
-    if (canvas_.strSCliectRect == u"small" || !hasScale())
+    if (canvas_.strSCliectRect == u"small" || !hasScale(canvas_.view()))
         return;
     passPaintThroughShowPage();
     const std::optional<int> page = pageShownOn(surface);
@@ -421,7 +356,7 @@ void CanvasAreas::tellReader()
 
 bool CanvasAreas::takesMouse(int surface, const QMouseEvent& event, QPointF at)
 {
-    if (!guest_ || !hasScale())
+    if (!guest_ || !hasScale(canvas_.view()))
         return false;
     const std::optional<int> page = pageShownOn(surface);
     const QSizeF scale = pixelsPerTwip();
@@ -469,7 +404,7 @@ void CanvasAreas::mousePressed(Qt::MouseButton button, QPointF at)
 {
     if (button == Qt::RightButton)
         rightButton_.pressed();
-    if (!hasScale())
+    if (!hasScale(canvas_.view()))
         return;
     const QSizeF scale = pixelsPerTwip();
     MemberCalls::endQuietly(
@@ -480,77 +415,11 @@ void CanvasAreas::mouseReleased(Qt::MouseButton button, QPointF at)
 {
     if (button == Qt::RightButton)
         rightButton_.released();
-    if (!hasScale())
+    if (!hasScale(canvas_.view()))
         return;
     const QSizeF scale = pixelsPerTwip();
     MemberCalls::endQuietly(
         [&] { canvas_.mouseUp(at.x() / scale.width(), at.y() / scale.height()); });
-}
-
-void CanvasAreas::wheel(QWheelEvent& event)
-{
-    const QPoint angle = event.angleDelta();
-    event.accept();
-    if (event.modifiers() & Qt::ControlModifier) {
-        wheelRest_ += angle.y();
-        const int clicks = wheelRest_ / QWheelEvent::DefaultDeltasPerStep;
-        wheelRest_ -= clicks * QWheelEvent::DefaultDeltasPerStep;
-        if (clicks != 0)
-            zoomAbout(
-                std::pow(ZoomStep, clicks), backScreen_->mapFrom(&control_, event.position()));
-        return;
-    }
-    const bool isAcross
-        = std::abs(angle.x()) > std::abs(angle.y()) || (event.modifiers() & Qt::ShiftModifier);
-    QScrollBar* const bar = isAcross ? Hbar_ : Vbar_;
-    QWheelEvent passed(event.position(), event.globalPosition(), event.pixelDelta(), angle,
-        event.buttons(), event.modifiers() & ~Qt::ShiftModifier, event.phase(), event.inverted());
-    if (!bar->isEnabled())
-        return;
-    // Never further than what is seen at once: a large step is a rounded number.
-    const ViewState& view = canvas_.view();
-    const double seen = (isAcross ? view.innerWidth : view.innerHeight) / ScrollStep;
-    bar->setPageStep(std::clamp(static_cast<int>(std::min(seen, 32767.0)), 1, bar->pageStep()));
-    bar->event(&passed);
-}
-
-void CanvasAreas::zoomAbout(double factor, QPointF at)
-{
-    const ViewState& view = canvas_.view();
-    if (!hasScale() || !view.baseVisible)
-        return;
-    const double present = 1 / static_cast<double>(view.divisor);
-    const double scale = std::clamp(present * factor, SmallestScale, LargestScale);
-    if ((factor > 1) != (scale > present))
-        return;
-    MemberCalls::endQuietly([&] {
-        canvas_.zoomAbout(static_cast<float>(scale), at.x() * TwipsPerInch / control_.logicalDpiX(),
-            at.y() * TwipsPerInch / control_.logicalDpiY());
-    });
-}
-
-/// A pinch on a touch pad.
-bool CanvasAreas::gesture(QNativeGestureEvent& event)
-{
-    if (event.gestureType() != Qt::ZoomNativeGesture)
-        return false;
-    const double factor = 1 + event.value();
-    if (factor > 0 && factor != 1)
-        zoomAbout(factor, backScreen_->mapFrom(&control_, event.position()));
-    return true;
-}
-
-bool CanvasAreas::key(int key)
-{
-    for (const KeyRow& row : Keys) {
-        if (row.key != key)
-            continue;
-        QScrollBar* const bar = row.bar == Qt::Horizontal ? Hbar_ : Vbar_;
-        if (bar->isEnabled())
-            bar->triggerAction(row.action);
-        return true;
-    }
-    return false;
 }
 
 } // namespace pelloric::qt

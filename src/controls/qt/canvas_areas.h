@@ -5,6 +5,7 @@
 
 #include "controls/canvas.h"
 #include "controls/qt/back_screen.h"
+#include "controls/qt/canvas_scrolling.h"
 #include "controls/qt/page_surface.h"
 #include "document/page_document.h"
 
@@ -14,8 +15,6 @@
 #include <vector>
 
 class QLabel;
-class QNativeGestureEvent;
-class QScrollBar;
 
 namespace pelloric::qt {
 
@@ -48,14 +47,8 @@ public:
     /// @param edge  what stays free around them: pixels
     void fill(int edge);
 
-    /// Scrolls by the wheel; with the control key zooms about the pointer.
-    void wheel(QWheelEvent& event);
-
-    /// Zooms by a pinch. @return whether the gesture has a meaning
-    bool gesture(QNativeGestureEvent& event);
-
-    /// Scrolls by a key. @return whether the key has a meaning
-    bool key(int key);
+    /// What wheel, pinch and keys are handed on to.
+    CanvasScrolling& scrolling() { return scrolling_; }
 
     /// Has what is painted marked on the screen, and the mouse seen first.
     /// @param guest  borrowed, or null
@@ -95,7 +88,6 @@ private:
     void mouseReleased(Qt::MouseButton button, QPointF at) override;
 
     void tellReader();
-    QScrollBar* makeBar(Qt::Orientation orientation, const char* name);
     void setViewport();
     bool isAtStart() const;
     void showBars();
@@ -108,13 +100,11 @@ private:
     Look look() const;
     QPoint firstCorner() const;
     PageSurface& surfaceFor(int index, std::vector<PageSurface*>& spare);
-    bool hasScale() const;
     QSizeF pixelsPerTwip() const;
     QRectF pageArea(int surface) const;
     void passPaintThroughShowPage();
     std::optional<int> pageShownOn(int surface) const;
     void replay(int page, QPainter& painter, const QRectF& visible);
-    void zoomAbout(double factor, QPointF at);
 
     QWidget& control_;
     Canvas& canvas_;
@@ -125,8 +115,7 @@ private:
     StartIcon* startIcon_;
     ProgressArea* progress_;
     QLabel* hand_;
-    QScrollBar* Hbar_;
-    QScrollBar* Vbar_;
+    CanvasScrolling scrolling_;
     std::map<int, PageSurface*> surfaces_; ///< those that exist; 0 is always there
     Look shownLook_;
     std::uint32_t shownDocument_ = 0; ///< that screen readers were told of
@@ -134,7 +123,6 @@ private:
     QPoint shownCorner_; ///< of surface 0 when the surfaces were placed last: pixels
     bool isPainting_ = false;
     bool showsHand_ = false;
-    int wheelRest_ = 0; ///< eighths of a degree that are no zoom step yet
 };
 
 } // namespace pelloric::qt

@@ -367,7 +367,7 @@ QSize Sorvane::minimumSizeHint() const { return { 120, 90 }; }
 bool Sorvane::event(QEvent* event)
 {
     if (event->type() == QEvent::NativeGesture
-        && parts_->areas.gesture(static_cast<QNativeGestureEvent&>(*event)))
+        && parts_->areas.scrolling().gesture(static_cast<QNativeGestureEvent&>(*event)))
         return true;
     return QWidget::event(event);
 }
@@ -393,11 +393,11 @@ void Sorvane::paintEvent(QPaintEvent*)
         painter.drawRect(rect().adjusted(1, 1, -2, -2));
 }
 
-void Sorvane::wheelEvent(QWheelEvent* event) { parts_->areas.wheel(*event); }
+void Sorvane::wheelEvent(QWheelEvent* event) { parts_->areas.scrolling().wheel(*event); }
 
 void Sorvane::keyPressEvent(QKeyEvent* event)
 {
-    if (!parts_->areas.key(event->key()))
+    if (!parts_->areas.scrolling().key(event->key()))
         QWidget::keyPressEvent(event);
 }
 
