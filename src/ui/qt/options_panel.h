@@ -80,7 +80,4 @@ private:
     QComboBox* logoSlot_;
 };
 
-/// One sentence on what was done to bring a table onto the sheet; empty where nobody asked.
-QString fitText(const FitResult& fit);
-
 } // namespace pelloric::qt

@@ -10,6 +10,7 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "platform/services.h"
+#include "ui/qt/fit_text.h"
 #include "ui/qt/options_panel.h"
 
 #include <pelloric/sorvane.h>
