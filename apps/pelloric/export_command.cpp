@@ -382,14 +382,11 @@ int runExport(const Invocation& invocation)
 
 QString exportDetails()
 {
-    return qt::phrased(
-        u"FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
-        u".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
-        u"--query), or a saved document (.ostl).\n"
-        u"Pages look as the default settings and the options say; --settings takes others.\n"
-        u"Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
-        u"FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
-        u"file each in the folder OUT, or with --join one file.\n");
+    return fileDetails()
+        + qt::phrased(
+            u"Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
+            u"FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
+            u"file each in the folder OUT, or with --join one file.\n");
 }
 
 OptionTables exportOptions()

@@ -194,12 +194,9 @@ int runPrint(const Invocation& invocation)
 
 QString printDetails()
 {
-    return qt::phrased(
-        u"FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
-        u".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
-        u"--query), or a saved document (.ostl).\n"
-        u"Pages look as the default settings and the options say; --settings takes others.\n"
-        u"Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
+    return fileDetails()
+        + qt::phrased(
+            u"Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
 }
 
 OptionTables printOptions()

@@ -217,6 +217,15 @@ void checkReadable(const QString& name)
 
 OptionTable sourceOptions() { return Options; }
 
+QString fileDetails()
+{
+    return qt::phrased(
+        u"FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or\n"
+        u".ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with\n"
+        u"--query), or a saved document (.ostl).\n"
+        u"Pages look as the default settings and the options say; --settings takes others.\n");
+}
+
 bool isPipe(const QString& name)
 {
     std::error_code ignored;

@@ -14,6 +14,10 @@ class ProgressLine;
 /// The options that say what is read of a file, for every command that reads tables.
 OptionTable sourceOptions();
 
+/// What FILE is and how its pages look, for the help of commands that make pages of tables and
+/// saved documents alike without a window.
+QString fileDetails();
+
 using qt::pathOf;
 
 /// Refuses in words what no file is that can be read: a name without one, a folder, a device, a

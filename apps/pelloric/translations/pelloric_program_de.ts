@@ -245,15 +245,19 @@ Tabellen lassen sich daneben öffnen. Was die Dialoge ändern, wird vergessen.
 .ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
 --query), or a saved document (.ostl).
 Pages look as the default settings and the options say; --settings takes others.
-Several pages as .png or .svg become OUT-001, OUT-002 and so on.
-FILE - is the standard input, OUT - the standard output. Several FILEs become one
-file each in the folder OUT, or with --join one file.
 </source>
         <translation>FILE ist eine CSV- oder TSV-Datei, deren erste Zeile die Titel enthält, eine JSON-Datei, eine
 .xlsx- oder .ods-Datei (datei.xlsx:Blatt), eine SQLite-Datenbank (db.sqlite:tabelle, oder
 db.sqlite mit --query) oder ein gespeichertes Dokument (.ostl).
 Seiten sehen aus, wie es die Vorgaben und die Optionen sagen; --settings nimmt andere.
-Mehrere Seiten als .png oder .svg werden OUT-001, OUT-002 und so weiter.
+</translation>
+    </message>
+    <message>
+        <source>Several pages as .png or .svg become OUT-001, OUT-002 and so on.
+FILE - is the standard input, OUT - the standard output. Several FILEs become one
+file each in the folder OUT, or with --join one file.
+</source>
+        <translation>Mehrere Seiten als .png oder .svg werden OUT-001, OUT-002 und so weiter.
 FILE - ist die Standardeingabe, OUT - die Standardausgabe. Mehrere FILE werden je eine
 Datei im Ordner OUT, oder mit --join eine einzige.
 </translation>
@@ -410,17 +414,9 @@ und so weiter wird nicht behalten, was die Dialoge ändern.
 </translation>
     </message>
     <message>
-        <source>FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or
-.ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
---query), or a saved document (.ostl).
-Pages look as the default settings and the options say; --settings takes others.
-Every page is a job of its own, one-sided, on the paper it was laid out for.
+        <source>Every page is a job of its own, one-sided, on the paper it was laid out for.
 </source>
-        <translation>FILE ist eine CSV- oder TSV-Datei, deren erste Zeile die Titel enthält, eine JSON-Datei, eine
-.xlsx- oder .ods-Datei (datei.xlsx:Blatt), eine SQLite-Datenbank (db.sqlite:tabelle, oder
-db.sqlite mit --query) oder ein gespeichertes Dokument (.ostl).
-Seiten sehen aus, wie es die Vorgaben und die Optionen sagen; --settings nimmt andere.
-Jede Seite ist ein eigener Auftrag, einseitig, auf dem Papier, für das sie aufgebaut ist.
+        <translation>Jede Seite ist ein eigener Auftrag, einseitig, auf dem Papier, für das sie aufgebaut ist.
 </translation>
     </message>
     <message>

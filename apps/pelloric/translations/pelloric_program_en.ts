@@ -245,15 +245,19 @@ your own can be opened beside them. What its dialogs change is forgotten.
 .ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
 --query), or a saved document (.ostl).
 Pages look as the default settings and the options say; --settings takes others.
-Several pages as .png or .svg become OUT-001, OUT-002 and so on.
-FILE - is the standard input, OUT - the standard output. Several FILEs become one
-file each in the folder OUT, or with --join one file.
 </source>
         <translation>FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or
 .ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
 --query), or a saved document (.ostl).
 Pages look as the default settings and the options say; --settings takes others.
-Several pages as .png or .svg become OUT-001, OUT-002 and so on.
+</translation>
+    </message>
+    <message>
+        <source>Several pages as .png or .svg become OUT-001, OUT-002 and so on.
+FILE - is the standard input, OUT - the standard output. Several FILEs become one
+file each in the folder OUT, or with --join one file.
+</source>
+        <translation>Several pages as .png or .svg become OUT-001, OUT-002 and so on.
 FILE - is the standard input, OUT - the standard output. Several FILEs become one
 file each in the folder OUT, or with --join one file.
 </translation>
@@ -409,17 +413,9 @@ headers, paper and so on, what the dialogs change is not kept.
 </translation>
     </message>
     <message>
-        <source>FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or
-.ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
---query), or a saved document (.ostl).
-Pages look as the default settings and the options say; --settings takes others.
-Every page is a job of its own, one-sided, on the paper it was laid out for.
+        <source>Every page is a job of its own, one-sided, on the paper it was laid out for.
 </source>
-        <translation>FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or
-.ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
---query), or a saved document (.ostl).
-Pages look as the default settings and the options say; --settings takes others.
-Every page is a job of its own, one-sided, on the paper it was laid out for.
+        <translation>Every page is a job of its own, one-sided, on the paper it was laid out for.
 </translation>
     </message>
     <message>

@@ -244,14 +244,18 @@ your own can be opened beside them. What its dialogs change is forgotten.
 .ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
 --query), or a saved document (.ostl).
 Pages look as the default settings and the options say; --settings takes others.
-Several pages as .png or .svg become OUT-001, OUT-002 and so on.
-FILE - is the standard input, OUT - the standard output. Several FILEs become one
-file each in the folder OUT, or with --join one file.
 </source>
         <translation>FILE 可以是 CSV 或 TSV 文件（第一行为标题）、JSON 文件、.xlsx 或 .ods 文件
 （文件.xlsx:工作表）、SQLite 数据库（db.sqlite:表，或 db.sqlite 加 --query），或保存的文档（.ostl）。
 页面外观由默认设置和选项决定；--settings 使用其他设置。
-多页 .png 或 .svg 依次成为 OUT-001、OUT-002 等。
+</translation>
+    </message>
+    <message>
+        <source>Several pages as .png or .svg become OUT-001, OUT-002 and so on.
+FILE - is the standard input, OUT - the standard output. Several FILEs become one
+file each in the folder OUT, or with --join one file.
+</source>
+        <translation>多页 .png 或 .svg 依次成为 OUT-001、OUT-002 等。
 FILE 为 - 时是标准输入，OUT 为 - 时是标准输出。多个 FILE 各成为文件夹 OUT 中的
 一个文件，或用 --join 合并为一个文件。
 </translation>
@@ -405,16 +409,9 @@ headers, paper and so on, what the dialogs change is not kept.
 </translation>
     </message>
     <message>
-        <source>FILE is a CSV or TSV file, whose first row holds the titles, a JSON file, an .xlsx or
-.ods file (file.xlsx:Sheet), an SQLite database (db.sqlite:table, or db.sqlite with
---query), or a saved document (.ostl).
-Pages look as the default settings and the options say; --settings takes others.
-Every page is a job of its own, one-sided, on the paper it was laid out for.
+        <source>Every page is a job of its own, one-sided, on the paper it was laid out for.
 </source>
-        <translation>FILE 可以是 CSV 或 TSV 文件（第一行为标题）、JSON 文件、.xlsx 或 .ods 文件
-（文件.xlsx:工作表）、SQLite 数据库（db.sqlite:表，或 db.sqlite 加 --query），或保存的文档（.ostl）。
-页面外观由默认设置和选项决定；--settings 使用其他设置。
-每页是一个单独的任务，单面打印在为它排版的纸张上。
+        <translation>每页是一个单独的任务，单面打印在为它排版的纸张上。
 </translation>
     </message>
     <message>
