@@ -3,6 +3,7 @@
 
 #include "shape_options.h"
 
+#include "document/limits.h"
 #include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 
@@ -34,8 +35,7 @@ constexpr auto Options = std::to_array<Option>({
     { "logo-at", "SLOT", phraseText(u"where the logo stands: left, center or right (left)") },
 });
 
-constexpr double MostPages = 1000;
-constexpr double MostColumns = 32767;
+constexpr double MostPagesAcross = 1000;
 
 constexpr double Percent = 100;
 
@@ -171,7 +171,7 @@ ReportOptions shapeOf(const CommandLine& line)
     options.fit.toSheet = line.has("fit");
     if (line.has("pages-across"))
         options.fit.pagesAcross = static_cast<int>(
-            numberOf("pages-across", line.value("pages-across"), 1, MostPages, true));
+            numberOf("pages-across", line.value("pages-across"), 1, MostPagesAcross, true));
     if (line.has("key-columns"))
         takeKeys(line, options);
     if (line.has("down-first"))

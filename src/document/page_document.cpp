@@ -3,6 +3,7 @@
 
 #include "document/page_document.h"
 
+#include "document/limits.h"
 #include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/run_time_error.h"
@@ -10,7 +11,6 @@
 #include <algorithm>
 #include <functional>
 #include <initializer_list>
-#include <limits>
 #include <utility>
 
 namespace pelloric {
@@ -70,8 +70,9 @@ bool PageDocument::hasRecords() const
 
 void PageDocument::newPage()
 {
-    if (Totalpages == std::numeric_limits<std::int16_t>::max())
-        throw RunTimeError(ErrorNumber::Overflow, phrase(u"a document holds at most 32767 pages"));
+    if (Totalpages == MostPages)
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"a document holds at most %1 pages", { decimal(MostPages) }));
     Totalpages = narrowToInt16(std::int64_t { Totalpages } + 1);
     Page next;
     if (!pages_.empty()) {

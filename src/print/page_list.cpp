@@ -3,6 +3,7 @@
 
 #include "print/page_list.h"
 
+#include "document/limits.h"
 #include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/run_time_error.h"
@@ -11,7 +12,6 @@ namespace pelloric {
 
 namespace {
 
-constexpr double LastPage = 32767; ///< that any document can have
 constexpr std::size_t LongestList = std::size_t { 1 } << 24U; ///< code units
 
 TextView firstItem(TextView piece) { return piece.substr(0, piece.find(u',')); }
@@ -27,7 +27,7 @@ double endOf(TextView item) { return roundHalfEven(leadingNumber(item)); }
 /// Appends the numbers strictly between two ends, each with a comma in front.
 void appendBetween(double first, double last, Text& list)
 {
-    for (double page = first + 1; page < last && page <= LastPage; ++page) {
+    for (double page = first + 1; page < last && page <= MostPages; ++page) {
         list.push_back(u',');
         list += decimal(roundToInt32(page));
     }
@@ -79,7 +79,7 @@ std::vector<std::int16_t> pageNumbersOf(TextView list)
         if (!isNumber(item))
             continue;
         const double number = endOf(item);
-        if (number >= -LastPage - 1 && number <= LastPage)
+        if (number >= -MostPages - 1 && number <= MostPages)
             numbers.push_back(roundToInt16(number));
     }
     return numbers;

@@ -4,6 +4,7 @@
 #include "report/grid_reader.h"
 
 #include "document/cell_lines.h"
+#include "document/limits.h"
 #include "platform/automation_object.h"
 #include "platform/cell_look.h"
 #include "platform/numbers.h"
@@ -16,7 +17,6 @@
 #include "report/table_row_set.h"
 
 #include <algorithm>
-#include <limits>
 #include <numeric>
 #include <utility>
 
@@ -53,8 +53,6 @@ constexpr double DefaultWidthMarker = -1; ///< a flex grid's column of no defini
 constexpr double DefinedWidth = 2000; ///< twips; what such a column gets
 constexpr double WidenedWidth = 216; ///< twips; what a hidden column of a data grid gets
 
-constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max(); ///< that are printed
-
 bool isPrinted(double width) { return width > CellPadding; }
 
 /// A column of the grid that is printed.
@@ -66,8 +64,8 @@ struct PrintedColumn {
 void addColumn(std::vector<PrintedColumn>& columns, const PrintedColumn& column)
 {
     if (columns.size() == MostColumns)
-        throw RunTimeError(
-            ErrorNumber::Overflow, phrase(u"more than 32767 columns are printed; leave some out"));
+        throw RunTimeError(ErrorNumber::Overflow,
+            phrase(u"more than %1 columns are printed; leave some out", { decimal(MostColumns) }));
     columns.push_back(column);
 }
 

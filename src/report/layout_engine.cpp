@@ -3,6 +3,7 @@
 
 #include "report/layout_engine.h"
 
+#include "document/limits.h"
 #include "platform/numbers.h"
 #include "platform/platform.h"
 #include "platform/row_set.h"

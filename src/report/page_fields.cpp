@@ -9,6 +9,7 @@
 #include "platform/run_time_error.h"
 #include "platform/services.h"
 #include "report/report_style.h"
+#include "settings/settings_table.h"
 
 #include <array>
 
@@ -64,8 +65,9 @@ Color inkOf(const ColoredFont& font)
         return roundToInt32(font.color);
     } catch (const RunTimeError& error) {
         throw RunTimeError(error.number(),
-            phrase(u"the colour %1 of the font %2 is not between 0 and 16777215",
-                { formatNumber(font.color), font.font.name }));
+            phrase(u"the colour %1 of the font %2 is not between 0 and %3",
+                { formatNumber(font.color), font.font.name,
+                    formatNumber(settingOf(SettingKey::FontColor).range.most) }));
     }
 }
 

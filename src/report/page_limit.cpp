@@ -3,6 +3,7 @@
 
 #include "report/page_limit.h"
 
+#include "document/limits.h"
 #include "document/page_document.h"
 #include "platform/phrase.h"
 #include "platform/run_time_error.h"

@@ -12,11 +12,8 @@ namespace pelloric {
 
 struct PageSetup;
 
-/// A document has at most so many pages.
-inline constexpr std::int16_t MostPages = 32767;
-
-/// What to say when a report needs more pages than a document holds: how many it needs, how many
-/// rows fit, and what to do.
+/// What to say when a report needs more than `MostPages`: how many it needs, how many rows fit, and
+/// what to do.
 ///
 /// @param rowsThatFit  rows that are printed in full on the pages there are
 /// @param rows         rows of the report

@@ -5,6 +5,7 @@
 
 #include "document/page_document.h"
 #include "platform/file_bytes.h"
+#include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/platform.h"
 #include "report/report_style.h"
@@ -27,8 +28,8 @@ struct Judged {
     const SettingsSource* source;
 };
 
-/// What the value of one key must be, for a person: the range of its row; other keys go by their
-/// unit.
+/// What the value of one key must be, for a person; other keys go by their unit. "%1" stands for
+/// the most that its row of the settings allows.
 struct LimitRow {
     SettingKey key;
     TextView limit;
@@ -38,12 +39,12 @@ constexpr auto Limits = std::to_array<LimitRow>({
     { SettingKey::PagerOrientation, phraseText(u"1 is portrait and 2 is landscape") },
     { SettingKey::PagerSizeValue,
         phraseText(u"the number of a paper is a whole number, such as 9") },
-    { SettingKey::Top, phraseText(u"this margin is at most 361 mm") },
-    { SettingKey::Buttom, phraseText(u"this margin is at most 321 mm") },
-    { SettingKey::Left, phraseText(u"this margin is at most 481 mm") },
-    { SettingKey::Right, phraseText(u"this margin is at most 481 mm") },
-    { SettingKey::PagerWidth, phraseText(u"a sheet is wider than 0 and no wider than 5779 mm") },
-    { SettingKey::PagerHeight, phraseText(u"a sheet is higher than 0 and no higher than 5779 mm") },
+    { SettingKey::Top, phraseText(u"this margin is at most %1 mm") },
+    { SettingKey::Buttom, phraseText(u"this margin is at most %1 mm") },
+    { SettingKey::Left, phraseText(u"this margin is at most %1 mm") },
+    { SettingKey::Right, phraseText(u"this margin is at most %1 mm") },
+    { SettingKey::PagerWidth, phraseText(u"a sheet is wider than 0 and no wider than %1 mm") },
+    { SettingKey::PagerHeight, phraseText(u"a sheet is higher than 0 and no higher than %1 mm") },
 });
 
 TextView limitOf(SettingKey key)
@@ -53,9 +54,9 @@ TextView limitOf(SettingKey key)
         return row->limit;
     switch (settingOf(key).unit) {
     case SettingUnit::Color:
-        return phraseText(u"a colour is a number from 0 to 16777215");
+        return phraseText(u"a colour is a number from 0 to %1");
     case SettingUnit::Points:
-        return phraseText(u"a font size is a number of points above 0, at most 16000");
+        return phraseText(u"a font size is a number of points above 0, at most %1");
     case SettingUnit::Switch:
     case SettingUnit::Millimetres:
     case SettingUnit::Code:
@@ -90,7 +91,9 @@ Text describeValue(const Judged& judged, SettingKey key)
 {
     Text text = inFile(assignment(judged, key), judged.source);
     const TextView limit = limitOf(key);
-    return limit.empty() ? text : text.append(u": ").append(phrase(limit));
+    if (limit.empty())
+        return text;
+    return text.append(u": ").append(phrase(limit, { formatNumber(settingOf(key).range.most) }));
 }
 
 /// The line that begins with a key, without the key and what stands up to its "=".

@@ -3,6 +3,8 @@
 
 #include "tables/qt/csv_table.h"
 
+#include "document/limits.h"
+#include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -10,14 +12,12 @@
 #include "tables/separated_values.h"
 
 #include <algorithm>
-#include <limits>
 
 namespace pelloric::qt {
 
 namespace {
 
 constexpr std::size_t SniffedBytes = 1U << 16U;
-constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max();
 constexpr std::size_t RowsOfAStep = 4096; ///< between two reports of the progress
 constexpr std::size_t MostNamedRows = 5; ///< of those that look glued
 
@@ -76,7 +76,8 @@ bool nextRow(SeparatedValues& values)
         return false;
     if (values.valueCount() > MostColumns)
         throw RunTimeError(ErrorNumber::Overflow,
-            atLine(values.line(), phrase(u"more than 32767 values in a row")));
+            atLine(
+                values.line(), phrase(u"more than %1 values in a row", { decimal(MostColumns) })));
     return true;
 }
 

@@ -3,13 +3,14 @@
 
 #include "tables/qt/json_table.h"
 
+#include "document/limits.h"
+#include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <nlohmann/json.hpp>
 
 #include <algorithm>
-#include <limits>
 #include <optional>
 #include <unordered_map>
 #include <vector>
@@ -18,7 +19,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr std::size_t MostColumns = std::numeric_limits<std::int16_t>::max();
 constexpr std::string_view Blanks = " \t\r\n";
 
 constexpr TextView WantedShape = phraseText(
@@ -106,7 +106,8 @@ public:
             return true;
         }
         column_ = names_.columnOf(name);
-        return column_ < MostColumns || refuseWith(phrase(u"more than 32767 different names"));
+        return column_ < MostColumns
+            || refuseWith(phrase(u"more than %1 different names", { decimal(MostColumns) }));
     }
     bool end_object() override
     {

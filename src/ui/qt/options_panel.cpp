@@ -3,6 +3,7 @@
 
 #include "ui/qt/options_panel.h"
 
+#include "document/limits.h"
 #include "platform/qt/qt_text.h"
 #include "ui/qt/fit_text.h"
 #include "ui/qt/named_boxes.h"
@@ -30,7 +31,6 @@ namespace pelloric::qt {
 
 namespace {
 
-constexpr int MostColumns = 32767;
 constexpr int MostRows = std::numeric_limits<int>::max();
 constexpr int MostPagesAcross = 100;
 constexpr int FirstRange = 100; ///< rows of a range that nobody has set yet

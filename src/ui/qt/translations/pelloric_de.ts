@@ -83,8 +83,8 @@
         <translation>Seite</translation>
     </message>
     <message>
-        <source>a document holds at most 32767 pages</source>
-        <translation>ein Dokument fasst höchstens 32767 Seiten</translation>
+        <source>a document holds at most %1 pages</source>
+        <translation>ein Dokument fasst höchstens %1 Seiten</translation>
     </message>
     <message>
         <source>on page %1 line</source>
@@ -383,8 +383,8 @@
         <translation>keine Zeile des Gitters ist markiert; markieren Sie Zeilen, oder drucken Sie alle</translation>
     </message>
     <message>
-        <source>more than 32767 columns are printed; leave some out</source>
-        <translation>mehr als 32767 Spalten werden gedruckt; lassen Sie welche weg</translation>
+        <source>more than %1 columns are printed; leave some out</source>
+        <translation>mehr als %1 Spalten werden gedruckt; lassen Sie welche weg</translation>
     </message>
     <message>
         <source>the grid has %1 columns, at most %2 can be read</source>
@@ -407,8 +407,8 @@
         <translation>die Datenquelle kommt nie zu ihrem ersten Datensatz</translation>
     </message>
     <message>
-        <source>the colour %1 of the font %2 is not between 0 and 16777215</source>
-        <translation>die Farbe %1 der Schrift %2 liegt nicht zwischen 0 und 16777215</translation>
+        <source>the colour %1 of the font %2 is not between 0 and %3</source>
+        <translation>die Farbe %1 der Schrift %2 liegt nicht zwischen 0 und %3</translation>
     </message>
     <message>
         <source>the report needs about %1 pages, a document holds %2; print rows 1 to %3, or leave out columns</source>
@@ -427,32 +427,24 @@
         <translation>die Nummer eines Papiers ist eine ganze Zahl, etwa 9</translation>
     </message>
     <message>
-        <source>this margin is at most 361 mm</source>
-        <translation>dieser Rand ist höchstens 361 mm</translation>
+        <source>this margin is at most %1 mm</source>
+        <translation>dieser Rand ist höchstens %1 mm</translation>
     </message>
     <message>
-        <source>this margin is at most 321 mm</source>
-        <translation>dieser Rand ist höchstens 321 mm</translation>
+        <source>a sheet is wider than 0 and no wider than %1 mm</source>
+        <translation>ein Blatt ist breiter als 0 und höchstens %1 mm breit</translation>
     </message>
     <message>
-        <source>this margin is at most 481 mm</source>
-        <translation>dieser Rand ist höchstens 481 mm</translation>
+        <source>a sheet is higher than 0 and no higher than %1 mm</source>
+        <translation>ein Blatt ist höher als 0 und höchstens %1 mm hoch</translation>
     </message>
     <message>
-        <source>a sheet is wider than 0 and no wider than 5779 mm</source>
-        <translation>ein Blatt ist breiter als 0 und höchstens 5779 mm breit</translation>
+        <source>a colour is a number from 0 to %1</source>
+        <translation>eine Farbe ist eine Zahl von 0 bis %1</translation>
     </message>
     <message>
-        <source>a sheet is higher than 0 and no higher than 5779 mm</source>
-        <translation>ein Blatt ist höher als 0 und höchstens 5779 mm hoch</translation>
-    </message>
-    <message>
-        <source>a colour is a number from 0 to 16777215</source>
-        <translation>eine Farbe ist eine Zahl von 0 bis 16777215</translation>
-    </message>
-    <message>
-        <source>a font size is a number of points above 0, at most 16000</source>
-        <translation>eine Schriftgröße ist eine Zahl von Punkten über 0, höchstens 16000</translation>
+        <source>a font size is a number of points above 0, at most %1</source>
+        <translation>eine Schriftgröße ist eine Zahl von Punkten über 0, höchstens %1</translation>
     </message>
     <message>
         <source>%1 in %2</source>
@@ -559,8 +551,8 @@
         <translation>das ist ein Textdokument, keine Tabelle; speichern Sie seine Tabelle als CSV</translation>
     </message>
     <message>
-        <source>more than 32767 values in a row</source>
-        <translation>mehr als 32767 Werte in einer Zeile</translation>
+        <source>more than %1 values in a row</source>
+        <translation>mehr als %1 Werte in einer Zeile</translation>
     </message>
     <message>
         <source>the file is empty</source>
@@ -595,8 +587,8 @@
         <translation>eine Tabelle ist ein Array von Objekten, [{&quot;Name&quot;: Wert, …}, …], oder ein Objekt je Zeile</translation>
     </message>
     <message>
-        <source>more than 32767 different names</source>
-        <translation>mehr als 32767 verschiedene Namen</translation>
+        <source>more than %1 different names</source>
+        <translation>mehr als %1 verschiedene Namen</translation>
     </message>
     <message>
         <source>this is no JSON: %1</source>

@@ -83,8 +83,8 @@
         <translation>page</translation>
     </message>
     <message>
-        <source>a document holds at most 32767 pages</source>
-        <translation>a document holds at most 32767 pages</translation>
+        <source>a document holds at most %1 pages</source>
+        <translation>a document holds at most %1 pages</translation>
     </message>
     <message>
         <source>on page %1 line</source>
@@ -383,8 +383,8 @@
         <translation>no row of the grid is marked; mark rows, or print all</translation>
     </message>
     <message>
-        <source>more than 32767 columns are printed; leave some out</source>
-        <translation>more than 32767 columns are printed; leave some out</translation>
+        <source>more than %1 columns are printed; leave some out</source>
+        <translation>more than %1 columns are printed; leave some out</translation>
     </message>
     <message>
         <source>the grid has %1 columns, at most %2 can be read</source>
@@ -407,8 +407,8 @@
         <translation>the data source never comes to its first record</translation>
     </message>
     <message>
-        <source>the colour %1 of the font %2 is not between 0 and 16777215</source>
-        <translation>the colour %1 of the font %2 is not between 0 and 16777215</translation>
+        <source>the colour %1 of the font %2 is not between 0 and %3</source>
+        <translation>the colour %1 of the font %2 is not between 0 and %3</translation>
     </message>
     <message>
         <source>the report needs about %1 pages, a document holds %2; print rows 1 to %3, or leave out columns</source>
@@ -427,32 +427,24 @@
         <translation>the number of a paper is a whole number, such as 9</translation>
     </message>
     <message>
-        <source>this margin is at most 361 mm</source>
-        <translation>this margin is at most 361 mm</translation>
+        <source>this margin is at most %1 mm</source>
+        <translation>this margin is at most %1 mm</translation>
     </message>
     <message>
-        <source>this margin is at most 321 mm</source>
-        <translation>this margin is at most 321 mm</translation>
+        <source>a sheet is wider than 0 and no wider than %1 mm</source>
+        <translation>a sheet is wider than 0 and no wider than %1 mm</translation>
     </message>
     <message>
-        <source>this margin is at most 481 mm</source>
-        <translation>this margin is at most 481 mm</translation>
+        <source>a sheet is higher than 0 and no higher than %1 mm</source>
+        <translation>a sheet is higher than 0 and no higher than %1 mm</translation>
     </message>
     <message>
-        <source>a sheet is wider than 0 and no wider than 5779 mm</source>
-        <translation>a sheet is wider than 0 and no wider than 5779 mm</translation>
+        <source>a colour is a number from 0 to %1</source>
+        <translation>a colour is a number from 0 to %1</translation>
     </message>
     <message>
-        <source>a sheet is higher than 0 and no higher than 5779 mm</source>
-        <translation>a sheet is higher than 0 and no higher than 5779 mm</translation>
-    </message>
-    <message>
-        <source>a colour is a number from 0 to 16777215</source>
-        <translation>a colour is a number from 0 to 16777215</translation>
-    </message>
-    <message>
-        <source>a font size is a number of points above 0, at most 16000</source>
-        <translation>a font size is a number of points above 0, at most 16000</translation>
+        <source>a font size is a number of points above 0, at most %1</source>
+        <translation>a font size is a number of points above 0, at most %1</translation>
     </message>
     <message>
         <source>%1 in %2</source>
@@ -559,8 +551,8 @@
         <translation>this is a text document, not a table; save its table as CSV</translation>
     </message>
     <message>
-        <source>more than 32767 values in a row</source>
-        <translation>more than 32767 values in a row</translation>
+        <source>more than %1 values in a row</source>
+        <translation>more than %1 values in a row</translation>
     </message>
     <message>
         <source>the file is empty</source>
@@ -595,8 +587,8 @@
         <translation>a table is an array of objects, [{&quot;name&quot;: value, …}, …], or one object a line</translation>
     </message>
     <message>
-        <source>more than 32767 different names</source>
-        <translation>more than 32767 different names</translation>
+        <source>more than %1 different names</source>
+        <translation>more than %1 different names</translation>
     </message>
     <message>
         <source>this is no JSON: %1</source>

@@ -83,8 +83,8 @@
         <translation>页</translation>
     </message>
     <message>
-        <source>a document holds at most 32767 pages</source>
-        <translation>一个文档最多有 32767 页</translation>
+        <source>a document holds at most %1 pages</source>
+        <translation>一个文档最多有 %1 页</translation>
     </message>
     <message>
         <source>on page %1 line</source>
@@ -383,8 +383,8 @@
         <translation>表格中没有选中的行；请选中行，或打印全部</translation>
     </message>
     <message>
-        <source>more than 32767 columns are printed; leave some out</source>
-        <translation>要打印的列超过 32767；请去掉一些</translation>
+        <source>more than %1 columns are printed; leave some out</source>
+        <translation>要打印的列超过 %1；请去掉一些</translation>
     </message>
     <message>
         <source>the grid has %1 columns, at most %2 can be read</source>
@@ -407,8 +407,8 @@
         <translation>数据源始终到不了第一条记录</translation>
     </message>
     <message>
-        <source>the colour %1 of the font %2 is not between 0 and 16777215</source>
-        <translation>字体 %2 的颜色 %1 不在 0 与 16777215 之间</translation>
+        <source>the colour %1 of the font %2 is not between 0 and %3</source>
+        <translation>字体 %2 的颜色 %1 不在 0 与 %3 之间</translation>
     </message>
     <message>
         <source>the report needs about %1 pages, a document holds %2; print rows 1 to %3, or leave out columns</source>
@@ -427,32 +427,24 @@
         <translation>纸张编号是整数，例如 9</translation>
     </message>
     <message>
-        <source>this margin is at most 361 mm</source>
-        <translation>此边距最大为 361 mm</translation>
+        <source>this margin is at most %1 mm</source>
+        <translation>此边距最大为 %1 mm</translation>
     </message>
     <message>
-        <source>this margin is at most 321 mm</source>
-        <translation>此边距最大为 321 mm</translation>
+        <source>a sheet is wider than 0 and no wider than %1 mm</source>
+        <translation>纸张宽度大于 0，不超过 %1 mm</translation>
     </message>
     <message>
-        <source>this margin is at most 481 mm</source>
-        <translation>此边距最大为 481 mm</translation>
+        <source>a sheet is higher than 0 and no higher than %1 mm</source>
+        <translation>纸张高度大于 0，不超过 %1 mm</translation>
     </message>
     <message>
-        <source>a sheet is wider than 0 and no wider than 5779 mm</source>
-        <translation>纸张宽度大于 0，不超过 5779 mm</translation>
+        <source>a colour is a number from 0 to %1</source>
+        <translation>颜色是 0 到 %1 之间的数</translation>
     </message>
     <message>
-        <source>a sheet is higher than 0 and no higher than 5779 mm</source>
-        <translation>纸张高度大于 0，不超过 5779 mm</translation>
-    </message>
-    <message>
-        <source>a colour is a number from 0 to 16777215</source>
-        <translation>颜色是 0 到 16777215 之间的数</translation>
-    </message>
-    <message>
-        <source>a font size is a number of points above 0, at most 16000</source>
-        <translation>字号是大于 0、不超过 16000 的磅数</translation>
+        <source>a font size is a number of points above 0, at most %1</source>
+        <translation>字号是大于 0、不超过 %1 的磅数</translation>
     </message>
     <message>
         <source>%1 in %2</source>
@@ -559,8 +551,8 @@
         <translation>这是文字文档，不是表格；请把其中的表格另存为 CSV</translation>
     </message>
     <message>
-        <source>more than 32767 values in a row</source>
-        <translation>一行中的值超过 32767 个</translation>
+        <source>more than %1 values in a row</source>
+        <translation>一行中的值超过 %1 个</translation>
     </message>
     <message>
         <source>the file is empty</source>
@@ -595,8 +587,8 @@
         <translation>表格是对象的数组 [{&quot;名称&quot;: 值, …}, …]，或每行一个对象</translation>
     </message>
     <message>
-        <source>more than 32767 different names</source>
-        <translation>不同的名称超过 32767 个</translation>
+        <source>more than %1 different names</source>
+        <translation>不同的名称超过 %1 个</translation>
     </message>
     <message>
         <source>this is no JSON: %1</source>
