@@ -31,7 +31,6 @@ public:
     Platform record();
 
     QtFonts& fonts() { return fonts_; }
-    QtClock& clock() { return clock_; }
     QtMessageLoop& loop() { return loop_; }
     QtSystemFolders& folders() { return folders_; }
     LibraryState& library() { return library_; }

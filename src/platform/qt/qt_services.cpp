@@ -7,6 +7,7 @@
 #include "platform/run_time_error.h"
 
 #include <QApplication>
+#include <QDateTime>
 #include <QKeyEvent>
 #include <QLocale>
 #include <QMessageBox>
@@ -152,21 +153,16 @@ std::filesystem::path systemFolder()
 
 } // namespace
 
+QString plainDate(QDate date) { return QLocale::c().toString(date, QStringLiteral("yyyy-MM-dd")); }
+
 QString timeWithSeconds(QTime time, const QLocale& locale)
 {
     return locale.toString(time, withoutZone(locale.timeFormat(QLocale::LongFormat)));
 }
 
-void QtClock::setNow(std::optional<QDateTime> now) { now_ = std::move(now); }
+Text QtClock::date() const { return toText(plainDate(QDate::currentDate())); }
 
-Text QtClock::date() const
-{
-    return toText(QLocale::c().toString(now().date(), QStringLiteral("yyyy-MM-dd")));
-}
-
-Text QtClock::time() const { return toText(timeWithSeconds(now().time(), QLocale())); }
-
-QDateTime QtClock::now() const { return now_ ? *now_ : QDateTime::currentDateTime(); }
+Text QtClock::time() const { return toText(timeWithSeconds(QTime::currentTime(), QLocale())); }
 
 void QtMessageLoop::runOnce()
 {

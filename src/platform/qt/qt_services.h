@@ -5,37 +5,33 @@
 
 #include "platform/services.h"
 
-#include <QDateTime>
 #include <QElapsedTimer>
 
 #include <atomic>
 #include <cstdio>
 #include <vector>
 
+class QDate;
 class QLocale;
 class QObject;
+class QString;
+class QTime;
 class QWidget;
 
 namespace pelloric::qt {
 
+/// A day as YYYY-MM-DD, in plain digits whatever the locale.
+QString plainDate(QDate date);
+
 /// The time of day with seconds as a locale writes it, without a time zone.
 QString timeWithSeconds(QTime time, const QLocale& locale);
 
-/// The system's clock, or a fixed moment.
+/// The system's clock.
 class QtClock final : public Clock {
 public:
-    /// Stops the clock at a moment, for hosts whose reports have to come out alike on any day;
-    /// nothing: the clock runs.
-    void setNow(std::optional<QDateTime> now);
-
     Text date() const override;
     /// The time as the default locale writes it.
     Text time() const override;
-
-private:
-    QDateTime now() const;
-
-    std::optional<QDateTime> now_;
 };
 
 /// The application's event loop; does nothing where there is no application.

@@ -8,6 +8,7 @@
 #include "support/errors.h"
 
 #include <QApplication>
+#include <QDateTime>
 #include <QKeyEvent>
 #include <QLineEdit>
 #include <QLocale>
@@ -17,6 +18,7 @@
 #include <QTimer>
 #include <QWindow>
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 namespace pelloric::qt {
@@ -63,9 +65,7 @@ private:
 
 TEST(QtClock, TellsTheDateOneWayAndTheTimeAsTheLocaleDoes)
 {
-    QtClock clock;
-    clock.setNow(QDateTime(QDate(2004, 10, 3), QTime(7, 5, 9)));
-    EXPECT_EQ(clock.date(), u"2004-10-03");
+    EXPECT_EQ(plainDate(QDate(2004, 10, 3)), QStringLiteral("2004-10-03"));
     EXPECT_EQ(timeWithSeconds(QTime(7, 5, 9), QLocale::c()), QStringLiteral("07:05:09"));
     const QLocale german(QLocale::German, QLocale::Germany);
     EXPECT_EQ(timeWithSeconds(QTime(7, 5, 9), german), QStringLiteral("07:05:09"));
@@ -75,10 +75,21 @@ TEST(QtClock, TellsTheYearInPlainDigitsInEveryLocale)
 {
     const QLocale before;
     QLocale::setDefault(QLocale(QLocale::Arabic, QLocale::Egypt));
-    QtClock clock;
-    clock.setNow(QDateTime(QDate(2004, 10, 3), QTime(7, 5, 9)));
-    EXPECT_EQ(clock.date(), u"2004-10-03");
+    EXPECT_EQ(plainDate(QDate(2004, 10, 3)), QStringLiteral("2004-10-03"));
     QLocale::setDefault(before);
+}
+
+TEST(QtClock, IsTheSystems)
+{
+    const auto now = [] { return QDateTime::currentDateTime(); };
+    const QtClock clock;
+    const QDateTime before = now();
+    const QString told = toQString(clock.date()) + QLatin1Char(' ') + toQString(clock.time());
+    std::vector<QString> moments;
+    for (QDateTime moment = before; moment <= now().addSecs(1); moment = moment.addSecs(1))
+        moments.push_back(plainDate(moment.date()) + QLatin1Char(' ')
+            + timeWithSeconds(moment.time(), QLocale()));
+    EXPECT_THAT(moments, testing::Contains(told));
 }
 
 TEST(QtMessageLoop, RunsWhatIsPendingOnce)
