@@ -18,15 +18,8 @@ constexpr int CharactersWide = 16;
 
 } // namespace
 
-std::optional<QColor> chooseColor(QWidget* parent, const QColor& present)
-{
-    const QColor chosen = QColorDialog::getColor(present, parent);
-    return chosen.isValid() ? std::optional(chosen) : std::nullopt;
-}
-
-ColorPicker::ColorPicker(const QString& name, QWidget* parent, ChooseColor choose)
+ColorPicker::ColorPicker(const QString& name, QWidget* parent)
     : QPushButton(parent)
-    , choose_(std::move(choose))
 {
     setObjectName(name);
     setAutoDefault(false);
@@ -62,10 +55,10 @@ void ColorPicker::paintEvent(QPaintEvent* event)
 
 void ColorPicker::ask()
 {
-    const std::optional<QColor> chosen = choose_(this, colorOf(color_));
-    if (!chosen)
+    const QColor chosen = QColorDialog::getColor(colorOf(color_), this);
+    if (!chosen.isValid())
         return;
-    setColor(numberOf(*chosen));
+    setColor(numberOf(chosen));
     Q_EMIT colorChanged(color_);
 }
 

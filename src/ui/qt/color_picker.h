@@ -5,32 +5,20 @@
 
 #include <QPushButton>
 
-#include <functional>
-#include <optional>
-
 namespace pelloric::qt {
 
-/// Asks the user for a colour, beginning with one; nothing when the user cancels.
-using ChooseColor = std::function<std::optional<QColor>(QWidget* parent, const QColor& present)>;
-
-/// The toolkit's colour dialog.
-std::optional<QColor> chooseColor(QWidget* parent, const QColor& present);
-
-/// A button that shows a colour and lets the user choose another.
+/// A button that shows a colour and lets the user choose another in the toolkit's dialog.
 class ColorPicker final : public QPushButton {
     Q_OBJECT
 
 public:
-    ColorPicker(const QString& name, QWidget* parent, ChooseColor choose = chooseColor);
+    ColorPicker(const QString& name, QWidget* parent);
 
     /// The colour as 0x00BBGGRR, just as it was set or as the user chose it.
     double color() const { return color_; }
 
     /// Shows a colour; nothing is reported.
     void setColor(double color);
-
-    /// Replaces the colour dialog.
-    void useDialog(ChooseColor choose) { choose_ = std::move(choose); }
 
     QSize sizeHint() const override;
 
@@ -44,7 +32,6 @@ protected:
 private:
     void ask();
 
-    ChooseColor choose_;
     double color_ = 0;
 };
 

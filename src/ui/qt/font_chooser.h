@@ -7,8 +7,6 @@
 
 #include <QDialog>
 
-#include <functional>
-
 class QCheckBox;
 class QComboBox;
 class QFontComboBox;
@@ -19,12 +17,9 @@ namespace pelloric::qt {
 
 class ColorPicker;
 
-/// Asks the user for a font and its colour, beginning with one.
+/// Asks the user for a font and its colour in a `FontChooser`, beginning with one.
 ///
 /// @throws RunTimeError Cancelled: the user closed the dialog without choosing
-using ChooseFont = std::function<ColoredFont(QWidget* parent, const ColoredFont& present)>;
-
-/// Shows a `FontChooser`.
 ColoredFont chooseFont(QWidget* parent, const ColoredFont& present);
 
 /// The modal font dialog: face, size, the four styles and the colour, with a sample.

@@ -7,6 +7,7 @@
 #include "platform/run_time_error.h"
 #include "ui/qt/color_picker.h"
 #include "ui/qt/dialog_parts.h"
+#include "ui/qt/font_chooser.h"
 
 #include <QCheckBox>
 #include <QGridLayout>
@@ -196,7 +197,7 @@ void GridStyleDialog::changeFont()
         return;
     }
     try {
-        state_.setChosenFont(chooseFont_(this, std::get<ColoredFont>(pressed)));
+        state_.setChosenFont(chooseFont(this, std::get<ColoredFont>(pressed)));
         showFonts();
     } catch (const RunTimeError&) {
         // The user cancelled: the font stays.

@@ -5,7 +5,6 @@
 
 #include "platform/platform.h"
 #include "ui/grid_style.h"
-#include "ui/qt/font_chooser.h"
 
 #include <QDialog>
 
@@ -29,9 +28,6 @@ public:
     explicit GridStyleDialog(
         const Platform& platform, QWidget* parent = nullptr, ReportSettings* own = nullptr);
 
-    /// Replaces the font dialog.
-    void useFontDialog(ChooseFont choose) { chooseFont_ = std::move(choose); }
-
     /// How the save of "OK" ended, of which the dialog itself tells nobody; nothing before.
     std::optional<SaveOutcome> saved() const { return saved_; }
 
@@ -47,7 +43,6 @@ private:
 
     Platform platform_;
     GridStyleState state_;
-    ChooseFont chooseFont_ = chooseFont;
     std::optional<SaveOutcome> saved_;
     QTreeWidget* fonts_ = nullptr;
 };

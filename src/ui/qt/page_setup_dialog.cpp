@@ -79,8 +79,7 @@ PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent, Repo
     tabs->setObjectName(QStringLiteral("tabStrip1"));
     tabs->addTab(makePageTab(), toQString(PageSetupTabs[0]));
     tabs->addTab(makeMarginsTab(), toQString(PageSetupTabs[1]));
-    texts_ = new PageTextsTab(state_, this);
-    tabs->addTab(texts_, toQString(PageSetupTabs[2]));
+    tabs->addTab(new PageTextsTab(state_, this), toQString(PageSetupTabs[2]));
     setTabKeys(*tabs, "GMD");
     auto* layout = new QVBoxLayout(this);
     layout->addWidget(tabs);
@@ -95,8 +94,6 @@ PageSetupDialog::PageSetupDialog(const Platform& platform, QWidget* parent, Repo
     connect(answerTimer_, &QTimer::timeout, this, &PageSetupDialog::takePapers);
     takePapers();
 }
-
-void PageSetupDialog::useFontDialog(ChooseFont choose) { texts_->useFontDialog(std::move(choose)); }
 
 QWidget* PageSetupDialog::makePageTab()
 {

@@ -6,7 +6,6 @@
 #include "platform/platform.h"
 #include "platform/printer.h"
 #include "ui/page_setup.h"
-#include "ui/qt/font_chooser.h"
 
 #include <QDialog>
 
@@ -25,7 +24,6 @@ namespace pelloric::qt {
 
 class HintLabel;
 class PageSketch;
-class PageTextsTab;
 class SheetPicture;
 class UpDownBox;
 
@@ -42,9 +40,6 @@ public:
     /// @param own       shown and changed instead of the settings file; null: the file
     explicit PageSetupDialog(
         const Platform& platform, QWidget* parent = nullptr, ReportSettings* own = nullptr);
-
-    /// Replaces the font dialog.
-    void useFontDialog(ChooseFont choose);
 
     /// How the save of "OK" ended, of which the dialog itself tells nobody; nothing before.
     std::optional<SaveOutcome> saved() const { return saved_; }
@@ -84,7 +79,6 @@ private:
     HintLabel* marginHint_ = nullptr;
     HintLabel* fileHint_ = nullptr;
     PageSketch* sketch_ = nullptr;
-    PageTextsTab* texts_ = nullptr;
 };
 
 } // namespace pelloric::qt

@@ -6,6 +6,7 @@
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
 #include "ui/qt/dialog_parts.h"
+#include "ui/qt/font_chooser.h"
 
 #include <QContextMenuEvent>
 #include <QGridLayout>
@@ -197,9 +198,9 @@ void PageTextsTab::askFont(bool isHeader)
 {
     try {
         if (isHeader)
-            state_.setHeaderFont(chooseFont_(this, state_.headerFont));
+            state_.setHeaderFont(chooseFont(this, state_.headerFont));
         else
-            state_.setFooterFont(chooseFont_(this, state_.footerFont));
+            state_.setFooterFont(chooseFont(this, state_.footerFont));
         showFont(isHeader);
     } catch (const RunTimeError&) {
         // The user cancelled: the font stays.

@@ -4,7 +4,6 @@
 #pragma once
 
 #include "ui/page_setup.h"
-#include "ui/qt/font_chooser.h"
 
 #include <QWidget>
 
@@ -26,9 +25,6 @@ public:
     /// @param state  borrowed; told what the user enters
     PageTextsTab(PageSetupState& state, QWidget* parent);
 
-    /// Replaces the font dialog.
-    void useFontDialog(ChooseFont choose) { chooseFont_ = std::move(choose); }
-
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
@@ -42,7 +38,6 @@ private:
     void showFont(bool isHeader);
 
     PageSetupState& state_;
-    ChooseFont chooseFont_ = chooseFont;
     QMenu* fields_ = nullptr;
     std::array<QLineEdit*, PageSetupState::FormatBoxes> formatBoxes_ {};
     QLineEdit* headerFont_ = nullptr;

@@ -3,6 +3,7 @@
 
 #include "controls/messages.h"
 #include "fakes/fake_platform.h"
+#include "platform/numbers.h"
 #include "platform/qt/qt_text.h"
 #include "print/paper_names.h"
 #include "settings/default_settings.h"
@@ -18,6 +19,7 @@
 #include <QAbstractSpinBox>
 #include <QApplication>
 #include <QCheckBox>
+#include <QColorDialog>
 #include <QComboBox>
 #include <QGroupBox>
 #include <QLabel>
@@ -150,23 +152,50 @@ protected:
     void store(TextView key, TextView value) { writeSetting(services(), key, value); }
 };
 
-/// Answers with one font and keeps what it was opened with.
-struct FontAnswer {
-    ColoredFont answer;
-    int opened = 0;
-    ColoredFont preset {};
+/// Does something with the dialog that a press opens, which it ends.
+template <typename Dialog, typename Answer>
+void pressAndAnswer(const QWidget& dialog, const char* button, const Answer& answer)
+{
+    QTimer::singleShot(0, qApp, [&answer] {
+        QWidget* const opened = QApplication::activeModalWidget();
+        auto* const wanted = qobject_cast<Dialog*>(opened);
+        ASSERT_TRUE(wanted);
+        answer(*wanted);
+        EXPECT_FALSE(opened->isVisible());
+    });
+    press(dialog, button);
+}
 
-    ChooseFont chooser()
-    {
-        return [this](QWidget*, const ColoredFont& present) {
-            ++opened;
-            preset = present;
-            return answer;
-        };
-    }
-};
+const auto Escape = [](QWidget& opened) { QTest::keyClick(&opened, Qt::Key_Escape); };
 
-ColoredFont cancelFont(QWidget*, const ColoredFont&) { throw RunTimeError(ErrorNumber::Cancelled); }
+/// Presses the button of a colour and chooses another.
+void pickColor(const QWidget& dialog, const char* button, const QColor& color)
+{
+    pressAndAnswer<QColorDialog>(dialog, button, [&](QColorDialog& opened) {
+        opened.setCurrentColor(color);
+        opened.accept();
+    });
+}
+
+/// Presses the button of a font and enters another into the dialog.
+/// @return  what the dialog was opened with
+ColoredFont enterFont(const QWidget& dialog, const char* button, const ColoredFont& font)
+{
+    ColoredFont preset;
+    pressAndAnswer<FontChooser>(dialog, button, [&](FontChooser& opened) {
+        preset = opened.chosen();
+        typeInto(*child<QComboBox>(opened, "cboFace").lineEdit(), toQString(font.font.name));
+        typeInto(*child<QComboBox>(opened, "cboSize").lineEdit(),
+            toQString(formatSingle(font.font.size)));
+        child<QCheckBox>(opened, "chkBold").setChecked(font.font.bold);
+        child<QCheckBox>(opened, "chkItalic").setChecked(font.font.italic);
+        child<QCheckBox>(opened, "chkStrikeOut").setChecked(font.font.strikethrough);
+        child<QCheckBox>(opened, "chkUnderline").setChecked(font.font.underline);
+        pickColor(opened, "clrFont", colorOf(font.color));
+        press(opened, "cmdOk");
+    });
+    return preset;
+}
 
 ColoredFont blueArial()
 {
@@ -319,14 +348,12 @@ TEST_F(PageSetupDialogTest, OkWritesTheChangedKeysAndNoOther)
 {
     const std::string before = file();
     PageSetupDialog dialog(services());
-    FontAnswer fonts { .answer = blueArial() };
-    dialog.useFontDialog(fonts.chooser());
     showTab(dialog, 0);
     clickRow(child<QTreeWidget>(dialog, "ListView1"), 7);
     child<QRadioButton>(dialog, "Option1(2)").click();
     typeInto(child<QLineEdit>(dialog, "txtTop"), "12.5");
     child<QLineEdit>(dialog, "txtFormat(1)").setText("  页眉 & [Page #]  ");
-    press(dialog, "cmdFooterFont");
+    enterFont(dialog, "cmdFooterFont", blueArial());
     press(dialog, "cmdOk");
     std::string expected = before;
     const auto change = [&expected](const std::string& from, const std::string& to) {
@@ -529,19 +556,16 @@ TEST_F(PageSetupDialogTest, OpensTheFieldsByTheButtonAndByTheRightButton)
 TEST_F(PageSetupDialogTest, TakesTheFontThatWasChosenAndNoneThatWasCancelled)
 {
     PageSetupDialog dialog(services());
-    dialog.useFontDialog(cancelFont);
-    press(dialog, "cmdHeaderFont");
+    pressAndAnswer<FontChooser>(dialog, "cmdHeaderFont", Escape);
     EXPECT_EQ(boxText(dialog, "txtHeaderFont"), "9 pt. 宋体");
-    FontAnswer fonts { .answer = blueArial() };
-    dialog.useFontDialog(fonts.chooser());
-    press(dialog, "cmdHeaderFont");
-    EXPECT_EQ(fonts.preset.font.name, u"宋体");
+    EXPECT_EQ(enterFont(dialog, "cmdHeaderFont", blueArial()).font.name, u"宋体");
     EXPECT_EQ(boxText(dialog, "txtHeaderFont"), "10.5 pt. Arial [ Bold Underline ]");
     EXPECT_EQ(boxText(dialog, "txtFooterFont"), "9 pt. 宋体");
     EXPECT_EQ(child<QLineEdit>(dialog, "txtHeaderFont").palette().color(QPalette::Text),
         QColor(0, 0, 255));
-    fonts.answer.font.name.clear();
-    press(dialog, "cmdHeaderFont");
+    ColoredFont nameless = blueArial();
+    nameless.font.name.clear();
+    enterFont(dialog, "cmdHeaderFont", nameless);
     EXPECT_EQ(boxText(dialog, "txtHeaderFont"), "10.5 pt. 宋体 [ Bold Underline ]");
 }
 
@@ -741,19 +765,15 @@ TEST_F(GridStyleDialogTest, ClicksOnHeadersGoOnAndOffAndLeaveAGreyBoxAtTwo)
 TEST_F(GridStyleDialogTest, CancelLeavesTheFileAndOkWritesColours)
 {
     const std::string before = file();
-    const auto red = [](QWidget*, const QColor&) { return std::optional(QColor(255, 16, 0)); };
+    const QColor red(255, 16, 0);
     GridStyleDialog cancelled(services());
-    child<ColorPicker>(cancelled, "clrGrid").useDialog(red);
-    press(cancelled, "clrGrid");
+    pickColor(cancelled, "clrGrid", red);
     press(cancelled, "cmdCancel");
     EXPECT_EQ(file(), before);
     EXPECT_FALSE(cancelled.saved());
     GridStyleDialog dialog(services());
-    auto& picker = child<ColorPicker>(dialog, "clrGrid");
-    picker.useDialog(red);
-    press(dialog, "clrGrid");
-    picker.useDialog([](QWidget*, const QColor&) { return std::optional<QColor>(); });
-    press(dialog, "clrGrid");
+    pickColor(dialog, "clrGrid", red);
+    pressAndAnswer<QColorDialog>(dialog, "clrGrid", Escape);
     press(dialog, "cmdOk");
     EXPECT_EQ(dialog.saved(), SaveOutcome::Written);
     EXPECT_EQ(setting(u"GridLineColor"), "4351");
@@ -763,10 +783,7 @@ TEST_F(GridStyleDialogTest, CancelLeavesTheFileAndOkWritesColours)
 TEST_F(GridStyleDialogTest, ChangesTheFontOfTheChosenRowOnly)
 {
     GridStyleDialog dialog(services());
-    FontAnswer fonts { .answer = blueArial() };
-    dialog.useFontDialog(fonts.chooser());
-    press(dialog, "cmdFont");
-    EXPECT_EQ(fonts.opened, 0);
+    press(dialog, "cmdFont"); // opens nothing
     const std::vector<Message> shown = messages.take();
     ASSERT_EQ(shown.size(), 1U);
     EXPECT_EQ(shown.front().text, u"请选择一项进行设置");
@@ -775,13 +792,11 @@ TEST_F(GridStyleDialogTest, ChangesTheFontOfTheChosenRowOnly)
     showTab(dialog, 2);
     auto& list = child<QTreeWidget>(dialog, "ListView1");
     clickRow(list, 1);
-    press(dialog, "cmdFont");
-    EXPECT_EQ(fonts.opened, 1);
+    enterFont(dialog, "cmdFont", blueArial());
     EXPECT_EQ(list.topLevelItem(1)->text(1), "10.5 pt. Arial [ Bold Underline ]");
     EXPECT_EQ(list.topLevelItem(0)->text(1), QStringLiteral("9 pt. 宋体"));
-    dialog.useFontDialog(cancelFont);
     clickRow(list, 0);
-    press(dialog, "cmdFont");
+    pressAndAnswer<FontChooser>(dialog, "cmdFont", Escape);
     EXPECT_EQ(list.topLevelItem(0)->text(1), QStringLiteral("9 pt. 宋体"));
     press(dialog, "cmdOk");
     EXPECT_EQ(setting(u"HeaderFontName"), "Arial");
@@ -1139,10 +1154,7 @@ TEST(FontChooser, TakesAFaceASizeStylesAndAColour)
     typeInto(*child<QComboBox>(chooser, "cboFace").lineEdit(), "Nowhere Sans");
     typeInto(*child<QComboBox>(chooser, "cboSize").lineEdit(), "12.5");
     child<QCheckBox>(chooser, "chkUnderline").click();
-    child<ColorPicker>(chooser, "clrFont").useDialog([](QWidget*, const QColor&) {
-        return std::optional(QColor(1, 2, 3));
-    });
-    press(chooser, "clrFont");
+    pickColor(chooser, "clrFont", QColor(1, 2, 3));
     const ColoredFont chosen = chooser.chosen();
     EXPECT_EQ(chosen.font.name, u"Nowhere Sans");
     EXPECT_EQ(chosen.font.size, 12.5F);
