@@ -37,6 +37,7 @@ constexpr auto Options = std::to_array<Option>({
     { "delimiter", "CHAR", phraseText(u"between the values of a CSV file, or tab; else found out"),
         true },
     { "no-quote", nullptr, phraseText(u"a quote in a CSV file is a character like any other") },
+    { "hidden", nullptr, phraseText(u"hidden rows and columns of an office sheet, too") },
 });
 
 /// The name that stands for the standard input.
@@ -197,6 +198,40 @@ TableGrid readValues(
     return grid;
 }
 
+QString rowsOf(std::int64_t count)
+{
+    return count == 1 ? qt::phrased(u"1 hidden row") : qt::phrased(u"%1 hidden rows").arg(count);
+}
+
+QString columnsOf(std::int64_t count)
+{
+    return count == 1 ? qt::phrased(u"1 hidden column")
+                      : qt::phrased(u"%1 hidden columns").arg(count);
+}
+
+void tellLeftOut(const qt::HiddenCount& left, const QString& shown)
+{
+    if (left == qt::HiddenCount())
+        return;
+    const QString what = left.rows == 0 ? columnsOf(left.columns)
+        : left.columns == 0
+        ? rowsOf(left.rows)
+        : qt::phrased(u"%1 and %2").arg(rowsOf(left.rows), columnsOf(left.columns));
+    note(qt::phrased(u"%1: left out are %2; --hidden takes them, too").arg(shown, what));
+}
+
+/// @param shown  what the file is called in warnings
+TableGrid readSheet(const DatabaseName& name, const QString& shown, const CommandLine& line)
+{
+    qt::HiddenCount left;
+    TableGrid grid = qt::readOffice({ .path = pathOf(name.file),
+        .sheet = name.table,
+        .takesHidden = line.has("hidden"),
+        .leftOut = &left });
+    tellLeftOut(left, shown);
+    return grid;
+}
+
 } // namespace
 
 void checkReadable(const QString& name)
@@ -273,8 +308,7 @@ TableGrid readTable(const QString& file, const CommandLine& line, ProgressLine& 
                 { shown, name.table }));
     try {
         if (isOffice)
-            return selected(
-                qt::readOffice({ .path = pathOf(name.file), .sheet = name.table }), line);
+            return selected(readSheet(name, shown, line), line);
         return selected(isFromDatabase ? readDatabase(name, line, progress)
                                        : readValues(name.file, shown, line, progress),
             line);

@@ -19,7 +19,7 @@ struct TableColumn {
     Text title;
     Twips width = 0; ///< -1: the default width, which a reader replaces on the grid
     CellAlignment alignment = CellAlignment::Left; ///< of the title, where cells have looks
-    /// Where cells have looks: how wide the column is shown; 0: it is hidden; nothing: not known.
+    /// Where cells have looks: how wide the column is shown; nothing: not known.
     std::optional<Twips> shownWidth {};
 };
 

@@ -91,6 +91,13 @@ private:
         return {};
     }
 
+    /// Whether the rows or columns that begin here are hidden, by hand or by a filter.
+    bool isHidden() const
+    {
+        const QString visibility = attribute(xml_, "visibility");
+        return !visibility.isEmpty() && visibility != QLatin1String("visible");
+    }
+
     /// Columns of one style, and what their cells look like that name none.
     void readColumns()
     {
@@ -101,10 +108,9 @@ private:
             cells_.fillBlanks(
                 { 0, columnCount_, SheetCells::MostRows, count }, looks_.value(style));
         const auto width = widths_.constFind(attribute(xml_, "style-name"));
-        const QString visibility = attribute(xml_, "visibility");
-        if (!visibility.isEmpty() && visibility != QLatin1String("visible"))
-            cells_.setWidth(columnCount_, count, 0);
-        else if (width != widths_.constEnd())
+        if (isHidden())
+            cells_.hiddenColumns().hide(columnCount_, count);
+        if (width != widths_.constEnd())
             cells_.setWidth(columnCount_, count, *width);
         columnCount_ += count;
     }
@@ -121,6 +127,8 @@ private:
     std::int64_t readRow(std::int64_t row)
     {
         const std::int64_t rows = repeated(xml_, "number-rows-repeated");
+        if (isHidden())
+            cells_.hiddenRows().hide(row, rows);
         std::int64_t column = 0;
         std::int64_t end = 0; ///< of what is filled
         std::int64_t characters = 0;

@@ -8,7 +8,6 @@
 #include "platform/qt/file_names.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
-#include "tables/qt/sheet_cells.h"
 #include "tables/qt/zip_entries.h"
 
 #include <QFileInfo>
@@ -98,8 +97,11 @@ TableGrid readOffice(const OfficeSource& source)
     const bool isOld = startOf(source.path) == OldOfficeMark;
     const std::filesystem::path path = isOld ? converted(source.path, folder) : source.path;
     const ZipEntries file(path);
-    const SheetCells cells = file.has("content.xml") ? readOdsSheet(file, source.sheet)
-                                                     : readXlsxSheet(file, source.sheet);
+    SheetCells cells = file.has("content.xml") ? readOdsSheet(file, source.sheet)
+                                               : readXlsxSheet(file, source.sheet);
+    const HiddenCount hidden = source.takesHidden ? HiddenCount() : cells.leaveOutHidden();
+    if (source.leftOut != nullptr)
+        *source.leftOut = hidden;
     return cells.toTable();
 }
 

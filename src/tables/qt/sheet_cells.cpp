@@ -101,6 +101,56 @@ private:
     std::int64_t mostChecked_;
 };
 
+/// Where a row or column stands once the hidden ones are left out.
+/// @param places  as `HiddenLines` has them
+std::int64_t placeOf(std::span<const std::int32_t> places, std::int64_t at)
+{
+    return places.empty() ? at
+                          : places[static_cast<std::size_t>(std::min(at, std::ssize(places) - 1))];
+}
+
+bool isHidden(std::span<const std::int32_t> places, std::int64_t at)
+{
+    return !places.empty() && placeOf(places, at + 1) == placeOf(places, at);
+}
+
+/// The first of some lines that is not hidden; -1: all are.
+std::int64_t firstShown(
+    std::span<const std::int32_t> places, std::int64_t first, std::int64_t count)
+{
+    if (places.empty())
+        return first;
+    const std::int64_t end = std::min(first + count, std::ssize(places) - 1);
+    if (first >= end || placeOf(places, end) == placeOf(places, first))
+        return -1;
+    const auto after = std::upper_bound(
+        places.begin() + first, places.begin() + end + 1, placeOf(places, first));
+    return after - places.begin() - 1;
+}
+
+SheetArea shownPart(const SheetArea& area, std::span<const std::int32_t> rows,
+    std::span<const std::int32_t> columns)
+{
+    SheetArea part { placeOf(rows, area.row), placeOf(columns, area.column) };
+    part.rows = placeOf(rows, area.row + area.rows) - part.row;
+    part.columns = placeOf(columns, area.column + area.columns) - part.column;
+    return part;
+}
+
+template <typename Line>
+void closeGaps(std::span<const std::int32_t> places, std::vector<Line>& lines)
+{
+    std::size_t kept = 0;
+    for (std::size_t at = 0; at < lines.size(); ++at) {
+        if (isHidden(places, static_cast<std::int64_t>(at)))
+            continue;
+        if (kept != at)
+            lines[kept] = std::move(lines[at]);
+        ++kept;
+    }
+    lines.resize(kept);
+}
+
 } // namespace
 
 Color colorNumber(const QColor& color) { return rgb(color.red(), color.green(), color.blue()); }
@@ -174,6 +224,105 @@ void SheetCells::merge(const SheetArea& area)
 {
     if (area.rows > 1 || area.columns > 1)
         boxes_.push_back(area);
+}
+
+void HiddenLines::hide(std::int64_t first, std::int64_t count)
+{
+    const std::int64_t end = std::min(first + count, most_);
+    if (first < 0 || first >= end)
+        return;
+    if (changes_.empty())
+        changes_.resize(static_cast<std::size_t>(most_) + 1);
+    ++changes_[static_cast<std::size_t>(first)];
+    --changes_[static_cast<std::size_t>(end)];
+}
+
+std::vector<std::int32_t> HiddenLines::places() const
+{
+    std::vector<std::int32_t> places;
+    places.reserve(changes_.size());
+    std::int32_t shown = 0;
+    std::int32_t hiding = 0;
+    for (const std::int32_t change : changes_) {
+        places.push_back(shown);
+        hiding += change;
+        shown += hiding == 0 ? 1 : 0;
+    }
+    return places;
+}
+
+/// What a box shows goes to the first of its cells that is not hidden.
+void SheetCells::moveBoxTexts(
+    std::span<const std::int32_t> rows, std::span<const std::int32_t> columns)
+{
+    for (const SheetArea& box : boxes_) {
+        const std::int64_t row = firstShown(rows, box.row, box.rows);
+        const std::int64_t column = firstShown(columns, box.column, box.columns);
+        if (row < 0 || column < 0 || (row == box.row && column == box.column)
+            || box.row >= std::ssize(rows_))
+            continue;
+        const std::vector<Cell>& from = rows_[static_cast<std::size_t>(box.row)];
+        if (box.column >= std::ssize(from))
+            continue;
+        Cell shown = from[static_cast<std::size_t>(box.column)];
+        if (row >= std::ssize(rows_))
+            rows_.resize(static_cast<std::size_t>(row) + 1);
+        std::vector<Cell>& into = rows_[static_cast<std::size_t>(row)];
+        if (const std::int64_t more = column + 1 - std::ssize(into); more > 0) {
+            requireRoom(more, 0);
+            into.resize(static_cast<std::size_t>(column) + 1);
+            cells_ += more;
+        }
+        into[static_cast<std::size_t>(column)] = std::move(shown);
+    }
+}
+
+/// How many of the hidden lines hold texts.
+HiddenCount SheetCells::countHidden(
+    std::span<const std::int32_t> rows, std::span<const std::int32_t> columns) const
+{
+    HiddenCount count;
+    std::vector<bool> isFilled(columns.size());
+    for (std::int64_t row = 0; row < std::ssize(rows_); ++row) {
+        bool isRowFilled = false;
+        std::int64_t column = 0;
+        for (const Cell& cell : rows_[static_cast<std::size_t>(row)]) {
+            if (!cell.text.empty() && isHidden(columns, column))
+                isFilled[static_cast<std::size_t>(column)] = true;
+            isRowFilled = isRowFilled || !cell.text.empty();
+            ++column;
+        }
+        count.rows += isRowFilled && isHidden(rows, row) ? 1 : 0;
+    }
+    count.columns = std::ranges::count(isFilled, true);
+    return count;
+}
+
+HiddenCount SheetCells::leaveOutHidden()
+{
+    const std::vector<std::int32_t> rows = hiddenRows_.places();
+    const std::vector<std::int32_t> columns = hiddenColumns_.places();
+    const HiddenCount count = countHidden(rows, columns);
+    moveBoxTexts(rows, columns);
+    closeGaps(rows, rows_);
+    for (std::vector<Cell>& row : rows_)
+        closeGaps(columns, row);
+    for (Blanks& blanks : blanks_)
+        blanks.area = shownPart(blanks.area, rows, columns);
+    for (SheetArea& box : boxes_)
+        box = shownPart(box, rows, columns);
+    std::erase_if(boxes_, [](const SheetArea& box) { return box.rows * box.columns <= 1; });
+    for (Width& width : widths_) {
+        const SheetArea part = shownPart({ 0, width.column, 1, width.columns }, {}, columns);
+        width = { part.column, part.columns, width.width };
+    }
+    const auto isBlank = [](const std::vector<Cell>& row) {
+        return std::ranges::all_of(row, [](const Cell& cell) { return cell.text.empty(); });
+    };
+    if (count != HiddenCount() && std::ranges::all_of(rows_, isBlank))
+        throw RunTimeError(
+            ErrorNumber::TypeMismatch, phrase(u"all that the sheet holds is hidden"));
+    return count;
 }
 
 void SheetCells::setWidth(std::int64_t column, std::int64_t columns, Twips width)

@@ -8,6 +8,7 @@
 #include <QString>
 
 #include <cstdint>
+#include <span>
 #include <vector>
 
 class QColor;
@@ -40,6 +41,35 @@ struct SheetArea {
     bool isEmpty() const { return rows <= 0 || columns <= 0; }
 };
 
+/// How many rows and columns that hold anything a sheet hides.
+struct HiddenCount {
+    std::int64_t rows = 0;
+    std::int64_t columns = 0;
+
+    bool operator==(const HiddenCount&) const = default;
+};
+
+/// The rows or the columns of a sheet, some of which are hidden: from 0.
+class HiddenLines {
+public:
+    /// @param most  how many the sheet has
+    explicit HiddenLines(std::int64_t most)
+        : most_(most)
+    {
+    }
+
+    /// What lies past the end of the sheet is passed over.
+    void hide(std::int64_t first, std::int64_t count);
+
+    /// Where each one stands once the hidden ones are left out, and one more for the end; where a
+    /// hidden one stood, the next one that is shown does. Empty: none is hidden.
+    std::vector<std::int32_t> places() const;
+
+private:
+    std::int64_t most_;
+    std::vector<std::int32_t> changes_; ///< of how many areas hide a line, to the one before
+};
+
 /// The cells of a sheet of an office file, as they look.
 class SheetCells {
 public:
@@ -64,8 +94,18 @@ public:
     /// Makes one box of cells, which shows its first one.
     void merge(const SheetArea& area);
 
-    /// Says how wide columns are: twips; 0: they are hidden.
+    /// Says how wide columns are: twips.
     void setWidth(std::int64_t column, std::int64_t columns, Twips width);
+
+    /// The rows and columns that the sheet hides.
+    HiddenLines& hiddenRows() { return hiddenRows_; }
+    HiddenLines& hiddenColumns() { return hiddenColumns_; }
+
+    /// Closes the gaps that hidden rows and columns leave. A box shows its first cell even where
+    /// that one is hidden.
+    /// @return  how many of those that hold texts were left out
+    /// @throws RunTimeError TypeMismatch: nothing is left
+    HiddenCount leaveOutHidden();
 
     /// A table of the part of the sheet that holds texts; its first row has the titles.
     /// @throws RunTimeError TypeMismatch: the sheet is empty
@@ -91,6 +131,9 @@ private:
 
     std::uint16_t numberOf(const CellLook& look);
     SheetArea filledArea() const;
+    HiddenCount countHidden(
+        std::span<const std::int32_t> rows, std::span<const std::int32_t> columns) const;
+    void moveBoxTexts(std::span<const std::int32_t> rows, std::span<const std::int32_t> columns);
     std::vector<TableColumn> columnsOf(const SheetArea& area) const;
 
     std::vector<std::vector<Cell>> rows_;
@@ -98,6 +141,8 @@ private:
     std::vector<Blanks> blanks_; ///< later ones lie above earlier ones
     std::vector<SheetArea> boxes_;
     std::vector<Width> widths_;
+    HiddenLines hiddenRows_ { MostRows };
+    HiddenLines hiddenColumns_ { MostColumns };
     std::int64_t cells_ = 0;
     std::int64_t characters_ = 0;
 };

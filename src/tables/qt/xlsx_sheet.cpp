@@ -176,6 +176,8 @@ public:
                 const std::int64_t row
                     = number.isEmpty() ? next_.row + 1 : std::max(number.toLongLong(), 0LL) - 1;
                 next_ = { std::min(row, SheetCells::MostRows), 0 };
+                if (isOn(xml, "hidden"))
+                    cells_.hiddenRows().hide(next_.row, 1);
                 fillFrom(xml, "s", { next_.row, 0, 1, SheetCells::MostColumns });
             } else if (xml.name() == QLatin1String("c")) {
                 readCell(xml);
@@ -222,8 +224,8 @@ private:
         bool isNumber = false;
         const double width = attribute(xml, "width").toDouble(&isNumber);
         if (isOn(xml, "hidden"))
-            cells_.setWidth(first, last - first + 1, 0);
-        else if (isNumber && width > 0 && width <= WidestColumn)
+            cells_.hiddenColumns().hide(first, last - first + 1);
+        if (isNumber && width > 0 && width <= WidestColumn)
             cells_.setWidth(first, last - first + 1, twipsOfDigits(width));
     }
 

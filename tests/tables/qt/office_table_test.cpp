@@ -22,10 +22,10 @@ std::filesystem::path sample(const char* name)
 }
 
 /// "title|title|/cell|cell|": what reading gives, or the error's text.
-std::string read(const std::filesystem::path& path, const QString& sheet = {})
+std::string read(const OfficeSource& source)
 {
     try {
-        const TableGrid grid = readOffice({ .path = path, .sheet = sheet });
+        const TableGrid grid = readOffice(source);
         Text text;
         for (int column = 0; column < grid.columnCount(); ++column)
             text.append(grid.column(column).title).append(u"|");
@@ -38,6 +38,11 @@ std::string read(const std::filesystem::path& path, const QString& sheet = {})
     } catch (const RunTimeError& error) {
         return toUtf8(error.text());
     }
+}
+
+std::string read(const std::filesystem::path& path, const QString& sheet = {})
+{
+    return read(OfficeSource { .path = path, .sheet = sheet });
 }
 
 /// Makes an archive of files, by name and content.
@@ -211,11 +216,12 @@ TEST(OfficeTable, TakesColoursOfEmptyCellsMergedCellsAndWidthsOfExcelSheets)
                 "<row r='1000000'><c r='B1000000' s='1'/></row></sheetData>"
                 "<mergeCells><mergeCell ref='A3:A4'/><mergeCell ref='A4:B5'/>"
                 "<mergeCell ref='C5:XFD1048576'/></mergeCells></worksheet>" } });
-    EXPECT_EQ(read(file), "A|B|C|D|/box||||/||c||/end||||");
-    TableGrid grid = readOffice({ .path = file, .sheet = {} });
+    const OfficeSource whole { .path = file, .takesHidden = true };
+    EXPECT_EQ(read(whole), "A|B|C|D|/box||||/||c||/end||||");
+    TableGrid grid = readOffice(whole);
     EXPECT_EQ(grid.column(0).shownWidth, std::optional<Twips>(1125)); // 75 pixels
     EXPECT_EQ(grid.column(1).shownWidth, std::nullopt);
-    EXPECT_EQ(grid.column(2).shownWidth, std::optional<Twips>(0));
+    EXPECT_EQ(grid.column(2).shownWidth, std::optional<Twips>(945));
     EXPECT_EQ(backgroundsOf(grid), "- g g b / - g - - / - - - - ");
     EXPECT_EQ(boxesOf(grid), "1-2,0-0 / 3-3,2-3 ");
 }
@@ -259,13 +265,93 @@ TEST(OfficeTable, TakesColoursOfEmptyCellsMergedCellsAndWidthsOfOpenDocumentShee
                       "<table:table-cell table:style-name='g' "
                       "table:number-columns-repeated='16384'/></table:table-row>"
                       "</table:table></o:d>" } });
-    EXPECT_EQ(read(file), "x|x|x|/x|||/|||/||x|");
-    TableGrid grid = readOffice({ .path = file, .sheet = {} });
+    const OfficeSource whole { .path = file, .takesHidden = true };
+    EXPECT_EQ(read(whole), "x|x|x|/x|||/|||/||x|");
+    TableGrid grid = readOffice(whole);
     EXPECT_EQ(grid.column(0).shownWidth, std::optional<Twips>(1440));
-    EXPECT_EQ(grid.column(1).shownWidth, std::optional<Twips>(0));
+    EXPECT_EQ(grid.column(1).shownWidth, std::optional<Twips>(1440));
     EXPECT_EQ(grid.column(2).shownWidth, std::nullopt);
     EXPECT_EQ(backgroundsOf(grid), "- - b / - - g / g g b ");
     EXPECT_EQ(boxesOf(grid), "1-2,0-1 ");
+}
+
+TEST(OfficeTable, LeavesOutWhatExcelSheetsHideAndCountsIt)
+{
+    const TempFolder folder;
+    const auto cell = [](const std::string& place, const std::string& text) {
+        return "<c r='" + place + "' s='1' t='str'><v>" + text + "</v></c>";
+    };
+    const auto file = zipped(folder.file("hidden.xlsx"),
+        { { "xl/workbook.xml",
+              "<workbook xmlns:r='r'><sheets><sheet name='S' r:id='1'/><sheet name='N' "
+              "r:id='2'/></sheets></workbook>" },
+            { "xl/_rels/workbook.xml.rels",
+                "<Relationships><Relationship Id='1' Target='s.xml'/><Relationship Id='2' "
+                "Target='n.xml'/></Relationships>" },
+            { "xl/styles.xml",
+                "<styleSheet><fonts><font/></fonts><fills><fill/><fill><patternFill "
+                "patternType='solid'><fgColor rgb='FF00FF00'/></patternFill></fill></fills>"
+                "<cellXfs><xf fontId='0' fillId='0'/><xf fontId='0' fillId='1'/></cellXfs>"
+                "</styleSheet>" },
+            { "xl/n.xml",
+                "<worksheet><sheetData><row r='1' hidden='1'>" + cell("A1", "x")
+                    + "</row></sheetData></worksheet>" },
+            { "xl/s.xml",
+                "<worksheet><cols><col min='1' max='1' width='10'/>"
+                "<col min='2' max='2' width='9' hidden='1'/><col min='3' max='3' width='20'/>"
+                "<col min='16384' max='16384' hidden='1'/></cols><sheetData>"
+                "<row r='1' hidden='1'>"
+                    + cell("A1", "made by us") + "</row><row r='2'>" + cell("A2", "Name")
+                    + cell("B2", "Key") + cell("C2", "Price") + cell("D2", "Note")
+                    + "</row><row r='3'>" + cell("A3", "bolt") + cell("B3", "1") + cell("C3", "5")
+                    + "</row><row r='4' hidden='1'>" + cell("A4", "screw") + cell("C4", "box")
+                    + "</row><row r='5'>" + cell("A5", "nut") + "<c r='C5'/>" + cell("D5", "end")
+                    + "</row><row r='6'>" + cell("A6", "nail")
+                    + "</row><row r='7' hidden='1'/>"
+                      "</sheetData><mergeCells><mergeCell ref='C4:C6'/><mergeCell ref='A3:B3'/>"
+                      "</mergeCells></worksheet>" } });
+    HiddenCount left;
+    const OfficeSource source { .path = file, .leftOut = &left };
+    EXPECT_EQ(read(source), "Name|Price|Note|/bolt|5||/nut|box|end|/nail|||");
+    EXPECT_EQ(left, (HiddenCount { .rows = 2, .columns = 1 }));
+    TableGrid grid = readOffice(source);
+    EXPECT_EQ(grid.column(0).shownWidth, std::optional<Twips>(1050));
+    EXPECT_EQ(grid.column(1).shownWidth, std::optional<Twips>(2100));
+    EXPECT_EQ(grid.column(2).shownWidth, std::nullopt);
+    EXPECT_EQ(boxesOf(grid), "2-3,1-1 ");
+    EXPECT_EQ(backgroundsOf(grid), "g g - / g g g / g g - ");
+    EXPECT_EQ(read({ .path = file, .takesHidden = true, .leftOut = &left }),
+        "made by us||||/Name|Key|Price|Note|/bolt|1|5||/screw||box||/nut|||end|/nail||||");
+    EXPECT_EQ(left, HiddenCount());
+    EXPECT_EQ(read(file, QStringLiteral("N")), "Type mismatch: all that the sheet holds is hidden");
+}
+
+TEST(OfficeTable, LeavesOutWhatOpenDocumentSheetsHideAndCountsIt)
+{
+    const TempFolder folder;
+    const auto cell = [](const std::string& text) {
+        return "<table:table-cell><text:p>" + text + "</text:p></table:table-cell>";
+    };
+    const auto file = zipped(folder.file("hidden.ods"),
+        { { "mimetype", "application/vnd.oasis.opendocument.spreadsheet" },
+            { "content.xml",
+                "<o:d xmlns:o='o' xmlns:table='t' xmlns:text='x'><table:table table:name='S'>"
+                "<table:table-column/><table:table-column table:visibility='collapse'/>"
+                "<table:table-column/>"
+                "<table:table-row>"
+                    + cell("Name") + cell("Key") + cell("Price")
+                    + "</table:table-row><table:table-row table:visibility='filter' "
+                      "table:number-rows-repeated='3'>"
+                    + cell("screw") + "</table:table-row><table:table-row>" + cell("nut")
+                    + cell("2") + cell("7")
+                    + "</table:table-row><table:table-row table:visibility='collapse' "
+                      "table:number-rows-repeated='1048571'><table:table-cell/>"
+                      "</table:table-row></table:table></o:d>" } });
+    HiddenCount left;
+    EXPECT_EQ(read({ .path = file, .leftOut = &left }), "Name|Price|/nut|7|");
+    EXPECT_EQ(left, (HiddenCount { .rows = 3, .columns = 1 }));
+    EXPECT_EQ(read({ .path = file, .takesHidden = true }),
+        "Name|Key|Price|/screw|||/screw|||/screw|||/nut|2|7|");
 }
 
 TEST(OfficeTable, RefusesAtOnceMoreThanFitsHoweverFewBytesSayIt)
