@@ -91,7 +91,8 @@ QString previewDetails()
                        u"db.sqlite with\n"
                        u"--query). Pages look as your settings say, which the window's dialogs\n"
                        u"change; --defaults does without them. With one of the options for\n"
-                       u"headers, paper and so on, what the dialogs change is not kept.\n");
+                       u"headers, paper and so on, what the dialogs change is not kept.\n")
+        + namesDetails();
 }
 
 OptionTables previewOptions()

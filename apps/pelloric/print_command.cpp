@@ -196,7 +196,8 @@ QString printDetails()
 {
     return fileDetails()
         + qt::phrased(
-            u"Every page is a job of its own, one-sided, on the paper it was laid out for.\n");
+            u"Every page is a job of its own, one-sided, on the paper it was laid out for.\n")
+        + namesDetails();
 }
 
 OptionTables printOptions()

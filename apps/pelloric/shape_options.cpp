@@ -4,6 +4,7 @@
 #include "shape_options.h"
 
 #include "document/limits.h"
+#include "platform/name_list.h"
 #include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 
@@ -54,14 +55,13 @@ constexpr auto Functions = std::to_array<FunctionName>({
     { "max", AggregateFunction::Maximum },
 });
 
-/// The items of an option's list, between commas; empty when it was not given.
+/// The names of an option's list; none when it was not given.
 /// @throws CommandError WrongUsage: the list holds only commas
-QStringList itemsOf(const CommandLine& line, const char* option)
+std::vector<ListedName> itemsOf(const CommandLine& line, const char* option)
 {
-    QStringList items;
-    for (const QString& item : line.value(option).split(QLatin1Char(','), Qt::SkipEmptyParts))
-        items.append(item.trimmed());
-    if (items.isEmpty() && line.has(option))
+    std::vector<ListedName> items = listedNames(qt::toText(line.value(option)));
+    std::erase_if(items, [](const ListedName& item) { return item.whole().empty(); });
+    if (items.empty() && line.has(option))
         throw CommandError(qt::phrased(u"--%1 names no column, only \"%2\"",
                                { QLatin1String(option), line.value(option) }),
             WrongUsage);
@@ -71,13 +71,14 @@ QStringList itemsOf(const CommandLine& line, const char* option)
 std::vector<Text> namesOf(const CommandLine& line, const char* option)
 {
     std::vector<Text> names;
-    for (const QString& name : itemsOf(line, option))
-        names.push_back(qt::toText(name));
+    for (const ListedName& name : itemsOf(line, option))
+        names.push_back(name.whole());
     return names;
 }
 
-Aggregation totalOf(const QString& text)
+Aggregation totalOf(const ListedName& listed)
 {
+    const QString text = qt::toQString(listed.whole());
     const auto colon = text.indexOf(QLatin1Char(':'));
     const QString name = text.left(colon).trimmed();
     for (const FunctionName& row : Functions) {
@@ -178,7 +179,7 @@ ReportOptions shapeOf(const CommandLine& line)
         options.pageOrder = PageOrder::DownThenAcross;
     options.groupColumns = namesOf(line, "group");
     options.keepsGroups = !options.groupColumns.empty();
-    for (const QString& total : itemsOf(line, "total"))
+    for (const ListedName& total : itemsOf(line, "total"))
         options.totals.push_back(totalOf(total));
     takePictures(line, options);
     return options;

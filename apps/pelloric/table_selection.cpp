@@ -3,6 +3,7 @@
 
 #include "table_selection.h"
 
+#include "platform/name_list.h"
 #include "platform/qt/qt_phrase.h"
 #include "platform/qt/qt_text.h"
 #include "report/shown_number.h"
@@ -29,24 +30,6 @@ constexpr auto Options = std::to_array<Option>({
         phraseText(u"only these rows, from 1, after sorting; 100- and -100 work, too") },
 });
 
-/// The parts of a list with commas; a part in double quotes may hold commas itself.
-QStringList partsOf(const QString& list)
-{
-    QStringList parts { QString() };
-    bool isQuoted = false;
-    for (const QChar character : list) {
-        if (character == QLatin1Char('"'))
-            isQuoted = !isQuoted;
-        else if (character == QLatin1Char(',') && !isQuoted)
-            parts.append(QString());
-        else
-            parts.back().append(character);
-    }
-    for (QString& part : parts)
-        part = part.trimmed();
-    return parts;
-}
-
 QStringList titlesOf(const TableGrid& table)
 {
     QStringList titles;
@@ -56,11 +39,12 @@ QStringList titlesOf(const TableGrid& table)
 }
 
 /// The first column of a title, whatever its letter case where no other has it exactly.
-int columnNamed(const QString& name, const QStringList& titles, const char* option)
+/// @param isQuoted  "#3" is that title, not the third column
+int columnNamed(const QString& name, bool isQuoted, const QStringList& titles, const char* option)
 {
     bool isNumber = false;
     const int number = name.startsWith(QLatin1Char('#')) ? name.mid(1).toInt(&isNumber) : 0;
-    if (isNumber && number >= 1 && number <= titles.size())
+    if (isNumber && !isQuoted && number >= 1 && number <= titles.size())
         return number - 1;
     const auto exact = titles.indexOf(name);
     if (exact >= 0)
@@ -70,7 +54,10 @@ int columnNamed(const QString& name, const QStringList& titles, const char* opti
             return column;
     }
     constexpr int MostTold = 20;
-    QString known = titles.mid(0, MostTold).join(QStringLiteral(", "));
+    std::vector<Text> told;
+    for (const QString& title : titles.mid(0, MostTold))
+        told.push_back(qt::toText(title));
+    QString known = qt::toQString(listOf(told));
     if (titles.size() > MostTold)
         known += QStringLiteral(", …");
     throw CommandError(qt::phrased(u"--%1: there is no column \"%2\"; the table has %3")
@@ -86,8 +73,9 @@ std::vector<int> columnsOf(const CommandLine& line, const QStringList& titles)
         std::iota(columns.begin(), columns.end(), 0);
         return columns;
     }
-    for (const QString& name : partsOf(line.value("columns")))
-        columns.push_back(columnNamed(name, titles, "columns"));
+    for (const ListedName& name : listedNames(qt::toText(line.value("columns"))))
+        columns.push_back(
+            columnNamed(qt::toQString(name.whole()), name.isQuoted, titles, "columns"));
     return columns;
 }
 
@@ -138,13 +126,15 @@ void sortBy(const TableGrid& table, int column, bool isDown, std::vector<std::in
 void sortRows(const TableGrid& table, const CommandLine& line, const QStringList& titles,
     std::vector<std::int64_t>& rows)
 {
-    QStringList names = partsOf(line.value("sort"));
+    std::vector<ListedName> names = listedNames(qt::toText(line.value("sort")));
     std::reverse(names.begin(), names.end());
-    for (QString name : names) {
-        const bool isDown = name.endsWith(QLatin1String(":desc"), Qt::CaseInsensitive);
-        if (isDown || name.endsWith(QLatin1String(":asc"), Qt::CaseInsensitive))
+    for (const ListedName& listed : names) {
+        QString name = qt::toQString(listed.whole());
+        const QString order = listed.isQuoted ? qt::toQString(listed.after) : name;
+        const bool isDown = order.endsWith(QLatin1String(":desc"), Qt::CaseInsensitive);
+        if (isDown || order.endsWith(QLatin1String(":asc"), Qt::CaseInsensitive))
             name.truncate(name.lastIndexOf(QLatin1Char(':')));
-        sortBy(table, columnNamed(name.trimmed(), titles, "sort"), isDown, rows);
+        sortBy(table, columnNamed(name.trimmed(), listed.isQuoted, titles, "sort"), isDown, rows);
     }
 }
 
@@ -223,6 +213,12 @@ std::vector<CellLook> movedLooks(const TableGrid& table, std::span<const std::in
 } // namespace
 
 OptionTable selectionOptions() { return Options; }
+
+QString namesDetails()
+{
+    return qt::phrased(u"A NAME that holds a comma stands in double quotes, as in a CSV file:\n"
+                       u"--columns 'Item,\"Price, net\"'.\n");
+}
 
 TableGrid selected(TableGrid table, const CommandLine& line)
 {

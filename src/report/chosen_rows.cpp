@@ -4,6 +4,7 @@
 #include "report/chosen_rows.h"
 
 #include "platform/cell_look.h"
+#include "platform/name_list.h"
 #include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
@@ -50,9 +51,7 @@ private:
 [[noreturn]] void refuseColumn(TextView name, std::span<const Text> titles)
 {
     constexpr std::size_t MostNames = 12;
-    Text names;
-    for (std::size_t at = 0; at < std::min(titles.size(), MostNames); ++at)
-        names.append(at > 0 ? u", " : u"").append(titles[at]);
+    Text names = listOf(titles.first(std::min(titles.size(), MostNames)));
     if (titles.size() > MostNames)
         names.append(u" …");
     throw RunTimeError(ErrorNumber::InvalidCall,

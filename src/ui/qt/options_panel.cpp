@@ -4,6 +4,7 @@
 #include "ui/qt/options_panel.h"
 
 #include "document/limits.h"
+#include "platform/name_list.h"
 #include "platform/qt/qt_text.h"
 #include "ui/qt/fit_text.h"
 #include "ui/qt/named_boxes.h"
@@ -38,28 +39,14 @@ constexpr int Percent = 100;
 
 enum FitChoice { FitOff, FitSheet, FitPages };
 
-std::vector<Text> namesOf(const QString& list)
-{
-    std::vector<Text> names;
-    for (const QString& name : list.split(QLatin1Char(','), Qt::SkipEmptyParts))
-        names.push_back(toText(name.trimmed()));
-    return names;
-}
-
-QString listOf(const std::vector<Text>& names)
-{
-    QStringList list;
-    for (const Text& name : names)
-        list.append(toQString(name));
-    return list.join(QStringLiteral(", "));
-}
+QString shownList(const std::vector<Text>& names) { return toQString(listOf(names)); }
 
 QString columnsOf(const std::vector<Aggregation>& totals)
 {
     std::vector<Text> names;
     for (const Aggregation& total : totals)
         names.push_back(total.column);
-    return listOf(names);
+    return shownList(names);
 }
 
 template <typename Part> Part* named(Part* part, const char* name)
@@ -274,8 +261,8 @@ void OptionsPanel::setOptions(const ReportOptions& options)
     lastRow_->setValue(options.lastRow > 0
             ? static_cast<int>(std::min<std::int64_t>(options.lastRow, MostRows))
             : FirstRange);
-    columns_->setText(listOf(options.columns));
-    groups_->setText(listOf(options.groupColumns));
+    columns_->setText(shownList(options.columns));
+    groups_->setText(shownList(options.groupColumns));
     keepsGroups_->setChecked(options.keepsGroups);
     totalFunction_->setCurrentIndex(
         options.totals.empty() ? 0 : static_cast<int>(options.totals.front().function));
@@ -313,8 +300,8 @@ void OptionsPanel::readContent(ReportOptions& options) const
         options.firstRow = firstRow_->value();
         options.lastRow = lastRow_->value();
     }
-    options.columns = namesOf(columns_->text());
-    options.groupColumns = namesOf(groups_->text());
+    options.columns = namesOf(toText(columns_->text()));
+    options.groupColumns = namesOf(toText(groups_->text()));
     options.keepsGroups = keepsGroups_->isChecked();
     const auto function = static_cast<AggregateFunction>(totalFunction_->currentIndex());
     const bool isKept = totals_->text() == columnsOf(kept_.totals)
@@ -322,7 +309,7 @@ void OptionsPanel::readContent(ReportOptions& options) const
     if (isKept)
         return;
     options.totals.clear();
-    for (Text& name : namesOf(totals_->text()))
+    for (Text& name : namesOf(toText(totals_->text())))
         options.totals.push_back({ std::move(name), function });
 }
 
