@@ -260,7 +260,19 @@ TEST(LiveView, HasTicksThatKeepTheirShareOfTheBoxAtEveryResolution)
     const Seen coarse = look(150);
     const Seen fine = look(600);
     EXPECT_NEAR(coarse.side, fine.side, 0.01);
-    EXPECT_NEAR(coarse.ink, fine.ink, 0.12); // the pens are a pixel wide
+    // Pens are a pixel wide, and that much every stroke is wider than its share: a frame of a 32nd,
+    // and strokes that rise 0.26 and 0.54 of the box, 0.16 wide, with a triangle in common where
+    // they meet.
+    const auto exactInk = [](double pixel) {
+        const double box = 1 - pixel;
+        const double hollow = 1 - 2 * (box / 32 + pixel);
+        const double stroke = 0.16 * box + pixel;
+        const double narrowing = 0.21 / 0.26 + 0.37 / 0.54; // of the triangle, as it rises
+        return 1 - hollow * hollow + (0.26 + 0.54) * box * stroke
+            - stroke * stroke / (2 * narrowing);
+    };
+    EXPECT_NEAR(coarse.ink, exactInk(1 / (coarse.side * 150)), 0.02);
+    EXPECT_NEAR(fine.ink, exactInk(1 / (fine.side * 600)), 0.02);
     EXPECT_NEAR(fine.tick, 0.16, 0.03);
     EXPECT_NEAR(coarse.tick, fine.tick, 0.06);
     EXPECT_NEAR(fine.frame, 1.0 / 32, 0.012);
