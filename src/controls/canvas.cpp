@@ -218,7 +218,7 @@ bool Canvas::rebuild(AutomationObject& grid, bool takeWidths, const Shape& earli
     const ViewState earlierView = view_;
     const RecorderState earlierState = recorder_.state();
     try {
-        layOut(table);
+        layOut(table, takeWidths);
     } catch (...) {
         document_ = std::move(earlierDocument);
         recorder_.restore(earlierState);
@@ -248,10 +248,19 @@ void Canvas::giveBack(const ViewState& view)
 }
 
 /// Style and paper are those of the beginning, whatever a host writes while messages run.
-void Canvas::layOut(GridTable& table)
+///
+/// A report that is laid out again starts from the paper as it lay before it was turned to fit, as
+/// the report may fit in another way by now.
+void Canvas::layOut(GridTable& table, bool isNew)
 {
     ReportStyle style = style_;
     PageSetup setup = page;
+    if (!isNew && turned_ && turned_->width == setup.myWidth && turned_->height == setup.myHeight) {
+        std::swap(setup.myWidth, setup.myHeight);
+        style.PagerOrientation = turned_->orientation;
+        setPrintableTenths(style, setup);
+    }
+    const std::int16_t orientation = style.PagerOrientation;
     const ReportOptions wanted = options;
     const CursorKeeper cursor(*table.rows);
     endArrangement(view_);
@@ -268,7 +277,11 @@ void Canvas::layOut(GridTable& table)
     fit_ = outcome.fit;
     printedRows_ = outcome.records;
     leftOut_ = std::move(outcome.leftOut);
-    if (!fit_.isTurned)
+    const bool wasTurned = setup.myWidth != page.myWidth || setup.myHeight != page.myHeight;
+    turned_.reset();
+    if (fit_.isTurned)
+        turned_ = { setup.myWidth, setup.myHeight, orientation };
+    if (!fit_.isTurned && !wasTurned)
         return;
     page.myWidth = setup.myWidth;
     page.myHeight = setup.myHeight;

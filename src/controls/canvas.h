@@ -228,6 +228,13 @@ private:
         ReportStyle style;
     };
 
+    /// A sheet that fitting a report has turned, and how the paper lay before.
+    struct TurnedSheet {
+        std::int32_t width = 0; ///< twips, as turned
+        std::int32_t height = 0;
+        std::int16_t orientation = 0; ///< of the paper before
+    };
+
     void showProgress(std::int64_t done, std::int64_t total);
     void endProgress();
 
@@ -235,7 +242,7 @@ private:
     bool rebuild(AutomationObject& grid, bool takeWidths, const Shape& earlier);
     void giveBack(const Shape& shape);
     void giveBack(const ViewState& view);
-    void layOut(GridTable& table);
+    void layOut(GridTable& table, bool isNew);
     void showFirstPage();
     void scaleReport(double factor);
     using Notification = void (CanvasObserver::*)();
@@ -256,6 +263,7 @@ private:
     Text openedName_; ///< of the file that the document was opened from
     double titleTop_ = 0;
     FitResult fit_;
+    std::optional<TurnedSheet> turned_; ///< nothing: the paper lies as it was chosen
     std::int64_t printedRows_ = 0;
     std::vector<LeftOut> leftOut_;
     std::uint32_t documentNumber_ = 0;

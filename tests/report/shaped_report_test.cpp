@@ -4,6 +4,7 @@
 #include "report/shaped_report.h"
 
 #include "platform/cell_look.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 #include "support/errors.h"
 #include "support/recorded_pages.h"
@@ -362,6 +363,38 @@ TEST_F(ShapedReportTest, BringsATableOntoTheSheetByTheFirstRuleThatDoes)
     }
 }
 
+TEST_F(ShapedReportTest, FitsAZoomedReportAnewFromThePaperThatWasChosen)
+{
+    set({ { u"FontSize", u"9" } });
+    TableGrid grid = gridOf(columnsOf(4, 2900), numberedRows(2, 2));
+    canvas.options = {};
+    canvas.options.fit.toSheet = true;
+    canvas.doPreview(grid);
+    const std::int16_t upright = 1;
+    const auto zoomed = [&](void (Canvas::*zoom)(), int times) {
+        for (int time = 0; time < times; ++time)
+            (canvas.*zoom)();
+        canvas.ReDrawZoom(grid);
+        const bool lies = canvas.page.myWidth > canvas.page.myHeight;
+        EXPECT_EQ(lies, canvas.fit().isTurned);
+        EXPECT_EQ(lies, canvas.style().PagerOrientation != upright);
+        return canvas.fit().rule;
+    };
+    ASSERT_EQ(canvas.fit().rule, FitRule::Landscape);
+    EXPECT_EQ(zoomed(&Canvas::Minimum, 0), FitRule::Landscape);
+    EXPECT_TRUE(canvas.fit().isTurned);
+    EXPECT_EQ(zoomed(&Canvas::Minimum, 2), FitRule::AsItIs);
+    EXPECT_EQ(zoomed(&Canvas::Maximum, 2), FitRule::Landscape);
+    EXPECT_EQ(zoomed(&Canvas::Maximum, 5), FitRule::Shrunk);
+    EXPECT_TRUE(canvas.fit().isTurned);
+    canvas.options.fit.toSheet = false;
+    EXPECT_EQ(zoomed(&Canvas::Minimum, 7), FitRule::NotAsked);
+    canvas.page.myWidth = 16840; // the host chooses lying paper itself
+    canvas.page.myHeight = 11907;
+    canvas.ReDrawZoom(grid);
+    EXPECT_EQ(canvas.page.myWidth, 16840);
+}
+
 TEST_F(ShapedReportTest, ShrinksToAsManyPagesAcrossAsAreAskedFor)
 {
     TableGrid grid = gridOf(columnsOf(9, 2900), numberedRows(2, 9));
@@ -394,6 +427,28 @@ TEST_F(ShapedReportTest, AddsTotalsBehindEveryGroupAndAtTheEnd)
         "fruit: Sum|0.3|fruit: Count|2|fruit: Maximum|0.2|"
         "nut||n/a|nut|pecan|3|nut: Sum|3|nut: Count|1|nut: Maximum|3|"
         "Total: Sum|3.3|Total: Count|3|Total: Maximum|3.0");
+}
+
+TEST_F(ShapedReportTest, CallsTotalsAsTheLanguageInForceOrTheHostDoes)
+{
+    const auto lastTexts = [this](const TotalWords& words) {
+        ReportOptions options;
+        options.groupColumns = { u"Kind" };
+        options.totals = { { u"Pieces" }, { u"Pieces", AggregateFunction::Count } };
+        options.totalWords = words;
+        canvas.options = options;
+        TableGrid grid({ { u"Kind", 3000 }, { u"Pieces", 3000 } });
+        grid.addRow(std::vector<TextView> { u"nut", u"3" });
+        canvas.doPreview(grid);
+        return page(1).substr(std::string("Kind|Pieces|nut|3|").size());
+    };
+    EXPECT_EQ(lastTexts({}), "nut: Sum|3|nut: Count|1|Total: Sum|3|Total: Count|1");
+    usePhraseTranslator(+[](TextView english) { return u"<" + Text(english) + u">"; });
+    const std::string translated = lastTexts({});
+    const std::string own = lastTexts({ .total = u"Alles", .sum = u"zusammen" });
+    usePhraseTranslator(nullptr);
+    EXPECT_EQ(translated, "nut: <Sum>|3|nut: <Count>|1|<Total>: <Sum>|3|<Total>: <Count>|1");
+    EXPECT_EQ(own, "nut: zusammen|3|nut: <Count>|1|Alles: zusammen|3|Alles: <Count>|1");
 }
 
 TEST_F(ShapedReportTest, ReadsAndWritesTheNumbersOfTotalsAsTheTableShowsThem)
