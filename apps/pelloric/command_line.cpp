@@ -68,6 +68,7 @@ CommandLine::CommandLine(
 {
     for (const OptionTable table : tables) {
         for (const Option& option : table) {
+            known_.append(QString::fromLatin1(option.name));
             parser_.addOption(QCommandLineOption(QString::fromLatin1(option.name), {},
                 option.value ? QString::fromLatin1(option.value) : QString()));
         }
@@ -98,12 +99,13 @@ void CommandLine::refuseBlank(const Option& option) const
 
 bool CommandLine::has(const char* option) const
 {
-    return parser_.isSet(QString::fromLatin1(option));
+    const QString name = QString::fromLatin1(option);
+    return known_.contains(name) && parser_.isSet(name);
 }
 
 QString CommandLine::value(const char* option) const
 {
-    return parser_.value(QString::fromLatin1(option));
+    return has(option) ? parser_.value(QString::fromLatin1(option)) : QString();
 }
 
 double numberOf(const char* option, const QString& text, double least, double most, bool isWhole)

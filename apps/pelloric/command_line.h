@@ -68,6 +68,7 @@ public:
     /// files
     CommandLine(const QStringList& arguments, const std::vector<OptionTable>& tables, int files);
 
+    /// Whether an option was given; one that the command does not take never is.
     bool has(const char* option) const;
 
     /// The value of an option, the last one given; empty when it was not given.
@@ -82,6 +83,7 @@ private:
     void refuseBlank(const Option& option) const;
 
     QCommandLineParser parser_;
+    QStringList known_;
 };
 
 /// The value of an option as a number.

@@ -5,6 +5,7 @@
 
 #include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
+#include "report/report_totals.h"
 #include "ui/qt/translation.h"
 
 #include <QTranslator>
@@ -47,6 +48,21 @@ bool speakAs(const QLocale& locale)
         presentCatalogues() = std::move(catalogues);
     usePhraseTranslator(isThere ? wordingOf : nullptr);
     return isThere;
+}
+
+TotalWords totalWordsIn(const QLocale& locale)
+{
+    TotalWords words = englishTotalWords();
+    const auto catalogue = qt::catalogueOf(locale, QStringLiteral("pelloric"));
+    if (catalogue == nullptr)
+        return words;
+    for (Text* const word :
+        { &words.total, &words.sum, &words.count, &words.mean, &words.minimum, &words.maximum }) {
+        const QString wording = catalogue->translate(qt::PhraseContext, toUtf8(*word).c_str());
+        if (!wording.isEmpty())
+            *word = qt::toText(wording);
+    }
+    return words;
 }
 
 void speakEnglish() { usePhraseTranslator(nullptr); }

@@ -8,6 +8,7 @@
 #include "font_notes.h"
 #include "grids/table_grid.h"
 #include "interruption.h"
+#include "language.h"
 #include "outcome.h"
 #include "platform/automation_object.h"
 #include "platform/numbers.h"
@@ -61,7 +62,8 @@ void widenForTotals(
     const Font& font = canvas.style().body.font;
     FaceMetrics& face = canvas.platform().metrics.face(font.name, true, font.italic);
     const auto widthOf = [&](TextView text) { return textWidth(face.advanceOf(text), font.size); };
-    double names = widthOf(u"Total");
+    const TotalWords words = completed(options.totalWords);
+    double names = widthOf(words.total);
     double group = 0;
     for (const Text& title : options.groupColumns) {
         if (const int column = columnOf(grid, title); column < grid.columnCount())
@@ -70,10 +72,20 @@ void widenForTotals(
     names = std::max(names, group);
     Twips& width = widths[static_cast<std::size_t>(first)];
     for (const Aggregation& total : options.totals) {
-        const Text name = Text(u": ").append(functionName(total.function));
+        const Text name = Text(u": ").append(wordOf(words, total.function));
         const double needed = names + widthOf(name) + CellPadding + 1;
         width = std::max(width, roundToInt32(std::min<double>(needed, WidestContent)));
     }
+}
+
+/// The options of the command line; on paper the words are those of its language.
+ReportOptions optionsOf(const CommandLine& line)
+{
+    ReportOptions options = shapeOf(line);
+    const QString name = line.value("language");
+    const bool isNamed = !name.isEmpty() && name != QLatin1String("system");
+    options.totalWords = totalWordsIn(isNamed ? QLocale(name) : QLocale::system());
+    return options;
 }
 
 void setWidth(TableGrid& grid, int column, Twips width)
@@ -89,7 +101,7 @@ void setColumnWidths(TableGrid& grid, const CommandLine& line, Canvas& canvas)
     const Font& font = canvas.style().body.font;
     FaceMetrics& face = canvas.platform().metrics.face(font.name, font.bold, font.italic);
     std::vector<Twips> widths = contentWidths(grid, face, font.size, &canvas.platform().loop);
-    widenForTotals(grid, shapeOf(line), canvas, widths);
+    widenForTotals(grid, optionsOf(line), canvas, widths);
     // A table exactly as wide as the room is divided.
     fitWidths(widths, canvas.page.myWidth - 2 * canvas.page.intLeft - 1);
     const QStringList given
@@ -116,7 +128,7 @@ void buildReport(Canvas& canvas, TableGrid& grid, const CommandLine& line, Progr
     canvas.loadReportStyle();
     setColumnWidths(grid, line, canvas);
     const LayoutProgress watched(canvas, progress);
-    canvas.options = shapeOf(line);
+    canvas.options = optionsOf(line);
     if (canvas.options.asShown && !grid.hasLooks())
         note(qt::phrased(u"--as-shown does nothing here: only cells of office files have looks"));
     canvas.doPreview(grid);

@@ -138,6 +138,19 @@ struct Aggregation {
     bool operator==(const Aggregation&) const = default;
 };
 
+/// What the rows of totals are called on paper: "Total: Sum". A word that is empty is the one of
+/// the language in force, which is English unless `installTranslation` was called.
+struct TotalWords {
+    std::u16string total {}; ///< of the rows at the end; those of a group bear its texts
+    std::u16string sum {};
+    std::u16string count {};
+    std::u16string mean {};
+    std::u16string minimum {};
+    std::u16string maximum {};
+
+    bool operator==(const TotalWords&) const = default;
+};
+
 /// Cells of a column that are not empty but show no number, so that its totals leave them out.
 struct LeftOut {
     std::u16string column {}; ///< its title
@@ -201,6 +214,7 @@ struct ReportOptions {
     std::vector<std::u16string> groupColumns {}; ///< rows with equal texts in these make a group
     bool keepsGroups = false; ///< a group stays on a page where one can hold it
     std::vector<Aggregation> totals {};
+    TotalWords totalWords {}; ///< empty: those of the language in force
     Watermark watermark {};
     Logo logo {};
 

@@ -4,29 +4,35 @@
 #include "report/report_totals.h"
 
 #include "platform/numbers.h"
+#include "platform/phrase.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 
 namespace pelloric {
 
 namespace {
 
-struct FunctionName {
-    AggregateFunction function;
-    TextView name;
+/// A word of totals and its English wording.
+struct Word {
+    Text TotalWords::*word;
+    TextView english;
 };
 
 constexpr int MeanDecimals = 2; ///< that a mean may have more than its cells
 constexpr std::size_t GroupDigits = 3;
 
-constexpr FunctionName Names[] = {
-    { AggregateFunction::Sum, u"Sum" },
-    { AggregateFunction::Count, u"Count" },
-    { AggregateFunction::Mean, u"Mean" },
-    { AggregateFunction::Minimum, u"Minimum" },
-    { AggregateFunction::Maximum, u"Maximum" },
-};
+/// Those of the functions in their order, then that of the whole report.
+constexpr auto Words = std::to_array<Word>({
+    { &TotalWords::sum, phraseText(u"Sum") },
+    { &TotalWords::count, phraseText(u"Count") },
+    { &TotalWords::mean, phraseText(u"Mean") },
+    { &TotalWords::minimum, phraseText(u"Minimum") },
+    { &TotalWords::maximum, phraseText(u"Maximum") },
+    { &TotalWords::total, phraseText(u"Total") },
+});
+static_assert(Words.size() == static_cast<std::size_t>(AggregateFunction::Maximum) + 2);
 
 } // namespace
 
@@ -134,13 +140,27 @@ Text Totals::shown(const Column& column, double number, int decimals)
     return text;
 }
 
-TextView functionName(AggregateFunction function)
+TotalWords englishTotalWords()
 {
-    for (const FunctionName& row : Names) {
-        if (row.function == function)
-            return row.name;
+    TotalWords words;
+    for (const Word& row : Words)
+        words.*row.word = row.english;
+    return words;
+}
+
+TotalWords completed(const TotalWords& given)
+{
+    TotalWords words = given;
+    for (const Word& row : Words) {
+        if ((words.*row.word).empty())
+            words.*row.word = phrase(row.english);
     }
-    return {};
+    return words;
+}
+
+const Text& wordOf(const TotalWords& words, AggregateFunction function)
+{
+    return words.*Words[static_cast<std::size_t>(function)].word;
 }
 
 } // namespace pelloric

@@ -68,7 +68,13 @@ private:
     std::vector<AggregateFunction> functions_;
 };
 
-/// What a row of totals is called: "Sum", "Count", "Mean", "Minimum", "Maximum".
-TextView functionName(AggregateFunction function);
+/// The words of totals in English.
+TotalWords englishTotalWords();
+
+/// These words, the empty ones in the language in force.
+TotalWords completed(const TotalWords& given);
+
+/// What the row of a function is called.
+const Text& wordOf(const TotalWords& words, AggregateFunction function);
 
 } // namespace pelloric

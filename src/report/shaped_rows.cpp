@@ -55,6 +55,7 @@ void ShapedRows::resolve(std::span<const Text> titles)
 {
     const ReportOptions& options = source_.options;
     groupFields_ = fieldsNamed(titles, options.groupColumns);
+    words_ = completed(options.totalWords);
     for (const Aggregation& total : options.totals) {
         totalFields_.push_back(fieldsNamed(titles, { &total.column, 1 }).front());
         separators_.push_back(total.function == AggregateFunction::Count
@@ -184,7 +185,7 @@ void ShapedRows::readNext()
     if (nextRecord_ > source_.rows.recordCount()) {
         closeGroup();
         if (nextRecord_ > 1)
-            addTotals(allTotals_, u"Total");
+            addTotals(allTotals_, words_.total);
         isRead_ = true;
         return;
     }
@@ -394,7 +395,7 @@ void ShapedRows::addTotals(const Totals& totals, TextView name)
         TotalTexts texts(source_.widths.size());
         for (std::size_t place = 0; place < texts.size(); ++place)
             texts[place] = document_.store().add(totals.text(number, static_cast<int>(place)));
-        const Text label = Text(name) + u": " + Text(functionName(totals.function(number)));
+        const Text label = Text(name) + u": " + wordOf(words_, totals.function(number));
         const auto first = static_cast<std::size_t>(bands_.front().front());
         texts[first] = document_.store().add(
             texts[first].empty() ? label : label + u" " + Text(texts[first]));

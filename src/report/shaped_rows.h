@@ -163,6 +163,7 @@ private:
     std::int64_t nextRecord_ = 1;
     bool isRead_ = false; ///< all records and totals have been read
     std::vector<TextView> groupTexts_; ///< of the row that was read last
+    TotalWords words_; ///< none is empty
     Totals groupTotals_;
     Totals allTotals_;
     std::vector<TotalTexts> totalTexts_;

@@ -822,8 +822,44 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
         <translation>nur %1 Dateien dürfen offen sein; mindestens %2 erlauben: ulimit -n 1024</translation>
     </message>
     <message>
+        <source>hidden rows and columns of an office sheet, too</source>
+        <translation>auch verborgene Zeilen und Spalten eines Tabellenblatts</translation>
+    </message>
+    <message>
+        <source>1 hidden row</source>
+        <translation>1 verborgene Zeile</translation>
+    </message>
+    <message>
+        <source>%1 hidden rows</source>
+        <translation>%1 verborgene Zeilen</translation>
+    </message>
+    <message>
+        <source>1 hidden column</source>
+        <translation>1 verborgene Spalte</translation>
+    </message>
+    <message>
+        <source>%1 hidden columns</source>
+        <translation>%1 verborgene Spalten</translation>
+    </message>
+    <message>
+        <source>%1 and %2</source>
+        <translation>%1 und %2</translation>
+    </message>
+    <message>
+        <source>%1: left out are %2; --hidden takes them, too</source>
+        <translation>%1: ausgelassen sind %2; --hidden nimmt auch sie</translation>
+    </message>
+    <message>
+        <source>A NAME that holds a comma stands in double quotes, as in a CSV file:
+--columns &apos;Item,&quot;Price, net&quot;&apos;.
+</source>
+        <translation>Ein NAME mit Komma steht in doppelten Anführungszeichen, wie in einer CSV-Datei:
+--columns &apos;Artikel,&quot;Preis, netto&quot;&apos;.
+</translation>
+    </message>
+    <message>
         <source>standard output cannot be written: %1</source>
-        <translation>die Standardausgabe kann nicht geschrieben werden: %1</translation>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>

@@ -821,8 +821,44 @@ An exception that it does not catch ends the program with status 1.
         <translation>only %1 files may be open; allow %2 at least: ulimit -n 1024</translation>
     </message>
     <message>
+        <source>hidden rows and columns of an office sheet, too</source>
+        <translation>hidden rows and columns of an office sheet, too</translation>
+    </message>
+    <message>
+        <source>1 hidden row</source>
+        <translation>1 hidden row</translation>
+    </message>
+    <message>
+        <source>%1 hidden rows</source>
+        <translation>%1 hidden rows</translation>
+    </message>
+    <message>
+        <source>1 hidden column</source>
+        <translation>1 hidden column</translation>
+    </message>
+    <message>
+        <source>%1 hidden columns</source>
+        <translation>%1 hidden columns</translation>
+    </message>
+    <message>
+        <source>%1 and %2</source>
+        <translation>%1 and %2</translation>
+    </message>
+    <message>
+        <source>%1: left out are %2; --hidden takes them, too</source>
+        <translation>%1: left out are %2; --hidden takes them, too</translation>
+    </message>
+    <message>
+        <source>A NAME that holds a comma stands in double quotes, as in a CSV file:
+--columns &apos;Item,&quot;Price, net&quot;&apos;.
+</source>
+        <translation>A NAME that holds a comma stands in double quotes, as in a CSV file:
+--columns &apos;Item,&quot;Price, net&quot;&apos;.
+</translation>
+    </message>
+    <message>
         <source>standard output cannot be written: %1</source>
-        <translation>standard output cannot be written: %1</translation>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>

@@ -816,8 +816,44 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
         <translation>最多只能打开 %1 个文件；请至少允许 %2 个：ulimit -n 1024</translation>
     </message>
     <message>
+        <source>hidden rows and columns of an office sheet, too</source>
+        <translation>也包括工作表中隐藏的行和列</translation>
+    </message>
+    <message>
+        <source>1 hidden row</source>
+        <translation>1 个隐藏行</translation>
+    </message>
+    <message>
+        <source>%1 hidden rows</source>
+        <translation>%1 个隐藏行</translation>
+    </message>
+    <message>
+        <source>1 hidden column</source>
+        <translation>1 个隐藏列</translation>
+    </message>
+    <message>
+        <source>%1 hidden columns</source>
+        <translation>%1 个隐藏列</translation>
+    </message>
+    <message>
+        <source>%1 and %2</source>
+        <translation>%1和%2</translation>
+    </message>
+    <message>
+        <source>%1: left out are %2; --hidden takes them, too</source>
+        <translation>%1：略去了%2；用 --hidden 可一并打印</translation>
+    </message>
+    <message>
+        <source>A NAME that holds a comma stands in double quotes, as in a CSV file:
+--columns &apos;Item,&quot;Price, net&quot;&apos;.
+</source>
+        <translation>含有逗号的 NAME 要像在 CSV 文件中那样放在双引号里：
+--columns &apos;品名,&quot;单价,含税&quot;&apos;。
+</translation>
+    </message>
+    <message>
         <source>standard output cannot be written: %1</source>
-        <translation>无法写入标准输出：%1</translation>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>

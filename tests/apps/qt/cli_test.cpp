@@ -45,6 +45,28 @@ TEST_F(Program, PrintsOfficeCellsAsTheyAreShownOnlyWhenAskedTo)
         picture("sorted.png", { "--as-shown", "--sort", "Number", "--columns", "Text" }), gold));
 }
 
+TEST_F(Program, LeavesOutWhatASheetHidesAndSaysSo)
+{
+    const QString sheet = QStringLiteral(PELLORIC_TESTS_DIR "/data/office/hidden.xlsx");
+    const QStringList command { QStringLiteral("export"), sheet, QStringLiteral("-o"),
+        QStringLiteral("h.pdf") };
+    const Ended shown = run(command);
+    EXPECT_EQ(shown.status, 0) << shown.errors;
+    EXPECT_EQ(shown.errors,
+        "pelloric: " + sheet.toStdString()
+            + ": left out are 2 hidden rows and 1 hidden column; --hidden takes them, too\n");
+    EXPECT_TRUE(has(pdfText("h.pdf"), "nut"));
+    EXPECT_FALSE(has(pdfText("h.pdf"), "screw"));
+    EXPECT_FALSE(has(pdfText("h.pdf"), "Key"));
+    const Ended told = run(command + words("--json"));
+    EXPECT_TRUE(has(told.output, "left out are 2 hidden rows and 1 hidden column")) << told.output;
+    EXPECT_TRUE(has(told.output, "\"rows\":1"));
+    const Ended whole = run(command + words("--hidden"));
+    EXPECT_EQ(whole.errors, "");
+    EXPECT_TRUE(has(pdfText("h.pdf"), "screw"));
+    EXPECT_TRUE(has(pdfText("h.pdf"), "Key"));
+}
+
 TEST_F(Program, RefusesALanguageThatItHasNoCatalogueFor)
 {
     const Ended refused = run({ "demo", "--walk", "out", "--language", "fi" });
@@ -560,6 +582,22 @@ TEST_F(Program, TakesTheColumnsAndRowsThatAreAskedForInTheirOrder)
         std::erase_if(text, [](char c) { return c == ' ' || c == '\n' || c == '\f'; });
         EXPECT_TRUE(has(text, row.text)) << row.options << ": " << text;
     }
+    folder_.write("c.csv", "\"Price, net\",#1,Size 5\"\n7,x,8\n9,y,6\n");
+    const Ended quoted = run({ QStringLiteral("export"), QStringLiteral("c.csv"),
+        QStringLiteral("-o"), QStringLiteral("c.pdf"), QStringLiteral("--columns"),
+        QStringLiteral("\"#1\",\"Price, net\",Size 5\""), QStringLiteral("--sort"),
+        QStringLiteral("\"Price, net\":desc"), QStringLiteral("--key-columns"),
+        QStringLiteral("\"Price, net\",\"#1\""), QStringLiteral("--group"),
+        QStringLiteral("\"Price, net\""), QStringLiteral("--total"),
+        QStringLiteral("sum:\"Price, net\",\"max:Price, net\",mean:Size 5\"") });
+    EXPECT_EQ(quoted.status, 0) << quoted.errors;
+    EXPECT_EQ(run(words("export c.csv -o u.pdf --sort Price")).errors,
+        "pelloric: --sort: there is no column \"Price\"; the table has \"Price, net\", #1, Size "
+        "5\"\n");
+    const std::string listed = pdfText("c.pdf");
+    EXPECT_LT(listed.find("Price, net"), listed.find("#1"));
+    EXPECT_LT(listed.find('y'), listed.find('x')) << listed;
+    EXPECT_TRUE(has(listed, "16")) << listed;
     const Ended unknown = run(words("export t.csv -o u.pdf --columns Nope"));
     EXPECT_EQ(unknown.status, 2);
     EXPECT_EQ(unknown.errors,
@@ -681,11 +719,14 @@ TEST_F(Program, AddsUpNumbersAsTheTableShowsThemInEveryLocale)
         EXPECT_EQ(points.status, 0) << points.errors;
         EXPECT_EQ(points.errors, "");
         EXPECT_TRUE(has(pdfText("p.pdf"), "1,259.50")) << locale << pdfText("p.pdf");
-        EXPECT_TRUE(has(pdfText("p.pdf"), "Total: Sum")) << "in one line";
+        const bool isGerman = std::string_view(locale).starts_with("de");
+        const char* const name = isGerman ? "Gesamt: Summe" : "Total: Sum";
+        EXPECT_TRUE(has(pdfText("p.pdf"), name)) << "in one line";
         run(words("export points.csv -o s.pdf --sort Price:desc --columns Name"));
         EXPECT_LT(pdfText("s.pdf").find('z'), pdfText("s.pdf").find('x')) << locale;
         const Ended commas
             = run(words("export commas.csv -o c.pdf --total sum:Price --delimiter ; --json --fit"));
+        EXPECT_TRUE(has(pdfText("c.pdf"), name)) << "though what is told is English";
         EXPECT_TRUE(has(pdfText("c.pdf"), "1.247,00")) << locale << pdfText("c.pdf");
         const QJsonObject told
             = QJsonDocument::fromJson(QByteArray::fromStdString(commas.output)).object();
@@ -694,6 +735,8 @@ TEST_F(Program, AddsUpNumbersAsTheTableShowsThemInEveryLocale)
         EXPECT_EQ(told[QStringLiteral("fit")].toString(), QStringLiteral("as is"));
         EXPECT_EQ(told[QStringLiteral("bands")].toInt(), 1);
     }
+    run(words("export points.csv -o z.pdf --total mean:Price --language zh_CN"));
+    EXPECT_TRUE(has(pdfText("z.pdf"), "总计: 平均值")) << pdfText("z.pdf");
 }
 
 TEST_F(Program, TakesQuotationMarksForWhatTheyAreWhenAsked)

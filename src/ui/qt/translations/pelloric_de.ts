@@ -851,8 +851,36 @@
         <translation>die Anweisung lässt einen Wert offen (?, :name oder $name); den Wert selbst schreiben</translation>
     </message>
     <message>
+        <source>all that the sheet holds is hidden</source>
+        <translation>alles, was das Blatt enthält, ist verborgen</translation>
+    </message>
+    <message>
+        <source>Sum</source>
+        <translation>Summe</translation>
+    </message>
+    <message>
+        <source>Count</source>
+        <translation>Anzahl</translation>
+    </message>
+    <message>
+        <source>Mean</source>
+        <translation>Mittelwert</translation>
+    </message>
+    <message>
+        <source>Minimum</source>
+        <translation>Kleinster Wert</translation>
+    </message>
+    <message>
+        <source>Maximum</source>
+        <translation>Größter Wert</translation>
+    </message>
+    <message>
+        <source>Total</source>
+        <translation>Gesamt</translation>
+    </message>
+    <message>
         <source>the file cannot be copied into %1 to be converted: %2</source>
-        <translation>die Datei kann zum Umwandeln nicht nach %1 kopiert werden: %2</translation>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>

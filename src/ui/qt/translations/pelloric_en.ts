@@ -851,8 +851,36 @@
         <translation>the statement leaves a value open (?, :name or $name); write the value</translation>
     </message>
     <message>
+        <source>all that the sheet holds is hidden</source>
+        <translation>all that the sheet holds is hidden</translation>
+    </message>
+    <message>
+        <source>Sum</source>
+        <translation>Sum</translation>
+    </message>
+    <message>
+        <source>Count</source>
+        <translation>Count</translation>
+    </message>
+    <message>
+        <source>Mean</source>
+        <translation>Mean</translation>
+    </message>
+    <message>
+        <source>Minimum</source>
+        <translation>Minimum</translation>
+    </message>
+    <message>
+        <source>Maximum</source>
+        <translation>Maximum</translation>
+    </message>
+    <message>
+        <source>Total</source>
+        <translation>Total</translation>
+    </message>
+    <message>
         <source>the file cannot be copied into %1 to be converted: %2</source>
-        <translation>the file cannot be copied into %1 to be converted: %2</translation>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>

@@ -851,8 +851,36 @@
         <translation>语句中有未给出的值（?、:name 或 $name）；请直接写出该值</translation>
     </message>
     <message>
+        <source>all that the sheet holds is hidden</source>
+        <translation>工作表中的所有内容都被隐藏了</translation>
+    </message>
+    <message>
+        <source>Sum</source>
+        <translation>合计</translation>
+    </message>
+    <message>
+        <source>Count</source>
+        <translation>计数</translation>
+    </message>
+    <message>
+        <source>Mean</source>
+        <translation>平均值</translation>
+    </message>
+    <message>
+        <source>Minimum</source>
+        <translation>最小值</translation>
+    </message>
+    <message>
+        <source>Maximum</source>
+        <translation>最大值</translation>
+    </message>
+    <message>
+        <source>Total</source>
+        <translation>总计</translation>
+    </message>
+    <message>
         <source>the file cannot be copied into %1 to be converted: %2</source>
-        <translation>无法将文件复制到 %1 以便转换：%2</translation>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
