@@ -859,7 +859,7 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
     </message>
     <message>
         <source>standard output cannot be written: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>die Standardausgabe kann nicht geschrieben werden: %1</translation>
     </message>
 </context>
 <context>

@@ -858,7 +858,7 @@ An exception that it does not catch ends the program with status 1.
     </message>
     <message>
         <source>standard output cannot be written: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>standard output cannot be written: %1</translation>
     </message>
 </context>
 <context>

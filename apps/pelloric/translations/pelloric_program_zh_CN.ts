@@ -853,7 +853,7 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
     </message>
     <message>
         <source>standard output cannot be written: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>无法写入标准输出：%1</translation>
     </message>
 </context>
 <context>

@@ -880,7 +880,7 @@
     </message>
     <message>
         <source>the file cannot be copied into %1 to be converted: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>die Datei kann zum Umwandeln nicht nach %1 kopiert werden: %2</translation>
     </message>
 </context>
 <context>

@@ -880,7 +880,7 @@
     </message>
     <message>
         <source>the file cannot be copied into %1 to be converted: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>无法将文件复制到 %1 以便转换：%2</translation>
     </message>
 </context>
 <context>
