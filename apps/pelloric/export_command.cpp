@@ -233,11 +233,12 @@ Laid layOut(
         SavedDocument saved = readDocument(file, line, platform.record());
         return { std::move(saved.document), saved.setup, {} };
     }
-    auto grid = std::make_unique<TableGrid>(readTable(file, line, progress));
-    const auto rows = static_cast<qint64>(grid->rowCount());
     Platform record = platform.record();
     Canvas canvas(record);
     canvas.useSettings(settingsFor(line, record, SettingsBase::Defaults));
+    canvas.options = shapeOf(line);
+    auto grid = std::make_unique<TableGrid>(readTable(file, line, progress));
+    const auto rows = static_cast<qint64>(grid->rowCount());
     buildReport(canvas, *grid, line, progress);
     QJsonObject facts = shapeFacts(canvas);
     facts.insert(QStringLiteral("rows"), rows);

@@ -52,18 +52,19 @@ int runPreview(const Invocation& invocation)
     chooseLanguage(line);
     qt::QtPreviewOpener& opener = qt::installPreviewWindow();
     qt::QtPlatform& platform = qt::defaultPlatform();
-    std::unique_ptr<TableGrid> grid;
-    {
-        const Interruption interruption(platform.loop());
-        ProgressLine progress;
-        grid = std::make_unique<TableGrid>(readTable(line.file(0), line, progress));
-    }
     // What the dialogs change is kept, unless options say how this one report looks.
     std::optional<ReportSettings> settings;
     if (firstReportOption(line) != nullptr)
         settings = settingsFor(line, platform.record(), SettingsBase::Users);
     else
         prepareSettings(platform.record());
+    const ReportOptions shape = shapeOf(line);
+    std::unique_ptr<TableGrid> grid;
+    {
+        const Interruption interruption(platform.loop());
+        ProgressLine progress;
+        grid = std::make_unique<TableGrid>(readTable(line.file(0), line, progress));
+    }
     opener.setSettings(settings);
     // Before every build: a dialog may have chosen another font or paper.
     TableGrid& table = *grid;
@@ -74,7 +75,7 @@ int runPreview(const Invocation& invocation)
     };
     opener.setPrompts(prompts);
     shown = &opener.showWindow().canvas().canvas();
-    shown->options = shapeOf(line);
+    shown->options = shape;
     try {
         opener.openPreview(std::move(grid));
     } catch (const RunTimeError& error) {

@@ -155,10 +155,11 @@ void printDocument(const Order& order, const CommandLine& line, qt::QtPlatform& 
 void printTable(const Order& order, const CommandLine& line, qt::QtPlatform& platform,
     qt::QtPrinting& printing, ProgressLine& progress, const Outcome& outcome)
 {
-    auto grid = std::make_unique<TableGrid>(readTable(order.file, line, progress));
     Platform record = platform.record();
     Canvas canvas(record);
     canvas.useSettings(settingsFor(line, record, SettingsBase::Defaults));
+    canvas.options = shapeOf(line);
+    auto grid = std::make_unique<TableGrid>(readTable(order.file, line, progress));
     buildReport(canvas, *grid, line, progress);
     grid.reset();
     tellFonts(canvas.document(), platform);

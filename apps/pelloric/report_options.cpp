@@ -19,6 +19,7 @@
 
 #include <array>
 #include <cmath>
+#include <filesystem>
 #include <optional>
 #include <utility>
 
@@ -238,14 +239,18 @@ ReportSettings settingsOfFile(const QString& file, const Platform& platform)
     return settings;
 }
 
-/// The user's settings, or the default ones where there are none and none can be made.
+/// The user's settings, or the default ones where there are none and none can be made, or those
+/// that there are cannot be read, which is told.
 ReportSettings settingsOfUser(const Platform& platform)
 {
     std::optional<SettingsSnapshot> snapshot;
     try {
         deployDefaultSettings(platform);
         snapshot.emplace(platform);
-    } catch (const RunTimeError&) {
+    } catch (const RunTimeError& error) {
+        std::error_code ignored;
+        if (std::filesystem::exists(settingsPath(platform), ignored))
+            tell(describe(error));
         return {};
     }
     const ReportSettings settings = readReportSettings(*snapshot);

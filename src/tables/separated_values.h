@@ -12,6 +12,9 @@
 
 namespace pelloric {
 
+/// A table file with a longer value is refused as soon as that is seen: bytes.
+inline constexpr std::size_t MostValueBytes = 1U << 26U;
+
 /// How the values of a file are told apart.
 struct ValuesDialect {
     char delimiter = ','; ///< an ASCII character

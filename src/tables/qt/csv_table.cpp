@@ -69,11 +69,30 @@ void noteOddRow(const SeparatedValues& row, std::size_t titles, OddRows& odd)
         odd.gluedLines.push_back(row.line());
 }
 
-/// Goes to the next row. @throws RunTimeError Overflow: too many columns
-bool nextRow(SeparatedValues& values)
+/// @throws RunTimeError Overflow: a value of the row is too long
+void refuseLongValues(const SeparatedValues& values, std::size_t most)
 {
+    for (std::size_t at = 0; at < values.valueCount(); ++at) {
+        if (values.value(at).size() > most)
+            throw RunTimeError(ErrorNumber::Overflow,
+                atLine(values.line(),
+                    phrase(u"value %1 of the row holds more than %2 bytes; leave it out, or "
+                           u"shorten it",
+                        { decimal(static_cast<std::int64_t>(at) + 1),
+                            decimal(static_cast<std::int64_t>(most)) })));
+    }
+}
+
+/// Goes to the next row.
+/// @param most  bytes of a value
+/// @throws RunTimeError Overflow: too many columns, or a value is too long
+bool nextRow(SeparatedValues& values, std::size_t most)
+{
+    const std::size_t before = values.position();
     if (!values.nextRow())
         return false;
+    if (values.position() - before > most)
+        refuseLongValues(values, most);
     if (values.valueCount() > MostColumns)
         throw RunTimeError(ErrorNumber::Overflow,
             atLine(
@@ -82,10 +101,11 @@ bool nextRow(SeparatedValues& values)
 }
 
 /// The most values of a row, from a row on.
-std::size_t widestFrom(SeparatedValues values)
+/// @param most  bytes of a value
+std::size_t widestFrom(SeparatedValues values, std::size_t most)
 {
     std::size_t widest = values.valueCount();
-    while (nextRow(values))
+    while (nextRow(values, most))
         widest = std::max(widest, values.valueCount());
     return widest;
 }
@@ -128,15 +148,15 @@ TableGrid makeGrid(
     std::string_view text, ValuesDialect dialect, const CsvOptions& options, OddRows& odd)
 {
     SeparatedValues values(text, dialect);
-    if (!nextRow(values))
+    if (!nextRow(values, options.mostValueBytes))
         refuse(phrase(u"the file is empty"));
     RowTexts row;
     TableGrid grid = gridOf(row.of(values));
     const std::size_t titles = values.valueCount();
-    for (std::size_t rows = 1; nextRow(values); ++rows) {
+    for (std::size_t rows = 1; nextRow(values, options.mostValueBytes); ++rows) {
         noteOddRow(values, titles, odd);
         if (values.valueCount() > static_cast<std::size_t>(grid.columnCount()))
-            grid.widen(widestFrom(values), { .title = {}, .width = -1 });
+            grid.widen(widestFrom(values, options.mostValueBytes), { .title = {}, .width = -1 });
         grid.addRow(row.of(values));
         if (rows % RowsOfAStep != 0)
             continue;
@@ -193,7 +213,9 @@ Text raggedNote(const OddRows& odd, std::int64_t rows, char delimiter)
 
 TableGrid readCsv(const std::filesystem::path& path, const CsvOptions& options)
 {
-    TextFileOptions reading { options.encoding, {} };
+    TextFileOptions reading { .encoding = options.encoding,
+        .mostValueBytes = options.mostValueBytes,
+        .delimiter = options.delimiter.value_or(',') };
     if (options.progress)
         reading.progress = [&](std::int64_t done, std::int64_t total) {
             const double part

@@ -17,6 +17,7 @@ struct CsvOptions {
     Progress progress {}; ///< told now and then how many thousandths of the work are done
     std::optional<char> delimiter {}; ///< an ASCII character; nothing: found out
     bool hasQuotes = true; ///< false: a quote is a character like any other
+    std::size_t mostValueBytes = MostValueBytes; ///< of a value, see there
     /// Gets sentences that the user should read: an encoding that was guessed, rows that look glued
     /// together, rows with another number of values than the titles. May be null; borrowed.
     std::vector<Text>* notes = nullptr;

@@ -7,6 +7,7 @@
 #include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/run_time_error.h"
+#include "tables/separated_values.h"
 
 #include <nlohmann/json.hpp>
 
@@ -44,17 +45,23 @@ private:
     std::vector<std::string> names_;
 };
 
+/// What is known of a text before it is parsed.
+struct TextShape {
+    bool isOne = false; ///< one object of a file of lines
+    std::size_t mostValueBytes = MostValueBytes; ///< see there
+};
+
 /// Takes the objects of a table apart as they are parsed.
 ///
 /// Without a grid it only learns the names; with one it fills the rows. What is nested in a value
 /// is written down again as it comes.
 class TableReceiver : public nlohmann::json_sax<nlohmann::json> {
 public:
-    /// @param isLine  the text is one object of a file of lines
-    TableReceiver(Names& names, TableGrid* grid, bool isLine)
+    TableReceiver(Names& names, TableGrid* grid, const TextShape& shape)
         : names_(names)
         , grid_(grid)
-        , objectDepth_(isLine ? 1 : 2)
+        , objectDepth_(shape.isOne ? 1 : 2)
+        , shape_(shape)
     {
     }
 
@@ -152,6 +159,11 @@ private:
     {
         if (depth_ < objectDepth_)
             return refuseShape();
+        const std::size_t size = isNested() ? nested_.size() + json.size() : plain.size();
+        if (size > shape_.mostValueBytes)
+            return refuseWith(phrase(u"a value holds more than %1 bytes; leave it out, or shorten "
+                                     u"it",
+                { decimal(static_cast<std::int64_t>(shape_.mostValueBytes)) }));
         if (isNested()) {
             separate();
             nested_ += json;
@@ -205,6 +217,7 @@ private:
     Names& names_;
     TableGrid* grid_;
     int objectDepth_; ///< of the objects that are rows
+    TextShape shape_;
     int depth_ = 0;
     std::size_t column_ = 0;
     std::vector<std::string> values_;
@@ -247,13 +260,13 @@ void parse(std::string_view text, TableReceiver& receiver, std::int64_t firstLin
 }
 
 /// Parses all of a file: an array or one object as a whole, and anything else line by line.
-void parseAll(std::string_view text, bool isOne, Names& names, TableGrid* grid)
+void parseAll(std::string_view text, const TextShape& shape, Names& names, TableGrid* grid)
 {
     const std::size_t first = text.find_first_not_of(Blanks);
     if (first == std::string_view::npos)
         refuse(phrase(u"the file is empty"));
-    if (isOne || text[first] == '[') {
-        TableReceiver receiver(names, grid, isOne);
+    if (shape.isOne || text[first] == '[') {
+        TableReceiver receiver(names, grid, shape);
         parse(text, receiver, 1);
         return;
     }
@@ -265,7 +278,7 @@ void parseAll(std::string_view text, bool isOne, Names& names, TableGrid* grid)
         text.remove_prefix(std::min(end + 1, text.size()));
         if (object.find_first_not_of(Blanks) == std::string_view::npos)
             continue;
-        TableReceiver receiver(names, grid, true);
+        TableReceiver receiver(names, grid, { true, shape.mostValueBytes });
         parse(object, receiver, line);
     }
 }
@@ -332,11 +345,11 @@ bool looksLikeJson(std::string_view start)
 TableGrid readJson(const std::filesystem::path& path, const TextFileOptions& options)
 {
     const TextFile file = readTextFile(path, options);
-    const bool isOne = isOneObject(file.text);
-    if (isOne && !hasLineName(path))
+    const TextShape shape { isOneObject(file.text), options.mostValueBytes };
+    if (shape.isOne && !hasLineName(path))
         refuseNestedObject(file.text);
     Names names;
-    parseAll(file.text, isOne, names, nullptr);
+    parseAll(file.text, shape, names, nullptr);
     if (names.all().empty())
         refuse(phrase(u"no object of the file has a name, so there is no column; %1",
             { phrase(WantedShape) }));
@@ -344,7 +357,7 @@ TableGrid readJson(const std::filesystem::path& path, const TextFileOptions& opt
     for (const std::string& name : names.all())
         columns.push_back({ .title = fromUtf8(name), .width = -1 });
     TableGrid grid(std::move(columns));
-    parseAll(file.text, isOne, names, &grid);
+    parseAll(file.text, shape, names, &grid);
     return grid;
 }
 

@@ -19,6 +19,7 @@
 #include <fstream>
 #include <memory>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace pelloric::qt {
@@ -39,6 +40,38 @@ constexpr char Western[] = "windows-1252";
 
 Text named(const QByteArray& encoding) { return toText(QString::fromLatin1(encoding)); }
 
+/// Looks for values without an end while a file is read. Only bytes are known then: in an encoding
+/// that somebody names, others may end a value.
+class ValueEnds {
+public:
+    explicit ValueEnds(const TextFileOptions& options)
+        : ends_(",;|\t\r\n\"")
+        , most_(options.encoding.isEmpty() ? options.mostValueBytes : std::string::npos)
+    {
+        ends_ += options.delimiter;
+    }
+
+    /// @param from  where the bytes stand in the file
+    /// @throws RunTimeError Overflow
+    void look(std::string_view bytes, std::size_t from)
+    {
+        const std::size_t end = bytes.find_last_of(ends_);
+        if (end != std::string_view::npos)
+            begin_ = from + end + 1;
+        if (from + bytes.size() - begin_ > most_)
+            throw RunTimeError(ErrorNumber::Overflow,
+                phrase(u"the value behind byte %1 holds more than %2 bytes; leave it out, or "
+                       u"shorten it",
+                    { decimal(static_cast<std::int64_t>(begin_)),
+                        decimal(static_cast<std::int64_t>(most_)) }));
+    }
+
+private:
+    std::string ends_;
+    std::size_t most_; ///< bytes of a value
+    std::size_t begin_ = 0; ///< of the value that has not ended
+};
+
 std::string readAll(const std::filesystem::path& path, const TextFileOptions& options)
 {
     std::error_code none;
@@ -53,10 +86,13 @@ std::string readAll(const std::filesystem::path& path, const TextFileOptions& op
     std::string bytes;
     bytes.reserve(whole + Chunk);
     std::size_t size = 0;
+    ValueEnds ends(options);
     while (file) {
         bytes.resize(size + Chunk);
         file.read(bytes.data() + size, ChunkBytes);
-        size += static_cast<std::size_t>(file.gcount());
+        const std::size_t before
+            = std::exchange(size, size + static_cast<std::size_t>(file.gcount()));
+        ends.look(std::string_view(bytes).substr(before, size - before), before);
         if (whole == 0 && static_cast<std::int64_t>(size) > MostPipeBytes)
             throw RunTimeError(ErrorNumber::Overflow,
                 phrase(

@@ -5,6 +5,7 @@
 
 #include "platform/progress.h"
 #include "platform/text.h"
+#include "tables/separated_values.h"
 
 #include <QString>
 
@@ -28,6 +29,8 @@ struct TextFile {
 struct TextFileOptions {
     QString encoding {}; ///< empty: by a byte order mark, else UTF-8, else guessed by the letters
     Progress progress {}; ///< told now and then how many bytes have been read
+    std::size_t mostValueBytes = MostValueBytes; ///< of a value, see there
+    char delimiter = ','; ///< ends a value, as commas, tabs, semicolons, bars and quotes do
 };
 
 /// Reads a text file of any encoding.
@@ -35,7 +38,8 @@ struct TextFileOptions {
 /// @throws RunTimeError FileNotFound: it is missing or cannot be read, with the path; TypeMismatch,
 ///         naming the line where there is one: an unknown encoding, bytes that are no text, or a
 ///         file that begins as no table does, see `notATable`;
-///         Overflow: a pipe goes on after `MostPipeBytes`; Cancelled: the progress said so
+///         Overflow: a pipe goes on after `MostPipeBytes`, or a value is too long; Cancelled: the
+///         progress said so
 TextFile readTextFile(const std::filesystem::path& path, const TextFileOptions& options);
 
 /// "line 3: what": how errors of text files begin.

@@ -207,6 +207,35 @@ TEST(CsvTable, SaysHowManyRowsHaveNotAsManyValuesAsTheTitles)
     EXPECT_TRUE(notes.empty());
 }
 
+TEST(CsvTable, RefusesAValueWithoutEndAsSoonAsItIsSeen)
+{
+    constexpr std::size_t Most = 1U << 20U;
+    const TempFolder folder;
+    std::int64_t seen = 0;
+    const auto read = [&](const std::string& bytes, CsvOptions options) {
+        options.mostValueBytes = Most;
+        options.progress = [&seen](std::int64_t done, std::int64_t) {
+            seen = done;
+            return true;
+        };
+        try {
+            return std::to_string(readCsv(folder.write("t.csv", bytes), options).rowCount());
+        } catch (const RunTimeError& error) {
+            return toUtf8(error.text());
+        }
+    };
+    EXPECT_EQ(read("a,b\n1," + std::string(9 * Most, 'x'), {}),
+        "Overflow: the value behind byte 6 holds more than 1048576 bytes; leave it out, or shorten "
+        "it");
+    EXPECT_LT(seen, 100) << "of the 300 parts that reading takes";
+    EXPECT_EQ(read("a,b\n1," + std::string(Most, 'x'), {}), "1");
+    const std::string half(Most / 2 + 1, 'x');
+    EXPECT_EQ(read("a#b\n" + half + '#' + half, { .delimiter = '#' }), "1");
+    EXPECT_EQ(read("a,b\n1,\"" + half + '\n' + half + "\"\n", {}),
+        "Overflow: line 2: value 2 of the row holds more than 1048576 bytes; leave it out, or "
+        "shorten it");
+}
+
 TEST(CsvTable, RefusesAnUnknownEncodingAndAMissingFile)
 {
     EXPECT_EQ(read("a.csv", "a\n", QStringLiteral("no-such")).substr(0, 40),

@@ -99,6 +99,25 @@ TEST(JsonTable, EndsForDeepNesting)
     EXPECT_EQ(read(deep).size(), 4 + 400000U);
 }
 
+TEST(JsonTable, RefusesAValueWithoutEnd)
+{
+    const TempFolder folder;
+    const auto read = [&](const std::string& bytes) {
+        try {
+            readJson(folder.write("a.json", bytes), { .mostValueBytes = 40 });
+            return std::string();
+        } catch (const RunTimeError& error) {
+            return toUtf8(error.text());
+        }
+    };
+    const std::string ten = "\"123456\",";
+    EXPECT_EQ(read("[{\"a\":[" + ten + ten + ten + "12345678]}]"), "");
+    EXPECT_EQ(read("[{\"a\":[" + ten + ten + ten + ten + ten + "1]}]"),
+        "Type mismatch: line 1: a value holds more than 40 bytes; leave it out, or shorten it");
+    EXPECT_EQ(read("[{\"b\":1,\"a\":\"" + std::string(41, 'x')),
+        "Overflow: the value behind byte 13 holds more than 40 bytes; leave it out, or shorten it");
+}
+
 TEST(JsonTable, IsToldByItsBeginning)
 {
     for (const std::string_view start : { "[{\"a\":1}]", " [\n {", "{\"a\":", "[\n1" })

@@ -882,6 +882,18 @@
         <source>the file cannot be copied into %1 to be converted: %2</source>
         <translation>die Datei kann zum Umwandeln nicht nach %1 kopiert werden: %2</translation>
     </message>
+    <message>
+        <source>value %1 of the row holds more than %2 bytes; leave it out, or shorten it</source>
+        <translation>Wert %1 der Zeile hat mehr als %2 Bytes; weglassen oder kürzen</translation>
+    </message>
+    <message>
+        <source>a value holds more than %1 bytes; leave it out, or shorten it</source>
+        <translation>ein Wert hat mehr als %1 Bytes; weglassen oder kürzen</translation>
+    </message>
+    <message>
+        <source>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</source>
+        <translation>der Wert hinter Byte %1 hat mehr als %2 Bytes; weglassen oder kürzen</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

@@ -882,6 +882,18 @@
         <source>the file cannot be copied into %1 to be converted: %2</source>
         <translation>the file cannot be copied into %1 to be converted: %2</translation>
     </message>
+    <message>
+        <source>value %1 of the row holds more than %2 bytes; leave it out, or shorten it</source>
+        <translation>value %1 of the row holds more than %2 bytes; leave it out, or shorten it</translation>
+    </message>
+    <message>
+        <source>a value holds more than %1 bytes; leave it out, or shorten it</source>
+        <translation>a value holds more than %1 bytes; leave it out, or shorten it</translation>
+    </message>
+    <message>
+        <source>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</source>
+        <translation>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

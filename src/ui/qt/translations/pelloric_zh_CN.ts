@@ -882,6 +882,18 @@
         <source>the file cannot be copied into %1 to be converted: %2</source>
         <translation>无法将文件复制到 %1 以便转换：%2</translation>
     </message>
+    <message>
+        <source>value %1 of the row holds more than %2 bytes; leave it out, or shorten it</source>
+        <translation>该行的第 %1 个值超过 %2 个字节；请省略或缩短</translation>
+    </message>
+    <message>
+        <source>a value holds more than %1 bytes; leave it out, or shorten it</source>
+        <translation>有一个值超过 %1 个字节；请省略或缩短</translation>
+    </message>
+    <message>
+        <source>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</source>
+        <translation>第 %1 个字节之后的值超过 %2 个字节；请省略或缩短</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
