@@ -388,7 +388,7 @@ QString exportDetails()
             u"Several pages as .png or .svg become OUT-001, OUT-002 and so on.\n"
             u"FILE - is the standard input, OUT - the standard output. Several FILEs become one\n"
             u"file each in the folder OUT, or with --join one file.\n")
-        + namesDetails();
+        + textsDetails() + namesDetails();
 }
 
 OptionTables exportOptions()

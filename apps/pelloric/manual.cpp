@@ -67,6 +67,31 @@ QString manParagraph(const QString& prose)
     return text;
 }
 
+QString manHeading(const QString& heading)
+{
+    const bool hasBlank = heading.contains(QLatin1Char(' '));
+    return QLatin1String(".SH ") + (hasBlank ? u'"' + heading + u'"' : heading) + QLatin1Char('\n');
+}
+
+QString manEntry(const QString& term, const QString& meaning)
+{
+    return QStringLiteral(".TP\n") + manText(term) + QLatin1Char('\n') + manText(meaning)
+        + QLatin1Char('\n');
+}
+
+/// What the program ends with.
+struct Status {
+    const char* numbers;
+    TextView meaning;
+};
+
+constexpr auto Statuses = std::to_array<Status>({
+    { "0", phraseText(u"Everything was done.") },
+    { "1", phraseText(u"It failed; standard error says why in one line.") },
+    { "2", phraseText(u"The program was called in a wrong way.") },
+    { "130, 143", phraseText(u"It was ended by Ctrl+C or a signal.") },
+});
+
 QString manCommand(const Command& command)
 {
     QString text = QStringLiteral(".SS \"pelloric %1\"\n")
@@ -240,32 +265,30 @@ constexpr auto Shells = std::to_array<Shell>({
 
 QString manualPage()
 {
-    QString text = QStringLiteral(".TH PELLORIC 1 \"\" \"Pelloric %1\" \"User Commands\"\n"
-                                  ".SH NAME\n"
-                                  "pelloric \\- previews, exports and prints tables\n"
-                                  ".SH SYNOPSIS\n")
-                       .arg(QStringLiteral(PELLORIC_VERSION));
+    QString text = QStringLiteral(".TH PELLORIC 1 \"\" \"Pelloric %1\" \"%2\"\n")
+                       .arg(QStringLiteral(PELLORIC_VERSION), qt::phrased(u"User Commands"));
+    text += manHeading(qt::phrased(u"NAME")) + QStringLiteral("pelloric \\- ")
+        + manText(qt::phrased(u"previews, exports and prints tables")) + QLatin1Char('\n');
+    text += manHeading(qt::phrased(u"SYNOPSIS"));
     for (const Command& command : commands()) {
-        text += QStringLiteral(".B pelloric %1\n%2\n.br\n")
-                    .arg(manText(QString::fromLatin1(command.name)),
-                        manText(QString::fromLatin1(command.synopsis)));
+        text += QStringLiteral(".B pelloric %1\n").arg(manText(QString::fromLatin1(command.name)));
+        if (const QString synopsis = QString::fromLatin1(command.synopsis); !synopsis.isEmpty())
+            text += manText(synopsis) + QLatin1Char('\n');
+        text += QStringLiteral(".br\n");
     }
-    text += QStringLiteral(
-        ".SH DESCRIPTION\n"
-        "Lays tables out into pages with header, titles, grid lines and footer, and "
-        "shows, prints or saves them.\n"
-        ".SH COMMANDS\n");
+    text += manHeading(qt::phrased(u"DESCRIPTION"))
+        + manParagraph(qt::phrased(
+            u"Lays tables out into pages with header, titles, grid lines and footer, and shows, "
+            u"prints or saves them."));
+    text += manHeading(qt::phrased(u"COMMANDS"));
     for (const Command& command : commands())
         text += manCommand(command);
-    return text
-        + QStringLiteral(".SH \"EXIT STATUS\"\n"
-                         ".TP\n0\nEverything was done.\n"
-                         ".TP\n1\nIt failed; standard error says why in one line.\n"
-                         ".TP\n2\nThe program was called in a wrong way.\n"
-                         ".TP\n130, 143\nIt was ended by Ctrl+C or a signal.\n"
-                         ".SH FILES\n"
-                         ".TP\n$XDG_CONFIG_HOME/pelloric/OstlConfig.ini\n"
-                         "Paper, margins, texts and styles; see \\fBpelloric settings\\fR.\n");
+    text += manHeading(qt::phrased(u"EXIT STATUS"));
+    for (const Status& status : Statuses)
+        text += manEntry(QLatin1String(status.numbers), qt::phrased(status.meaning));
+    return text + manHeading(qt::phrased(u"FILES"))
+        + manEntry(QStringLiteral("$XDG_CONFIG_HOME/pelloric/OstlConfig.ini"),
+            qt::phrased(u"Paper, margins, texts and styles; see \"pelloric settings\"."));
 }
 
 QString completionOf(const QString& shell)
@@ -282,8 +305,8 @@ int runCompletion(const Invocation& invocation)
     const CommandLine line(invocation.arguments, {}, 1);
     const QString completion = completionOf(line.file(0));
     if (completion.isEmpty())
-        throw CommandError(QStringLiteral("no completion for the shell %1; take bash, zsh or fish")
-                               .arg(line.file(0)),
+        throw CommandError(qt::phrased(u"no completion for the shell %1; take bash, zsh or fish",
+                               { line.file(0) }),
             WrongUsage);
     print(completion);
     return Done;
@@ -291,9 +314,9 @@ int runCompletion(const Invocation& invocation)
 
 QString completionDetails()
 {
-    return QStringLiteral("For bash: source <(pelloric completion bash)\n"
-                          "For zsh: pelloric completion zsh > a folder of $fpath, as _pelloric\n"
-                          "For fish: pelloric completion fish | source\n");
+    return qt::phrased(u"For bash: source <(pelloric completion bash)\n"
+                       u"For zsh: pelloric completion zsh > a folder of $fpath, as _pelloric\n"
+                       u"For fish: pelloric completion fish | source\n");
 }
 
 } // namespace pelloric::app

@@ -93,7 +93,7 @@ QString previewDetails()
                        u"--query). Pages look as your settings say, which the window's dialogs\n"
                        u"change; --defaults does without them. With one of the options for\n"
                        u"headers, paper and so on, what the dialogs change is not kept.\n")
-        + namesDetails();
+        + textsDetails() + namesDetails();
 }
 
 OptionTables previewOptions()

@@ -198,7 +198,7 @@ QString printDetails()
     return fileDetails()
         + qt::phrased(
             u"Every page is a job of its own, one-sided, on the paper it was laid out for.\n")
-        + namesDetails();
+        + textsDetails() + namesDetails();
 }
 
 OptionTables printOptions()

@@ -32,14 +32,12 @@ constexpr auto Options = std::to_array<Option>({
     { "settings", "FILE",
         phraseText(u"the settings of this file; the default ones for those it lacks") },
     { "title", "TEXT", phraseText(u"title of the file, and centred above every page"), true },
-    { "header-left", "TEXT", phraseText(u"header texts; they may hold one of the fields"), true },
-    { "header-center", "TEXT",
-        phraseText(u"[Date Printed], [Time Printed], [Date & Time Printed],"), true },
-    { "header-right", "TEXT", phraseText(u"[Page # of Pages #], [Total Pages] and [Page #]"),
-        true },
-    { "footer-left", "TEXT", phraseText(u"footer texts, likewise"), true },
-    { "footer-center", "TEXT", {}, true },
-    { "footer-right", "TEXT", {}, true },
+    { "header-left", "TEXT", phraseText(u"above every page, at the left"), true },
+    { "header-center", "TEXT", phraseText(u"above every page, in the middle"), true },
+    { "header-right", "TEXT", phraseText(u"above every page, at the right"), true },
+    { "footer-left", "TEXT", phraseText(u"below every page, at the left"), true },
+    { "footer-center", "TEXT", phraseText(u"below every page, in the middle"), true },
+    { "footer-right", "TEXT", phraseText(u"below every page, at the right"), true },
     { "paper", "NAME",
         phraseText(u"A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in") },
     { "margins", "LENGTHS",
@@ -273,6 +271,14 @@ ReportSettings presentSettings(const CommandLine& line, const Platform& platform
 } // namespace
 
 OptionTable reportOptions() { return Options; }
+
+QString textsDetails()
+{
+    return qt::phrased(u"The texts above and below every page may hold one of the fields "
+                       u"[Date Printed],\n"
+                       u"[Time Printed], [Date & Time Printed], [Page # of Pages #], [Total Pages] "
+                       u"and [Page #].\n");
+}
 
 const char* firstReportOption(const CommandLine& line)
 {

@@ -15,6 +15,9 @@ namespace pelloric::app {
 /// The options that shape a report, for every command that lays one out.
 OptionTable reportOptions();
 
+/// What the texts above and below pages may hold, for the help of the commands that take them.
+QString textsDetails();
+
 /// The first of these options that was given; null when none was.
 const char* firstReportOption(const CommandLine& line);
 

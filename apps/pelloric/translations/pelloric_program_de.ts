@@ -474,22 +474,6 @@ und so weiter wird nicht behalten, was die Dialoge ändern.
         <translation>Titel der Datei, und mittig über jeder Seite</translation>
     </message>
     <message>
-        <source>header texts; they may hold one of the fields</source>
-        <translation>Kopftexte; sie dürfen eines der Felder enthalten</translation>
-    </message>
-    <message>
-        <source>[Date Printed], [Time Printed], [Date &amp; Time Printed],</source>
-        <translation>[Date Printed], [Time Printed], [Date &amp; Time Printed],</translation>
-    </message>
-    <message>
-        <source>[Page # of Pages #], [Total Pages] and [Page #]</source>
-        <translation>[Page # of Pages #], [Total Pages] und [Page #]</translation>
-    </message>
-    <message>
-        <source>footer texts, likewise</source>
-        <translation>Fußtexte, ebenso</translation>
-    </message>
-    <message>
         <source>A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in</source>
         <translation>A2 bis A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in</translation>
     </message>
@@ -860,6 +844,108 @@ Eine Ausnahme, die es nicht fängt, beendet das Programm mit Status 1.
     <message>
         <source>standard output cannot be written: %1</source>
         <translation>die Standardausgabe kann nicht geschrieben werden: %1</translation>
+    </message>
+    <message>
+        <source>Everything was done.</source>
+        <translation>Alles ist getan.</translation>
+    </message>
+    <message>
+        <source>It failed; standard error says why in one line.</source>
+        <translation>Es ist misslungen; die Standardfehlerausgabe sagt in einer Zeile, warum.</translation>
+    </message>
+    <message>
+        <source>The program was called in a wrong way.</source>
+        <translation>Das Programm wurde falsch aufgerufen.</translation>
+    </message>
+    <message>
+        <source>It was ended by Ctrl+C or a signal.</source>
+        <translation>Es wurde durch Strg+C oder ein Signal beendet.</translation>
+    </message>
+    <message>
+        <source>User Commands</source>
+        <translation>Dienstprogramme für Benutzer</translation>
+    </message>
+    <message>
+        <source>NAME</source>
+        <translation>BEZEICHNUNG</translation>
+    </message>
+    <message>
+        <source>previews, exports and prints tables</source>
+        <translation>zeigt, exportiert und druckt Tabellen</translation>
+    </message>
+    <message>
+        <source>SYNOPSIS</source>
+        <translation>ÜBERSICHT</translation>
+    </message>
+    <message>
+        <source>DESCRIPTION</source>
+        <translation>BESCHREIBUNG</translation>
+    </message>
+    <message>
+        <source>Lays tables out into pages with header, titles, grid lines and footer, and shows, prints or saves them.</source>
+        <translation>Verteilt Tabellen auf Seiten mit Kopfzeile, Titeln, Gitterlinien und Fußzeile und zeigt, druckt oder speichert sie.</translation>
+    </message>
+    <message>
+        <source>COMMANDS</source>
+        <translation>BEFEHLE</translation>
+    </message>
+    <message>
+        <source>EXIT STATUS</source>
+        <translation>EXIT-STATUS</translation>
+    </message>
+    <message>
+        <source>FILES</source>
+        <translation>DATEIEN</translation>
+    </message>
+    <message>
+        <source>Paper, margins, texts and styles; see &quot;pelloric settings&quot;.</source>
+        <translation>Papier, Ränder, Texte und Stile; siehe „pelloric settings“.</translation>
+    </message>
+    <message>
+        <source>no completion for the shell %1; take bash, zsh or fish</source>
+        <translation>keine Vervollständigung für die Shell %1; es gibt bash, zsh und fish</translation>
+    </message>
+    <message>
+        <source>For bash: source &lt;(pelloric completion bash)
+For zsh: pelloric completion zsh &gt; a folder of $fpath, as _pelloric
+For fish: pelloric completion fish | source
+</source>
+        <translation>Für bash: source &lt;(pelloric completion bash)
+Für zsh: pelloric completion zsh &gt; in einen Ordner von $fpath, als _pelloric
+Für fish: pelloric completion fish | source
+</translation>
+    </message>
+    <message>
+        <source>above every page, at the left</source>
+        <translation>über jeder Seite, links</translation>
+    </message>
+    <message>
+        <source>above every page, in the middle</source>
+        <translation>über jeder Seite, in der Mitte</translation>
+    </message>
+    <message>
+        <source>above every page, at the right</source>
+        <translation>über jeder Seite, rechts</translation>
+    </message>
+    <message>
+        <source>below every page, at the left</source>
+        <translation>unter jeder Seite, links</translation>
+    </message>
+    <message>
+        <source>below every page, in the middle</source>
+        <translation>unter jeder Seite, in der Mitte</translation>
+    </message>
+    <message>
+        <source>below every page, at the right</source>
+        <translation>unter jeder Seite, rechts</translation>
+    </message>
+    <message>
+        <source>The texts above and below every page may hold one of the fields [Date Printed],
+[Time Printed], [Date &amp; Time Printed], [Page # of Pages #], [Total Pages] and [Page #].
+</source>
+        <translation>Die Texte über und unter jeder Seite dürfen eines der Felder [Date Printed],
+[Time Printed], [Date &amp; Time Printed], [Page # of Pages #], [Total Pages] und [Page #] enthalten.
+</translation>
     </message>
 </context>
 <context>

@@ -473,22 +473,6 @@ headers, paper and so on, what the dialogs change is not kept.
         <translation>title of the file, and centred above every page</translation>
     </message>
     <message>
-        <source>header texts; they may hold one of the fields</source>
-        <translation>header texts; they may hold one of the fields</translation>
-    </message>
-    <message>
-        <source>[Date Printed], [Time Printed], [Date &amp; Time Printed],</source>
-        <translation>[Date Printed], [Time Printed], [Date &amp; Time Printed],</translation>
-    </message>
-    <message>
-        <source>[Page # of Pages #], [Total Pages] and [Page #]</source>
-        <translation>[Page # of Pages #], [Total Pages] and [Page #]</translation>
-    </message>
-    <message>
-        <source>footer texts, likewise</source>
-        <translation>footer texts, likewise</translation>
-    </message>
-    <message>
         <source>A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in</source>
         <translation>A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in</translation>
     </message>
@@ -859,6 +843,108 @@ An exception that it does not catch ends the program with status 1.
     <message>
         <source>standard output cannot be written: %1</source>
         <translation>standard output cannot be written: %1</translation>
+    </message>
+    <message>
+        <source>Everything was done.</source>
+        <translation>Everything was done.</translation>
+    </message>
+    <message>
+        <source>It failed; standard error says why in one line.</source>
+        <translation>It failed; standard error says why in one line.</translation>
+    </message>
+    <message>
+        <source>The program was called in a wrong way.</source>
+        <translation>The program was called in a wrong way.</translation>
+    </message>
+    <message>
+        <source>It was ended by Ctrl+C or a signal.</source>
+        <translation>It was ended by Ctrl+C or a signal.</translation>
+    </message>
+    <message>
+        <source>User Commands</source>
+        <translation>User Commands</translation>
+    </message>
+    <message>
+        <source>NAME</source>
+        <translation>NAME</translation>
+    </message>
+    <message>
+        <source>previews, exports and prints tables</source>
+        <translation>previews, exports and prints tables</translation>
+    </message>
+    <message>
+        <source>SYNOPSIS</source>
+        <translation>SYNOPSIS</translation>
+    </message>
+    <message>
+        <source>DESCRIPTION</source>
+        <translation>DESCRIPTION</translation>
+    </message>
+    <message>
+        <source>Lays tables out into pages with header, titles, grid lines and footer, and shows, prints or saves them.</source>
+        <translation>Lays tables out into pages with header, titles, grid lines and footer, and shows, prints or saves them.</translation>
+    </message>
+    <message>
+        <source>COMMANDS</source>
+        <translation>COMMANDS</translation>
+    </message>
+    <message>
+        <source>EXIT STATUS</source>
+        <translation>EXIT STATUS</translation>
+    </message>
+    <message>
+        <source>FILES</source>
+        <translation>FILES</translation>
+    </message>
+    <message>
+        <source>Paper, margins, texts and styles; see &quot;pelloric settings&quot;.</source>
+        <translation>Paper, margins, texts and styles; see &quot;pelloric settings&quot;.</translation>
+    </message>
+    <message>
+        <source>no completion for the shell %1; take bash, zsh or fish</source>
+        <translation>no completion for the shell %1; take bash, zsh or fish</translation>
+    </message>
+    <message>
+        <source>For bash: source &lt;(pelloric completion bash)
+For zsh: pelloric completion zsh &gt; a folder of $fpath, as _pelloric
+For fish: pelloric completion fish | source
+</source>
+        <translation>For bash: source &lt;(pelloric completion bash)
+For zsh: pelloric completion zsh &gt; a folder of $fpath, as _pelloric
+For fish: pelloric completion fish | source
+</translation>
+    </message>
+    <message>
+        <source>above every page, at the left</source>
+        <translation>above every page, at the left</translation>
+    </message>
+    <message>
+        <source>above every page, in the middle</source>
+        <translation>above every page, in the middle</translation>
+    </message>
+    <message>
+        <source>above every page, at the right</source>
+        <translation>above every page, at the right</translation>
+    </message>
+    <message>
+        <source>below every page, at the left</source>
+        <translation>below every page, at the left</translation>
+    </message>
+    <message>
+        <source>below every page, in the middle</source>
+        <translation>below every page, in the middle</translation>
+    </message>
+    <message>
+        <source>below every page, at the right</source>
+        <translation>below every page, at the right</translation>
+    </message>
+    <message>
+        <source>The texts above and below every page may hold one of the fields [Date Printed],
+[Time Printed], [Date &amp; Time Printed], [Page # of Pages #], [Total Pages] and [Page #].
+</source>
+        <translation>The texts above and below every page may hold one of the fields [Date Printed],
+[Time Printed], [Date &amp; Time Printed], [Page # of Pages #], [Total Pages] and [Page #].
+</translation>
     </message>
 </context>
 <context>

@@ -469,22 +469,6 @@ headers, paper and so on, what the dialogs change is not kept.
         <translation>文件的标题，并居中显示在每页上方</translation>
     </message>
     <message>
-        <source>header texts; they may hold one of the fields</source>
-        <translation>页眉文字；可包含下列字段之一：</translation>
-    </message>
-    <message>
-        <source>[Date Printed], [Time Printed], [Date &amp; Time Printed],</source>
-        <translation>[Date Printed], [Time Printed], [Date &amp; Time Printed],</translation>
-    </message>
-    <message>
-        <source>[Page # of Pages #], [Total Pages] and [Page #]</source>
-        <translation>[Page # of Pages #], [Total Pages] 和 [Page #]</translation>
-    </message>
-    <message>
-        <source>footer texts, likewise</source>
-        <translation>页脚文字，同上</translation>
-    </message>
-    <message>
         <source>A2 to A6, B5, Letter, Legal, Tabloid, 8k, 16k, 10x15cm, 4x6in</source>
         <translation>A2 到 A6、B5、Letter、Legal、Tabloid、8k、16k、10x15cm、4x6in</translation>
     </message>
@@ -854,6 +838,108 @@ Kestrane.doPreview 在预览窗口中生成页面，其画布为 previewCanvas()
     <message>
         <source>standard output cannot be written: %1</source>
         <translation>无法写入标准输出：%1</translation>
+    </message>
+    <message>
+        <source>Everything was done.</source>
+        <translation>一切都已完成。</translation>
+    </message>
+    <message>
+        <source>It failed; standard error says why in one line.</source>
+        <translation>失败；标准错误输出用一行说明原因。</translation>
+    </message>
+    <message>
+        <source>The program was called in a wrong way.</source>
+        <translation>程序的调用方式有误。</translation>
+    </message>
+    <message>
+        <source>It was ended by Ctrl+C or a signal.</source>
+        <translation>程序被 Ctrl+C 或信号终止。</translation>
+    </message>
+    <message>
+        <source>User Commands</source>
+        <translation>用户命令</translation>
+    </message>
+    <message>
+        <source>NAME</source>
+        <translation>名称</translation>
+    </message>
+    <message>
+        <source>previews, exports and prints tables</source>
+        <translation>预览、导出和打印表格</translation>
+    </message>
+    <message>
+        <source>SYNOPSIS</source>
+        <translation>概述</translation>
+    </message>
+    <message>
+        <source>DESCRIPTION</source>
+        <translation>描述</translation>
+    </message>
+    <message>
+        <source>Lays tables out into pages with header, titles, grid lines and footer, and shows, prints or saves them.</source>
+        <translation>把表格排成带页眉、标题、网格线和页脚的页面，并显示、打印或保存它们。</translation>
+    </message>
+    <message>
+        <source>COMMANDS</source>
+        <translation>命令</translation>
+    </message>
+    <message>
+        <source>EXIT STATUS</source>
+        <translation>退出状态</translation>
+    </message>
+    <message>
+        <source>FILES</source>
+        <translation>文件</translation>
+    </message>
+    <message>
+        <source>Paper, margins, texts and styles; see &quot;pelloric settings&quot;.</source>
+        <translation>纸张、边距、文字和样式；参见“pelloric settings”。</translation>
+    </message>
+    <message>
+        <source>no completion for the shell %1; take bash, zsh or fish</source>
+        <translation>没有适用于 %1 的补全；可用 bash、zsh 或 fish</translation>
+    </message>
+    <message>
+        <source>For bash: source &lt;(pelloric completion bash)
+For zsh: pelloric completion zsh &gt; a folder of $fpath, as _pelloric
+For fish: pelloric completion fish | source
+</source>
+        <translation>bash：source &lt;(pelloric completion bash)
+zsh：pelloric completion zsh &gt; 放入 $fpath 的某个文件夹，名为 _pelloric
+fish：pelloric completion fish | source
+</translation>
+    </message>
+    <message>
+        <source>above every page, at the left</source>
+        <translation>每页上方左侧的文字</translation>
+    </message>
+    <message>
+        <source>above every page, in the middle</source>
+        <translation>每页上方居中的文字</translation>
+    </message>
+    <message>
+        <source>above every page, at the right</source>
+        <translation>每页上方右侧的文字</translation>
+    </message>
+    <message>
+        <source>below every page, at the left</source>
+        <translation>每页下方左侧的文字</translation>
+    </message>
+    <message>
+        <source>below every page, in the middle</source>
+        <translation>每页下方居中的文字</translation>
+    </message>
+    <message>
+        <source>below every page, at the right</source>
+        <translation>每页下方右侧的文字</translation>
+    </message>
+    <message>
+        <source>The texts above and below every page may hold one of the fields [Date Printed],
+[Time Printed], [Date &amp; Time Printed], [Page # of Pages #], [Total Pages] and [Page #].
+</source>
+        <translation>每页上方和下方的文字可以含有以下字段之一：[Date Printed]、
+[Time Printed]、[Date &amp; Time Printed]、[Page # of Pages #]、[Total Pages] 和 [Page #]。
+</translation>
     </message>
 </context>
 <context>

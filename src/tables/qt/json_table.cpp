@@ -14,6 +14,7 @@
 #include <algorithm>
 #include <optional>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 namespace pelloric::qt {
@@ -283,21 +284,100 @@ void parseAll(std::string_view text, const TextShape& shape, Names& names, Table
     }
 }
 
-/// What takes the first array of objects out of an object, as jq writes it.
-Text pathOfRows(const nlohmann::json& object)
+using Object = nlohmann::ordered_json;
+
+constexpr std::size_t MostNamed = 4; ///< of the members of an object, in an error
+constexpr int MostDepth = 4; ///< of objects in objects in which arrays are looked for
+
+bool isRows(const Object& value)
 {
-    const auto isRows = [](const nlohmann::json& value) {
-        return value.is_array() && !value.empty() && value.front().is_object();
-    };
-    const auto isWord = [](char letter) {
+    return value.is_array() && !value.empty() && value.front().is_object();
+}
+
+bool isWord(std::string_view name)
+{
+    const auto isOfWord = [](char letter) {
         return letter == '_' || (letter >= '0' && letter <= '9') || (letter >= 'a' && letter <= 'z')
             || (letter >= 'A' && letter <= 'Z');
     };
-    for (const auto& [name, value] : object.items()) {
-        if (isRows(value) && !name.empty() && std::ranges::all_of(name, isWord))
-            return u"." + fromUtf8(name);
+    return !name.empty() && (name.front() < '0' || name.front() > '9')
+        && std::ranges::all_of(name, isOfWord);
+}
+
+/// A step of a path as jq takes it.
+std::string stepTo(const std::string& name)
+{
+    return isWord(name) ? "." + name : "." + Object(name).dump();
+}
+
+/// The paths of the first arrays of objects in an object, those that lie deeper behind the others.
+std::vector<std::string> pathsOfRows(const Object& object)
+{
+    std::vector<std::string> paths;
+    std::vector<std::pair<const Object*, std::string>> level { { &object, "" } };
+    for (int depth = 0; depth < MostDepth && paths.size() < MostNamed; ++depth) {
+        std::vector<std::pair<const Object*, std::string>> next;
+        for (const auto& [parent, path] : level) {
+            for (const auto& [name, value] : parent->items()) {
+                if (isRows(value) && paths.size() < MostNamed)
+                    paths.push_back(path + stepTo(name));
+                if (value.is_object())
+                    next.emplace_back(&value, path + stepTo(name));
+            }
+        }
+        level = std::move(next);
     }
-    return u".NAME";
+    return paths;
+}
+
+/// A path as a word of a shell.
+Text shellWord(const std::string& path)
+{
+    constexpr std::string_view Apart = "'\\''";
+    if (path.find_first_of("\"'[") == std::string::npos)
+        return fromUtf8(path);
+    std::string word = "'";
+    for (const char letter : path)
+        word += letter == '\'' ? std::string(Apart) : std::string(1, letter);
+    return fromUtf8(word + "'");
+}
+
+/// What the first members of an object are: name: […], name: {…}, name: 7.
+Text membersOf(const Object& object)
+{
+    constexpr std::size_t MostBytes = 40; ///< of a member
+    std::string members;
+    std::size_t told = 0;
+    for (const auto& [name, value] : object.items()) {
+        members += told > 0 ? ", " : "";
+        if (++told > MostNamed) {
+            members += "…";
+            break;
+        }
+        const bool isNested = value.is_structured() && !value.empty();
+        const std::string shown = !isNested ? value.dump() : value.is_array() ? "[…]" : "{…}";
+        members += Object(name).dump() + ": " + (shown.size() > MostBytes ? "…" : shown);
+    }
+    return fromUtf8(members);
+}
+
+/// What can be done about an object that is no table.
+Text wayOut(const Object& object)
+{
+    const std::vector<std::string> paths = pathsOfRows(object);
+    if (paths.size() == 1)
+        return phrase(
+            u"take the array out of it, for example with: jq %1", { shellWord(paths.front()) });
+    if (!paths.empty()) {
+        Text words;
+        for (const std::string& path : paths)
+            words.append(words.empty() ? u"" : u", ").append(shellWord(path));
+        return phrase(
+            u"take one of its arrays out of it, for example with jq and one of: %1", { words });
+    }
+    if (std::ranges::all_of(object, [](const Object& value) { return value.is_object(); }))
+        return phrase(u"make rows of its objects, for example with: jq '[.[]]'");
+    return phrase(u"it holds no array of objects, but %1", { membersOf(object) });
 }
 
 /// Whether a text is one object alone.
@@ -311,12 +391,10 @@ bool isOneObject(std::string_view text)
 /// something that holds tables, unless the file's name says that its lines are rows.
 void refuseNestedObject(std::string_view text)
 {
-    const nlohmann::json object = nlohmann::json::parse(text);
-    const auto isPlain = [](const nlohmann::json& value) { return value.is_primitive(); };
+    const Object object = Object::parse(text);
+    const auto isPlain = [](const Object& value) { return value.is_primitive(); };
     if (!std::ranges::all_of(object, isPlain))
-        refuse(
-            phrase(u"the file is one object; %1; take the array out of it, for example with: jq %2",
-                { phrase(WantedShape), pathOfRows(object) }));
+        refuse(phrase(u"the file is one object; %1; %2", { phrase(WantedShape), wayOut(object) }));
 }
 
 bool hasLineName(const std::filesystem::path& path)

@@ -19,6 +19,7 @@
 
 #include <algorithm>
 #include <csignal>
+#include <sstream>
 
 namespace pelloric::qt {
 
@@ -768,6 +769,38 @@ TEST_F(Program, CompletesItsCommandsAndOptionsInBash)
         "--header-left --header-center --header-right");
     EXPECT_EQ(completed(QStringLiteral("pelloric export pell")), "pelloric.bash");
     EXPECT_EQ(completed(QStringLiteral("pelloric completion z")), "zsh");
+}
+
+TEST_F(Program, WritesItsManualInTheLanguageOfTheLocale)
+{
+    struct Row {
+        const char* locale;
+        const char* headings;
+        const char* status;
+    };
+    const Row rows[] = {
+        { "C.UTF-8", "NAME|SYNOPSIS|DESCRIPTION|COMMANDS|\"EXIT STATUS\"|FILES|",
+            ".TP\n0\nEverything was done.\n" },
+        { "de_DE.UTF-8", "BEZEICHNUNG|ÜBERSICHT|BESCHREIBUNG|BEFEHLE|EXIT-STATUS|DATEIEN|",
+            ".TP\n0\nAlles ist getan.\n" },
+        { "zh_CN.UTF-8", "名称|概述|描述|命令|退出状态|文件|", ".TP\n0\n一切都已完成。\n" },
+    };
+    for (const Row& row : rows) {
+        surround = [&row](QProcess&, QProcessEnvironment& environment) {
+            environment.remove(QStringLiteral("LANGUAGE"));
+            environment.insert(QStringLiteral("LC_ALL"), QString::fromLatin1(row.locale));
+        };
+        const Ended ended = run(words("help --man"));
+        std::string headings;
+        std::istringstream lines(ended.output);
+        for (std::string line; std::getline(lines, line);) {
+            if (line.starts_with(".SH "))
+                headings += line.substr(4) + "|";
+        }
+        EXPECT_EQ(QString::fromStdString(headings).remove(u'\\').toStdString(), row.headings);
+        EXPECT_TRUE(has(ended.output, row.status)) << row.locale;
+        EXPECT_FALSE(has(ended.output, "\n\n")) << "an empty line is a gap in the page";
+    }
 }
 
 TEST_F(Program, NamesEveryOptionInItsManualAndCompletions)

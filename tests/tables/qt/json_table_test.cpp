@@ -69,19 +69,41 @@ TEST(JsonTable, NamesTheLineOfWhatItCannotReadAndWhatATableIs)
     EXPECT_EQ(read("[1,2]"), "Type mismatch: line 1: " + std::string(Shape));
     EXPECT_EQ(read("[[1],[2]]"), "Type mismatch: line 1: " + std::string(Shape));
     EXPECT_EQ(read("{\"a\":1}\n3\n"), "Type mismatch: line 2: " + std::string(Shape));
-    for (const char* const object :
-        { "{\n\"data\": [{\"a\":1}]\n}", "{\"n\":[1],\"data\":[{\"a\":1}]}" })
-        EXPECT_EQ(read(object),
-            "Type mismatch: the file is one object; " + std::string(Shape)
-                + "; take the array out of it, for example with: jq .data");
-    EXPECT_EQ(read("{\"a b\":[{\"a\":1}]}"),
-        "Type mismatch: the file is one object; " + std::string(Shape)
-            + "; take the array out of it, for example with: jq .NAME");
     EXPECT_EQ(read(" \n"), "Type mismatch: the file is empty");
     for (const char* const nameless : { "[]", "[{}]", "{}\n{}\n" })
         EXPECT_EQ(read(nameless),
             "Type mismatch: no object of the file has a name, so there is no column; "
                 + std::string(Shape));
+}
+
+TEST(JsonTable, SaysHowTheRowsComeOutOfAnObject)
+{
+    const std::string one = "take the array out of it, for example with: jq ";
+    const std::string several
+        = "take one of its arrays out of it, for example with jq and one of: ";
+    const std::string none = "it holds no array of objects, but ";
+    struct WayOut {
+        std::string_view bytes;
+        std::string text;
+    };
+    const WayOut ways[] = {
+        { "{\n\"data\": [{\"a\":1}]\n}", one + ".data" },
+        { "{\"n\":[1],\"data\":[{\"a\":1}]}", one + ".data" },
+        { "{\"a b\":[{\"a\":1}]}", one + "'.\"a b\"'" },
+        { "{\"it's\":[{\"a\":1}]}", one + "'.\"it'\\''s\"'" },
+        { "{\"page\":1,\"data\":{\"2024\":{\"items\":[{}]}}}", one + "'.data.\"2024\".items'" },
+        { "{\"x\":{\"far\":[{\"a\":1}]},\"rows\":[{}],\"cells\":[{}]}",
+            several + ".rows, .cells, .x.far" },
+        { "{\"a\":[{}],\"b\":[{}],\"c\":[{}],\"d\":[{}],\"e\":[{}]}", several + ".a, .b, .c, .d" },
+        { "{\"x\":{\"a\":1},\"y\":{\"a\":2}}",
+            "make rows of its objects, for example with: jq '[.[]]'" },
+        { "{\"z\":[1,2],\"m\":{\"k\":0},\"n\":1.50}", none + "\"z\": […], \"m\": {…}, \"n\": 1.5" },
+        { "{\"rows\":[],\"b\":true,\"c\":null,\"d\":\"x\",\"e\":1}",
+            none + "\"rows\": [], \"b\": true, \"c\": null, \"d\": \"x\", …" },
+    };
+    for (const WayOut& way : ways)
+        EXPECT_EQ(read(way.bytes),
+            "Type mismatch: the file is one object; " + std::string(Shape) + "; " + way.text);
 }
 
 TEST(JsonTable, TakesOneNestedObjectForARowWhereTheNameSaysSo)

@@ -595,10 +595,6 @@
         <translation>das ist kein JSON: %1</translation>
     </message>
     <message>
-        <source>the file is one object; %1; take the array out of it, for example with: jq %2</source>
-        <translation>die Datei ist ein einziges Objekt; %1; nehmen Sie das Array heraus, zum Beispiel mit: jq %2</translation>
-    </message>
-    <message>
         <source>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</source>
         <translation>diese Office-Datei muss von LibreOffice umgewandelt werden, das nicht installiert ist; installieren Sie libreoffice-calc, oder speichern Sie die Datei als .xlsx, .ods oder CSV</translation>
     </message>
@@ -893,6 +889,26 @@
     <message>
         <source>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</source>
         <translation>der Wert hinter Byte %1 hat mehr als %2 Bytes; weglassen oder kürzen</translation>
+    </message>
+    <message>
+        <source>take the array out of it, for example with: jq %1</source>
+        <translation>nehmen Sie das Array heraus, zum Beispiel mit: jq %1</translation>
+    </message>
+    <message>
+        <source>take one of its arrays out of it, for example with jq and one of: %1</source>
+        <translation>nehmen Sie eines der Arrays heraus, zum Beispiel mit jq und einem von: %1</translation>
+    </message>
+    <message>
+        <source>make rows of its objects, for example with: jq &apos;[.[]]&apos;</source>
+        <translation>machen Sie Zeilen aus seinen Objekten, zum Beispiel mit: jq &apos;[.[]]&apos;</translation>
+    </message>
+    <message>
+        <source>it holds no array of objects, but %1</source>
+        <translation>es enthält kein Array von Objekten, sondern %1</translation>
+    </message>
+    <message>
+        <source>the file is one object; %1; %2</source>
+        <translation>die Datei ist ein einziges Objekt; %1; %2</translation>
     </message>
 </context>
 <context>

@@ -595,10 +595,6 @@
         <translation>this is no JSON: %1</translation>
     </message>
     <message>
-        <source>the file is one object; %1; take the array out of it, for example with: jq %2</source>
-        <translation>the file is one object; %1; take the array out of it, for example with: jq %2</translation>
-    </message>
-    <message>
         <source>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</source>
         <translation>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</translation>
     </message>
@@ -893,6 +889,26 @@
     <message>
         <source>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</source>
         <translation>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</translation>
+    </message>
+    <message>
+        <source>take the array out of it, for example with: jq %1</source>
+        <translation>take the array out of it, for example with: jq %1</translation>
+    </message>
+    <message>
+        <source>take one of its arrays out of it, for example with jq and one of: %1</source>
+        <translation>take one of its arrays out of it, for example with jq and one of: %1</translation>
+    </message>
+    <message>
+        <source>make rows of its objects, for example with: jq &apos;[.[]]&apos;</source>
+        <translation>make rows of its objects, for example with: jq &apos;[.[]]&apos;</translation>
+    </message>
+    <message>
+        <source>it holds no array of objects, but %1</source>
+        <translation>it holds no array of objects, but %1</translation>
+    </message>
+    <message>
+        <source>the file is one object; %1; %2</source>
+        <translation>the file is one object; %1; %2</translation>
     </message>
 </context>
 <context>

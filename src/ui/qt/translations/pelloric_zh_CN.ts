@@ -595,10 +595,6 @@
         <translation>这不是 JSON：%1</translation>
     </message>
     <message>
-        <source>the file is one object; %1; take the array out of it, for example with: jq %2</source>
-        <translation>文件是一个对象；%1；请取出其中的数组，例如：jq %2</translation>
-    </message>
-    <message>
         <source>this office file has to be converted by LibreOffice, which is not installed; install libreoffice-calc, or save the file as .xlsx, .ods or CSV</source>
         <translation>此办公文件需要由 LibreOffice 转换，但未安装 LibreOffice；请安装 libreoffice-calc，或把文件另存为 .xlsx、.ods 或 CSV</translation>
     </message>
@@ -893,6 +889,26 @@
     <message>
         <source>the value behind byte %1 holds more than %2 bytes; leave it out, or shorten it</source>
         <translation>第 %1 个字节之后的值超过 %2 个字节；请省略或缩短</translation>
+    </message>
+    <message>
+        <source>take the array out of it, for example with: jq %1</source>
+        <translation>请取出其中的数组，例如用：jq %1</translation>
+    </message>
+    <message>
+        <source>take one of its arrays out of it, for example with jq and one of: %1</source>
+        <translation>请取出其中一个数组，例如用 jq 加上其中之一：%1</translation>
+    </message>
+    <message>
+        <source>make rows of its objects, for example with: jq &apos;[.[]]&apos;</source>
+        <translation>请把其中的对象变成行，例如用：jq &apos;[.[]]&apos;</translation>
+    </message>
+    <message>
+        <source>it holds no array of objects, but %1</source>
+        <translation>其中没有对象数组，只有 %1</translation>
+    </message>
+    <message>
+        <source>the file is one object; %1; %2</source>
+        <translation>文件是一个对象；%1；%2</translation>
     </message>
 </context>
 <context>
