@@ -16,6 +16,7 @@ PackagesBuild=(
     g++
     libcups2-dev
     libdeflate-dev
+    libfontconfig-dev
     libgmock-dev
     libgtest-dev
     libharfbuzz-dev

@@ -4,6 +4,7 @@
 #include "export/qt/qt_font_program.h"
 
 #include "export/cff_charset.h"
+#include "export/qt/font_files.h"
 #include "platform/phrase.h"
 #include "platform/qt/qt_text.h"
 #include "platform/run_time_error.h"
@@ -45,6 +46,11 @@ constexpr auto NeedlessTables = std::to_array<hb_tag_t>({ HB_TAG('G', 'S', 'U', 
     HB_TAG('h', 'd', 'm', 'x'), HB_TAG('V', 'D', 'M', 'X'), HB_TAG('M', 'A', 'T', 'H'),
     HB_TAG('V', 'O', 'R', 'G'), HB_TAG('B', 'A', 'S', 'E'), HB_TAG('D', 'S', 'I', 'G') });
 
+/// Tables that tell a font from all others: faces of a collection may share all but what leads from
+/// characters to glyphs.
+constexpr auto TellingTables
+    = std::to_array<hb_tag_t>({ Head, HorizontalHead, Os2, Name, Characters, Locations });
+
 /// Embedding rights in the table OS/2.
 constexpr unsigned UsageRights = 0xF;
 constexpr unsigned NoEmbedding = 0x2;
@@ -84,11 +90,11 @@ struct FreePlan {
     void operator()(hb_subset_plan_t* plan) const { hb_subset_plan_destroy(plan); }
 };
 
-std::string bytesOf(const Blob& blob)
+QByteArrayView viewOf(const Blob& blob)
 {
     unsigned size = 0;
     const char* const data = hb_blob_get_data(blob.get(), &size);
-    return data ? std::string(data, size) : std::string();
+    return data ? QByteArrayView(data, size) : QByteArrayView();
 }
 
 /// The PostScript name, which holds nothing but letters, digits and a few signs.
@@ -105,12 +111,30 @@ std::string postScriptName(hb_face_t* face, const QRawFont& font)
     return name.empty() ? "Font" : name;
 }
 
+/// The same font in its file, which is mapped into memory; null: no file is known to hold it.
+hb_face_t* faceOfFile(const QRawFont& font)
+{
+    for (const FontFile& file : fontFilesOf(font.familyName())) {
+        const Blob bytes(hb_blob_create_from_file_or_fail(file.path.c_str()));
+        hb_face_t* const face = bytes ? hb_face_create(bytes.get(), file.index) : nullptr;
+        const auto isSame = [&](hb_tag_t tag) {
+            const Blob table(hb_face_reference_table(face, tag));
+            return viewOf(table) == tableOf(font, tag);
+        };
+        if (face && std::ranges::all_of(TellingTables, isSame))
+            return face;
+        hb_face_destroy(face);
+    }
+    return nullptr;
+}
+
 } // namespace
 
 void QtFontProgram::FreeFace::operator()(hb_face_t* face) const { hb_face_destroy(face); }
 
 QtFontProgram::QtFontProgram(const QRawFont& font)
     : font_(font)
+    , file_(faceOfFile(font))
 {
     const auto blobOf = [](hb_face_t*, hb_tag_t tag, void* program) {
         const QByteArray& bytes = static_cast<const QtFontProgram*>(program)->table(tag);
@@ -161,8 +185,10 @@ pdf::FontSubset QtFontProgram::subset(std::span<const std::uint32_t> glyphs)
             phrase(u"the font %1 is damaged", { toText(font_.familyName()) }));
     const bool isCff = facts_.outlines == pdf::Outlines::Cff;
     pdf::FontSubset subset;
-    subset.bytes = bytesOf(Blob(isCff ? hb_face_reference_table(left.get(), CffGlyphs)
-                                      : hb_face_reference_blob(left.get())));
+    const Blob bytes(isCff ? hb_face_reference_table(left.get(), CffGlyphs)
+                           : hb_face_reference_blob(left.get()));
+    const QByteArrayView held = viewOf(bytes);
+    subset.bytes.assign(held.data(), static_cast<std::size_t>(held.size()));
     const hb_map_t* const numbers = hb_subset_plan_old_to_new_glyph_mapping(plan.get());
     for (const std::uint32_t glyph : glyphs)
         subset.numbers.push_back(static_cast<std::uint16_t>(hb_map_get(numbers, glyph)));
@@ -176,18 +202,29 @@ pdf::FontSubset QtFontProgram::subset(std::span<const std::uint32_t> glyphs)
 
 QByteArray QtFontProgram::fingerprintOf(const QRawFont& font)
 {
-    // Faces of a collection may share all but what leads from characters to glyphs.
     QCryptographicHash hash(QCryptographicHash::Md5);
-    for (const hb_tag_t tag : { Head, HorizontalHead, Os2, Name, Characters, Locations })
+    for (const hb_tag_t tag : TellingTables)
         hash.addData(tableOf(font, tag));
     return hash.result();
+}
+
+/// Outlines take megabytes, of which a page needs a few glyphs.
+QByteArray QtFontProgram::outlines(std::uint32_t tag) const
+{
+    if (!file_)
+        return tableOf(font_, tag);
+    const Blob table(hb_face_reference_table(file_.get(), tag));
+    const QByteArrayView bytes = viewOf(table); // stays where it is as long as the file is mapped
+    return QByteArray::fromRawData(bytes.data(), bytes.size());
 }
 
 const QByteArray& QtFontProgram::table(std::uint32_t tag) const
 {
     const auto known = tables_.find(tag);
-    return known != tables_.end() ? known->second
-                                  : tables_.emplace(tag, tableOf(font_, tag)).first->second;
+    if (known != tables_.end())
+        return known->second;
+    const bool isLarge = tag == TrueTypeGlyphs || tag == CffGlyphs;
+    return tables_.emplace(tag, isLarge ? outlines(tag) : tableOf(font_, tag)).first->second;
 }
 
 /// @throws CannotEmbed

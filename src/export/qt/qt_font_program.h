@@ -36,6 +36,7 @@ public:
     static QByteArray fingerprintOf(const QRawFont& font);
 
 private:
+    QByteArray outlines(std::uint32_t tag) const;
     const QByteArray& table(std::uint32_t tag) const;
     void refuseUnlessEmbeddable();
     void readFacts();
@@ -48,6 +49,7 @@ private:
     struct FreeFace {
         void operator()(hb_face_t* face) const;
     };
+    std::unique_ptr<hb_face_t, FreeFace> file_; ///< mapped into memory; null: it is not known
     std::unique_ptr<hb_face_t, FreeFace> face_;
     pdf::FontFacts facts_;
     double unitsPerEm_ = 1000;
