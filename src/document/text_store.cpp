@@ -3,6 +3,8 @@
 
 #include "document/text_store.h"
 
+#include "platform/text_copy.h"
+
 #include <algorithm>
 
 namespace pelloric {
@@ -44,7 +46,7 @@ std::optional<std::uint64_t> TextStore::placeOf(TextView text, std::size_t& bloc
 char16_t* TextStore::copy(TextView text)
 {
     char16_t* const place = room(text.size());
-    std::copy(text.begin(), text.end(), place);
+    putText(place, text);
     return place;
 }
 

@@ -7,6 +7,7 @@
 #include "platform/numbers.h"
 #include "platform/phrase.h"
 #include "platform/run_time_error.h"
+#include "platform/text_copy.h"
 
 #include <algorithm>
 #include <iterator>
@@ -85,7 +86,7 @@ void TableGrid::addRow(std::span<const TextView> cells, std::span<const std::uin
     rowStarts_.push_back(texts);
     std::uint32_t end = 0;
     for (const TextView cell : cells) {
-        std::copy(cell.begin(), cell.end(), texts + end);
+        putText(texts + end, cell);
         end += static_cast<std::uint32_t>(cell.size());
         cellEnds_.push_back(end);
     }
