@@ -54,11 +54,9 @@ TextView CellText::of(const QAbstractItemView& view, const QModelIndex& index)
 {
     const QAbstractItemDelegate* const delegate = view.itemDelegateForIndex(index);
     const DelegateKind kind = kindOf(delegate);
-    if (kind == DelegateKind::Styled)
-        readStyled(static_cast<const QStyledItemDelegate&>(*delegate), index);
-    else
-        readPlain(index, kind);
-    return viewOf(text_);
+    return kind == DelegateKind::Styled
+        ? readStyled(static_cast<const QStyledItemDelegate&>(*delegate), index)
+        : readPlain(index, kind);
 }
 
 CellText::DelegateKind CellText::kindOf(const QAbstractItemDelegate* delegate)
@@ -77,26 +75,32 @@ CellText::DelegateKind CellText::kindOf(const QAbstractItemDelegate* delegate)
 }
 
 /// What a delegate does that changes nothing, without its fonts, colours and icons. Most models
-/// answer several roles one after the other, too, and then copy every answer.
-void CellText::readPlain(const QModelIndex& index, DelegateKind kind)
+/// answer several roles one after the other, too, and then copy every answer. A text that is shown
+/// as it is stays where the model's answer has it.
+TextView CellText::readPlain(const QModelIndex& index, DelegateKind kind)
 {
-    setText(shown(index.data(Qt::DisplayRole), kind), index.data(Qt::CheckStateRole));
+    value_ = index.data(Qt::DisplayRole);
+    const QVariant checkState = index.data(Qt::CheckStateRole);
+    if (value_.typeId() != QMetaType::QString)
+        return changed(shown(value_, kind), checkState);
+    const auto& text = *static_cast<const QString*>(value_.constData());
+    const bool isAsItIs = checkState.isNull() && !text.contains(QChar(QChar::LineSeparator));
+    return isAsItIs ? viewOf(text) : changed(text, checkState);
 }
 
-void CellText::readStyled(const QStyledItemDelegate& delegate, const QModelIndex& index)
+TextView CellText::readStyled(const QStyledItemDelegate& delegate, const QModelIndex& index)
 {
     QStyleOptionViewItem option = option_;
     option.index = index;
     (delegate.*OptionOfDelegate::init)(&option, index);
     const bool hasBox = option.features.testFlag(QStyleOptionViewItem::HasCheckIndicator);
-    setText(option.features.testFlag(QStyleOptionViewItem::HasDisplay) ? option.text : QString(),
+    return changed(
+        option.features.testFlag(QStyleOptionViewItem::HasDisplay) ? option.text : QString(),
         hasBox ? QVariant(static_cast<int>(option.checkState)) : QVariant());
 }
 
 QString CellText::shown(const QVariant& value, DelegateKind kind) const
 {
-    if (value.typeId() == QMetaType::QString)
-        return *static_cast<const QString*>(value.constData());
     if (value.isNull())
         return {};
     if (kind == DelegateKind::Numbers && value.typeId() == QMetaType::Double)
@@ -105,15 +109,17 @@ QString CellText::shown(const QVariant& value, DelegateKind kind) const
     return plain_.displayText(value, option_.locale);
 }
 
-void CellText::setText(QString text, const QVariant& checkState)
+/// Line separators as line feeds, as delegates write them, and the check box before the text.
+TextView CellText::changed(QString text, const QVariant& checkState)
 {
     text_ = std::move(text);
-    text_.replace(QChar(QChar::LineSeparator), QLatin1Char('\n')); // as delegates write line feeds
-    if (checkState.isNull())
-        return;
-    if (!text_.isEmpty())
-        text_.prepend(QLatin1Char(' '));
-    text_.prepend(boxOf(static_cast<Qt::CheckState>(checkState.toInt())));
+    text_.replace(QChar(QChar::LineSeparator), QLatin1Char('\n'));
+    if (!checkState.isNull()) {
+        if (!text_.isEmpty())
+            text_.prepend(QLatin1Char(' '));
+        text_.prepend(boxOf(static_cast<Qt::CheckState>(checkState.toInt())));
+    }
+    return viewOf(text_);
 }
 
 } // namespace pelloric::qt

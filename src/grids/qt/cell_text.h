@@ -8,6 +8,7 @@
 #include <QString>
 #include <QStyleOptionViewItem>
 #include <QStyledItemDelegate>
+#include <QVariant>
 
 class QAbstractItemView;
 class QModelIndex;
@@ -37,15 +38,16 @@ private:
     enum class DelegateKind { Plain, Numbers, Styled, Painter };
 
     DelegateKind kindOf(const QAbstractItemDelegate* delegate);
-    void readPlain(const QModelIndex& index, DelegateKind kind);
-    void readStyled(const QStyledItemDelegate& delegate, const QModelIndex& index);
-    void setText(QString text, const QVariant& checkState);
+    TextView readPlain(const QModelIndex& index, DelegateKind kind);
+    TextView readStyled(const QStyledItemDelegate& delegate, const QModelIndex& index);
+    TextView changed(QString text, const QVariant& checkState);
     QString shown(const QVariant& value, DelegateKind kind) const;
 
     QStyleOptionViewItem option_; ///< of every cell of the view that was taken
     QStyledItemDelegate plain_; ///< formats what no delegate of the host's formats itself
     const QAbstractItemDelegate* lastDelegate_ = nullptr;
     DelegateKind lastKind_ = DelegateKind::Painter;
+    QVariant value_; ///< what a model answered last; its text is lent as it is
     QString text_;
 };
 

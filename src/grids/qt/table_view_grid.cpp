@@ -127,10 +127,10 @@ void TableViewGrid::readRow(
         throw RunTimeError(
             ErrorNumber::SubscriptOutOfRange, noSuchItem(phrase(u"row"), row, rows_.count()));
     const int modelRow = rows_.logical(row - 1);
-    const int modelColumns = model.columnCount(root);
+    const int modelColumns = modelRow < model.rowCount(root) ? model.columnCount(root) : 0;
     for (const int column : columns) {
         const int modelColumn = columns_.logical(column);
-        if (modelRow >= model.rowCount(root) || modelColumn >= modelColumns)
+        if (modelColumn >= modelColumns)
             throw RunTimeError(ErrorNumber::SubscriptOutOfRange, phrase(u"the grid has lost rows"));
         take(text(table, root, { modelRow, modelColumn }));
     }
@@ -145,7 +145,7 @@ TextView TableViewGrid::title(int column)
 
 TextView TableViewGrid::text(const QTableView& table, const QModelIndex& root, ModelCell cell)
 {
-    if (const CellSpan* const span = spans_.at(cell)) {
+    if (const CellSpan* const span = spans_.isEmpty() ? nullptr : spans_.at(cell)) {
         if (span->shown != cell)
             return {};
         cell = span->first;

@@ -5,6 +5,7 @@
 
 #include "grids/collection.h"
 #include "grids/qt/cell_text.h"
+#include "grids/qt/listed_rows.h"
 #include "grids/qt/view_looks.h"
 #include "grids/qt/view_sections.h"
 #include "platform/member_names.h"
@@ -19,9 +20,7 @@
 #include <QPointer>
 #include <QTreeView>
 
-#include <functional>
 #include <iterator>
-#include <vector>
 
 namespace pelloric::qt {
 
@@ -42,34 +41,6 @@ enum ItemMember { ItemText, SubItems, ItemMemberCount };
 constexpr TextView ItemNames[] = { u"Text", u"SubItems" };
 static_assert(std::size(ItemNames) == ItemMemberCount);
 
-/// Tells that the rows of a model are no longer those that were listed.
-class ModelWatch {
-public:
-    /// Watches this model and no other, from now on.
-    void watch(QAbstractItemModel& model)
-    {
-        context_ = std::make_unique<QObject>();
-        isChanged_ = false;
-        const auto change = [this] { isChanged_ = true; };
-        QObject* const context = context_.get();
-        QObject::connect(&model, &QAbstractItemModel::rowsInserted, context, change);
-        QObject::connect(&model, &QAbstractItemModel::rowsRemoved, context, change);
-        QObject::connect(&model, &QAbstractItemModel::rowsMoved, context, change);
-        QObject::connect(&model, &QAbstractItemModel::columnsInserted, context, change);
-        QObject::connect(&model, &QAbstractItemModel::columnsRemoved, context, change);
-        QObject::connect(&model, &QAbstractItemModel::columnsMoved, context, change);
-        QObject::connect(&model, &QAbstractItemModel::layoutChanged, context, change);
-        QObject::connect(&model, &QAbstractItemModel::modelReset, context, change);
-        QObject::connect(&model, &QObject::destroyed, context, change);
-    }
-
-    bool isChanged() const { return isChanged_; }
-
-private:
-    std::unique_ptr<QObject> context_;
-    bool isChanged_ = true;
-};
-
 } // namespace
 
 /// The view, and what was listed of it.
@@ -78,10 +49,9 @@ struct TreeViewGrid::Source {
     QPointer<QListView> list; ///< null for a tree
     Twips listWidth = -1; ///< what was put; below 0: the view's own
     SectionMap columns;
-    std::vector<QModelIndex> rows; ///< the first column of each row
+    ListedRows rows;
     CellText text;
     ViewLooks looks;
-    ModelWatch watch;
 
     QAbstractItemView& view() const
     {
@@ -133,54 +103,21 @@ struct TreeViewGrid::Source {
             listWidth = width;
     }
 
-    /// Fetching may move rows, so that all of it is done before the first row is listed.
     void takeRows()
     {
         QAbstractItemView& shown = view();
-        QAbstractItemModel& model = *shown.model();
-        listBelow(shown.rootIndex(), [&](const QModelIndex& parent) { fetchAll(model, parent); });
-        listBelow(shown.rootIndex(), [](const QModelIndex&) {});
+        rows.take({ .model = *shown.model(),
+            .root = shown.rootIndex(),
+            .isHidden
+            = [this](int row, const QModelIndex& parent) { return isHidden(row, parent); },
+            .isOpen = [this](const QModelIndex& row) { return tree && tree->isExpanded(row); } });
         text.take(shown);
         looks.take(shown);
-        watch.watch(model);
     }
 
     bool isHidden(int row, const QModelIndex& parent) const
     {
         return tree ? tree->isRowHidden(row, parent) : list->isRowHidden(row);
-    }
-
-    /// Walks the open branches; a branch that was never opened is never asked for its rows.
-    void listBelow(
-        const QModelIndex& root, const std::function<void(const QModelIndex&)>& beforeBranch)
-    {
-        struct Branch {
-            QPersistentModelIndex parent;
-            int next;
-            int count;
-        };
-        const QAbstractItemModel& model = *view().model();
-        std::vector<Branch> open;
-        const auto enter = [&](const QModelIndex& parent) {
-            beforeBranch(parent);
-            open.push_back({ parent, 0, model.rowCount(parent) });
-        };
-        rows.clear();
-        enter(root);
-        while (!open.empty()) {
-            Branch& branch = open.back();
-            if (branch.next == branch.count) {
-                open.pop_back();
-                continue;
-            }
-            const int row = branch.next++;
-            const QModelIndex index = model.index(row, 0, branch.parent);
-            if (!index.isValid() || isHidden(row, branch.parent))
-                continue;
-            rows.push_back(index);
-            if (tree && tree->isExpanded(index) && model.hasChildren(index))
-                enter(index);
-        }
     }
 
     /// The column of the branches: the model's number.
@@ -209,23 +146,32 @@ struct TreeViewGrid::Source {
         look.indent = twipsOfPixels(steps * tree->indentation(), tree->logicalDpiX());
     }
 
+    /// Tells the texts of a row in some columns; what does not hang on the column is asked once.
+    /// @param places  of the columns as they are seen, from 0
+    template <typename Take> void cells(int row, std::span<const int> places, const Take& take)
+    {
+        const QAbstractItemView& shown = view();
+        const QAbstractItemModel& model = *shown.model();
+        const QModelIndex first = rows.at(row);
+        const QModelIndex parent = first.parent();
+        const bool isFirstSpanned = isSpanned(first);
+        for (const int place : places) {
+            if (place < 0 || place >= columns.count() || rows.isChanged())
+                throw RunTimeError(
+                    ErrorNumber::SubscriptOutOfRange, phrase(u"the list has changed"));
+            const int section = logical(place);
+            take(section > 0 && isFirstSpanned
+                    ? TextView()
+                    : text.of(shown, model.index(first.row(), section, parent)));
+        }
+    }
+
     /// The text of a row in a column.
     TextView cell(int row, int column)
     {
-        const QAbstractItemView& shown = view();
-        const QModelIndex& first = this->row(row);
-        const int section = logical(column);
-        if (section > 0 && isSpanned(first))
-            return {};
-        return text.of(shown, first.siblingAtColumn(section));
-    }
-
-    const QModelIndex& row(int place) const
-    {
-        const auto at = static_cast<std::size_t>(place);
-        if (watch.isChanged() || at >= rows.size())
-            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, phrase(u"the list has changed"));
-        return rows[at];
+        TextView shown;
+        cells(row, { &column, 1 }, [&](TextView told) { shown = told; });
+        return shown;
     }
 };
 
@@ -340,7 +286,7 @@ public:
     }
 
 private:
-    int count() const override { return static_cast<int>(source_.rows.size()); }
+    int count() const override { return source_.rows.count(); }
 
     AutomationObject& itemAt(int place) override
     {
@@ -392,7 +338,7 @@ Value TreeViewGrid::get(MemberId member, std::span<const Value> arguments)
         return Value::ofObject(*headers_);
     case ListItems:
         if (!arguments.empty()) {
-            if (source_->watch.isChanged())
+            if (source_->rows.isChanged())
                 source_->takeRows();
             return items_->item(arguments);
         }
@@ -411,11 +357,7 @@ void TreeViewGrid::put(MemberId member, std::span<const Value>, const Value&)
 void TreeViewGrid::readRow(
     std::int32_t row, std::span<const int> columns, const std::function<void(TextView text)>& take)
 {
-    for (const int column : columns) {
-        if (column < 0 || column >= source_->columns.count())
-            throw RunTimeError(ErrorNumber::SubscriptOutOfRange, u"the list has changed");
-        take(source_->cell(row - 1, column));
-    }
+    source_->cells(row - 1, columns, take);
 }
 
 /// Trees and lists draw no lines between cells.
@@ -424,7 +366,7 @@ GridLook TreeViewGrid::gridLook() { return ViewLooks::withoutLines(); }
 void TreeViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& look)
 {
     const QAbstractItemView& view = source_->view();
-    const QModelIndex& index = source_->row(row - 1);
+    const QModelIndex& index = source_->rows.at(row - 1);
     const int logical = source_->logical(column);
     source_->looks.read(view, index.siblingAtColumn(logical), look);
     source_->looks.alternate(row, look);
@@ -436,7 +378,7 @@ void TreeViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& loo
 
 TextView TreeViewGrid::text(std::int32_t row, std::int32_t column)
 {
-    const QModelIndex& index = source_->row(row - 1);
+    const QModelIndex& index = source_->rows.at(row - 1);
     return source_->text.of(source_->view(), index.siblingAtColumn(source_->logical(column)));
 }
 
@@ -451,13 +393,13 @@ CellAlignment TreeViewGrid::titleAlignment(std::int32_t column)
 bool TreeViewGrid::isMarked(std::int32_t row)
 {
     const QItemSelectionModel* const selection = source_->view().selectionModel();
-    const QModelIndex& index = source_->row(row - 1);
+    const QModelIndex& index = source_->rows.at(row - 1);
     return selection && selection->rowIntersectsSelection(index.row(), index.parent());
 }
 
 std::optional<double> TreeViewGrid::number(std::int32_t row, std::int32_t column)
 {
-    return ViewLooks::number(source_->row(row - 1).siblingAtColumn(source_->logical(column)));
+    return ViewLooks::number(source_->rows.at(row - 1).siblingAtColumn(source_->logical(column)));
 }
 
 } // namespace pelloric::qt
