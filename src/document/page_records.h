@@ -46,6 +46,8 @@ struct PatternLine {
     {
         return { { x1, startsAtBottom ? bottom : top }, { x2, endsAtBottom ? bottom : top }, pen };
     }
+
+    bool operator==(const PatternLine&) const = default;
 };
 
 /// The line patterns of a document, by number.

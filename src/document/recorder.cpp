@@ -101,6 +101,14 @@ void Recorder::setTextFont(const Font& font, Color color)
     applyTextFont();
 }
 
+void Recorder::setTextStyle(const KnownStyle& known)
+{
+    styleNumber_ = known.number;
+    style_ = known.style;
+    measured_ = known.measured;
+    applyTextFont();
+}
+
 void Recorder::moveTo(Tpoint point)
 {
     point_ = point;

@@ -19,6 +19,13 @@ struct RecorderState {
     Tpoint point; ///< twips
 };
 
+/// Font and colour as a document knows them, to be taken again without being looked up.
+struct KnownStyle {
+    TextStyle style;
+    std::uint32_t number = 0; ///< of the document
+    MeasuredFont measured;
+};
+
 /// Draws on the page that is being built: every operation appends a record to the current page
 /// and moves the current point, which holds whole twips.
 ///
@@ -52,6 +59,10 @@ public:
     /// @throws RunTimeError Overflow: a line of that size is higher than 32 bits of twips; nothing
     ///         has changed
     void setTextFont(const Font& font, Color color);
+    /// Font and colour that are set.
+    KnownStyle textStyle() const { return { style_, styleNumber_, measured_ }; }
+    /// Sets what `textStyle` answered since the document was replaced as a whole.
+    void setTextStyle(const KnownStyle& known);
     const Font& textFont() const { return style_.font; }
     Color textColor() const { return style_.color; }
 

@@ -88,9 +88,10 @@ std::optional<Color> ShapedLayout::backgroundOf(
 void ShapedLayout::drawRowLines(std::size_t at)
 {
     const ShapedRow& row = page_[at];
-    const Twips top = tops_[at];
-    const Twips bottom = tops_[at + 1];
     const bool isMerged = source_.style.GridMerge && !row.isTotal();
+    const std::uint32_t pen = recorder_.penNumber();
+    const auto upright = [&](Twips x) { rowLines_.push_back({ x, x, false, true, pen }); };
+    rowLines_.clear();
     if (drawsVer_) {
         for (std::size_t place = 0; place < columns_.size(); ++place) {
             const int field = columns_[place].field;
@@ -98,15 +99,26 @@ void ShapedLayout::drawRowLines(std::size_t at)
                 && ((isMerged && equalsLeft(row, field))
                     || isSameBox(row, columns_[place - 1].field, row, field));
             if (!isOpen)
-                drawLine({ columns_[place].edge, top }, { columns_[place].edge, bottom });
+                upright(columns_[place].edge);
         }
-        drawLine({ tableRight_, top }, { tableRight_, bottom });
+        upright(tableRight_);
     }
-    if (!drawsHor_)
-        return;
+    if (drawsHor_)
+        ruleBelow(at, isMerged);
+    recordRowLines(tops_[at], tops_[at + 1]);
+}
+
+/// Rules the bottom of a row where no cell goes on below it.
+void ShapedLayout::ruleBelow(std::size_t at, bool isMerged)
+{
+    const ShapedRow& row = page_[at];
+    const std::uint32_t pen = recorder_.penNumber();
+    const auto level = [&](Twips left, Twips right) {
+        rowLines_.push_back({ left, right, true, true, pen });
+    };
     const ShapedRow* const next = at + 1 < page_.size() ? &page_[at + 1] : nullptr;
     if (!isMerged && (next == nullptr || row.looks.empty())) {
-        drawLine({ tableLeft_, bottom }, { tableRight_, bottom });
+        level(tableLeft_, tableRight_);
         return;
     }
     const auto isOpen = [&](int field) {
@@ -124,10 +136,22 @@ void ShapedLayout::drawRowLines(std::size_t at)
         // A merged row's columns each have a line of their own, as on the plain page.
         while (!isMerged && end + 1 < columns_.size() && !isOpen(columns_[end + 1].field))
             ++end;
-        const Twips right = end + 1 < columns_.size() ? columns_[end + 1].edge : tableRight_;
-        drawLine({ columns_[first].edge, bottom }, { right, bottom });
+        level(
+            columns_[first].edge, end + 1 < columns_.size() ? columns_[end + 1].edge : tableRight_);
         first = end;
     }
+}
+
+/// Neighbouring rows mostly have the same lines.
+void ShapedLayout::recordRowLines(Twips top, Twips bottom)
+{
+    if (rowLines_.empty())
+        return;
+    if (rowLines_ != patternLines_) {
+        patternLines_ = rowLines_;
+        pattern_ = document_.addLinePattern(rowLines_);
+    }
+    recorder_.rowLines(top, bottom, pattern_);
 }
 
 void ShapedLayout::printCells(std::size_t at)
@@ -344,18 +368,24 @@ void ShapedLayout::underline(const CellLook& look, const CellLine& line, Tpoint 
         stroke(0.55);
 }
 
+/// Fonts are looked up once for each look that they have.
 void ShapedLayout::useFont(bool bold, bool italic, Color color)
 {
-    const Font& now = recorder_.textFont();
-    const Font& body = source_.style.body.font;
-    const bool isSet = now.bold == bold && now.italic == italic && recorder_.textColor() == color
-        && now.size == body.size && now.name == body.name;
-    if (isSet)
+    const std::uint64_t look = std::uint64_t { static_cast<std::uint32_t>(color) }
+        | std::uint64_t { bold } << 32U | std::uint64_t { italic } << 33U;
+    if (style_ == look)
         return;
-    Font wanted = body;
-    wanted.bold = bold;
-    wanted.italic = italic;
-    recorder_.setTextFont(wanted, color);
+    const auto [known, isNew] = styles_.try_emplace(look);
+    if (isNew) {
+        Font wanted = source_.style.body.font;
+        wanted.bold = bold;
+        wanted.italic = italic;
+        recorder_.setTextFont(wanted, color);
+        known->second = recorder_.textStyle();
+    } else {
+        recorder_.setTextStyle(known->second);
+    }
+    style_ = look;
 }
 
 void ShapedLayout::usePen(const LinePen& pen)

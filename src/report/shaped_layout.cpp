@@ -295,6 +295,7 @@ void ShapedLayout::endPage(bool isFull)
     pageLines_.drawPageFooter(document_.currentPage + 1,
         isFull && !tops_.empty() ? below(tops_.back(), LineGap) : bottom + LineGap);
     pen_.reset();
+    style_.reset();
 }
 
 } // namespace pelloric

@@ -89,6 +89,8 @@ private:
     void printRows();
     void fillBackgrounds(std::size_t at);
     void drawRowLines(std::size_t at);
+    void ruleBelow(std::size_t at, bool isMerged);
+    void recordRowLines(Twips top, Twips bottom);
     void printCells(std::size_t at);
     void printCell(std::size_t at, std::size_t place);
     void printPlain(const BandColumn& column, std::span<const CellLine> lines, Twips top);
@@ -148,6 +150,12 @@ private:
     std::vector<TextView> lastTexts_; ///< of the row before the page's first; empty: none
     std::vector<PlannedPage> plan_;
     std::optional<LinePen> pen_; ///< set last
+
+    std::unordered_map<std::uint64_t, KnownStyle> styles_; ///< by colour, bold and italic
+    std::optional<std::uint64_t> style_; ///< set last
+    std::vector<PatternLine> rowLines_; ///< of the row that is drawn
+    std::vector<PatternLine> patternLines_; ///< of the pattern that was drawn last
+    std::uint32_t pattern_ = 0; ///< its number
 };
 
 } // namespace pelloric

@@ -16,7 +16,6 @@
 #include <QTreeView>
 
 #include <algorithm>
-#include <array>
 #include <typeinfo>
 
 namespace pelloric::qt {
@@ -71,18 +70,18 @@ TooWide tooWideOf(const QAbstractItemView& view)
     return TooWide::CutRight;
 }
 
-void setFont(const QFont& font, CellLook& look)
-{
-    look.bold = font.weight() >= QFont::DemiBold;
-    look.italic = font.italic();
-    look.underline = font.underline();
-    look.strikethrough = font.strikeOut();
-}
-
 void setBackground(const QBrush& brush, CellLook& look)
 {
     if (brush.style() != Qt::NoBrush && brush.color().alpha() > 0)
         look.background = colorOf(brush.color());
+}
+
+/// A brush, or a colour or picture as a brush; nothing: it is none of them.
+std::optional<QBrush> brushOf(const QVariant& value)
+{
+    if (value.typeId() == QMetaType::QBrush)
+        return *static_cast<const QBrush*>(value.constData());
+    return value.canConvert<QBrush>() ? std::optional(value.value<QBrush>()) : std::nullopt;
 }
 
 CheckMark markOf(Qt::CheckState state)
@@ -162,6 +161,12 @@ void ViewLooks::take(const QAbstractItemView& view)
 {
     option_ = QStyleOptionViewItem();
     (view.*OptionOfView::init)(&option_);
+    lastDelegate_ = nullptr;
+    lastStyled_ = nullptr;
+    ownFont_ = lookOf(option_.font);
+    fonts_.fill(ownFont_);
+    for (FontLook& known : fonts_)
+        known.font = QFont(); // says nothing, so that the view's font stays as it is
     tooWide_ = tooWideOf(view);
     iconFiles_.clear();
     alternates_ = view.alternatingRowColors();
@@ -172,12 +177,21 @@ void ViewLooks::read(const QAbstractItemView& view, const QModelIndex& index, Ce
 {
     look = {};
     look.tooWide = tooWide_;
-    const QAbstractItemDelegate* const delegate = view.itemDelegateForIndex(index);
-    const auto* const styled = qobject_cast<const QStyledItemDelegate*>(delegate);
-    if (styled && typeid(*styled) != typeid(QStyledItemDelegate))
+    if (const auto* const styled = styledDelegate(view.itemDelegateForIndex(index)))
         readStyled(*styled, index, look);
     else
         readPlain(index, look);
+}
+
+/// A delegate whose own reading of the model changes looks; null: it reads what is there.
+const QStyledItemDelegate* ViewLooks::styledDelegate(const QAbstractItemDelegate* delegate)
+{
+    if (delegate == lastDelegate_)
+        return lastStyled_;
+    lastDelegate_ = delegate;
+    const auto* const styled = qobject_cast<const QStyledItemDelegate*>(delegate);
+    lastStyled_ = styled && typeid(*styled) != typeid(QStyledItemDelegate) ? styled : nullptr;
+    return lastStyled_;
 }
 
 void ViewLooks::alternate(std::int32_t row, CellLook& look) const
@@ -188,35 +202,33 @@ void ViewLooks::alternate(std::int32_t row, CellLook& look) const
 
 void ViewLooks::readPlain(const QModelIndex& index, CellLook& look)
 {
-    std::array<QModelRoleData, 6> roles { QModelRoleData(Qt::FontRole),
-        QModelRoleData(Qt::TextAlignmentRole), QModelRoleData(Qt::ForegroundRole),
-        QModelRoleData(Qt::BackgroundRole), QModelRoleData(Qt::CheckStateRole),
-        QModelRoleData(Qt::DecorationRole) };
-    index.multiData(roles);
-    if (!roles[0].data().isNull())
-        setFont(roles[0].data().value<QFont>().resolve(option_.font), look);
+    const QVariant font = index.data(Qt::FontRole);
+    if (font.isNull())
+        setFont(ownFont_, look);
+    else if (font.typeId() == QMetaType::QFont)
+        setFont(fontLook(*static_cast<const QFont*>(font.constData())), look);
     else
-        setFont(option_.font, look);
-    if (!roles[1].data().isNull())
-        setAlignment(Qt::Alignment(roles[1].data().toInt()), look);
-    else
-        setAlignment(option_.displayAlignment, look);
-    if (roles[2].data().canConvert<QBrush>())
-        look.foreground = colorOf(roles[2].data().value<QBrush>().color());
-    if (roles[3].data().canConvert<QBrush>())
-        setBackground(roles[3].data().value<QBrush>(), look);
-    if (!roles[4].data().isNull())
-        look.check = markOf(static_cast<Qt::CheckState>(roles[4].data().toInt()));
-    setDecoration(roles[5].data(), look);
+        setFont(fontLook(font.value<QFont>()), look);
+    const QVariant alignment = index.data(Qt::TextAlignmentRole);
+    setAlignment(
+        alignment.isNull() ? option_.displayAlignment : Qt::Alignment(alignment.toInt()), look);
+    if (const auto foreground = brushOf(index.data(Qt::ForegroundRole)))
+        look.foreground = colorOf(foreground->color());
+    if (const auto background = brushOf(index.data(Qt::BackgroundRole)))
+        setBackground(*background, look);
+    const QVariant check = index.data(Qt::CheckStateRole);
+    if (!check.isNull())
+        look.check = markOf(static_cast<Qt::CheckState>(check.toInt()));
+    setDecoration(index.data(Qt::DecorationRole), look);
 }
 
 void ViewLooks::readStyled(
-    const QAbstractItemDelegate& delegate, const QModelIndex& index, CellLook& look)
+    const QStyledItemDelegate& delegate, const QModelIndex& index, CellLook& look)
 {
     QStyleOptionViewItem option = option_;
     option.index = index;
-    (static_cast<const QStyledItemDelegate&>(delegate).*OptionOfDelegate::init)(&option, index);
-    setFont(option.font, look);
+    (delegate.*OptionOfDelegate::init)(&option, index);
+    setFont(lookOf(option.font), look);
     setAlignment(option.displayAlignment, look);
     const QColor text = option.palette.color(QPalette::Normal, QPalette::Text);
     if (text != option_.palette.color(QPalette::Normal, QPalette::Text))
@@ -226,6 +238,38 @@ void ViewLooks::readStyled(
         look.check = markOf(option.checkState);
     if (option.features.testFlag(QStyleOptionViewItem::HasDecoration))
         setDecoration(option.icon, look);
+}
+
+/// Cells mostly share a few fonts, which are told apart by what they share; laying one over the
+/// view's makes a font of its own.
+const ViewLooks::FontLook& ViewLooks::fontLook(const QFont& font)
+{
+    for (const FontLook& known : fonts_) {
+        if (font.isCopyOf(known.font) && font.resolveMask() == known.font.resolveMask())
+            return known;
+    }
+    FontLook& known = fonts_[nextFont_];
+    nextFont_ = (nextFont_ + 1) % fonts_.size();
+    known = lookOf(font.resolve(option_.font));
+    known.font = font;
+    return known;
+}
+
+ViewLooks::FontLook ViewLooks::lookOf(const QFont& font)
+{
+    return { .font = font,
+        .bold = font.weight() >= QFont::DemiBold,
+        .italic = font.italic(),
+        .underline = font.underline(),
+        .strikethrough = font.strikeOut() };
+}
+
+void ViewLooks::setFont(const FontLook& font, CellLook& look)
+{
+    look.bold = font.bold;
+    look.italic = font.italic;
+    look.underline = font.underline;
+    look.strikethrough = font.strikethrough;
 }
 
 /// Where the alignment says nothing, texts stand as the writing runs.

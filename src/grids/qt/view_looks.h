@@ -5,9 +5,10 @@
 
 #include "platform/cell_look.h"
 
-#include <QPalette>
+#include <QFont>
 #include <QStyleOptionViewItem>
 
+#include <array>
 #include <map>
 #include <utility>
 
@@ -15,6 +16,7 @@ class QAbstractItemDelegate;
 class QAbstractItemView;
 class QHeaderView;
 class QModelIndex;
+class QStyledItemDelegate;
 
 namespace pelloric::qt {
 
@@ -42,9 +44,21 @@ public:
     static std::optional<double> number(const QModelIndex& index);
 
 private:
+    /// What of a font is shown.
+    struct FontLook {
+        QFont font; ///< as a cell has it
+        bool bold = false;
+        bool italic = false;
+        bool underline = false;
+        bool strikethrough = false;
+    };
+
+    const QStyledItemDelegate* styledDelegate(const QAbstractItemDelegate* delegate);
     void readPlain(const QModelIndex& index, CellLook& look);
-    void readStyled(
-        const QAbstractItemDelegate& delegate, const QModelIndex& index, CellLook& look);
+    void readStyled(const QStyledItemDelegate& delegate, const QModelIndex& index, CellLook& look);
+    const FontLook& fontLook(const QFont& font);
+    static FontLook lookOf(const QFont& font);
+    static void setFont(const FontLook& font, CellLook& look);
     void setAlignment(Qt::Alignment alignment, CellLook& look) const;
     void setDecoration(const QVariant& decoration, CellLook& look);
 
@@ -53,6 +67,11 @@ private:
 
     QStyleOptionViewItem option_; ///< of every cell of the view that was taken
     TooWide tooWide_ = TooWide::Wrapped;
+    const QAbstractItemDelegate* lastDelegate_ = nullptr; ///< that was looked at
+    const QStyledItemDelegate* lastStyled_ = nullptr; ///< the same, where it has to be asked
+    FontLook ownFont_; ///< of the view
+    std::array<FontLook, 8> fonts_; ///< that were met last
+    std::size_t nextFont_ = 0; ///< the one that gives way
     bool alternates_ = false;
     Color alternateColor_ = 0;
     std::map<IconKey, Text> iconFiles_; ///< of the decorations that were met

@@ -91,6 +91,32 @@ TEST_F(TableLooks, AreThoseThatTheModelGivesItsCells)
     EXPECT_EQ(plain.place, CellPlace::Middle);
 }
 
+TEST_F(TableLooks, LayTheFontsOfCellsOverTheFontOfTheView)
+{
+    QFont ofView = table_.font();
+    ofView.setBold(true);
+    ofView.setStrikeOut(true);
+    table_.setFont(ofView);
+    for (int cell = 0; cell < 12; ++cell) { // more fonts than are kept
+        QFont font;
+        if (cell != 0)
+            font.setBold((cell & 1) != 0);
+        font.setItalic((cell & 2) != 0);
+        font.setUnderline((cell & 4) != 0);
+        item(cell / 3, cell % 3, QStringLiteral("text"))->setFont(cell == 0 ? QFont() : font);
+    }
+    const auto made = grid();
+    for (int times = 0; times < 2; ++times) {
+        for (int cell = 0; cell < 12; ++cell) {
+            const CellLook look = lookOf(*made, cell / 3 + 1, cell % 3);
+            EXPECT_EQ(look.bold, cell == 0 || (cell & 1) != 0) << cell;
+            EXPECT_EQ(look.italic, (cell & 2) != 0) << cell;
+            EXPECT_EQ(look.underline, (cell & 4) != 0) << cell;
+            EXPECT_TRUE(look.strikethrough) << cell; // no cell says anything about it
+        }
+    }
+}
+
 TEST_F(TableLooks, AreThoseThatADelegateGives)
 {
     RedNumbers delegate;
