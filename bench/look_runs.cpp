@@ -23,6 +23,7 @@
 #include <algorithm>
 #include <array>
 #include <cstdlib>
+#include <initializer_list>
 
 namespace {
 
@@ -79,6 +80,24 @@ private:
     QFont font_;
 };
 
+/// What asking a model for some roles of every cell takes, whatever is done with the answers.
+double walkSeconds(const QAbstractItemModel& model, std::initializer_list<int> roles)
+{
+    double least = 1e9;
+    for (int repeat = 0; repeat < Repeats; ++repeat) {
+        const bench::StopWatch watch;
+        for (int row = 0; row < model.rowCount(); ++row) {
+            for (int column = 0; column < model.columnCount(); ++column) {
+                const QModelIndex index = model.index(row, column);
+                for (const int role : roles)
+                    index.data(role);
+            }
+        }
+        least = std::min(least, watch.seconds());
+    }
+    return least;
+}
+
 class Runs {
 public:
     Runs()
@@ -92,6 +111,14 @@ public:
     {
         TableGrid table = bench::sampleTable(rows);
         LookModel shown(table, true);
+        bench::print("bare walk of the model, the text of every cell", rows,
+            walkSeconds(shown, { Qt::DisplayRole, Qt::CheckStateRole }), "");
+        bench::print("bare walk of the model, its look besides", rows,
+            walkSeconds(shown,
+                { Qt::DisplayRole, Qt::CheckStateRole, Qt::FontRole, Qt::TextAlignmentRole,
+                    Qt::ForegroundRole, Qt::BackgroundRole, Qt::CheckStateRole,
+                    Qt::DecorationRole }),
+            "");
         const auto [plain, asShown] = compare(shown);
         bench::print("plain page of a view", rows, plain, "");
         bench::print("as shown, a look in every cell", rows, asShown, "");

@@ -241,7 +241,6 @@ ShapedRow ShapedRows::takeSpare()
     row.textHeight = 0;
     row.cells.assign(source_.widths.size(), {});
     row.lines.clear();
-    row.looks.clear();
     return row;
 }
 
@@ -249,8 +248,7 @@ void ShapedRows::readRow(std::int64_t record, ShapedRow& row)
 {
     source_.rows.setPosition(record);
     row.record = record;
-    if (source_.looks != nullptr)
-        row.looks.resize(row.cells.size());
+    row.looks.resize(source_.looks != nullptr ? row.cells.size() : 0);
     for (std::size_t place = 0; place < row.cells.size(); ++place) {
         const auto field = static_cast<int>(place);
         row.cells[place].text = readText(field);
@@ -409,6 +407,7 @@ void ShapedRows::addTotals(const Totals& totals, TextView name)
 void ShapedRows::layTotals(std::size_t total, ShapedRow& row)
 {
     row.total = total;
+    row.looks.clear();
     const MeasuredFont& face = font(true, source_.style.body.font.italic);
     row.textHeight = face.lineHeight;
     for (std::size_t place = 0; place < row.cells.size(); ++place) {

@@ -171,11 +171,12 @@ GridLook TableViewGrid::gridLook()
 
 void TableViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& look)
 {
-    look = {};
-    if (!hasCell(row, column))
+    if (!hasCell(row, column)) {
+        look = {};
         return;
+    }
     const ModelCell cell { rows_.logical(row - 1), columns_.logical(column) };
-    const CellSpan* const span = spans_.at(cell);
+    const CellSpan* const span = spans_.isEmpty() ? nullptr : spans_.at(cell);
     const ModelCell shown = span && span->shown == cell ? span->first : cell;
     const QTableView& table = view();
     looks_.read(table, table.model()->index(shown.row, shown.column, table.rootIndex()), look);
