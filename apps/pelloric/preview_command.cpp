@@ -74,8 +74,8 @@ int runPreview(const Invocation& invocation)
         prepareWidths(table, line, platform.record(), shown->ownSettings());
     };
     opener.setPrompts(prompts);
+    opener.setReportOptions(shape);
     shown = &opener.showWindow().canvas().canvas();
-    shown->options = shape;
     try {
         opener.openPreview(std::move(grid));
     } catch (const RunTimeError& error) {

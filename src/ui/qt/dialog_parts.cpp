@@ -23,6 +23,7 @@ namespace {
 constexpr double Colors = 0x1000000; ///< how many there are
 constexpr double PaleLightness = 0.72; ///< from here a text is hard to read on white; 0 to 1
 constexpr QRgb DarkGround = 0xFF303030;
+constexpr float HintStrength = 0.5F; ///< of a text's ink
 
 /// A control's name for assistive technology: its caption without blanks and colon at the ends.
 void nameAfter(QWidget& control, const QString& caption)
@@ -96,6 +97,16 @@ QColor colorOf(double number)
 double numberOf(const QColor& color)
 {
     return color.red() + 0x100 * color.green() + 0x10000 * color.blue();
+}
+
+void showHint(QLineEdit& box, const QString& hint)
+{
+    QPalette palette = box.palette();
+    QColor ink = palette.color(QPalette::Text);
+    ink.setAlphaF(HintStrength);
+    palette.setColor(QPalette::PlaceholderText, ink);
+    box.setPalette(palette);
+    box.setPlaceholderText(hint);
 }
 
 void showInColor(QLineEdit& box, double color)

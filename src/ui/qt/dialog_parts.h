@@ -52,6 +52,10 @@ QColor colorOf(double number);
 /// The number 0x00BBGGRR of a colour.
 double numberOf(const QColor& color);
 
+/// Shows a hint where a text box is empty, half as strong as its text: a palette that a host has
+/// darkened often keeps the ink of light ones for hints.
+void showHint(QLineEdit& box, const QString& hint);
+
 /// Shows a text box's text in a colour, on a ground that it can be read on in light and dark.
 ///
 /// @param color  0x00BBGGRR

@@ -8,6 +8,7 @@
 #include "platform/qt/qt_text.h"
 #include "ui/page_reading.h"
 #include "ui/preview_navigation.h"
+#include "ui/qt/dialog_parts.h"
 #include "ui/qt/icon_set.h"
 #include "ui/qt/page_marks.h"
 #include "view/page_texts.h"
@@ -48,7 +49,7 @@ FindBar::FindBar(Canvas& canvas, PreviewSession& session, PageMarks& marks, QWid
     setAccessibleName(tr("Find"));
     text_->setObjectName(QStringLiteral("txtFind"));
     text_->setAccessibleName(tr("Text to find"));
-    text_->setPlaceholderText(tr("Find on the pages"));
+    showHint(*text_, tr("Find on the pages"));
     text_->setClearButtonEnabled(true);
     text_->setMaximumWidth(TextWidth);
     text_->setMaxLength(MostLetters);

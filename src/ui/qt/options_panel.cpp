@@ -6,6 +6,7 @@
 #include "document/limits.h"
 #include "platform/name_list.h"
 #include "platform/qt/qt_text.h"
+#include "ui/qt/dialog_parts.h"
 #include "ui/qt/fit_text.h"
 #include "ui/qt/named_boxes.h"
 
@@ -74,7 +75,7 @@ QComboBox* choiceBox(const char* name, const QStringList& entries)
 QLineEdit* textBox(const char* name, const QString& hint)
 {
     auto* const box = named(new QLineEdit, name);
-    box->setPlaceholderText(hint);
+    showHint(*box, hint);
     return box;
 }
 

@@ -37,8 +37,11 @@ void ReportTools::setOptions(const ReportOptions& options)
     panel_->setOptions(options);
 }
 
+/// A host may have given the canvas other options meanwhile.
 void ReportTools::togglePanel()
 {
+    if (!panel_->isVisible())
+        panel_->setOptions(parts_.canvas.reportOptions());
     panel_->setVisible(!panel_->isVisible());
     if (panel_->isVisible())
         panel_->enter();

@@ -153,6 +153,32 @@ TEST_F(ReportToolsTest, ShowTheOptionsOfTheHostAndKeepWhatTheyHaveNoPartFor)
     EXPECT_EQ(canvas().document().reportPictures(0).size(), 1U);
 }
 
+TEST_F(ReportToolsTest, ShowWhatAHostGaveTheCanvasItselfWhenThePanelIsAskedFor)
+{
+    previewWide();
+    press(Qt::Key_F4);
+    ReportOptions options;
+    options.fit.toSheet = true;
+    options.columns = { u"C1", u"C2, net" };
+    opener_.window()->canvas().setReportOptions(options);
+    press(Qt::Key_F4);
+    EXPECT_EQ(part<QComboBox>("fit").currentIndex(), 1);
+    EXPECT_EQ(part<QLineEdit>("columns").text(), QStringLiteral("C1, \"C2, net\""));
+}
+
+TEST_F(ReportToolsTest, ShowHintsThatCanBeReadInADarkPalette)
+{
+    const QPalette light = QApplication::palette();
+    QPalette dark(QColor(0x35, 0x35, 0x35));
+    dark.setColor(QPalette::PlaceholderText, QColor(0, 0, 0, 128)); // as many hosts leave it
+    QApplication::setPalette(dark);
+    previewWide();
+    const QPalette shown = part<QLineEdit>("columns").palette();
+    QApplication::setPalette(light);
+    EXPECT_EQ(shown.color(QPalette::PlaceholderText).rgb(), shown.color(QPalette::Text).rgb());
+    EXPECT_GT(shown.color(QPalette::Text).lightness(), 200);
+}
+
 TEST_F(ReportToolsTest, SayThatADocumentFileHoldsNoWatermark)
 {
     ReportOptions options;
