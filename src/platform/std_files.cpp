@@ -103,8 +103,10 @@ std::FILE* openAs(const fs::path& path, const char* mode)
 
 OpenedFile StdFiles::create(const fs::path& path, const std::optional<fs::path>& like)
 {
-    OpenedFile result = opened(openAs(path, "w+bx"), path);
     std::error_code ignored;
+    if (fs::exists(fs::symlink_status(path, ignored))) // not every system's library knows the "x"
+        return { nullptr, FileFault::Exists };
+    OpenedFile result = opened(openAs(path, "w+bx"), path);
     if (result.file && like)
         fs::permissions(path, fs::status(*like, ignored).permissions(), ignored);
     return result;

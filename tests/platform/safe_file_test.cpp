@@ -198,6 +198,17 @@ TEST(SafeFile, OfAGroupMayBeClosedBeforeItIsPutInPlace)
     EXPECT_EQ(folder.names().size(), 2U);
 }
 
+TEST(StdFiles, MakeNoFileInThePlaceOfAnother)
+{
+    const TempFolder folder;
+    folder.write("a", "old");
+    StdFiles files;
+    const OpenedFile made = files.create(folder.file("a"), std::nullopt);
+    EXPECT_FALSE(made.file);
+    EXPECT_EQ(made.fault, FileFault::Exists);
+    EXPECT_EQ(folder.read("a"), "old");
+}
+
 #if defined(__unix__)
 TEST(SafeFile, FollowsALinkEvenToAFileThatIsNotThereYet)
 {
