@@ -36,7 +36,7 @@ QString wrongOption(const QCommandLineParser& parser)
         phraseText(u"Missing value after '%1'."),
         phraseText(u"Unexpected value after '%1'."),
     });
-    const QString text = parser.errorText();
+    QString text = parser.errorText();
     const auto quote = text.indexOf(QLatin1Char('\''));
     const auto last = text.lastIndexOf(QLatin1Char('\''));
     const QString option = last > quote ? text.mid(quote + 1, last - quote - 1) : QString();

@@ -232,7 +232,7 @@ ReportSettings settingsOfFile(const QString& file, const Platform& platform)
             qt::phrased(u"%1 holds no setting; \"pelloric settings --path\" names yours")
                 .arg(file));
     const SettingsSnapshot snapshot(settingsTextWith(values));
-    const ReportSettings settings = readReportSettings(snapshot);
+    ReportSettings settings = readReportSettings(snapshot);
     check(settings, { qt::toText(file), snapshot });
     return settings;
 }
@@ -251,7 +251,7 @@ ReportSettings settingsOfUser(const Platform& platform)
             tell(describe(error));
         return {};
     }
-    const ReportSettings settings = readReportSettings(*snapshot);
+    ReportSettings settings = readReportSettings(*snapshot);
     check(settings, { pathText(settingsPath(platform)), *snapshot });
     return settings;
 }

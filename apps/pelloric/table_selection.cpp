@@ -233,6 +233,7 @@ TableGrid selected(TableGrid table, const CommandLine& line)
     if (line.has("rows"))
         cutRows(line.value("rows").trimmed(), rows);
     std::vector<TableColumn> taken;
+    taken.reserve(columns.size());
     for (const int column : columns)
         taken.push_back(table.column(column));
     TableGrid result(std::move(taken));

@@ -433,9 +433,9 @@ void Canvas::changeView(const std::function<void()>& change, Notification notifi
     notify(notification);
 }
 
-/// An observer may go while it is told.
 void Canvas::notify(Notification notification)
 {
+    // An observer may go while it is told. NOLINTNEXTLINE(modernize-loop-convert)
     for (std::size_t next = 0; next < observers_.size(); ++next)
         (observers_[next]->*notification)();
 }

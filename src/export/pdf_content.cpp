@@ -314,7 +314,7 @@ void PdfContent::appendPoint(ContentPoint point)
         stream_ += ' ';
         return;
     }
-    std::array<char, 48> text;
+    std::array<char, 48> text {};
     char* end = std::to_chars(text.data(), text.data() + 24, point.x / Hundred).ptr;
     *end++ = ' ';
     end = std::to_chars(end, end + 23, point.y / Hundred).ptr;

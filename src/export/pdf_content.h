@@ -109,7 +109,7 @@ private:
     void beginTextObject();
     void endTextObject();
     void leaveText();
-    void beginString(std::uint16_t use, const TextState& state);
+    void beginString(std::uint16_t number, const TextState& state);
     void setFont(const FontUse& use, const TextState& state);
     void setBold(const FontUse& use, const TextState& state);
     void place(bool isSkewed);

@@ -33,7 +33,7 @@ bool isPlainInName(unsigned char byte)
 
 void appendInteger(std::string& out, std::int64_t number)
 {
-    std::array<char, 24> digits;
+    std::array<char, 24> digits {};
     const auto end = std::to_chars(digits.data(), digits.data() + digits.size(), number).ptr;
     out.append(digits.data(), end);
 }

@@ -168,7 +168,7 @@ Text missingGlyphsText(const std::vector<MissingScript>& scripts)
             && std::ranges::find(packages, script.package) == packages.end())
             packages.push_back(script.package);
     }
-    const Text text = phrase(total == 1
+    Text text = phrase(total == 1
             ? phraseText(
                 u"%1 character has no glyph in any installed font and shows as a hollow box "
                 u"(%2)")

@@ -45,6 +45,7 @@ QString shownList(const std::vector<Text>& names) { return toQString(listOf(name
 QString columnsOf(const std::vector<Aggregation>& totals)
 {
     std::vector<Text> names;
+    names.reserve(totals.size());
     for (const Aggregation& total : totals)
         names.push_back(total.column);
     return shownList(names);

@@ -58,26 +58,26 @@ private:
 
     ReportOptions kept_;
     bool isFilling_ = false;
-    QCheckBox* asShown_;
-    QComboBox* fit_;
-    QSpinBox* pagesAcross_;
-    QLabel* fitResult_;
-    QSpinBox* keyColumns_;
-    QComboBox* pageOrder_;
-    QComboBox* rows_;
-    QSpinBox* firstRow_;
-    QSpinBox* lastRow_;
-    QLineEdit* columns_;
-    QLineEdit* groups_;
-    QCheckBox* keepsGroups_;
-    QComboBox* totalFunction_;
-    QLineEdit* totals_;
-    QLineEdit* watermark_;
-    QLineEdit* watermarkFile_;
-    QSpinBox* opacity_;
-    QCheckBox* isAbove_;
-    QLineEdit* logo_;
-    QComboBox* logoSlot_;
+    QCheckBox* asShown_ = nullptr;
+    QComboBox* fit_ = nullptr;
+    QSpinBox* pagesAcross_ = nullptr;
+    QLabel* fitResult_ = nullptr;
+    QSpinBox* keyColumns_ = nullptr;
+    QComboBox* pageOrder_ = nullptr;
+    QComboBox* rows_ = nullptr;
+    QSpinBox* firstRow_ = nullptr;
+    QSpinBox* lastRow_ = nullptr;
+    QLineEdit* columns_ = nullptr;
+    QLineEdit* groups_ = nullptr;
+    QCheckBox* keepsGroups_ = nullptr;
+    QComboBox* totalFunction_ = nullptr;
+    QLineEdit* totals_ = nullptr;
+    QLineEdit* watermark_ = nullptr;
+    QLineEdit* watermarkFile_ = nullptr;
+    QSpinBox* opacity_ = nullptr;
+    QCheckBox* isAbove_ = nullptr;
+    QLineEdit* logo_ = nullptr;
+    QComboBox* logoSlot_ = nullptr;
 };
 
 } // namespace pelloric::qt
