@@ -79,12 +79,13 @@ public:
     {
         if (glyph.use != shownUse_ || isMoved_ || !isStringOpen_)
             beginString(glyph.use, state);
-        stream_ += static_cast<char>(glyph.code >> 8U);
+        if (isLongCode(glyph.code))
+            stream_ += static_cast<char>(glyph.code >> 8U);
         stream_ += static_cast<char>(glyph.code & 0xFFU);
     }
 
     /// Shows glyphs of one font at the point moved to, and ends their run.
-    /// @param codes  two bytes each, none of which needs escaping
+    /// @param codes  as bytes, none of which needs escaping
     void glyphs(std::uint16_t use, std::string_view codes, const TextState& state)
     {
         beginString(use, state);

@@ -25,7 +25,17 @@ constexpr auto PlainBytes = [] {
     return bytes;
 }();
 
-constexpr std::size_t MostCodes = PlainBytes.size() * PlainBytes.size();
+/// Codes of one byte end before this byte, those of two begin with it or one behind it.
+constexpr std::size_t FirstOfTwo = 0x80;
+
+/// The bytes that are codes; 0 is none.
+constexpr auto ShortCodes = static_cast<std::size_t>(std::count_if(PlainBytes.begin(),
+    PlainBytes.end(), [](unsigned char byte) { return byte > 0 && byte < FirstOfTwo; }));
+
+constexpr std::size_t LongCodes = (256 - FirstOfTwo) * PlainBytes.size();
+
+/// Alphabets of few letters end here, and writings of many begin.
+constexpr char16_t FirstOfMany = 0x0600;
 
 /// A block of a character map holds no more.
 constexpr std::size_t BlockSize = 100;
@@ -39,18 +49,25 @@ constexpr int Italic = 64;
 
 constexpr std::string_view SystemInfo = "<</Registry(Adobe)/Ordering(Identity)/Supplement 0>>";
 
-/// The code at a place in the order of codes; the first is never used.
-std::uint16_t codeAt(std::size_t place)
+/// @param place  in the order of the codes of one byte
+std::uint16_t shortCode(std::size_t place) { return PlainBytes[place + 1]; }
+
+/// @param place  in the order of the codes of two bytes
+std::uint16_t longCode(std::size_t place)
 {
-    const unsigned high = PlainBytes[place / PlainBytes.size()];
+    const auto high = static_cast<unsigned>(FirstOfTwo + place / PlainBytes.size());
     const unsigned low = PlainBytes[place % PlainBytes.size()];
     return static_cast<std::uint16_t>((high << 8U) | low);
 }
 
 void appendCode(std::string& out, std::uint16_t code)
 {
+    constexpr std::string_view Digits = "0123456789ABCDEF";
     out += '<';
-    appendHex(out, TextView(reinterpret_cast<const char16_t*>(&code), 1));
+    for (unsigned shift = isLongCode(code) ? 16 : 8; shift > 0;) {
+        shift -= 4;
+        out += Digits[(code >> shift) & 0xFU];
+    }
     out += '>';
 }
 
@@ -61,7 +78,8 @@ std::string mapHead(std::string_view name)
     map += SystemInfo;
     map += " def\n/CMapName ";
     appendName(map, name);
-    map += " def\n/CMapType 1 def\n1 begincodespacerange\n<0000> <FFFF>\nendcodespacerange\n";
+    map += " def\n/CMapType 1 def\n2 begincodespacerange\n<00> <7F>\n<8000> <FFFF>\n"
+           "endcodespacerange\n";
     return map;
 }
 
@@ -94,39 +112,48 @@ std::optional<std::uint16_t> PdfFont::code(std::uint32_t glyph, TextView meaning
 {
     Text key { static_cast<char16_t>(glyph >> 16U), static_cast<char16_t>(glyph & 0xFFFFU) };
     key += meaning;
-    const auto [known, isNew] = known_.try_emplace(std::move(key), entries_.size());
-    if (isNew && entries_.size() + 1 == MostCodes) {
-        known_.erase(known);
-        return {};
+    const auto known = known_.find(key);
+    if (known != known_.end())
+        return known->second;
+    const auto code = nextCode(meaning);
+    if (code) {
+        known_.emplace(std::move(key), *code);
+        entries_.push_back({ *code, glyph, Text(meaning) });
     }
-    if (isNew)
-        entries_.push_back({ codeAt(entries_.size() + 1), glyph, Text(meaning) });
-    return entries_[known->second].code;
+    return code;
+}
+
+/// Letters of alphabets get the codes of one byte as long as there are any.
+std::optional<std::uint16_t> PdfFont::nextCode(TextView meaning)
+{
+    const bool isLetter = meaning.size() == 1 && meaning.front() < FirstOfMany;
+    if (isLetter && shortCodes_ < ShortCodes)
+        return shortCode(shortCodes_++);
+    if (longCodes_ < LongCodes)
+        return longCode(longCodes_++);
+    return std::nullopt;
 }
 
 void PdfFont::write(PdfFile& file) const
 {
+    std::vector<Entry> entries = entries_;
+    std::ranges::sort(entries, {}, &Entry::code);
     std::vector<std::uint32_t> glyphs;
-    for (const Entry& entry : entries_)
+    for (const Entry& entry : entries)
         glyphs.push_back(entry.glyph);
     const FontSubset subset = program_.subset(glyphs);
     const std::string name = taggedName();
-    const int descendant = writeDescendant(file, subset, name);
+    const int descendant = writeDescendant(file, subset, name, widths(glyphs, subset));
     const int meanings = file.reserve();
-    file.writeStream(meanings, "", toUnicode());
+    file.writeStream(meanings, "", toUnicode(entries));
+    const int encoding = file.reserve();
+    std::string encodingEntries("/Type/CMap/CMapName/Codes/CIDSystemInfo");
+    encodingEntries += SystemInfo;
+    file.writeStream(encoding, encodingEntries, cids(entries, subset));
     std::string body("<</Type/Font/Subtype/Type0/BaseFont");
     appendName(body, name);
-    body += "/Encoding";
-    if (program_.facts().outlines == Outlines::TrueType) {
-        body += "/Identity-H";
-    } else {
-        const int encoding = file.reserve();
-        std::string entries("/Type/CMap/CMapName/Codes/CIDSystemInfo");
-        entries += SystemInfo;
-        file.writeStream(encoding, entries, cids(subset));
-        body += ' ';
-        appendReference(body, encoding);
-    }
+    body += "/Encoding ";
+    appendReference(body, encoding);
     body += "/DescendantFonts[";
     appendReference(body, descendant);
     body += "]/ToUnicode ";
@@ -150,11 +177,11 @@ std::string PdfFont::taggedName() const
 }
 
 /// The character map from codes to the glyphs of the subset.
-std::string PdfFont::cids(const FontSubset& subset) const
+std::string PdfFont::cids(std::span<const Entry> entries, const FontSubset& subset)
 {
     std::string map = mapHead("Codes");
-    appendBlocks(map, "cidchar", entries_.size(), [&](std::size_t at) {
-        appendCode(map, entries_[at].code);
+    appendBlocks(map, "cidchar", entries.size(), [&](std::size_t at) {
+        appendCode(map, entries[at].code);
         map += ' ';
         appendInteger(map, subset.numbers[at]);
         map += '\n';
@@ -163,15 +190,14 @@ std::string PdfFont::cids(const FontSubset& subset) const
     return map;
 }
 
-/// Widths by code, or by glyph where a character map leads from codes to glyphs.
-std::string PdfFont::widths(const FontSubset& subset) const
+/// Widths by glyph of the subset.
+std::string PdfFont::widths(std::span<const std::uint32_t> glyphs, const FontSubset& subset) const
 {
     std::vector<std::pair<std::uint16_t, double>> widths;
-    const bool isByCode = program_.facts().outlines == Outlines::TrueType;
-    for (std::size_t at = 0; at < entries_.size(); ++at) {
-        const double width = program_.advance(entries_[at].glyph);
+    for (std::size_t at = 0; at < glyphs.size(); ++at) {
+        const double width = program_.advance(glyphs[at]);
         if (width != DefaultWidth)
-            widths.emplace_back(isByCode ? entries_[at].code : subset.numbers[at], width);
+            widths.emplace_back(subset.numbers[at], width);
     }
     std::sort(widths.begin(), widths.end());
     widths.erase(std::unique(widths.begin(), widths.end()), widths.end());
@@ -188,10 +214,10 @@ std::string PdfFont::widths(const FontSubset& subset) const
     return widths.empty() ? list : list + ']';
 }
 
-std::string PdfFont::toUnicode() const
+std::string PdfFont::toUnicode(std::span<const Entry> entries)
 {
     std::vector<const Entry*> meant;
-    for (const Entry& entry : entries_) {
+    for (const Entry& entry : entries) {
         if (!entry.meaning.empty())
             meant.push_back(&entry);
     }
@@ -240,7 +266,9 @@ int PdfFont::writeProgram(PdfFile& file, const FontSubset& subset, const std::st
     return descriptor;
 }
 
-int PdfFont::writeDescendant(PdfFile& file, const FontSubset& subset, const std::string& name) const
+/// @param widthList  the widths of the glyphs
+int PdfFont::writeDescendant(PdfFile& file, const FontSubset& subset, const std::string& name,
+    const std::string& widthList) const
 {
     const bool isTrueType = program_.facts().outlines == Outlines::TrueType;
     const int descriptor = writeProgram(file, subset, name);
@@ -252,20 +280,9 @@ int PdfFont::writeDescendant(PdfFile& file, const FontSubset& subset, const std:
     body += SystemInfo;
     body += "/FontDescriptor ";
     appendReference(body, descriptor);
-    body += "/DW 1000/W[" + widths(subset) + ']';
-    if (isTrueType) {
-        std::string glyphs(
-            entries_.empty() ? 2 : 2 * (std::size_t { entries_.back().code } + 1), '\0');
-        for (std::size_t at = 0; at < entries_.size(); ++at) {
-            const std::size_t place = 2 * std::size_t { entries_[at].code };
-            glyphs[place] = static_cast<char>(subset.numbers[at] >> 8U);
-            glyphs[place + 1] = static_cast<char>(subset.numbers[at] & 0xFFU);
-        }
-        const int map = file.reserve();
-        file.writeStream(map, "", glyphs);
-        body += "/CIDToGIDMap ";
-        appendReference(body, map);
-    }
+    body += "/DW 1000/W[" + widthList + ']';
+    if (isTrueType)
+        body += "/CIDToGIDMap/Identity";
     body += ">>";
     const int descendant = file.reserve();
     file.write(descendant, body);

@@ -12,11 +12,15 @@ namespace pelloric::pdf {
 
 class PdfFile;
 
+/// Whether a code is written as two bytes.
+constexpr bool isLongCode(std::uint16_t code) { return code > 0xFF; }
+
 /// A font of a PDF file: hands out codes as texts need glyphs, and is written when all is known.
 ///
-/// Glyphs are written as codes of two bytes, handed out at first use, none of which needs escaping
-/// in a string. A glyph that stands for different characters has a code for each, so that texts
-/// are found and copied as they were.
+/// Glyphs are written as codes, handed out at first use, none of which needs escaping in a string:
+/// letters of alphabets as one byte, as far as there are any left, others as two. A glyph that
+/// stands for different characters has a code for each, so that texts are found and copied as they
+/// were.
 class PdfFont {
 public:
     /// @param program  borrowed
@@ -42,16 +46,20 @@ private:
     };
 
     std::string taggedName() const;
-    std::string cids(const FontSubset& subset) const;
-    std::string widths(const FontSubset& subset) const;
-    std::string toUnicode() const;
+    std::optional<std::uint16_t> nextCode(TextView meaning);
+    static std::string cids(std::span<const Entry> entries, const FontSubset& subset);
+    std::string widths(std::span<const std::uint32_t> glyphs, const FontSubset& subset) const;
+    static std::string toUnicode(std::span<const Entry> entries);
     int writeProgram(PdfFile& file, const FontSubset& subset, const std::string& name) const;
-    int writeDescendant(PdfFile& file, const FontSubset& subset, const std::string& name) const;
+    int writeDescendant(PdfFile& file, const FontSubset& subset, const std::string& name,
+        const std::string& widthList) const;
 
     FontProgram& program_;
     int object_;
-    std::vector<Entry> entries_; ///< in the order of their codes
-    std::unordered_map<Text, std::size_t> known_; ///< by glyph and meaning
+    std::vector<Entry> entries_; ///< in the order of their first use
+    std::unordered_map<Text, std::uint16_t> known_; ///< codes by glyph and meaning
+    std::size_t shortCodes_ = 0; ///< of one byte that are handed out
+    std::size_t longCodes_ = 0; ///< of two bytes that are handed out
 };
 
 } // namespace pelloric::pdf

@@ -215,11 +215,13 @@ bool PdfSurface::drawAtOnce(TextView text)
         const GlyphCode code = face_->unit(unit);
         if (code.code == 0 || code.use != use)
             return false;
-        *place++ = static_cast<char>(code.code >> 8U);
+        if (isLongCode(code.code))
+            *place++ = static_cast<char>(code.code >> 8U);
         *place++ = static_cast<char>(code.code & 0xFFU);
     }
     content_.moveTo(baselineAt(0, 0));
-    content_.glyphs(use, shown_, { .em = em_, .stretch = 1, .color = state_.foreColor });
+    const std::string_view shown(shown_.data(), static_cast<std::size_t>(place - shown_.data()));
+    content_.glyphs(use, shown, { .em = em_, .stretch = 1, .color = state_.foreColor });
     return true;
 }
 

@@ -14,6 +14,11 @@ namespace pelloric::pdf {
 
 namespace {
 
+/// Bytes below 128 but 0 and the five that mean something in a string; and pairs of a byte from 128
+/// on and one that means nothing.
+constexpr std::uint32_t ShortCodes = 127 - 5;
+constexpr std::uint32_t LongCodes = 128 * (256 - 5);
+
 class PdfFontTest : public testing::Test {
 protected:
     std::string written(const PdfFont& font)
@@ -39,16 +44,36 @@ protected:
 
 TEST_F(PdfFontTest, HandsOutCodesThatNeedNoEscapingInStrings)
 {
+    constexpr std::string_view Special("()\\\r\n");
     std::set<std::uint16_t> codes;
     std::uint32_t glyph = 0;
     while (const auto code = font_.code(glyph++, u"x")) {
         for (const int byte : { *code >> 8, *code & 0xFF })
-            EXPECT_EQ(
-                std::string_view("()\\\r\n").find(static_cast<char>(byte)), std::string::npos);
+            EXPECT_EQ(Special.find(static_cast<char>(byte)), std::string_view::npos);
         EXPECT_NE(*code, 0);
         codes.insert(*code);
     }
-    EXPECT_EQ(codes.size(), 251U * 251U - 1);
+    EXPECT_EQ(codes.size(), ShortCodes + LongCodes);
+}
+
+TEST_F(PdfFontTest, TellsCodesOfOneByteFromThoseOfTwoByTheFirst)
+{
+    for (std::uint32_t glyph = 0; glyph < ShortCodes + 300; ++glyph) {
+        const std::uint16_t code = font_.code(glyph, u"x").value();
+        EXPECT_EQ(isLongCode(code), glyph >= ShortCodes) << glyph;
+        EXPECT_EQ(isLongCode(code) ? code >> 15 : code >> 7, isLongCode(code) ? 1 : 0) << glyph;
+    }
+    EXPECT_TRUE(
+        isWritten(font_, "2 begincodespacerange\n<00> <7F>\n<8000> <FFFF>\nendcodespacerange"));
+}
+
+TEST_F(PdfFontTest, KeepsCodesOfOneByteForTheLettersOfAlphabets)
+{
+    EXPECT_TRUE(isLongCode(font_.code(1, u"北").value()));
+    EXPECT_TRUE(isLongCode(font_.code(2, u"fi").value()));
+    EXPECT_TRUE(isLongCode(font_.code(3, u"").value()));
+    EXPECT_FALSE(isLongCode(font_.code(4, u"A").value()));
+    EXPECT_FALSE(isLongCode(font_.code(5, u"я").value()));
 }
 
 TEST_F(PdfFontTest, GivesAGlyphACodeForEachMeaning)
@@ -56,7 +81,7 @@ TEST_F(PdfFontTest, GivesAGlyphACodeForEachMeaning)
     const auto small = font_.code(7, u"a");
     EXPECT_EQ(font_.code(7, u"a"), small);
     EXPECT_NE(font_.code(7, u"A"), small);
-    EXPECT_TRUE(isWritten(font_, "<0001> <0061>\n<0002> <0041>\n"));
+    EXPECT_TRUE(isWritten(font_, "<01> <0061>\n<02> <0041>\n"));
 }
 
 TEST_F(PdfFontTest, WritesWidthsInRowsAndLeavesTheUsualOneOut)
@@ -65,15 +90,16 @@ TEST_F(PdfFontTest, WritesWidthsInRowsAndLeavesTheUsualOneOut)
     font_.code('b', u"b");
     font_.code(0x5317, u"北");
     font_.code('c', u"c");
-    EXPECT_TRUE(isWritten(font_, "/DW 1000/W[1[500 500]4[500]]"));
+    EXPECT_TRUE(isWritten(font_, "/DW 1000/W[1[500 500 500]]")); // codes of two bytes come last
 }
 
-TEST_F(PdfFontTest, NamesTheGlyphsOfATrueTypeFontByACodeTable)
+TEST_F(PdfFontTest, NamesTheGlyphsOfATrueTypeFontByACharacterMap)
 {
+    font_.code(0x5317, u"北");
     font_.code('a', u"a");
     const std::string file = written(font_);
-    EXPECT_NE(file.find(std::string("stream\n\0\0\0\x01\nendstream", 21)), std::string::npos);
-    EXPECT_NE(file.find("/Encoding/Identity-H"), std::string::npos);
+    EXPECT_NE(file.find("2 begincidchar\n<01> 1\n<8000> 2\nendcidchar"), std::string::npos);
+    EXPECT_NE(file.find("/CIDToGIDMap/Identity"), std::string::npos);
     EXPECT_NE(file.find("/FontFile2 "), std::string::npos);
     EXPECT_NE(file.find("+Latin"), std::string::npos);
 }
@@ -84,7 +110,7 @@ TEST_F(PdfFontTest, NamesTheGlyphsOfACffFontByACharacterMap)
     font_.code('a', u"a");
     font_.code('a', u"A");
     const std::string file = written(font_);
-    EXPECT_NE(file.find("2 begincidchar\n<0001> 1\n<0002> 2\nendcidchar"), std::string::npos);
+    EXPECT_NE(file.find("2 begincidchar\n<01> 1\n<02> 2\nendcidchar"), std::string::npos);
     EXPECT_NE(file.find("/Subtype/CIDFontType0C"), std::string::npos);
     EXPECT_EQ(file.find("CIDToGIDMap"), std::string::npos);
 }
@@ -99,7 +125,7 @@ TEST_F(PdfFontTest, BeginsAnotherFontWhenTheCodesRunOut)
 {
     PdfFonts fonts(file_);
     const DrawnFont drawn { &program_, false, false };
-    for (std::uint32_t glyph = 0; glyph < 251U * 251U - 1; ++glyph)
+    for (std::uint32_t glyph = 0; glyph < ShortCodes + LongCodes; ++glyph)
         EXPECT_EQ(fonts.code(drawn, glyph, u"x").use, 0);
     const GlyphCode next = fonts.code(drawn, 65000, u"y");
     EXPECT_EQ(next.use, 1);

@@ -50,14 +50,17 @@ protected:
     PdfSurface surface_ { content_, faces_, fonts_, pictures_ };
 };
 
-/// The codes of the first characters that are used: 1, 2 and so on.
+/// The codes of the first letters that are used: 1, 2 and so on.
 std::string codes(std::initializer_list<int> numbers)
 {
     std::string bytes;
     for (const int number : numbers)
-        bytes += { '\0', static_cast<char>(number) };
+        bytes += static_cast<char>(number);
     return bytes;
 }
+
+/// The code of the first character that is used and no letter of an alphabet.
+std::string firstOfMany() { return { "\x80\0", 2 }; }
 
 } // namespace
 
@@ -75,7 +78,7 @@ TEST_F(PdfSurfaceTest, TakesCharactersThatAFaceLacksFromAnother)
 {
     print({ 0, 0 }, u"a北b");
     EXPECT_EQ(operators(),
-        "BT\n/F1 200 Tf\n0 9840 Td(" + codes({ 1 }) + ")Tj\n/F2 200 Tf\n(" + codes({ 1 })
+        "BT\n/F1 200 Tf\n0 9840 Td(" + codes({ 1 }) + ")Tj\n/F2 200 Tf\n(" + firstOfMany()
             + ")Tj\n/F1 200 Tf\n(" + codes({ 2 }) + ")Tj\nET\n");
 }
 
@@ -111,7 +114,7 @@ TEST_F(PdfSurfaceTest, PlacesACharacterOfAnotherSlantBehindThoseBefore)
     print({ 100, 0 }, u"aa北");
     EXPECT_EQ(operators(),
         "BT\n/F1 200 Tf\n1 0 .2126 1 100 9840 Tm\n(" + codes({ 1, 1 })
-            + ")Tj\n/F2 200 Tf\n1 0 0 1 300 9840 Tm\n(" + codes({ 1 }) + ")Tj\nET\n");
+            + ")Tj\n/F2 200 Tf\n1 0 0 1 300 9840 Tm\n(" + firstOfMany() + ")Tj\nET\n");
 }
 
 TEST_F(PdfSurfaceTest, SqueezesAShapedTextIntoItsMeasuredWidth)

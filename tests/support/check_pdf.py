@@ -129,9 +129,9 @@ def check_fonts(pdf):
             require("/ToUnicode" in font, f"{name} does not say its characters")
             if str(descendant.Subtype) == "/CIDFontType2":
                 require("/CIDToGIDMap" in descendant, f"{name} has no map to glyphs")
-            elif isinstance(font.Encoding, pikepdf.Stream):
-                same = font.Encoding.CIDSystemInfo == descendant.CIDSystemInfo
-                require(same, f"{name} and its codes name other collections")
+            require(isinstance(font.Encoding, pikepdf.Stream), f"{name} embeds no character map")
+            same = font.Encoding.CIDSystemInfo == descendant.CIDSystemInfo
+            require(same, f"{name} and its codes name other collections")
 
 
 def check_archive(pdf):

@@ -136,7 +136,7 @@ TEST_F(PageExport, PdfEmbedsOnlyTheCharactersThatAreUsed)
     add({ 1000, 1000 }, u"北京 Beijing");
     EXPECT_LT(std::filesystem::file_size(pdf()), 30000U);
     const QString list = ask(QStringLiteral("pdffonts"), { nameOf(folder_.file("a.pdf")) });
-    EXPECT_TRUE(list.contains(QRegularExpression(QStringLiteral("Identity-H +yes +\\w+ +yes"))))
+    EXPECT_TRUE(list.contains(QRegularExpression(QStringLiteral("Custom +yes +\\w+ +yes"))))
         << list.toStdString();
 }
 
