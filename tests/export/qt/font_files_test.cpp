@@ -26,8 +26,7 @@ TEST(FontFiles, TellApartTheFontsOfACollection)
         const std::vector<FontFile> files = fontFilesOf(family);
         return files.empty() ? -1 : static_cast<int>(files.front().index);
     };
-    EXPECT_NE(
-        indexOf(QStringLiteral("AR PL UMing CN")), indexOf(QStringLiteral("AR PL UMing TW")));
+    EXPECT_NE(indexOf(QStringLiteral("AR PL UMing CN")), indexOf(QStringLiteral("AR PL UMing TW")));
 }
 
 TEST(FontFiles, OfAFamilyThatIsNotInstalledAreNone)

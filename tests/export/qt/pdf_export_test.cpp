@@ -133,8 +133,8 @@ TEST_F(PdfExportTest, EmbedsOnePartOfAFontForAllItsGuises)
     }
     const QString list = answer(QStringLiteral("pdffonts"), { pdf() });
     EXPECT_EQ(list.count(QStringLiteral("UMing")), 1) << list.toStdString();
-    EXPECT_TRUE(list.contains(QRegularExpression(
-        QStringLiteral("[A-Z]{6}\\+\\S+ +CID TrueType +Custom +yes +yes +yes"))))
+    EXPECT_TRUE(list.contains(
+        QRegularExpression(QStringLiteral("[A-Z]{6}\\+\\S+ +CID TrueType +Custom +yes +yes +yes"))))
         << list.toStdString();
 }
 
