@@ -224,6 +224,8 @@ ReportSettings settingsOfFile(const QString& file, const Platform& platform)
     try {
         text = platform.codec.decode(readFileBytes(qt::pathOf(file), MostSettingsBytes));
     } catch (const RunTimeError& error) {
+        if (error.number() == ErrorNumber::Overflow)
+            throw CommandError(qt::phrased(u"%1; settings files are smaller", { detailOf(error) }));
         throw CommandError(describe(error));
     }
     const std::vector<SettingChange> values = settingsIn(text);

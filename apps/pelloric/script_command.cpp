@@ -12,6 +12,7 @@
 #include "print/qt/qt_printing.h"
 #include "report/content_widths.h"
 #include "script/qt/script_host.h"
+#include "stack_guard.h"
 #include "table_source.h"
 #include "tables/qt/csv_table.h"
 #include "tables/qt/sqlite_table.h"
@@ -21,10 +22,6 @@
 #include <algorithm>
 #include <memory>
 #include <optional>
-
-#ifdef Q_OS_UNIX
-#include <sys/resource.h>
-#endif
 
 namespace pelloric::app {
 
@@ -68,20 +65,6 @@ private:
     TextMetrics& metrics_;
 };
 
-/// Deeply nested expressions of a script are read by recursion; the stack grows as far as the
-/// address space that every process keeps free for it allows.
-void raiseStackLimit()
-{
-#ifdef Q_OS_UNIX
-    constexpr rlim_t StackBytes = 120U << 20U;
-    rlimit limit {};
-    if (getrlimit(RLIMIT_STACK, &limit) != 0 || limit.rlim_cur >= StackBytes)
-        return;
-    limit.rlim_cur = std::min(limit.rlim_max, StackBytes);
-    setrlimit(RLIMIT_STACK, &limit);
-#endif
-}
-
 } // namespace
 
 int runScript(const Invocation& invocation)
@@ -89,7 +72,7 @@ int runScript(const Invocation& invocation)
     if (invocation.arguments.isEmpty())
         throw UsageError(qt::phrased(u"say which script to run"));
     speakEnglish(); // a script may read what errors say
-    raiseStackLimit();
+    guardStack();
     QStringList arguments = invocation.arguments;
     const bool isWindowed = arguments.front() == QLatin1String("--window");
     if (isWindowed)

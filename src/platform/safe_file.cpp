@@ -4,6 +4,7 @@
 #include "platform/safe_file.h"
 
 #include "platform/file_bytes.h"
+#include "platform/phrase.h"
 #include "platform/run_time_error.h"
 
 #include <array>
@@ -145,7 +146,10 @@ void SafeFile::open(const SavingGroup& group)
     const auto status = fs::status(target_, ignored);
     exists_ = fs::exists(status);
     const bool isEndless = fs::is_symlink(fs::symlink_status(target_, ignored));
-    if (fs::is_directory(status) || target_.filename().empty() || isEndless)
+    if (isEndless)
+        throw RunTimeError(ErrorNumber::WriteFailed,
+            phrase(u"%1 is a link that leads to no file", { pathText(path_) }));
+    if (fs::is_directory(status) || target_.filename().empty())
         refuse(FileFault::Other);
     isDevice_ = exists_ && !fs::is_regular_file(status);
     if (!isDevice_) {

@@ -947,6 +947,14 @@ Für fish: pelloric completion fish | source
 [Time Printed], [Date &amp; Time Printed], [Page # of Pages #], [Total Pages] und [Page #] enthalten.
 </translation>
     </message>
+    <message>
+        <source>%1; settings files are smaller</source>
+        <translation>%1; Einstellungsdateien sind kleiner</translation>
+    </message>
+    <message>
+        <source>the script nests values deeper than its stack holds</source>
+        <translation>das Skript verschachtelt Werte tiefer, als sein Stapel fasst</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

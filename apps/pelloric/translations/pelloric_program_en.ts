@@ -946,6 +946,14 @@ For fish: pelloric completion fish | source
 [Time Printed], [Date &amp; Time Printed], [Page # of Pages #], [Total Pages] and [Page #].
 </translation>
     </message>
+    <message>
+        <source>%1; settings files are smaller</source>
+        <translation>%1; settings files are smaller</translation>
+    </message>
+    <message>
+        <source>the script nests values deeper than its stack holds</source>
+        <translation>the script nests values deeper than its stack holds</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

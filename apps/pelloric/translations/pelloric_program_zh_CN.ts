@@ -941,6 +941,14 @@ fish：pelloric completion fish | source
 [Time Printed]、[Date &amp; Time Printed]、[Page # of Pages #]、[Total Pages] 和 [Page #]。
 </translation>
     </message>
+    <message>
+        <source>%1; settings files are smaller</source>
+        <translation>%1；设置文件没有这么大</translation>
+    </message>
+    <message>
+        <source>the script nests values deeper than its stack holds</source>
+        <translation>脚本中的值嵌套过深，超出了栈的容量</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

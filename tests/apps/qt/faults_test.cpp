@@ -299,7 +299,7 @@ TEST_F(ProgramFaults, FollowLinksToTheFilesThatTheyName)
     EXPECT_TRUE(folder_.read("new.pdf").ends_with("%%EOF\n"));
     const Ended ended = run(words("export t.csv -o loop.pdf"));
     EXPECT_EQ(ended.status, 1);
-    EXPECT_TRUE(has(ended.errors, "loop.pdf")) << ended.errors;
+    EXPECT_TRUE(has(ended.errors, "loop.pdf is a link that leads to no file")) << ended.errors;
     EXPECT_TRUE(fs::is_symlink(folder_.file("loop.pdf")));
     EXPECT_EQ(folder_.names().size(), 6U);
 }
@@ -498,6 +498,19 @@ TEST_F(ProgramFaults, TellThatThereIsNotEnoughMemory)
     EXPECT_TRUE(has(ended.errors, "there is not enough memory for this table")) << ended.errors;
     EXPECT_EQ(folder_.read("t.pdf"), "old");
     EXPECT_THAT(sortedNames(), testing::ElementsAre("t.csv", "t.pdf"));
+}
+
+TEST_F(ProgramFaults, TellOfAScriptThatIsNestedTooDeeply)
+{
+    const std::string nested = "let a = []; for (let i = 0; i < 300000; i++) a = [a];\n";
+    for (const char* const line : { "String(a)", "a.flat(Infinity)", "new Sorvane().m_PrintObj = a",
+             "let p = a; for (let i = 0; i < 300000; i++) p = new Proxy(p, {}); p.x" }) {
+        folder_.write("s.js", nested + line);
+        const Ended ended = run(words("run s.js"));
+        EXPECT_EQ(ended.status, 1) << line;
+        EXPECT_EQ(ended.errors, "pelloric: the script nests values deeper than its stack holds\n")
+            << line;
+    }
 }
 
 TEST_F(ProgramFaults, NameALimitThatLeavesTheToolkitNoRoom)

@@ -142,6 +142,7 @@ TEST_F(ProgramErrors, NameTheFileAndWhatItIsNot)
         rows += "1\n";
     folder_.write("two-pages.csv", rows);
     folder_.write("no.ini", "a=1\n");
+    folder_.write("large.ini", std::string((16U << 20U) + 1, '\n'));
     std::filesystem::create_directory(folder_.file("folder"));
     folder_.write("wide.ini", "\"\r\nTop= 4000\r\n\"\r\n");
     for (const char* const call :
@@ -159,6 +160,8 @@ TEST_F(ProgramErrors, NameTheFileAndWhatItIsNot)
             "without: --defaults" },
         { words("export t.csv -o u.pdf --settings no.ini"), 1,
             "no.ini holds no setting; \"pelloric settings --path\" names yours" },
+        { words("export t.csv -o u.pdf --settings large.ini"), 1,
+            "large.ini holds more than 16777216 bytes; settings files are smaller" },
         { words("export folder -o u.pdf"), 1, "folder is a folder; name a file in it" },
         { words("export /dev/null -o u.pdf"), 1, "/dev/null is a device; name a file" },
         { words("export t.ostl t.csv --join -o u.pdf --paper A5"), 2,
@@ -183,7 +186,7 @@ TEST_F(ProgramErrors, NameTheFileAndWhatItIsNot)
         { words("demo --walk plain/out"), 1,
             "plain/out: the folder cannot be made: Not a directory" },
     });
-    EXPECT_EQ(folder_.names().size(), 9U);
+    EXPECT_EQ(folder_.names().size(), 10U);
 }
 
 TEST_F(ProgramErrors, NameTheFolderOfTemporaryFiles)

@@ -910,6 +910,10 @@
         <source>the file is one object; %1; %2</source>
         <translation>die Datei ist ein einziges Objekt; %1; %2</translation>
     </message>
+    <message>
+        <source>%1 is a link that leads to no file</source>
+        <translation>%1 ist ein Verweis, der zu keiner Datei führt</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>

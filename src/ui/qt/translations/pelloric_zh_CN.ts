@@ -910,6 +910,10 @@
         <source>the file is one object; %1; %2</source>
         <translation>文件是一个对象；%1；%2</translation>
     </message>
+    <message>
+        <source>%1 is a link that leads to no file</source>
+        <translation>%1 是一个不指向任何文件的链接</translation>
+    </message>
 </context>
 <context>
     <name>ToolMeanings</name>
