@@ -127,25 +127,6 @@ struct TreeViewGrid::Source {
         return position >= 0 ? position : logical(0);
     }
 
-    void readBranch(const QModelIndex& index, CellLook& look) const
-    {
-        const QAbstractItemModel& model = *tree->model();
-        constexpr int MostLevels = 63;
-        int level = 0;
-        for (QModelIndex at = index.parent(); at.isValid() && at != tree->rootIndex();
-             at = at.parent())
-            ++level;
-        int above = level;
-        for (QModelIndex at = index; above >= 0 && at.isValid(); at = at.parent(), --above) {
-            if (above <= MostLevels && at.row() + 1 < model.rowCount(at.parent()))
-                look.goesOn |= std::uint64_t { 1 } << static_cast<unsigned>(above);
-        }
-        const int steps = level + (tree->rootIsDecorated() ? 1 : 0);
-        look.isBranch = true;
-        look.level = static_cast<std::uint16_t>(level);
-        look.indent = twipsOfPixels(steps * tree->indentation(), tree->logicalDpiX());
-    }
-
     /// Tells the texts of a row in some columns; what does not hang on the column is asked once.
     /// @param places  of the columns as they are seen, from 0
     template <typename Take> void cells(int row, std::span<const int> places, const Take& take)
@@ -373,7 +354,7 @@ void TreeViewGrid::readLook(std::int32_t row, std::int32_t column, CellLook& loo
     if (source_->isSpanned(index) && source_->logical(0) == 0)
         look.box = CellBox { row, row, 0, source_->columns.count() - 1 };
     if (source_->tree && logical == source_->branchColumn())
-        source_->readBranch(index, look);
+        ViewLooks::readBranch(*source_->tree, index, look);
 }
 
 TextView TreeViewGrid::text(std::int32_t row, std::int32_t column)

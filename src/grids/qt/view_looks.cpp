@@ -3,6 +3,7 @@
 
 #include "grids/qt/view_looks.h"
 
+#include "grids/qt/view_sections.h"
 #include "platform/qt/picture_files.h"
 
 #include <QAbstractItemView>
@@ -305,6 +306,24 @@ CellAlignment ViewLooks::titleAlignment(const QHeaderView& header, int section)
 {
     const QVariant own = header.model()->headerData(section, Qt::Horizontal, Qt::TextAlignmentRole);
     return horizontalOf(own.isNull() ? header.defaultAlignment() : Qt::Alignment(own.toInt()));
+}
+
+void ViewLooks::readBranch(const QTreeView& tree, const QModelIndex& index, CellLook& look)
+{
+    const QAbstractItemModel& model = *tree.model();
+    constexpr int MostLevels = 63;
+    int level = 0;
+    for (QModelIndex at = index.parent(); at.isValid() && at != tree.rootIndex(); at = at.parent())
+        ++level;
+    int above = level;
+    for (QModelIndex at = index; above >= 0 && at.isValid(); at = at.parent(), --above) {
+        if (above <= MostLevels && at.row() + 1 < model.rowCount(at.parent()))
+            look.goesOn |= std::uint64_t { 1 } << static_cast<unsigned>(above);
+    }
+    const int steps = level + (tree.rootIsDecorated() ? 1 : 0);
+    look.isBranch = true;
+    look.level = static_cast<std::uint16_t>(level);
+    look.indent = twipsOfPixels(steps * tree.indentation(), tree.logicalDpiX());
 }
 
 std::optional<double> ViewLooks::number(const QModelIndex& index)

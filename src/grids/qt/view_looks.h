@@ -17,6 +17,7 @@ class QAbstractItemView;
 class QHeaderView;
 class QModelIndex;
 class QStyledItemDelegate;
+class QTreeView;
 
 namespace pelloric::qt {
 
@@ -42,6 +43,10 @@ public:
 
     /// The number of a cell, as its model has it.
     static std::optional<double> number(const QModelIndex& index);
+
+    /// How a row of a tree hangs below those above it.
+    /// @param index  in the column of the branches
+    static void readBranch(const QTreeView& tree, const QModelIndex& index, CellLook& look);
 
 private:
     /// What of a font is shown.
