@@ -6,13 +6,12 @@
 #include "manual.h"
 #include "platform/qt/qt_phrase.h"
 
+#include <algorithm>
 #include <array>
 
 namespace pelloric::app {
 
 namespace {
-
-constexpr int SynopsisWidth = 24;
 
 constexpr auto Options = std::to_array<Option>({
     { "man", nullptr, phraseText(u"write the manual page of the program") },
@@ -27,13 +26,13 @@ QString heading(const Command& command)
 
 QString overview()
 {
+    qsizetype width = 0;
+    for (const Command& command : commands())
+        width = std::max(width, heading(command).size());
     QString text = qt::phrased(u"Previews, exports and prints tables.\n\n");
-    for (const Command& command : commands()) {
-        const QString synopsis = QStringLiteral("%1 %2").arg(
-            QString::fromUtf8(command.name), QString::fromUtf8(command.synopsis));
-        text += QStringLiteral("  pelloric ") + synopsis.leftJustified(SynopsisWidth)
-            + QStringLiteral("  ") + qt::phrased(command.summary) + QLatin1Char('\n');
-    }
+    for (const Command& command : commands())
+        text += QStringLiteral("  ") + heading(command).leftJustified(width) + QStringLiteral("  ")
+            + qt::phrased(command.summary) + QLatin1Char('\n');
     return text
         + qt::phrased(
             u"\n\"pelloric help COMMAND\" says more, \"pelloric --version\" the version.\n");

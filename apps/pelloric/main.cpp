@@ -8,8 +8,10 @@
 #include "platform/qt/file_names.h"
 #include "platform/qt/qt_phrase.h"
 #include "platform/run_time_error.h"
+#include "table_source.h"
 
 #include <QCoreApplication>
+#include <QFileInfo>
 
 #include <algorithm>
 #include <array>
@@ -101,6 +103,10 @@ int run(Invocation invocation)
     }
     if (asksForHelp(name))
         return runHelp({ invocation.argc, invocation.argv, {} });
+    if (QFileInfo(qt::pathOf(name)).isFile())
+        throw CommandError(qt::phrased(u"%1 is a file; say what to do with it: pelloric %2 %1",
+                               { name, QLatin1String(isDocumentName(name) ? "open" : "preview") }),
+            WrongUsage);
     throw CommandError(qt::phrased(u"no command %1; see \"pelloric help\"").arg(name), WrongUsage);
 }
 

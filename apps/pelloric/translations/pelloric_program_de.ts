@@ -955,6 +955,10 @@ Für fish: pelloric completion fish | source
         <source>the script nests values deeper than its stack holds</source>
         <translation>das Skript verschachtelt Werte tiefer, als sein Stapel fasst</translation>
     </message>
+    <message>
+        <source>%1 is a file; say what to do with it: pelloric %2 %1</source>
+        <translation>%1 ist eine Datei; sagen Sie, was mit ihr geschehen soll: pelloric %2 %1</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

@@ -954,6 +954,10 @@ For fish: pelloric completion fish | source
         <source>the script nests values deeper than its stack holds</source>
         <translation>the script nests values deeper than its stack holds</translation>
     </message>
+    <message>
+        <source>%1 is a file; say what to do with it: pelloric %2 %1</source>
+        <translation>%1 is a file; say what to do with it: pelloric %2 %1</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

@@ -949,6 +949,10 @@ fish：pelloric completion fish | source
         <source>the script nests values deeper than its stack holds</source>
         <translation>脚本中的值嵌套过深，超出了栈的容量</translation>
     </message>
+    <message>
+        <source>%1 is a file; say what to do with it: pelloric %2 %1</source>
+        <translation>%1 是文件；请说明要做什么：pelloric %2 %1</translation>
+    </message>
 </context>
 <context>
     <name>pelloric::app::DemoWindow</name>

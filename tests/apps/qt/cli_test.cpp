@@ -324,6 +324,8 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
     const ErrorCase cases[] = {
         { "", 2, "pelloric help" },
         { "dance", 2, "no command dance" },
+        { "t.csv", 2, "t.csv is a file; say what to do with it: pelloric preview t.csv" },
+        { "broken.ostl", 2, "pelloric open broken.ostl" },
         { "export", 2, "the file is missing" },
         { "export t.csv", 2, "-o OUT" },
         { "export t.csv more.csv -o t.pdf", 2, "more.csv" },
