@@ -83,7 +83,7 @@ CommandLine::CommandLine(
         throw UsageError(qt::phrased(u"one argument too many: %1; quote names with blanks",
             { parser_.positionalArguments().at(files) }));
     if (given < std::max(files, files == OneOrMore ? 1 : 0))
-        throw UsageError(qt::phrased(u"the file is missing"));
+        throw UsageError(qt::phrased(u"an argument is missing"));
 }
 
 /// @throws UsageError the option's value says nothing, which nobody writes on purpose

@@ -71,10 +71,6 @@
         <translation>ein Argument zu viel: %1; setzen Sie Namen mit Leerzeichen in Anführungszeichen</translation>
     </message>
     <message>
-        <source>the file is missing</source>
-        <translation>die Datei fehlt</translation>
-    </message>
-    <message>
         <source>%1 takes a whole number from %2 to %3, not &quot;%4&quot;</source>
         <translation>%1 verlangt eine ganze Zahl von %2 bis %3, nicht „%4“</translation>
     </message>
@@ -958,6 +954,10 @@ Für fish: pelloric completion fish | source
     <message>
         <source>%1 is a file; say what to do with it: pelloric %2 %1</source>
         <translation>%1 ist eine Datei; sagen Sie, was mit ihr geschehen soll: pelloric %2 %1</translation>
+    </message>
+    <message>
+        <source>an argument is missing</source>
+        <translation>ein Argument fehlt</translation>
     </message>
 </context>
 <context>

@@ -71,10 +71,6 @@
         <translation>one argument too many: %1; quote names with blanks</translation>
     </message>
     <message>
-        <source>the file is missing</source>
-        <translation>the file is missing</translation>
-    </message>
-    <message>
         <source>%1 takes a whole number from %2 to %3, not &quot;%4&quot;</source>
         <translation>%1 takes a whole number from %2 to %3, not &quot;%4&quot;</translation>
     </message>
@@ -957,6 +953,10 @@ For fish: pelloric completion fish | source
     <message>
         <source>%1 is a file; say what to do with it: pelloric %2 %1</source>
         <translation>%1 is a file; say what to do with it: pelloric %2 %1</translation>
+    </message>
+    <message>
+        <source>an argument is missing</source>
+        <translation>an argument is missing</translation>
     </message>
 </context>
 <context>

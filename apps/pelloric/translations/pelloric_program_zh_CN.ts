@@ -71,10 +71,6 @@
         <translation>多了一个参数：%1；含空格的名称请加引号</translation>
     </message>
     <message>
-        <source>the file is missing</source>
-        <translation>缺少文件</translation>
-    </message>
-    <message>
         <source>%1 takes a whole number from %2 to %3, not &quot;%4&quot;</source>
         <translation>%1 需要 %2 到 %3 之间的整数，而不是“%4”</translation>
     </message>
@@ -952,6 +948,10 @@ fish：pelloric completion fish | source
     <message>
         <source>%1 is a file; say what to do with it: pelloric %2 %1</source>
         <translation>%1 是文件；请说明要做什么：pelloric %2 %1</translation>
+    </message>
+    <message>
+        <source>an argument is missing</source>
+        <translation>缺少参数</translation>
     </message>
 </context>
 <context>

@@ -326,7 +326,7 @@ TEST_F(Program, ExplainsEveryErrorInOneLine)
         { "dance", 2, "no command dance" },
         { "t.csv", 2, "t.csv is a file; say what to do with it: pelloric preview t.csv" },
         { "broken.ostl", 2, "pelloric open broken.ostl" },
-        { "export", 2, "the file is missing" },
+        { "export", 2, "an argument is missing" },
         { "export t.csv", 2, "-o OUT" },
         { "export t.csv more.csv -o t.pdf", 2, "more.csv" },
         { "export t.csv -o t.doc", 2, ".pdf, .png, .svg or .ostl" },
@@ -384,13 +384,13 @@ TEST_F(Program, SaysHowACommandIsCalledWhereItsArgumentsDoNotFit)
             "one argument too many: t.csv; quote names with blanks\n"
             "usage: pelloric demo; for example: pelloric demo" },
         { "preview",
-            "the file is missing\n"
+            "an argument is missing\n"
             "usage: pelloric preview FILE; for example: pelloric preview stock.csv" },
         { "open --bogus",
             "Unknown option 'bogus'.\n"
             "usage: pelloric open FILE.ostl; for example: pelloric open stock.ostl" },
         { "export",
-            "the file is missing\nusage: pelloric export FILE... -o OUT; for example: pelloric "
+            "an argument is missing\nusage: pelloric export FILE... -o OUT; for example: pelloric "
             "export "
             "stock.csv -o stock.pdf" },
         { "export t.csv -o",
@@ -401,7 +401,7 @@ TEST_F(Program, SaysHowACommandIsCalledWhereItsArgumentsDoNotFit)
             "say which script to run\nusage: pelloric run SCRIPT.js [ARGUMENT...]; for example: "
             "pelloric run report.js" },
         { "print",
-            "the file is missing\nusage: pelloric print FILE; for example: pelloric print "
+            "an argument is missing\nusage: pelloric print FILE; for example: pelloric print "
             "stock.csv" },
         { "printers x",
             "one argument too many: x; quote names with blanks\n"
@@ -410,7 +410,7 @@ TEST_F(Program, SaysHowACommandIsCalledWhereItsArgumentsDoNotFit)
             "one argument too many: x; quote names with blanks\n"
             "usage: pelloric settings; for example: pelloric settings --path" },
         { "completion",
-            "the file is missing\n"
+            "an argument is missing\n"
             "usage: pelloric completion SHELL; for example: pelloric completion bash" },
     };
     for (const Row& row : rows) {
