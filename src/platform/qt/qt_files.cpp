@@ -91,10 +91,12 @@ OpenedFile handedOver(Descriptor& made, const fs::path& path, QIODevice::OpenMod
     return opened(std::move(file), isOpen);
 }
 
-/// Opens a file that exists.
-OpenedFile openPresent(const fs::path& path, int flags, QIODevice::OpenMode mode)
+/// Opens a file that exists, for reading and writing or for writing alone.
+OpenedFile openPresent(const fs::path& path, QIODevice::OpenMode mode)
 {
-    Descriptor present(::open(path.c_str(), flags | O_CLOEXEC));
+    errno = 0;
+    const int access = mode == QIODevice::WriteOnly ? O_WRONLY : O_RDWR;
+    Descriptor present(::open(path.c_str(), access | O_CLOEXEC));
     if (!present.isOpen())
         return { nullptr, faultOf(errno) };
     return handedOver(present, path, mode);
@@ -110,6 +112,16 @@ public:
 private:
     Descriptor folder_;
 };
+
+#else
+
+OpenedFile openPresent(const fs::path& path, QIODevice::OpenMode mode)
+{
+    errno = 0;
+    auto file = std::make_unique<QFile>(path);
+    const bool isOpen = file->open(mode | QIODevice::ExistingOnly);
+    return opened(std::move(file), isOpen);
+}
 
 #endif
 
@@ -199,28 +211,11 @@ OpenedFile QtFiles::create(const fs::path& path, const std::optional<fs::path>& 
 #endif
 }
 
-OpenedFile QtFiles::open(const fs::path& path)
-{
-    errno = 0;
-#ifdef Q_OS_UNIX
-    return openPresent(path, O_RDWR, QIODevice::ReadWrite);
-#else
-    auto file = std::make_unique<QFile>(path);
-    const bool isOpen = file->open(QIODevice::ReadWrite | QIODevice::ExistingOnly);
-    return opened(std::move(file), isOpen);
-#endif
-}
+OpenedFile QtFiles::open(const fs::path& path) { return openPresent(path, QIODevice::ReadWrite); }
 
 OpenedFile QtFiles::openDevice(const fs::path& path)
 {
-    errno = 0;
-#ifdef Q_OS_UNIX
-    return openPresent(path, O_WRONLY, QIODevice::WriteOnly);
-#else
-    auto file = std::make_unique<QFile>(path);
-    const bool isOpen = file->open(QIODevice::WriteOnly | QIODevice::ExistingOnly);
-    return opened(std::move(file), isOpen);
-#endif
+    return openPresent(path, QIODevice::WriteOnly);
 }
 
 OpenedFile QtFiles::spool()
