@@ -29,7 +29,8 @@ std::string marksOf(std::string_view format)
             const std::size_t end
                 = std::min(format.find(mark == '"' ? '"' : ']', at + 1), format.size());
             const std::string_view inner = format.substr(at + 1, end - at - 1);
-            if (mark == '[' && !inner.empty() && inner.find_first_not_of("hmsHMS") == inner.npos)
+            if (mark == '[' && !inner.empty()
+                && inner.find_first_not_of("hmsHMS") == std::string_view::npos)
                 marks += inner;
             at = end;
         } else {

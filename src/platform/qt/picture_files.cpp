@@ -118,7 +118,7 @@ QImage loadPicture(TextView file)
     const std::lock_guard lock(guard);
     if (const QImage* const known = read.object(path))
         return *known;
-    const QImage picture(path);
+    QImage picture(path);
     if (!picture.isNull())
         read.insert(path, new QImage(picture), static_cast<int>(picture.sizeInBytes() / 1024 + 1));
     return picture;

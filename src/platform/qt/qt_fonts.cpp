@@ -188,7 +188,7 @@ QString QtFonts::resolve(const QString& name)
 {
     if (!name.isEmpty() && QFontDatabase::hasFamily(name))
         return name;
-    if (const QString song = songFamily(); !song.isEmpty() && isSongStyle(name))
+    if (QString song = songFamily(); !song.isEmpty() && isSongStyle(name))
         return song;
     const QString matched = QFontInfo(name.isEmpty() ? QFont() : QFont(name)).family();
     return matched.left(matched.lastIndexOf(QStringLiteral(" ["))); // without its foundry

@@ -22,7 +22,7 @@ struct Sheet {
 
 /// The sheet for pages: of the form that their code names, else of their own size where the printer
 /// has or takes it, else the printer's default.
-Sheet sheetOf(const QPrinterInfo& printer, const PaperRequest& pages);
+Sheet sheetOf(const QPrinterInfo& info, const PaperRequest& pages);
 
 /// Name and size of a sheet as it lies.
 PaperForm formOf(const Sheet& sheet);

@@ -74,6 +74,7 @@ QString namesOf(const QList<QKeySequence>& keys)
 std::vector<KeyLine> allKeys(const std::vector<ViewCommand>& commands)
 {
     std::vector<KeyLine> lines;
+    lines.reserve(ReadingKeys.size() + commands.size() + PreviewTools.size());
     for (const ReadingKey& row : ReadingKeys)
         lines.push_back({ nativeKeys(QString::fromLatin1(row.keys)),
             QCoreApplication::translate("KeysWindow", row.meaning) });
