@@ -5,6 +5,9 @@
 
 #include <QGuiApplication>
 
+/// What the toolkit's font library never gives back is no finding.
+extern "C" const char* __lsan_default_suppressions() { return "leak:libfontconfig"; }
+
 namespace pelloric::fuzz {
 
 /// Makes the application that fonts and images need, once and without a display. It stays to the
