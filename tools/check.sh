@@ -54,6 +54,7 @@ checkTranslations() {
 # Reads the compile commands of the preset asan, whose compiler is of the analyser's own version: it
 # takes the headers that were compiled for it.
 checkTidy() {
+    needPackages build test bench
     needTools clang-tidy-14 python3
     configureAndBuild asan > build/tidy-build.log 2>&1 || {
         cat build/tidy-build.log >&2
@@ -63,6 +64,7 @@ checkTidy() {
 }
 
 checkAsan() {
+    needPackages build test bench
     needTools ctest
     configureAndBuild asan
     ctest --preset asan
