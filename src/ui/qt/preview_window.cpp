@@ -51,6 +51,9 @@ constexpr short RightButtonNumber = 2;
 
 constexpr int CloseAgainMs = 20;
 
+/// A window that saves for longer shows how far it is, and lives only from then on.
+constexpr int ProgressAfterMs = 200;
+
 /// Where size and place of the window are kept.
 QSettings placeSettings()
 {
@@ -473,6 +476,7 @@ void PreviewWindow::writePages(const std::filesystem::path& path)
     QProgressDialog progress(tr("Saving the pages…"), tr("Cancel"), 0, 1, this);
     progress.setWindowModality(Qt::WindowModal);
     progress.setObjectName(QStringLiteral("SavingPages"));
+    progress.setMinimumDuration(ProgressAfterMs);
     qt::savePages(canvas_->canvas(), services_.fonts(), path, [&](int done, int total) {
         progress.setMaximum(std::max(1, total));
         progress.setValue(done);
