@@ -58,6 +58,7 @@ constexpr const char* MessageTexts[] = { "无下一页！", "文件格式不正�
 
 /// Words that a published caption has, too: what uses them here is none.
 const std::set<std::pair<QString, QString>> SameWords {
+    { "Phrase", "Minimum" }, // a total on paper
     { "pelloric::qt::AboutBox", "About" }, // the box behind the tool, whose title is left open
     { "pelloric::qt::FontChooser", "OK" }, { "pelloric::qt::FontChooser", "Cancel" },
     { "pelloric::qt::GridStyleDialog", "Fonts" }, // what a screen reader calls the list
