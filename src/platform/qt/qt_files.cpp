@@ -194,7 +194,10 @@ OpenedFile QtFiles::create(const fs::path& path, const std::optional<fs::path>& 
     if (!made.isOpen())
         return { nullptr, faultOf(errno) };
     // Held as long as the file is open: who gets the lock knows that the writer has ended.
-    isLocked(made);
+    if (!isLocked(made) && errno == EWOULDBLOCK) { // somebody is about to find it abandoned
+        ::unlink(path.c_str());
+        return { nullptr, FileFault::Exists };
+    }
     if (!hasName(made))
         return { nullptr, FileFault::Exists };
     if (like)
@@ -229,14 +232,17 @@ OpenedFile QtFiles::spool()
 void QtFiles::removeAbandoned(std::span<const fs::path> files)
 {
 #ifdef Q_OS_UNIX
-    const auto isAbandoned = [](const fs::path& path) {
+    const auto isAbandoned = [](const fs::path& path, bool isRemoved) {
         const Descriptor file(::open(path.c_str(), O_RDWR | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC));
-        return file.isOpen() && isLocked(file);
+        const bool isFree = file.isOpen() && isLocked(file);
+        if (isFree && isRemoved)
+            ::unlink(path.c_str()); // still locked: its writer may have made it a moment ago
+        return isFree;
     };
-    if (!std::ranges::all_of(files, isAbandoned))
+    if (!std::ranges::all_of(files, [&](const fs::path& path) { return isAbandoned(path, false); }))
         return;
     for (const fs::path& path : files)
-        ::unlink(path.c_str());
+        isAbandoned(path, true);
 #else
     for (const fs::path& path : files)
         QFile(path).remove(); // refused while it is open

@@ -183,7 +183,7 @@ TEST(QtFiles, LetEightWritersOfOneFileEachWriteItWhole)
     std::vector<Child> children;
     for (int writer = 0; writer < 8; ++writer) {
         children.emplace_back([&, writer] {
-            for (int round = 0; round < 10; ++round)
+            for (int round = 0; round < 50; ++round)
                 save(folder.file("a"), content(writer));
         });
     }
