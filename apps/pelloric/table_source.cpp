@@ -68,7 +68,8 @@ DatabaseName splitName(const QString& name)
 }
 
 /// What a pipe hands over, in a file of the same kind that can be read twice; removed with the
-/// object.
+/// object. The toolkit puts letters of its own in the place of the six X of the file's name, in
+/// front of the ending that tells the kind.
 class PipedInput {
 public:
     /// @param name   of the pipe; "-" is the standard input
